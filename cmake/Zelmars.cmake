@@ -1,0 +1,133 @@
+# SPDX-License-Identifier: MIT
+# One place for compiler settings and for the kinds of target that the tree knows.
+
+set(CMAKE_CXX_STANDARD 20)
+set(CMAKE_CXX_STANDARD_REQUIRED ON)
+set(CMAKE_CXX_EXTENSIONS OFF)
+set(CMAKE_EXPORT_COMPILE_COMMANDS ON)
+set(CMAKE_AUTOMOC ON)
+set(CMAKE_AUTORCC ON)
+set(CMAKE_OPTIMIZE_DEPENDENCIES ON)
+
+# Everything lands side by side, so that the shared objects are found beside the program.
+set(CMAKE_RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin)
+set(CMAKE_LIBRARY_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/bin)
+set(CMAKE_BUILD_RPATH_USE_ORIGIN ON)
+set(CMAKE_INSTALL_RPATH "$ORIGIN")
+
+find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Widgets Test)
+find_package(SQLite3 REQUIRED)
+
+find_program(ZELMARS_CCACHE ccache)
+if(ZELMARS_CCACHE)
+    set(CMAKE_CXX_COMPILER_LAUNCHER ${ZELMARS_CCACHE})
+endif()
+find_program(ZELMARS_MOLD mold)
+if(ZELMARS_MOLD)
+    add_link_options(-fuse-ld=mold)
+endif()
+
+# One position-independent code model for libraries and programs alike, so that all of them can
+# share the precompiled headers.
+add_compile_options(-fPIC)
+if(ZELMARS_CCACHE)
+    add_compile_options(-fpch-preprocess)
+endif()
+if(ZELMARS_SANITIZE)
+    add_compile_options(-fsanitize=address,undefined -fno-omit-frame-pointer
+                        -fno-sanitize-recover=undefined)
+    add_link_options(-fsanitize=address,undefined)
+endif()
+
+# Warnings for our own sources.
+add_library(zelmars_warnings INTERFACE)
+target_compile_options(zelmars_warnings INTERFACE -Wall -Wextra -Wpedantic -Wconversion -Wshadow)
+target_compile_definitions(zelmars_warnings INTERFACE QT_NO_CAST_TO_ASCII QT_NO_FOREACH)
+
+# Precompiled headers: one for code without widgets, one for screens.
+function(zelmars_precompiled name qt headers)
+    file(WRITE ${CMAKE_BINARY_DIR}/pch/${name}.cpp "")
+    add_library(${name} STATIC ${CMAKE_BINARY_DIR}/pch/${name}.cpp)
+    target_link_libraries(${name} PRIVATE ${qt} zelmars_warnings)
+    target_include_directories(${name} PRIVATE ${CMAKE_SOURCE_DIR})
+    target_precompile_headers(${name} PRIVATE ${headers})
+    set_target_properties(${name} PROPERTIES AUTOMOC OFF)
+endfunction()
+set(ZELMARS_CORE_HEADERS <QtCore/QString> <QtCore/QVariant> <QtCore/QDateTime> <QtCore/QObject>
+    <QtCore/QHash> <QtCore/QList> <QtCore/QFile> <QtCore/QDir> <QtCore/QLocale> <QtCore/QPointer>
+    <QtCore/QCoreApplication> <QtCore/QTimer> <functional> <memory> <optional> <vector>)
+set(ZELMARS_SCREEN_HEADERS ${ZELMARS_CORE_HEADERS} <QtWidgets/QApplication> <QtWidgets/QBoxLayout>
+    <QtWidgets/QComboBox> <QtWidgets/QDialog> <QtWidgets/QGridLayout> <QtWidgets/QGroupBox>
+    <QtWidgets/QLabel> <QtWidgets/QLineEdit> <QtWidgets/QMainWindow> <QtWidgets/QMessageBox>
+    <QtWidgets/QPushButton> <QtWidgets/QRadioButton> <QtWidgets/QTableView>
+    <QtGui/QKeyEvent> <QtGui/QPainter> <QtGui/QWindow>)
+zelmars_precompiled(zelmars_pch_core Qt6::Core "${ZELMARS_CORE_HEADERS}")
+zelmars_precompiled(zelmars_pch_screens Qt6::Widgets "${ZELMARS_SCREEN_HEADERS}")
+
+function(zelmars_settle target)
+    target_include_directories(${target} PUBLIC ${CMAKE_SOURCE_DIR})
+    target_link_libraries(${target} PRIVATE zelmars_warnings)
+    if(ZELMARS_WIDGETS)
+        target_precompile_headers(${target} REUSE_FROM zelmars_pch_screens)
+    else()
+        target_precompile_headers(${target} REUSE_FROM zelmars_pch_core)
+    endif()
+endfunction()
+
+# zelmars_ground(NAME [WIDGETS] SOURCES … LINKS …): a folder of platform/. It is a shared object,
+# because its state (the pending error, the default instances, the event filter) exists once in a
+# process, also when the host and four components use it.
+function(zelmars_ground name)
+    cmake_parse_arguments(ZELMARS "WIDGETS" "" "SOURCES;LINKS" ${ARGN})
+    add_library(${name} SHARED ${ZELMARS_SOURCES})
+    set_target_properties(${name} PROPERTIES OUTPUT_NAME zelmars-${name} DEFINE_SYMBOL "")
+    target_link_libraries(${name} PUBLIC Qt6::Core ${ZELMARS_LINKS})
+    zelmars_settle(${name})
+endfunction()
+
+# zelmars_room(NAME [WIDGETS] SOURCES … LINKS …): a room of the work; a static part of the component.
+function(zelmars_room name)
+    cmake_parse_arguments(ZELMARS "WIDGETS" "" "SOURCES;LINKS" ${ARGN})
+    add_library(${name} STATIC ${ZELMARS_SOURCES})
+    target_link_libraries(${name} PUBLIC Qt6::Core ${ZELMARS_LINKS})
+    zelmars_settle(${name})
+endfunction()
+
+# zelmars_component(NAME OUTPUT [WIDGETS] SOURCES … LINKS …): a shared object with the four entry
+# points; OUTPUT is the file's name without "lib" and ".so".
+function(zelmars_component name output)
+    cmake_parse_arguments(ZELMARS "WIDGETS" "" "SOURCES;LINKS" ${ARGN})
+    add_library(${name} SHARED ${ZELMARS_SOURCES})
+    set_target_properties(${name} PROPERTIES OUTPUT_NAME ${output} DEFINE_SYMBOL "")
+    target_link_libraries(${name} PUBLIC Qt6::Core ${ZELMARS_LINKS})
+    zelmars_settle(${name})
+endfunction()
+
+# zelmars_program(NAME [WIDGETS] SOURCES … LINKS …)
+function(zelmars_program name)
+    cmake_parse_arguments(ZELMARS "WIDGETS" "" "SOURCES;LINKS" ${ARGN})
+    add_executable(${name} ${ZELMARS_SOURCES})
+    target_link_libraries(${name} PRIVATE Qt6::Core ${ZELMARS_LINKS})
+    zelmars_settle(${name})
+endfunction()
+
+# zelmars_suite(NAME [WIDGETS] SOURCES … LINKS …): a test program, one ctest entry. A forgotten
+# message box fails by the time-out instead of hanging.
+function(zelmars_suite name)
+    cmake_parse_arguments(ZELMARS "WIDGETS" "TIMEOUT" "SOURCES;LINKS;NEEDS" ${ARGN})
+    if(NOT ZELMARS_TIMEOUT)
+        set(ZELMARS_TIMEOUT 120)
+    endif()
+    if(ZELMARS_SANITIZE)
+        math(EXPR ZELMARS_TIMEOUT "${ZELMARS_TIMEOUT} * 4")
+    endif()
+    add_executable(test_${name} ${ZELMARS_SOURCES})
+    target_link_libraries(test_${name} PRIVATE test_support ${ZELMARS_LINKS})
+    if(ZELMARS_NEEDS)
+        add_dependencies(test_${name} ${ZELMARS_NEEDS})
+    endif()
+    zelmars_settle(test_${name})
+    add_test(NAME ${name} COMMAND test_${name})
+    set_tests_properties(${name} PROPERTIES TIMEOUT ${ZELMARS_TIMEOUT}
+        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;LC_ALL=C.UTF-8;TZ=Europe/Lisbon")
+endfunction()

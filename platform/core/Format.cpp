@@ -1,0 +1,154 @@
+// SPDX-License-Identifier: MIT
+#include "platform/core/Format.h"
+
+#include <QDateTime>
+#include <cmath>
+
+#include "platform/core/Failure.h"
+#include "platform/core/Money.h"
+#include "platform/core/Values.h"
+
+namespace core {
+
+namespace {
+
+/// `magnitude` with two decimals, grouped or not, at least `wholeDigits` digits before the mark.
+QString twoDecimals(double magnitude, bool grouped, int wholeDigits) {
+    const QString plain = QString::number(magnitude, 'f', 2);
+    QString whole = plain.chopped(3).rightJustified(wholeDigits, u'0');
+    if (grouped)
+        for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, thousandsMark());
+    return whole + decimalMark() + plain.right(2);
+}
+
+/// Amounts are cut to cents for the eye with halves away from zero, from their exact digits.
+double toCents(const QVariant& value) {
+    if (value.typeId() != qMetaTypeId<Money>()) return toDouble(value);
+    const qint64 units = value.value<Money>().units();
+    const qint64 cents = (units + (units < 0 ? -50 : 50)) / 100;
+    return static_cast<double>(cents) / 100.0;
+}
+
+bool isNumber(const QVariant& value) {
+    switch (value.typeId()) {
+        case QMetaType::Int:
+        case QMetaType::LongLong:
+        case QMetaType::Short:
+        case QMetaType::Float:
+        case QMetaType::Double:
+            return true;
+        default:
+            return value.typeId() == qMetaTypeId<Money>();
+    }
+}
+
+QString formattedNumber(const QVariant& value, QStringView format) {
+    const double number = toCents(value);
+    if (format == format::Money) {
+        const QString shown = QStringLiteral("€ ") + twoDecimals(std::abs(number), true, 1);
+        // What shows as nothing has no sign.
+        return number < 0 && std::abs(number) >= 0.005 ? u'(' + shown + u')' : shown;
+    }
+    const QString sign = number < 0 && std::abs(number) >= 0.005 ? QStringLiteral("-") : QString();
+    if (format == format::Amount) return sign + twoDecimals(std::abs(number), true, 1);
+    if (format == format::Rate) return sign + twoDecimals(std::abs(number), false, 2);
+    return toText(value).replace(u'.', decimalMark());
+}
+
+/// Takes the currency sign, brackets and sign off; false when they do not pair.
+bool stripSigns(QString& text, bool& negative) {
+    text = text.trimmed();
+    if (text.startsWith(u'(') != text.endsWith(u')')) return false;
+    negative = text.startsWith(u'(');
+    if (negative) text = text.mid(1, text.size() - 2).trimmed();
+    if (text.startsWith(u'€')) text = text.mid(1).trimmed();
+    if (text.endsWith(u'€')) text = text.chopped(1).trimmed();
+    if (text.startsWith(u'-') || text.startsWith(u'+')) {
+        if (negative) return false;
+        negative = text.startsWith(u'-');
+        text = text.mid(1).trimmed();
+    }
+    return true;
+}
+
+/// Takes the thousands marks out of the whole part; false when one stands in the wrong place.
+bool stripThousands(QString& whole) {
+    const QStringList groups = whole.split(thousandsMark());
+    for (qsizetype at = 0; at < groups.size(); ++at) {
+        const qsizetype length = groups[at].size();
+        if (at > 0 ? length != 3 : groups.size() > 1 && (length < 1 || length > 3)) return false;
+    }
+    whole = groups.join(QString());
+    return true;
+}
+
+bool onlyDigits(QStringView text) {
+    return std::all_of(text.begin(), text.end(),
+                       [](QChar c) { return c >= u'0' && c <= u'9'; });
+}
+
+}  // namespace
+
+QLocale userLocale() {
+    const QLocale system = QLocale::system();
+    return system.language() == QLocale::C ? QLocale(QLocale::Portuguese, QLocale::Portugal)
+                                           : system;
+}
+
+QChar decimalMark() { return userLocale().decimalPoint() == QStringLiteral(".") ? u'.' : u','; }
+
+QChar thousandsMark() { return decimalMark() == u',' ? u'.' : u','; }
+
+QString formatted(const QVariant& value, QStringView format) {
+    if (isNull(value)) return {};
+    if (value.typeId() == QMetaType::QDateTime || value.typeId() == QMetaType::QDate)
+        return toDate(value).toString(QStringLiteral("dd-MM-yyyy"));
+    if (isNumber(value)) return formattedNumber(value, format);
+    return toText(value);
+}
+
+std::optional<QString> parseDecimal(const QString& typed) {
+    QString text = typed;
+    bool negative = false;
+    if (!stripSigns(text, negative)) return std::nullopt;
+    const qsizetype mark = text.indexOf(decimalMark());
+    QString whole = mark < 0 ? text : text.left(mark);
+    const QString decimals = mark < 0 ? QString() : text.mid(mark + 1);
+    if (!stripThousands(whole) || !onlyDigits(whole) || !onlyDigits(decimals) ||
+        whole.size() + decimals.size() == 0)
+        return std::nullopt;
+    QString plain = whole.isEmpty() ? QStringLiteral("0") : whole;
+    if (!decimals.isEmpty()) plain += u'.' + decimals;
+    const bool zero = std::all_of(plain.begin(), plain.end(),
+                                  [](QChar c) { return c == u'0' || c == u'.'; });
+    return negative && !zero ? u'-' + plain : plain;
+}
+
+std::optional<double> parseNumber(const QString& text) {
+    const std::optional<QString> plain = parseDecimal(text);
+    if (!plain) return std::nullopt;
+    bool ok = false;
+    const double number = plain->toDouble(&ok);
+    if (!ok || !std::isfinite(number)) return std::nullopt;
+    return number;
+}
+
+std::optional<QDate> parseDate(const QString& typed) {
+    QString text = typed.trimmed();
+    text.replace(u'/', u'-').replace(u'.', u'-');
+    if (!text.contains(u'-') && (text.size() == 6 || text.size() == 8))
+        text = text.left(2) + u'-' + text.mid(2, 2) + u'-' + text.mid(4);
+    const QStringList parts = text.split(u'-');
+    if (parts.size() != 3) return std::nullopt;
+    for (const QString& part : parts)
+        if (part.isEmpty() || part.size() > 4 || !onlyDigits(part)) return std::nullopt;
+    int year = parts[2].toInt();
+    // The window of two-digit years: 1930 to 2029.
+    if (parts[2].size() <= 2) year += year < 30 ? 2000 : 1900;
+    // Years outside this range are typing mistakes, and not every engine stores them.
+    if (year < 1753) return std::nullopt;
+    const QDate day(year, parts[1].toInt(), parts[0].toInt());
+    return day.isValid() ? std::optional(day) : std::nullopt;
+}
+
+}  // namespace core
