@@ -4,7 +4,7 @@
 #include <QDateTime>
 #include <cmath>
 
-#include "platform/core/Failure.h"
+#include "platform/core/Clock.h"
 #include "platform/core/Money.h"
 #include "platform/core/Values.h"
 
@@ -143,8 +143,12 @@ std::optional<QDate> parseDate(const QString& typed) {
     for (const QString& part : parts)
         if (part.isEmpty() || part.size() > 4 || !onlyDigits(part)) return std::nullopt;
     int year = parts[2].toInt();
-    // The window of two-digit years: 1930 to 2029.
-    if (parts[2].size() <= 2) year += year < 30 ? 2000 : 1900;
+    // Two digits mean the hundred years that end twenty years from now.
+    if (parts[2].size() <= 2) {
+        const int newest = today().year() + 20;
+        year += newest - newest % 100;
+        if (year > newest) year -= 100;
+    }
     // Years outside this range are typing mistakes, and not every engine stores them.
     if (year < 1753) return std::nullopt;
     const QDate day(year, parts[1].toInt(), parts[0].toInt());

@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+namespace forms {
+
+/// A control that is asked before the focus leaves it.
+///
+/// One filter for the whole application asks it before a click elsewhere in the window, an
+/// accelerator of another control, Tab, or Enter on a default button takes effect; a refusal
+/// swallows the event that caused it. Focus that goes to another window (a message box, another
+/// program) is no leaving. Esc, a button given to passesValidation() and the closing of the
+/// window pass: a person can always give up.
+class Validating {
+public:
+    Validating();
+    virtual ~Validating();
+    /// Runs the validation and writes what was typed; false keeps the focus.
+    virtual bool leave() = 0;
+};
+
+class Button;
+/// The button's click never waits for a validation ("&Cancelar").
+void passesValidation(Button* button);
+
+}  // namespace forms
