@@ -10,7 +10,8 @@
 namespace entry {
 
 /// Opens the entry screen modeless on a new row. Empty texts are replaced by their defaults: the
-/// connection "MSAccess" and the statement that returns no movement. Fails as opening a row set does.
+/// connection "MSAccess" and the statement that returns no movement. Fails as opening a row set
+/// does.
 void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL);
 
 /// Opens the movement whose key is `Pkey` read-only, in the screen of its type. A movement that is

@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <functional>
+
+#include "coverage/TryOut.h"
+
+namespace coverage {
+
+/// What a posting looks at beyond the try-out.
+struct PostingEntry {
+    Entry entry;
+    QString DataCombo3;       ///< mode of payment as shown
+    QVariant modo_pagamento;  ///< mode of payment chosen
+    QString Text7;            ///< date of the movement
+    QString Text1;            ///< date of the document
+    QString Text5;            ///< number of the document
+    QString DataCombo2;       ///< hospital as shown
+    /// Asks for the cheque's number and writes it to the row; returns when it was given.
+    std::function<void(const ado::RecordsetPtr&)> askCheque;
+};
+
+/// Turns the pending row into a committed movement: asks, tries out once more, checks, draws the
+/// number, saves the row and adds to the accumulators. True when the movement was saved; false when
+/// it was refused or failed (the operator was told) and the screen stays.
+///
+/// Counter, movement and accumulator are three writes with no transaction around them: what was
+/// written before a failure stays. A failure of the last one is passed over.
+bool post(const PostingEntry& posting, TryOut& run);
+
+}  // namespace coverage

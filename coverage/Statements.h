@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+#include <QVariant>
+
+/// The statements of the coverage rules. Values are joined in as they stand: numbers bare, texts
+/// between single quotes with no escaping.
+namespace coverage::statements {
+
+/// One row: a rubric.
+QString rubric(const QVariant& rubrica_id);
+/// Accumulators of one member, person and rubric.
+QString accumulator(const QVariant& rubrica_id, qint32 socio_id, const QString& codABC);
+/// One row: the credit of a rubric, the member and all his family, as `sum_credito_agregado`.
+QString creditOfHousehold(const QVariant& rubrica_id, qint32 socio_id);
+/// One row: the credit of a rubric, the relatives alone, as `sum_credito_tfamilia`.
+QString creditOfRelatives(const QVariant& rubrica_id, qint32 socio_id);
+/// One row: the credit of a main rubric's group for one person, as `Tagregado`.
+QString groupCreditOfPerson(const QVariant& main, const QString& codABC, qint32 socio_id);
+/// One row: the same for the member and all his family.
+QString groupCreditOfHousehold(const QVariant& main, qint32 socio_id);
+/// One row: the same for the relatives alone.
+QString groupCreditOfRelatives(const QVariant& main, qint32 socio_id);
+/// One row: a member's debits and credits over all his accumulators, as `tdebito_ac`,
+/// `tcredito_ac`.
+QString balance(qint32 socio_id);
+/// One row: what of the franchise is spent, whole family and every type of movement. The alias
+/// `t_iliquido` sums `liquido`; that is how it is meant.
+QString franchise(qint32 socio_id, const QVariant& rubrica_id);
+/// One row: a member.
+QString member(qint32 socio_id);
+
+}  // namespace coverage::statements

@@ -1,0 +1,119 @@
+// SPDX-License-Identifier: MIT
+#include "coverage/Posting.h"
+#include "boundary/environment/dtZelmars.h"
+#include "coverage/Statements.h"
+#include "data/Codes.h"
+#include "data/MovementNumber.h"
+#include "data/Procedures.h"
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace coverage {
+
+namespace {
+
+using core::Icon;
+using core::MsgBox;
+using core::passingOver;
+
+bool entryChecks(const PostingEntry& posting) {
+    const auto missing = [&](const QString& text) {
+        MsgBox(text, Icon::Information, posting.entry.caption);
+        return false;
+    };
+    if (posting.DataCombo3.isEmpty()) return missing(u"Tem de indicar um modo de pagamento."_s);
+    if (posting.Text7.isEmpty()) return missing(u"Tem de introduzir a data do registo."_s);
+    if (posting.Text1.isEmpty()) return missing(u"Tem de introduzir a data do documento."_s);
+    if (posting.Text5.isEmpty()) return missing(u"Tem de introduzir o número do documento."_s);
+    if (posting.entry.bHospital && posting.DataCombo2.isEmpty())
+        return missing(u"Tem de indicar um hospital."_s);
+    return true;
+}
+
+/// Made for every mode of payment, cheques included. A member who has left only warns.
+bool bankNumberCheck(qint32 socio_id) {
+    const ado::RecordsetPtr member = ado::Recordset::create();
+    member->Open(statements::member(socio_id), environment::dtZelmars::instance().MSAccess());
+    if (member->atEnd()) {
+        MsgBox(u"Este Associado não se encontra na tabela de Activos."_s, Icon::Critical);
+        return true;
+    }
+    const QVariant nib = member->Collect(u"nib"_s);
+    if (core::isNullOrEmpty(nib)) {
+        MsgBox(u"Este Associado não tem NIB!"_s, Icon::Critical);
+        return false;
+    }
+    if (nib.toString().size() != data::NibLength) {
+        MsgBox(u"Este Associado tem especificado um NIB INVÁLIDO!"_s, Icon::Critical);
+        return false;
+    }
+    return true;
+}
+
+/// Draws the number and saves the row; a failing statement is passed over and the next one runs.
+/// False when one failed.
+bool save(const PostingEntry& posting) {
+    ado::Recordset& record = *posting.entry.record;
+    qint32 number = 0;
+    passingOver([&] { data::drawMovementNumber(number); });
+    passingOver([&] { record.setCollect(u"movimento_no"_s, number); });
+    passingOver([&] { record.setCollect(u"created_by"_s, data::ObterUtilizador()); });
+    passingOver([&] { record.Update(); });
+    if (core::err().number() == 0) return true;
+    MsgBox(core::err().description());
+    MsgBox(u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
+           Icon::Critical, posting.entry.caption);
+    return false;
+}
+
+/// A sum with a null stays null.
+QVariant plus(const QVariant& a, const QVariant& b) {
+    if (core::isNull(a) || core::isNull(b)) return {};
+    return core::toDouble(a) + core::toDouble(b);
+}
+
+void addToAccumulators(const Entry& entry) {
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(statements::accumulator(entry.rubrica_id, entry.Socio_ID, entry.Text3),
+               environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
+               ado::adLockPessimistic, ado::adCmdUnknown);
+    if (rows->atEnd()) {
+        rows->AddNew();
+        rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
+        rows->setCollect(u"Rubrica_ID"_s, entry.rubrica_id);
+    }
+    const auto add = [&](const QString& column, const QVariant& amount) {
+        rows->setCollect(column, plus(rows->Collect(column), amount));
+    };
+    add(u"credito_ac"_s, entry.record->Collect(u"credito"_s));
+    add(u"debito_ac"_s, entry.record->Collect(u"debito"_s));
+    add(u"No_Docs"_s, 1);
+    rows->Update();
+    rows->Close();
+}
+
+}  // namespace
+
+bool post(const PostingEntry& posting, TryOut& run) {
+    const Entry& entry = posting.entry;
+    if (MsgBox(u"Deseja finalizar o registo?"_s, Icon::Question, entry.caption,
+               core::Buttons::YesNo) != core::Answer::Yes)
+        return false;
+    tryOut(entry, run);
+    // Still true after the boxes of the minimum and of the number of documents: the posting then
+    // goes on with what the row holds. It is meant so.
+    if (!run.bEnsaioValido) return false;
+    if (!entryChecks(posting) || !bankNumberCheck(entry.Socio_ID)) return false;
+
+    entry.record->setCollect(u"socio_id"_s, entry.Socio_ID);
+    core::err().clear();
+    if (core::toText(posting.modo_pagamento) == data::modo::Cheque) posting.askCheque(entry.record);
+    if (!save(posting)) return false;
+    passingOver([&] { addToAccumulators(entry); });
+    return true;
+}
+
+}  // namespace coverage

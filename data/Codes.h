@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QStringView>
+
+/// Code values of the book, each in one place.
+namespace data {
+
+/// `tipo` of a movement.
+namespace tipo {
+inline constexpr QStringView Document = u"DOC";
+inline constexpr QStringView Hospital = u"HOS";
+inline constexpr QStringView Receipt = u"PAG";
+inline constexpr QStringView Reposition = u"REP";
+}  // namespace tipo
+
+/// `modo_pagamento` of a movement.
+namespace modo {
+inline constexpr QStringView Cheque = u"CHQ";
+inline constexpr QStringView Transfer = u"TRF";
+}  // namespace modo
+
+/// `codABC`: who a document is for.
+namespace person {
+/// The member himself.
+inline constexpr QStringView Member = u"A";
+/// A code that contains this letter, in either case, is a child's.
+inline constexpr QStringView ChildLetter = u"C";
+}  // namespace person
+
+/// Characters of a valid bank account identifier (`nib`).
+inline constexpr int NibLength = 21;
+
+}  // namespace data

@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#include "data/MovementNumber.h"
+
+#include "boundary/environment/dtZelmars.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace data {
+
+void drawMovementNumber(qint32& number) {
+    const ado::RecordsetPtr counter = ado::Recordset::create();
+    counter->Open(u"select * from tbContadores"_s, environment::dtZelmars::instance().MSAccess(),
+                  ado::adOpenDynamic, ado::adLockPessimistic, ado::adCmdUnknown);
+    if (counter->atEnd()) {
+        counter->AddNew();
+        counter->setCollect(u"zelmars"_s, 1);
+        number = 1;
+    } else {
+        number = core::toLong(counter->Collect(u"zelmars"_s));
+        counter->setCollect(u"zelmars"_s, static_cast<qint64>(number) + 1);
+    }
+    counter->Update();
+    counter->Close();
+}
+
+}  // namespace data

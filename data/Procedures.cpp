@@ -1,0 +1,28 @@
+// SPDX-License-Identifier: MIT
+#include "data/Procedures.h"
+
+#include <cstring>
+
+#include "platform/core/UserName.h"
+
+namespace data {
+
+QString ObterUtilizador() {
+    char buffer[25];
+    std::memset(buffer, ' ', sizeof buffer);
+    if (!core::userName(buffer, sizeof buffer)) return {};
+    const void* end = std::memchr(buffer, 0, sizeof buffer);
+    // A name that fills the whole buffer has no end, and gives no name at all.
+    if (!end) return {};
+    return QString::fromUtf8(buffer, static_cast<const char*>(end) - buffer);
+}
+
+float MinSingle(float a, float b) {
+    return static_cast<double>(a) < static_cast<double>(b) ? a : b;
+}
+
+float MaxSingle(float a, float b) {
+    return static_cast<double>(a) < static_cast<double>(b) ? b : a;
+}
+
+}  // namespace data

@@ -1,0 +1,21 @@
+// SPDX-License-Identifier: MIT
+#include "data/modDlookup.h"
+
+#include "boundary/environment/dtZelmars.h"
+
+namespace data {
+
+QVariant DLookup(const QString& strSQL, const QString& /*strConnection*/, const QString& strField,
+                 const QString& /*unused1*/, const QString& /*unused2*/) {
+    if (strSQL.isEmpty() || strField.isEmpty()) return {};
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(strSQL, environment::dtZelmars::instance().Connections(1), ado::adOpenStatic,
+               ado::adLockPessimistic, ado::adCmdUnknown);
+    if (rows->atEnd()) return QString(u"");
+    rows->MoveFirst();
+    const QVariant value = rows->Collect(strField);
+    rows->Close();
+    return value;
+}
+
+}  // namespace data

@@ -1,0 +1,20 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+#include <QVariant>
+
+namespace data {
+
+/// One column of the first row of a statement, without the caller holding a row set.
+///
+/// Three outcomes stay apart: null for an empty statement or column name, or a null column; empty
+/// text for no row; otherwise the value. A statement that fails, or a column that is not there,
+/// fails the caller.
+///
+/// The statement always runs on the first connection of the data environment: `strConnection` and
+/// the two last texts are accepted and, on purpose, without effect.
+QVariant DLookup(const QString& strSQL, const QString& strConnection, const QString& strField,
+                 const QString& unused1 = {}, const QString& unused2 = {});
+
+}  // namespace data

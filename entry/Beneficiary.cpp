@@ -1,0 +1,183 @@
+// SPDX-License-Identifier: MIT
+#include "entry/Beneficiary.h"
+
+#include "boundary/environment/LoginState.h"
+#include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
+#include "data/modDlookup.h"
+#include "platform/core/Clock.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace entry {
+
+namespace {
+
+using core::Answer;
+using core::Buttons;
+using core::Icon;
+using core::MsgBox;
+
+/// Stands for 25 years: a child who is exactly so many days old is too old.
+constexpr int ChildAgeLimitDays = 9132;
+
+ado::RecordsetPtr openRead(const QString& statement) {
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(statement, environment::dtZelmars::instance().MSAccess());
+    return rows;
+}
+
+QVariant lookup(const QString& table, const QString& key, const QVariant& id,
+                const QString& column) {
+    return data::DLookup(
+        u"Select * from "_s + table + u" where "_s + key + u" ="_s + core::toText(id),
+        environment::dtZelmars::instance().MSAccess()->ConnectionString, column);
+}
+
+QVariant ofFamily(const QVariant& Familia_ID, const QString& column) {
+    return lookup(u"tbsocios_familias"_s, u"socio_familia_id"_s, Familia_ID, column);
+}
+
+/// A comparison with a null does not hold, neither this one.
+bool differ(const QVariant& a, const QVariant& b) {
+    const std::partial_ordering order = core::compareNumbers(a, b);
+    return order != std::partial_ordering::unordered && order != 0;
+}
+
+/// One month's delay is tolerated; a year ahead of today is a difference like one behind.
+bool inArrears(const ado::Recordset& premium) {
+    const QDate today = core::today();
+    return differ(today.year(), premium.Collect(u"ult_ano"_s)) ||
+           core::compareNumbers(today.month() - 1, premium.Collect(u"ult_mes"_s)) > 0;
+}
+
+void warnOfPremium(const ado::Recordset& premium) {
+    if (inArrears(premium))
+        MsgBox(
+            u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) "
+            "desde "_s +
+                core::toText(premium.Collect(u"ult_mes"_s)) + u"/"_s +
+                core::toText(premium.Collect(u"ult_ano"_s)) + u"."_s,
+            Icon::Critical);
+    else if (differ(premium.Collect(u"total_quotas"_s), premium.Collect(u"total_pago"_s)))
+        MsgBox(u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s,
+               Icon::Critical);
+}
+
+/// True when the waiting period that ends on `end` is over: the last day still belongs to it.
+bool waitingIsOver(const QVariant& end) {
+    return core::isNull(end) || core::toDate(end) < core::today();
+}
+
+bool refuse(const QString& text, const QString& title) {
+    MsgBox(text, Icon::Information, title);
+    return false;
+}
+
+bool relativeMayClaim(const QVariant& Familia_ID) {
+    return waitingIsOver(ofFamily(Familia_ID, u"data_carencia"_s)) ||
+           refuse(
+               u"Este familiar está dentro do periodo de carência! Não pode ser processado o "
+               "documento."_s,
+               u"Periodo de Carência"_s);
+}
+
+bool childMayClaim(const QVariant& Familia_ID) {
+    const QVariant birth = ofFamily(Familia_ID, u"data_nascimento"_s);
+    if (core::isNull(birth) || !(core::today().addDays(-ChildAgeLimitDays) < core::toDate(birth)))
+        return refuse(u"Este familiar tem mais de 25 anos! Tente indicar outro."_s,
+                      u"Familiares"_s);
+    return relativeMayClaim(Familia_ID);
+}
+
+bool memberMayClaim(qint32 Socio_ID) {
+    return waitingIsOver(
+               lookup(u"tbSocios"_s, u"socio_id"_s, Socio_ID, u"zelmar_data_carencia"_s)) ||
+           refuse(
+               u"O Associado está dentro do periodo de carência! Não pode ser processado o "
+               "documento."_s,
+               u"Periodo de Carência"_s);
+}
+
+bool mayClaim(const QString& codABC, const QVariant& Familia_ID, qint32 Socio_ID) {
+    // By containment, the child's letter first: a code with both letters is a child's.
+    if (codABC.contains(data::person::ChildLetter, Qt::CaseInsensitive))
+        return childMayClaim(Familia_ID);
+    if (codABC.contains(data::person::Member)) return memberMayClaim(Socio_ID);
+    return relativeMayClaim(Familia_ID);
+}
+
+}  // namespace
+
+ado::RecordsetPtr openMemberByNumber(const QString& no_kor) {
+    return openRead(u"select * from tbSocios where no_kor ='"_s + no_kor + u"'"_s);
+}
+
+ado::RecordsetPtr openMemberById(qint32 socio_id) {
+    return openRead(u"select * from tbsocios where socio_id ="_s + QString::number(socio_id));
+}
+
+com::Object openSearch() {
+    const environment::LoginState& login = environment::loginState();
+    const com::Object search = com::createObject(u"Lumbra.General"_s);
+    search.call(u"Login"_s, {login.dtUser, login.dtPassword});
+    return search;
+}
+
+bool checkEnrolled(const ado::Recordset& member) {
+    if (core::compareNumbers(member.Collect(u"zelmar"_s), 0) != 0) return true;
+    MsgBox(u"Este Associado não está inscrito no plano de Saúde."_s, Icon::Critical);
+    return false;
+}
+
+com::Object testPremium(qint32 socio_id) {
+    const QString id = QString::number(socio_id);
+    const ado::RecordsetPtr premium =
+        openRead(u"select * from tbQuotas_Socios where socio_id="_s + id);
+    if (premium->atEnd())
+        MsgBox(
+            u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
+            "de Saúde)."_s,
+            Icon::Critical);
+    else
+        warnOfPremium(*premium);
+    if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
+               u"Quotizações"_s, Buttons::YesNo) != Answer::Yes)
+        return {};
+    const com::Object statement = openSearch();
+    statement.call(u"appShow"_s, {u"QUO01"_s, 1, QVariant(), u"Activos"_s,
+                                  u"tbQuotas_Movimentos.socio_id="_s + id, true, true});
+    return statement;
+}
+
+void testBankNumber(const QVariant& nib, const std::function<QVariant()>& memberId) {
+    if (core::isNullOrEmpty(nib))
+        MsgBox(u"Este Associado não tem NIB!"_s, Icon::Critical);
+    else if (nib.toString().size() != data::NibLength)
+        MsgBox(u"Este Associado tem especificado um NIB INVÁLIDO!"_s, Icon::Critical);
+    else
+        return;
+    if (MsgBox(u"Quer abrir a ficha deste Associado para proceder a alterações?"_s, Icon::Question,
+               u"Associados"_s, Buttons::YesNo) != Answer::Yes)
+        return;
+    const com::Object file = com::createObject(u"Tiqueta.General"_s);
+    file.call(u"Login"_s);
+    file.call(u"AbrirRegisto"_s, {memberId()});
+}
+
+QVariant choosePerson(qint32 Socio_ID) {
+    const com::Object file = com::createObject(u"Tiqueta.General"_s);
+    file.call(u"Login"_s);
+    return file.call(u"EscolherFamiliar"_s, {Socio_ID});
+}
+
+std::optional<Person> admitPerson(const QVariant& Familia_ID, qint32 Socio_ID) {
+    const QVariant codABC = ofFamily(Familia_ID, u"codABC"_s);
+    if (core::isNull(codABC)) return std::nullopt;
+    if (!mayClaim(codABC.toString(), Familia_ID, Socio_ID)) return std::nullopt;
+    return Person{codABC, ofFamily(Familia_ID, u"nome"_s)};
+}
+
+}  // namespace entry

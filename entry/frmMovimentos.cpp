@@ -1,0 +1,392 @@
+// SPDX-License-Identifier: MIT
+#include "entry/frmMovimentos.h"
+
+#include <QLabel>
+
+#include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
+#include "entry/Beneficiary.h"
+#include "entry/DocumentVat.h"
+#include "payments/frmPagamentoCheque.h"
+#include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace entry {
+
+using core::Icon;
+using core::MsgBox;
+using forms::BackColor;
+
+frmMovimentos::frmMovimentos() : Form(u"frmMovimentos"_s, u"Lançamento (Plano de Saúde)"_s) {
+    makeControls();
+    layOut();
+    bindControls();
+    connectHandlers();
+}
+
+void frmMovimentos::bindControls() {
+    const environment::dtZelmars& lists = environment::dtZelmars::instance();
+    DataCombo1->setList(lists.Recordsets(u"msRubricas"_s), u"completo"_s, u"rubrica_id"_s);
+    DataCombo2->setList(lists.Recordsets(u"msHospitais"_s), u"completo"_s, u"hospital_id"_s);
+    DataCombo3->setList(lists.Recordsets(u"msModosPagamento"_s), u"completo"_s, u"code"_s);
+    DataCombo4->setList(lists.Recordsets(u"msOutrasInstituicoes"_s), u"descrit"_s, u"oe_id"_s);
+
+    const std::pair<forms::Bound*, QString> bindings[] = {
+        {Text3, u"codABC"_s},
+        {Text1, u"doc_data"_s},
+        {Text5, u"doc_no"_s},
+        {Text6, u"doc_valor"_s},
+        {Text9, u"recebido"_s},
+        {Text11, u"doc_tx_iva"_s},
+        {Text10, u"doc_iva"_s},
+        {DataCombo4, u"oe_id"_s},
+        {Text12, u"obs"_s},
+        {Text7, u"data"_s},
+        {Text8, u"tipo"_s},
+        {DataCombo1, u"rubrica_id"_s},
+        {DataCombo2, u"hospital_id"_s},
+        {DataCombo3, u"modo_pagamento"_s},
+    };
+    for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
+}
+
+void frmMovimentos::connectHandlers() {
+    No_Kor->onValidate = [this](bool& cancel) { No_Kor_Validate(cancel); };
+    Command1->onClick = [this] { Command1_Click(); };
+    Command2->onClick = [this] { Command2_Click(); };
+    connectFieldHandlers();
+    Command5->onClick = [this] { Command5_Click(); };
+    Command3->onClick = [this] { Command3_Click(); };
+    Command4->onClick = [this] { Command4_Click(); };
+    Command6->onClick = [] {
+        MsgBox(u"A anulação de movimentos ainda não está disponível nesta versão."_s,
+               Icon::Information);
+    };
+    Timer1->onTimer = [this] { Timer1_Timer(); };
+    forms::passesValidation(Command4);
+    setCancelButton(Command4);
+}
+
+void frmMovimentos::connectFieldHandlers() {
+    Text1->onValidate = [this](bool& cancel) { Text1_Validate(cancel); };
+    Text5->onGotFocus = [this] { Text5_GotFocus(); };
+    Text6->onGotFocus = [this] { Text6->SelectAll(); };
+    Text6->onValidate = [this](bool&) { Text6_Validate(); };
+    Text9->onGotFocus = [this] { Text9->SelectAll(); };
+    Text9->onValidate = [this](bool&) { emptyBecomesNull(Text9); };
+    Text11->onValidate = [this](bool& cancel) { Text11_Validate(cancel); };
+    for (forms::DataCombo* combo : {DataCombo1, DataCombo2}) {
+        combo->onGotFocus = [this, combo] { remembered_ = combo->Text(); };
+        combo->onLostFocus = [this, combo] { Combo_LostFocus(combo); };
+    }
+}
+
+void frmMovimentos::showAsHospital() {
+    if (!Caption().endsWith(u" - Hospital")) setCaption(Caption() + u" - Hospital"_s);
+    Label18->show();
+    DataCombo2->show();
+    Label19->setText(u"Incidência:"_s);
+    Text9->bind(Adodc1, u"incidencia"_s);
+    DataCombo3->setBoundText(data::modo::Cheque.toString());
+}
+
+void frmMovimentos::setMember(qint32 id, const QString& number, const QString& name) {
+    Socio_ID = id;
+    No_Kor->setText(number);
+    Text2->setText(name);
+    for (forms::TextBox* box : {Text2, Text3, Text4}) box->setBackColor(BackColor::Window);
+    Command2->setEnabled(true);
+    Command2->setFocus();
+}
+
+void frmMovimentos::showReadOnly(const QString& tipo) {
+    if (tipo == data::tipo::Hospital) {
+        setCaption(Caption() + u" - Hospital"_s);
+        Label18->show();
+        DataCombo2->show();
+    }
+    Timer1->setEnabled(false);
+    bShowing = true;
+    Command4->hide();
+    Command5->hide();
+    Command3->setCaption(u"&Sair"_s);
+    Command3->setDefault(true);
+    setCancelButton(Command3);
+    LimiteAplicavel->hide();
+    Label12->hide();
+
+    const std::pair<forms::Bound*, QString> bindings[] = {
+        {Incidencia, u"incidencia"_s},
+        {Comparticipacao, u"comparticipacao"_s},
+        {SaldoCC, u"saldo_acumulado"_s},
+        {Iliquido, u"iliquido"_s},
+        {SaldoPlafond, u"saldo_plafond"_s},
+        {Credito, u"credito"_s},
+        {Debito, u"debito"_s},
+        {Liquido, u"liquido"_s},
+        {No_Kor, u"no_kor"_s},
+        {Text2, u"nome"_s},
+        {Text4, u"familiar"_s},
+    };
+    for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
+
+    for (forms::TextBox* box : {Text2, Text3, Text4}) box->setBackColor(BackColor::Window);
+    for (forms::TextBox* box : {No_Kor, Text2, Text3, Text4, Text1, Text5, Text6})
+        box->setLocked(true);
+    for (forms::DataCombo* combo : {DataCombo1, DataCombo2, DataCombo3}) combo->setLocked(true);
+    Command1->hide();
+    Command2->hide();
+    Command6->show();
+    Command3->setFocus();
+}
+
+void frmMovimentos::Timer1_Timer() {
+    // The read-only view has no defaults to set; the timer stays as it is.
+    if (bShowing) return;
+    Timer1->setEnabled(false);
+    Text7->setValue(core::fromDate(core::today()));
+    Text8->setText((bHospital ? data::tipo::Hospital : data::tipo::Document).toString());
+    DataCombo3->setBoundText((bHospital ? data::modo::Cheque : data::modo::Transfer).toString());
+}
+
+// --- Who the document is for
+
+void frmMovimentos::No_Kor_Validate(bool& cancel) {
+    if (bShowing) return;
+    if (No_Kor->Text().isEmpty()) {
+        clearMember();
+        return;
+    }
+    Text10->setText(u"0"_s);
+    Text11->setText(u"0"_s);
+    const ado::RecordsetPtr member = openMemberByNumber(No_Kor->Text());
+    if (member->atEnd()) {
+        MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Associados"_s);
+        cancel = true;
+        return;
+    }
+    if (!checkEnrolled(*member)) {
+        clearMember();
+        return;
+    }
+    takeMemberFound(*member);
+    core::passingOver([this] { No_Kor->SelectAll(); });
+}
+
+/// Typing recolours the person's fields and keeps what they hold.
+void frmMovimentos::takeMemberFound(ado::Recordset& member) {
+    const qint32 id = core::toLong(member.Collect(u"socio_id"_s));
+    if (com::Object statement = testPremium(id)) search_ = statement;
+    // The member file takes the number typed as a 16-bit integer.
+    testBankNumber(member.Collect(u"nib"_s),
+                   [id] { return QVariant::fromValue(core::toInteger(id)); });
+    Socio_ID = id;
+    Text2->setBackColor(BackColor::Window);
+    Text2->setText(core::toText(member.Collect(u"nome"_s)));
+    Text3->setBackColor(BackColor::Window);
+    Text4->setBackColor(BackColor::Window);
+    Command2->setEnabled(true);
+    member.Close();
+}
+
+void frmMovimentos::Command1_Click() {
+    core::err().clear();
+    try {
+        searchMember();
+    } catch (const std::exception& failure) {
+        MsgBox(QString::fromUtf8(failure.what()));
+    }
+}
+
+void frmMovimentos::searchMember() {
+    search_ = openSearch();
+    const qint32 id = core::toLong(search_.call(u"appShow"_s, {u"SOC01"_s, false}));
+    if (id == 0) return;
+    const ado::RecordsetPtr member = openMemberById(id);
+    if (member->atEnd()) {
+        MsgBox(u"Este Associado não se encontra na tabela de activos."_s, Icon::Critical);
+    } else if (checkEnrolled(*member)) {
+        com::Object statement = testPremium(id);
+        testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
+        Socio_ID = id;
+        No_Kor->setText(core::toText(member->Collect(u"no_kor"_s)));
+        Text2->setText(core::toText(member->Collect(u"nome"_s)));
+        Text2->setBackColor(BackColor::Window);
+        Command2->setEnabled(true);
+        for (forms::TextBox* box : {Text3, Text4}) {
+            box->setBackColor(BackColor::Menu);
+            box->Clear();
+        }
+        Familia_ID = {};
+        search_ = statement;
+        return;
+    }
+    No_Kor->Clear();
+    clearMember();
+}
+
+void frmMovimentos::clearMember() {
+    for (forms::TextBox* box : {Text2, Text3, Text4}) {
+        box->setBackColor(BackColor::Menu);
+        box->Clear();
+    }
+    Command2->setEnabled(false);
+    Socio_ID = 0;
+    Familia_ID = {};
+}
+
+void frmMovimentos::Command2_Click() {
+    Familia_ID = 0;
+    Familia_ID = choosePerson(Socio_ID);
+    if (core::compareNumbers(Familia_ID, 0) == 0) return;
+    const std::optional<Person> person = admitPerson(Familia_ID, Socio_ID);
+    if (!person) return;
+    Text3->setText(core::toText(person->codABC));
+    if (!core::isNull(person->nome)) Text4->setText(core::toText(person->nome));
+}
+
+// --- The document's fields
+
+void frmMovimentos::Text1_Validate(bool& cancel) {
+    // Refused without a word: the focus just stays.
+    if (!Text1->Text().isEmpty() && !core::parseDate(Text1->Text())) cancel = true;
+}
+
+void frmMovimentos::Text5_GotFocus() {
+    if (Adodc1->hasField(Text5->DataField()))
+        Text5->setMaxLength(Adodc1->Recordset()->Fields(Text5->DataField()).DefinedSize());
+    Text5->SelectAll();
+}
+
+/// A bound box by itself could not do it: an empty text is not a number.
+void frmMovimentos::emptyBecomesNull(forms::TextBox* box) {
+    if (box->Text().isEmpty() && Adodc1->hasField(box->DataField()))
+        Adodc1->Recordset()->setCollect(box->DataField(), QVariant());
+}
+
+void frmMovimentos::Text6_Validate() {
+    if (Text6->Text().isEmpty()) {
+        emptyBecomesNull(Text6);
+        return;
+    }
+    // A value that is no number is refused by the binding, right after this.
+    if (!core::parseNumber(Text6->Text()) || Text11->Text().isEmpty()) return;
+    const std::optional<double> rate = core::parseNumber(Text11->Text());
+    if (rate && *rate > 0) workOutVat();
+}
+
+void frmMovimentos::Text11_Validate(bool& cancel) {
+    const std::optional<double> rate = core::parseNumber(Text11->Text());
+    if (!rate) {
+        MsgBox(u"O valor que digitou não é um número válido."_s, Icon::Information);
+        cancel = true;
+    } else if (*rate < 0 || *rate > 100) {
+        MsgBox(u"O valor de IVA tem de ser entre 0 e 100."_s, Icon::Information);
+        cancel = true;
+    } else if (*rate > 0) {
+        core::passingOver([this] { workOutVat(); });
+    } else {
+        core::passingOver([this] { Text10->setText(u"0"_s); });
+    }
+}
+
+/// From the texts in the boxes; does nothing with a value that is no number.
+void frmMovimentos::workOutVat() {
+    const std::optional<double> value = core::parseNumber(Text6->Text());
+    const std::optional<double> rate = core::parseNumber(Text11->Text());
+    if (!value || !rate) return;
+    Text10->setValue(vatOf(core::toSingle(*value), *rate));
+}
+
+/// A rubric or hospital that was wiped is held as 0, not as null.
+void frmMovimentos::Combo_LostFocus(forms::DataCombo* combo) {
+    if (combo->Text() == remembered_ || !Adodc1->hasField(combo->DataField())) return;
+    const auto write = [&](const QVariant& value) {
+        Adodc1->Recordset()->setCollect(combo->DataField(), value);
+    };
+    if (combo->Text().isEmpty())
+        write(0);
+    else
+        core::passingOver([&] { write(combo->BoundText()); });
+}
+
+// --- Try-out, posting, giving up
+
+coverage::Entry frmMovimentos::entry() const {
+    coverage::Entry entry;
+    entry.record = Adodc1->Recordset();
+    entry.Socio_ID = Socio_ID;
+    entry.bHospital = bHospital;
+    entry.caption = Caption();
+    entry.Text3 = Text3->Text();
+    entry.Text6 = Text6->Text();
+    entry.Text9 = Text9->Text();
+    entry.DataCombo1 = DataCombo1->Text();
+    entry.rubrica_id = DataCombo1->BoundText();
+    return entry;
+}
+
+void frmMovimentos::Command5_Click() {
+    tryOutWith([this](coverage::TryOut& run) { coverage::tryOut(entry(), run); });
+}
+
+void frmMovimentos::Command3_Click() {
+    if (Command3->Caption() == u"&Sair"_s) {
+        Unload();
+        return;
+    }
+    const coverage::PostingEntry posting{entry(),
+                                         DataCombo3->Text(),
+                                         DataCombo3->BoundText(),
+                                         Text7->Text(),
+                                         Text1->Text(),
+                                         Text5->Text(),
+                                         DataCombo2->Text(),
+                                         &payments::frmPagamentoCheque::ask};
+    bool posted = false;
+    tryOutWith([&](coverage::TryOut& run) { posted = coverage::post(posting, run); });
+    if (posted) leaveEntry();
+}
+
+void frmMovimentos::Command4_Click() {
+    leaveEntry();
+}
+
+void frmMovimentos::leaveEntry() {
+    Hide();
+    if (onLeft) onLeft();
+}
+
+/// What a run has reached is shown also when it fails on the way.
+void frmMovimentos::tryOutWith(const std::function<void(coverage::TryOut&)>& run) {
+    coverage::TryOut tryOut;
+    try {
+        run(tryOut);
+    } catch (...) {
+        showResults(tryOut.shown);
+        throw;
+    }
+    showResults(tryOut.shown);
+}
+
+void frmMovimentos::showResults(const coverage::Results& results) {
+    const auto put = [](forms::TextBox* box, const std::optional<QVariant>& value) {
+        if (value) box->setValue(*value);
+    };
+    put(LimiteAplicavel, results.LimiteAplicavel);
+    put(Incidencia, results.Incidencia);
+    put(Comparticipacao, results.Comparticipacao);
+    put(SaldoPlafond, results.SaldoPlafond);
+    put(SaldoCC, results.SaldoCC);
+    put(Iliquido, results.Iliquido);
+    put(Liquido, results.Liquido);
+    put(Credito, results.Credito);
+    put(Debito, results.Debito);
+}
+
+}  // namespace entry

@@ -1,0 +1,120 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QVariant>
+
+#include "coverage/Posting.h"
+#include "platform/com/Component.h"
+#include "platform/forms/Bound.h"
+#include "platform/forms/Controls.h"
+#include "platform/forms/DataCombo.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/TextBox.h"
+
+class QLabel;
+
+namespace entry {
+
+/// Entry of a medical document or a hospital bill, and the read-only view of one.
+class frmMovimentos : public forms::Form {
+    Q_OBJECT
+public:
+    frmMovimentos();
+
+    qint32 Socio_ID = 0;    ///< the chosen member; 0 for none
+    QVariant Familia_ID;    ///< the chosen person's family row; null until one was chosen
+    QVariant Movimento_ID;  ///< the movement under view
+    bool bHospital = false;
+    bool bShowing = false;            ///< read-only view
+    QPointer<QObject> CallbackClass;  ///< told of an annulment; may be null
+    forms::DataControl* Adodc1;
+
+    /// Called when the entry was posted or given up; the screen is hidden by then.
+    std::function<void()> onLeft;
+
+    /// The form of a hospital entry, before the row is given.
+    void showAsHospital();
+    /// A member already known from the entry before.
+    void setMember(qint32 id, const QString& number, const QString& name);
+    /// The read-only view of the row that Adodc1 holds, whose type is `tipo`.
+    void showReadOnly(const QString& tipo);
+    /// Sets the new row's defaults a moment after the screen is up.
+    void startDefaults() { Timer1->setEnabled(true); }
+
+    forms::TextBox* No_Kor;
+    forms::TextBox* Text1;
+    forms::TextBox* Text2;
+    forms::TextBox* Text3;
+    forms::TextBox* Text4;
+    forms::TextBox* Text5;
+    forms::TextBox* Text6;
+    forms::TextBox* Text7;
+    forms::TextBox* Text8;
+    forms::TextBox* Text9;
+    forms::TextBox* Text10;
+    forms::TextBox* Text11;
+    forms::TextBox* Text12;
+    forms::DataCombo* DataCombo1;
+    forms::DataCombo* DataCombo2;
+    forms::DataCombo* DataCombo3;
+    forms::DataCombo* DataCombo4;
+    forms::TextBox* Incidencia;
+    forms::TextBox* Comparticipacao;
+    forms::TextBox* LimiteAplicavel;
+    forms::TextBox* SaldoCC;
+    forms::TextBox* Iliquido;
+    forms::TextBox* SaldoPlafond;
+    forms::TextBox* Credito;
+    forms::TextBox* Debito;
+    forms::TextBox* Liquido;
+    forms::Button* Command1;
+    forms::Button* Command2;
+    forms::Button* Command3;
+    forms::Button* Command4;
+    forms::Button* Command5;
+    forms::Button* Command6;
+    QLabel* Label12;
+    QLabel* Label18;
+    QLabel* Label19;
+
+private:
+    void makeControls();
+    void layOut();
+    QWidget* beneficiaryFrame();
+    QWidget* documentFrame();
+    QWidget* propertiesFrame();
+    QWidget* resultFrame();
+    void setTabOrders();
+    void bindControls();
+    void connectHandlers();
+    void connectFieldHandlers();
+
+    void Timer1_Timer();
+    void No_Kor_Validate(bool& cancel);
+    void Command1_Click();
+    void Command2_Click();
+    void Text1_Validate(bool& cancel);
+    void Text5_GotFocus();
+    void Text6_Validate();
+    void emptyBecomesNull(forms::TextBox* box);
+    void Text11_Validate(bool& cancel);
+    void Combo_LostFocus(forms::DataCombo* combo);
+    void Command3_Click();
+    void Command4_Click();
+    void Command5_Click();
+
+    void takeMemberFound(ado::Recordset& member);
+    void searchMember();
+    void clearMember();
+    void workOutVat();
+    void leaveEntry();
+    coverage::Entry entry() const;
+    void tryOutWith(const std::function<void(coverage::TryOut&)>& run);
+    void showResults(const coverage::Results& results);
+
+    forms::Timer* Timer1;
+    com::Object search_;  ///< the last search component; keeps its premium statement open
+    QString remembered_;  ///< the text of DataCombo1 or DataCombo2 when it received the focus
+};
+
+}  // namespace entry

@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/forms/Controls.h"
+#include "platform/forms/Form.h"
+
+namespace entry {
+
+/// What to do after an entry was posted or given up.
+class frmMovimentosF : public forms::Form {
+    Q_OBJECT
+public:
+    enum class Choice { SameMember, NewMember, Statements, Leave };
+
+    frmMovimentosF();
+
+    /// Called on "OK" with the option chosen; closing the screen without a choice leaves.
+    std::function<void(Choice)> onChosen;
+
+private:
+    void layOut();
+    void Command1_Click();
+    void choose(Choice choice);
+
+    forms::OptionButton* Option1;
+    forms::OptionButton* Option2;
+    forms::OptionButton* Option3;
+    forms::OptionButton* Option4;
+    forms::Button* Command1;
+};
+
+}  // namespace entry

@@ -1,0 +1,199 @@
+// SPDX-License-Identifier: MIT
+// Controls and layout of the entry screen.
+#include <QGridLayout>
+#include <QLabel>
+
+#include "entry/frmMovimentos.h"
+#include "platform/core/Format.h"
+
+using namespace Qt::StringLiterals;
+
+namespace entry {
+
+using forms::fieldLabel;
+using forms::TextBox;
+namespace format = core::format;
+
+namespace {
+
+TextBox* box(const QString& name, QStringView shownAs = {}) {
+    auto* made = new TextBox(name);
+    made->setFormat(shownAs);
+    return made;
+}
+
+TextBox* displayOnly(const QString& name, QStringView shownAs = {}) {
+    TextBox* made = box(name, shownAs);
+    made->setDisplayOnly();
+    return made;
+}
+
+}  // namespace
+
+void frmMovimentos::makeControls() {
+    Adodc1 = new forms::DataControl(u"Adodc1"_s, this);
+    Timer1 = new forms::Timer(u"Timer1"_s, 1, this);
+
+    No_Kor = box(u"No_Kor"_s, format::Number);
+    Text2 = displayOnly(u"Text2"_s);
+    Text3 = displayOnly(u"Text3"_s);
+    Text4 = displayOnly(u"Text4"_s);
+    for (TextBox* person : {Text2, Text3, Text4}) person->setBackColor(forms::BackColor::Menu);
+    Command1 = new forms::Button(u"Command1"_s, u"&Procurar Sócio"_s);
+    Command2 = new forms::Button(u"Command2"_s, u"&Indicar Familiar"_s);
+    Command2->setEnabled(false);
+
+    Text1 = box(u"Text1"_s, format::Date);
+    Text5 = box(u"Text5"_s, format::Number);
+    Text6 = box(u"Text6"_s, format::Money);
+    Text9 = box(u"Text9"_s, format::Money);
+    Text11 = box(u"Text11"_s, format::Rate);
+    Text10 = displayOnly(u"Text10"_s, format::Amount);
+    Text12 = box(u"Text12"_s, format::Number);
+    DataCombo4 = new forms::DataCombo(u"DataCombo4"_s);
+
+    Text7 = displayOnly(u"Text7"_s, format::Date);
+    Text8 = displayOnly(u"Text8"_s);
+    DataCombo1 = new forms::DataCombo(u"DataCombo1"_s);
+    DataCombo2 = new forms::DataCombo(u"DataCombo2"_s);
+
+    Incidencia = displayOnly(u"Incidencia"_s, format::Money);
+    Comparticipacao = displayOnly(u"Comparticipacao"_s, format::Money);
+    LimiteAplicavel = displayOnly(u"LimiteAplicavel"_s, format::Money);
+    SaldoCC = displayOnly(u"SaldoCC"_s, format::Money);
+    Iliquido = displayOnly(u"Iliquido"_s, format::Money);
+    SaldoPlafond = displayOnly(u"SaldoPlafond"_s, format::Money);
+    Credito = displayOnly(u"Credito"_s, format::Money);
+    Debito = displayOnly(u"Debito"_s, format::Money);
+    Liquido = displayOnly(u"Liquido"_s, format::Money);
+
+    DataCombo3 = new forms::DataCombo(u"DataCombo3"_s);
+    Command3 = new forms::Button(u"Command3"_s, u"&OK"_s);
+    Command4 = new forms::Button(u"Command4"_s, u"&Cancelar"_s);
+    Command5 = new forms::Button(u"Command5"_s, u"&Ensaio"_s);
+    Command6 = new forms::Button(u"Command6"_s, u"Anular"_s);
+    Command6->hide();
+}
+
+QWidget* frmMovimentos::beneficiaryFrame() {
+    auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
+    auto* grid = new QGridLayout(frame);
+    grid->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor, u"Label1"_s), 0, 0);
+    grid->addWidget(No_Kor, 0, 1);
+    grid->addWidget(Text2, 0, 2);
+    grid->addWidget(Command1, 0, 3);
+    grid->addWidget(fieldLabel(u"Familiar:"_s, Text3, u"Label3"_s), 1, 0);
+    grid->addWidget(Text3, 1, 1);
+    grid->addWidget(Text4, 1, 2);
+    grid->addWidget(Command2, 1, 3);
+    No_Kor->setMaximumWidth(130);
+    Text3->setMaximumWidth(130);
+    // 6375 twips, fifteen to the pixel.
+    Text2->setMinimumWidth(425);
+    Text4->setMinimumWidth(425);
+    grid->setColumnStretch(2, 1);
+    return frame;
+}
+
+QWidget* frmMovimentos::documentFrame() {
+    auto* frame = new forms::Frame(u"Frame2"_s, u"Documento:"_s);
+    auto* grid = new QGridLayout(frame);
+    Label19 = fieldLabel(u"Recebido Euros:"_s, Text9, u"Label19"_s);
+    grid->addWidget(fieldLabel(u"Data:"_s, Text1), 0, 0);
+    grid->addWidget(Text1, 0, 1);
+    grid->addWidget(fieldLabel(u"Nº Documento:"_s, Text5), 0, 2);
+    grid->addWidget(Text5, 0, 3);
+    grid->addWidget(fieldLabel(u"Valor Euros:"_s, Text6), 0, 4);
+    grid->addWidget(Text6, 0, 5);
+    grid->addWidget(Label19, 1, 0);
+    grid->addWidget(Text9, 1, 1);
+    grid->addWidget(fieldLabel(u"Taxa IVA:"_s, Text11), 1, 2);
+    grid->addWidget(Text11, 1, 3);
+    grid->addWidget(fieldLabel(u"Imposto IVA:"_s, Text10), 1, 4);
+    grid->addWidget(Text10, 1, 5);
+    grid->addWidget(fieldLabel(u"Entidade:"_s, DataCombo4), 2, 0);
+    grid->addWidget(DataCombo4, 2, 1, 1, 2);
+    grid->addWidget(fieldLabel(u"Observações:"_s, Text12), 2, 3);
+    grid->addWidget(Text12, 2, 4, 1, 2);
+    for (int field : {1, 3, 5}) grid->setColumnStretch(field, 1);
+    return frame;
+}
+
+QWidget* frmMovimentos::propertiesFrame() {
+    auto* frame = new forms::Frame(u"Frame3"_s, u"Propriedades do Lançamento:"_s);
+    auto* grid = new QGridLayout(frame);
+    Label18 = fieldLabel(u"Hospital:"_s, DataCombo2, u"Label18"_s);
+    grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
+    grid->addWidget(Text7, 0, 1);
+    grid->addWidget(fieldLabel(u"Rúbrica:"_s, DataCombo1), 0, 2);
+    grid->addWidget(DataCombo1, 0, 3);
+    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 1, 0);
+    grid->addWidget(Text8, 1, 1);
+    grid->addWidget(Label18, 1, 2);
+    grid->addWidget(DataCombo2, 1, 3);
+    Text7->setMaximumWidth(130);
+    Text8->setMaximumWidth(130);
+    grid->setColumnStretch(3, 1);
+    Label18->hide();
+    DataCombo2->hide();
+    return frame;
+}
+
+QWidget* frmMovimentos::resultFrame() {
+    auto* frame = new forms::Frame(u"Frame4"_s, u"Resultado do Lançamento:"_s);
+    auto* grid = new QGridLayout(frame);
+    const auto put = [grid](int row, int column, const QString& text, TextBox* field,
+                            const QString& labelName = {}) {
+        QLabel* label = fieldLabel(text, field, labelName);
+        grid->addWidget(label, row, 2 * column);
+        grid->addWidget(field, row, 2 * column + 1);
+        return label;
+    };
+    put(0, 0, u"Incidência:"_s, Incidencia);
+    put(0, 1, u"Comparticipação:"_s, Comparticipacao);
+    Label12 = put(0, 2, u"Plafond:"_s, LimiteAplicavel, u"Label12"_s);
+    put(1, 0, u"Saldo C.Corrente:"_s, SaldoCC);
+    put(1, 1, u"Ilíquido:"_s, Iliquido);
+    put(1, 2, u"Saldo Plafond:"_s, SaldoPlafond);
+    put(2, 0, u"Crédito:"_s, Credito);
+    put(2, 1, u"Débito:"_s, Debito);
+    put(2, 2, u"Líquido:"_s, Liquido);
+    for (int field : {1, 3, 5}) grid->setColumnStretch(field, 1);
+    return frame;
+}
+
+void frmMovimentos::layOut() {
+    auto* below = new QHBoxLayout;
+    below->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3));
+    below->addWidget(DataCombo3, 1);
+    below->addStretch(1);
+    for (forms::Button* button : {Command6, Command5, Command3, Command4}) below->addWidget(button);
+
+    auto* all = new QVBoxLayout(this);
+    all->setContentsMargins(0, 0, 0, 0);
+    all->addWidget(forms::headingBand(
+        u"Lançamento de Documentos"_s,
+        u"Lançamento no Plano de Saúde de documentos na conta corrente do associado."_s,
+        u"Label25"_s, u"Label26"_s, u"Image1"_s));
+    auto* body = new QVBoxLayout;
+    body->setContentsMargins(12, 8, 12, 12);
+    body->addWidget(beneficiaryFrame());
+    body->addWidget(documentFrame());
+    body->addWidget(propertiesFrame());
+    body->addWidget(resultFrame());
+    body->addLayout(below);
+    all->addLayout(body);
+
+    // Enter tries the document out, which does no harm; posting wants its own key.
+    Command5->setDefault(true);
+    setTabOrders();
+}
+
+void frmMovimentos::setTabOrders() {
+    QWidget* const order[] = {No_Kor,     Command1, Command2,   Text1,    Text5,      Text6,
+                              Text9,      Text11,   DataCombo4, Text12,   DataCombo1, DataCombo2,
+                              DataCombo3, Command5, Command3,   Command6, Command4};
+    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+}
+
+}  // namespace entry

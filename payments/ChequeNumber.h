@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+
+namespace payments {
+
+/// The next cheque number to offer. A book without one gets the row, holding 0.
+QString nextChequeNumber();
+
+/// The number that a person typed. Fails with TypeMismatch when it is no whole number.
+qint64 chequeNumber(const QString& typed);
+
+/// Stores what follows the number used, also when that lies below the former one.
+void storeChequeNumber(qint64 used);
+
+}  // namespace payments

@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/Recordset.h"
+#include "platform/forms/Controls.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/TextBox.h"
+
+namespace payments {
+
+/// Gives a document its cheque number, and keeps the running number.
+class frmPagamentoCheque : public forms::Form {
+    Q_OBJECT
+public:
+    /// @param movement  its current row takes the number; saving the row is its owner's work
+    explicit frmPagamentoCheque(const ado::RecordsetPtr& movement);
+
+    /// Shows the screen and waits until it is gone.
+    static void ask(const ado::RecordsetPtr& movement);
+
+private:
+    void layOut();
+    void Form_Load();
+    void step(int by);
+    void Command1_Click();
+
+    ado::RecordsetPtr movement_;
+    forms::TextBox* Text1;
+    forms::Button* Command1;
+    forms::Button* Command2;
+    forms::Button* Command3;
+};
+
+}  // namespace payments
