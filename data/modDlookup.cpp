@@ -3,6 +3,8 @@
 
 #include "boundary/environment/dtZelmars.h"
 
+using namespace Qt::StringLiterals;
+
 namespace data {
 
 QVariant DLookup(const QString& strSQL, const QString& /*strConnection*/, const QString& strField,
@@ -11,7 +13,7 @@ QVariant DLookup(const QString& strSQL, const QString& /*strConnection*/, const 
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(strSQL, environment::dtZelmars::instance().Connections(1), ado::adOpenStatic,
                ado::adLockPessimistic, ado::adCmdUnknown);
-    if (rows->atEnd()) return QString(u"");
+    if (rows->atEnd()) return u""_s;
     rows->MoveFirst();
     const QVariant value = rows->Collect(strField);
     rows->Close();
