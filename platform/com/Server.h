@@ -15,10 +15,10 @@ namespace com {
 /// What a server offers: one class.
 struct ServedClass {
     Guid clsid;
-    QString progId;        ///< "Lumbra.General"
-    QString description;   ///< one line, for the registry
-    QString fileVersion;   ///< "1.00.0002"
-    QString interfaceName; ///< "_General"
+    QString progId;         ///< "Lumbra.General"
+    QString description;    ///< one line, for the registry
+    QString fileVersion;    ///< "1.00.0002"
+    QString interfaceName;  ///< "_General"
     /// Makes a component with one reference.
     Dispatch* (*make)();
 };
@@ -26,12 +26,13 @@ struct ServedClass {
 /// A component around a QObject that has no interface of its own: members by name only.
 Dispatch* makeAutomation(std::unique_ptr<QObject> object);
 
-/// How many components and locks keep the calling server loaded. Counted by makeAutomation and by
-/// servers with an interface of their own.
+/// How many components, class factories and locks keep servers loaded. One count for all servers of
+/// the process: none goes while another is in use. Kept by Counted.h.
 std::atomic<quint32>& serverUse();
 
 // The bodies of the four entry points. A server exports DllGetClassObject, DllCanUnloadNow,
-// DllRegisterServer and DllUnregisterServer with C linkage (the macro below) and answers with these.
+// DllRegisterServer and DllUnregisterServer with C linkage (the macro below) and answers with
+// these.
 Status getClassObject(const ServedClass& served, const Guid& clsid, const Guid& iid, void** object);
 Status canUnloadNow();
 /// Writes the class into HKEY_CLASSES_ROOT: programmatic name, class id, the path of the shared
@@ -44,15 +45,19 @@ QString guidText(const Guid& guid);
 
 }  // namespace com
 
-#define ZELMARS_SERVER(served)                                                                     \
-    extern "C" {                                                                                   \
-    Q_DECL_EXPORT com::Status DllGetClassObject(const com::Guid* clsid, const com::Guid* iid,      \
-                                                void** object) {                                   \
-        return clsid && iid ? com::getClassObject(served(), *clsid, *iid, object) : com::Pointer;  \
-    }                                                                                              \
-    Q_DECL_EXPORT com::Status DllCanUnloadNow() { return com::canUnloadNow(); }                    \
-    Q_DECL_EXPORT com::Status DllRegisterServer() {                                                \
-        return com::registerServer(served(), reinterpret_cast<const void*>(&DllRegisterServer));   \
-    }                                                                                              \
-    Q_DECL_EXPORT com::Status DllUnregisterServer() { return com::unregisterServer(served()); }    \
+#define ZELMARS_SERVER(served)                                                                    \
+    extern "C" {                                                                                  \
+    Q_DECL_EXPORT com::Status DllGetClassObject(const com::Guid* clsid, const com::Guid* iid,     \
+                                                void** object) {                                  \
+        return clsid && iid ? com::getClassObject(served(), *clsid, *iid, object) : com::Pointer; \
+    }                                                                                             \
+    Q_DECL_EXPORT com::Status DllCanUnloadNow() {                                                 \
+        return com::canUnloadNow();                                                               \
+    }                                                                                             \
+    Q_DECL_EXPORT com::Status DllRegisterServer() {                                               \
+        return com::registerServer(served(), reinterpret_cast<const void*>(&DllRegisterServer));  \
+    }                                                                                             \
+    Q_DECL_EXPORT com::Status DllUnregisterServer() {                                             \
+        return com::unregisterServer(served());                                                   \
+    }                                                                                             \
     }
