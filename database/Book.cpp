@@ -1,0 +1,106 @@
+// SPDX-License-Identifier: MIT
+#include "database/Book.h"
+
+#include <QDir>
+#include <QFile>
+#include <QScopeGuard>
+
+#include "database/Sqlite.h"
+#include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
+#include "platform/registry/Registry.h"
+
+using namespace Qt::StringLiterals;
+
+// A static library's resource is linked in only when it is asked for, and that from outside any
+// namespace.
+static void loadSchema() {
+    Q_INIT_RESOURCE(schema);
+}
+
+namespace database {
+
+namespace {
+
+QByteArray schemaText(const QString& name) {
+    loadSchema();
+    QFile file(u":/zelmars/schema/"_s + name);
+    if (!file.open(QIODevice::ReadOnly))
+        throw core::Failure(core::InvalidCall, u"Falta no programa o ficheiro %1."_s.arg(name));
+    return file.readAll();
+}
+
+void removeBook(const QString& file) {
+    for (const QString& suffix : {u""_s, u"-wal"_s, u"-shm"_s, u"-journal"_s})
+        QFile::remove(file + suffix);
+}
+
+/// Makes the book under a name of its own first; the book's name appears when all of it stands.
+void makeStaged(const QString& file) {
+    const QString staged = file + u".novo"_s;
+    removeBook(staged);
+    auto cleanup = qScopeGuard([&] { removeBook(staged); });
+    {
+        sqlite::Database book(staged, sqlite::Database::Mode::CreateNew);
+        book.run("PRAGMA journal_mode=WAL; PRAGMA synchronous=FULL; BEGIN");
+        book.run(schemaText(u"sqlite.sql"_s));
+        book.run(schemaText(u"codes.sql"_s));
+        book.run("COMMIT");
+    }
+    if (!QFile::rename(staged, file))  // never over an existing file
+        throw core::Failure(core::InvalidCall,
+                            u"Não foi possível criar a base de dados %1."_s.arg(file));
+    cleanup.dismiss();
+}
+
+}  // namespace
+
+QString bookFile(const QString& folder, const QString& catalogue) {
+    return QDir(folder).absoluteFilePath(catalogue + u".db"_s);
+}
+
+void createBook(const QString& folder, const QString& catalogue) {
+    const QString file = bookFile(folder, catalogue);
+    if (QFile::exists(file) || QFileInfo(file).isSymLink())
+        throw core::Failure(core::InvalidCall,
+                            u"Já existe uma base de dados em %1. Não foi alterada."_s.arg(file));
+    const bool madeFolder = !QDir(folder).exists();
+    if (!QDir().mkpath(folder))
+        throw core::Failure(core::InvalidCall, u"Não foi possível criar a pasta %1."_s.arg(folder));
+    auto cleanup = qScopeGuard([&] {
+        if (madeFolder) QDir().rmdir(folder);
+    });
+    makeStaged(file);
+    cleanup.dismiss();
+}
+
+void writeSettings(const QString& folder, const QString& catalogue) {
+    const QString key = u"SOFTWARE\\Norvanta\\Corvenda"_s;
+    const auto write = [&](const QString& name, const QString& value) {
+        registry::writeValue(registry::Hive::LocalMachine, key, name, value);
+    };
+    write(u"dtSecurityInfo"_s, u"True"_s);
+    write(u"dtUser"_s, u"zelmars"_s);
+    write(u"dtPassword"_s, u""_s);
+    write(u"dtInitialCatalog"_s, catalogue);
+    write(u"dtDataSource"_s, u"sqlite:"_s + QDir(folder).absolutePath());
+}
+
+void fillSample(const QString&, const QString&, const BookSizes&, QDate) {
+    throw core::Failure(core::InvalidCall, u"O livro de exemplo ainda não existe."_s);
+}
+
+void initBook(const QString& folder, bool sample) {
+    const QString catalogue = u"zelmars"_s;
+    const bool madeFolder = !QDir(folder).exists();
+    createBook(folder, catalogue);
+    auto cleanup = qScopeGuard([&] {
+        removeBook(bookFile(folder, catalogue));
+        if (madeFolder) QDir().rmdir(folder);
+    });
+    if (sample) fillSample(folder, catalogue);
+    writeSettings(folder, catalogue);
+    cleanup.dismiss();
+}
+
+}  // namespace database

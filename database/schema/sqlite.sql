@@ -1,0 +1,329 @@
+-- SPDX-License-Identifier: MIT
+-- The book on SQLite. Names are the system's own; letter case does not matter to the engine.
+--
+-- Types by name, as the row-set layer reads them:
+--   MONEY     an amount with four decimals
+--   REAL      a 32-bit float, DOUBLE a 64-bit one
+--   DATETIME  text 'YYYY-MM-DD HH:MM:SS', a day being its first instant
+-- Nothing refers to anything by a constraint: members leave into the tables *_Inactivos, rubrics and
+-- hospitals may go while old movements still name them, and the screens rely on being let.
+
+-- Movements --------------------------------------------------------------------------------------
+
+-- One row is one movement of a member's account in the current plan year.
+CREATE TABLE tbZelmar_Movimentos (
+    movimento_id      INTEGER PRIMARY KEY AUTOINCREMENT,  -- never given twice
+    movimento_no      INTEGER,                            -- drawn from tbContadores, unique in a year
+    socio_id          INTEGER,
+    codABC            VARCHAR(4),                         -- whom it is for; null or '' for nobody
+    rubrica_id        INTEGER,
+    hospital_id       INTEGER,
+    oe_id             INTEGER,
+    data              DATETIME,                           -- day of entry
+    tipo              VARCHAR(3),
+    doc_data          DATETIME,
+    doc_no            VARCHAR(20),
+    doc_valor         MONEY,
+    doc_iva           MONEY,
+    doc_tx_iva        DOUBLE,                             -- per cent, 0 to 100
+    recebido          MONEY,
+    incidencia        MONEY,
+    comparticipacao   MONEY,
+    saldo_plafond     MONEY,
+    saldo_acumulado   MONEY,
+    iliquido          MONEY,
+    liquido           MONEY,
+    credito           MONEY,
+    debito            MONEY,
+    modo_pagamento    VARCHAR(3),
+    cheque            BIGINT,
+    descrit           TEXT,
+    obs               TEXT,
+    created_by        VARCHAR(50),
+    upsize_ts         BIGINT                              -- row version of the former server; unused
+);
+-- Franchise of the try-out: WHERE socio_id = ? AND rubrica_id = ?; statements: WHERE socio_id = ?
+CREATE INDEX ixMovimentos_socio ON tbZelmar_Movimentos (socio_id, rubrica_id);
+-- Payment listings, hospital listing: WHERE data >= ? AND data <= ?
+CREATE INDEX ixMovimentos_data ON tbZelmar_Movimentos (data);
+
+-- The same for members who have left.
+CREATE TABLE tbZelmar_Movimentos_Inactivos (
+    movimento_id      INTEGER PRIMARY KEY AUTOINCREMENT,
+    movimento_no      INTEGER,
+    socio_id          INTEGER,
+    codABC            VARCHAR(4),
+    rubrica_id        INTEGER,
+    hospital_id       INTEGER,
+    oe_id             INTEGER,
+    data              DATETIME,
+    tipo              VARCHAR(3),
+    doc_data          DATETIME,
+    doc_no            VARCHAR(20),
+    doc_valor         MONEY,
+    doc_iva           MONEY,
+    doc_tx_iva        DOUBLE,
+    recebido          MONEY,
+    incidencia        MONEY,
+    comparticipacao   MONEY,
+    saldo_plafond     MONEY,
+    saldo_acumulado   MONEY,
+    iliquido          MONEY,
+    liquido           MONEY,
+    credito           MONEY,
+    debito            MONEY,
+    modo_pagamento    VARCHAR(3),
+    cheque            BIGINT,
+    descrit           TEXT,
+    obs               TEXT,
+    created_by        VARCHAR(50),
+    upsize_ts         BIGINT
+);
+-- A movement keeps its id when its member leaves. What is first written here (corrections, opening
+-- balances) is numbered far above, so that an id names one movement in both tables together.
+INSERT INTO sqlite_sequence (name, seq) VALUES ('tbZelmar_Movimentos_Inactivos', 1000000000);
+-- The same statements as above, run on this table beside them.
+CREATE INDEX ixMovimentos_Inactivos_socio ON tbZelmar_Movimentos_Inactivos (socio_id, rubrica_id);
+CREATE INDEX ixMovimentos_Inactivos_data ON tbZelmar_Movimentos_Inactivos (data);
+
+-- Movements of closed years, with the member's name and address as they stood at the close.
+CREATE TABLE tbZelmar_Movimentos_Historico (
+    ano                 INTEGER,                          -- the year closed
+    movimento_no        INTEGER,
+    socio_id            INTEGER,
+    codABC              VARCHAR(4),
+    rubrica_id          INTEGER,
+    hospital_id         INTEGER,
+    oe_id               INTEGER,
+    data                DATETIME,
+    tipo                VARCHAR(3),
+    doc_data            DATETIME,
+    doc_no              VARCHAR(20),
+    doc_valor           MONEY,
+    doc_iva             MONEY,
+    doc_tx_iva          DOUBLE,
+    recebido            MONEY,
+    incidencia          MONEY,
+    comparticipacao     MONEY,
+    saldo_plafond       MONEY,
+    saldo_acumulado     MONEY,
+    iliquido            MONEY,
+    liquido             MONEY,
+    credito             MONEY,
+    debito              MONEY,
+    modo_pagamento      VARCHAR(3),
+    cheque              BIGINT,
+    descrit             TEXT,
+    obs                 TEXT,
+    created_by          VARCHAR(50),
+    no_kor              VARCHAR(10),
+    nome                VARCHAR(100),
+    nome_guerra         VARCHAR(40),
+    no_contribuinte     VARCHAR(15),
+    nome_familiar       VARCHAR(100),
+    morada              VARCHAR(100),
+    localidade_completo VARCHAR(70)
+);
+-- List of closed years: GROUP BY ano; year close: WHERE ano > ?; tax declaration of one year.
+CREATE INDEX ixHistorico_ano ON tbZelmar_Movimentos_Historico (ano, no_kor);
+-- Tax declaration, whether a member has any: WHERE no_kor = ?
+CREATE INDEX ixHistorico_no_kor ON tbZelmar_Movimentos_Historico (no_kor);
+
+-- Accumulators -----------------------------------------------------------------------------------
+-- Running totals per member, person and rubric. Neither key nor constraint: several equal rows are
+-- allowed, and so is null in every column.
+
+CREATE TABLE tbSocios_Acumulados (
+    socio_id        INTEGER,
+    codABC          VARCHAR(4),
+    rubrica_id      INTEGER,
+    rubrica_id_main INTEGER,
+    debito_ac       REAL,
+    credito_ac      REAL,
+    no_docs         INTEGER
+);
+-- Try-out and posting: WHERE rubrica_id = ? AND socio_id = ? AND codABC = ?; all sums of a member:
+-- WHERE socio_id = ?
+CREATE INDEX ixAcumulados_socio ON tbSocios_Acumulados (socio_id, rubrica_id, codABC);
+
+-- The year close writes one of the two sums here and leaves the other to its default.
+CREATE TABLE tbSocios_Acumulados_Inactivos (
+    socio_id        INTEGER,
+    codABC          VARCHAR(4),
+    rubrica_id      INTEGER,
+    rubrica_id_main INTEGER,
+    debito_ac       REAL DEFAULT 0,
+    credito_ac      REAL DEFAULT 0,
+    no_docs         INTEGER
+);
+-- Annulments, as above.
+CREATE INDEX ixAcumulados_Inactivos_socio
+    ON tbSocios_Acumulados_Inactivos (socio_id, rubrica_id, codABC);
+
+-- Rubrics and hospitals --------------------------------------------------------------------------
+-- Keys are never given twice, since closed years go on naming rubrics and hospitals that are gone.
+
+-- A main rubric has a null rubrica_id_main and carries the ceilings of its group. A null ceiling is
+-- no ceiling.
+CREATE TABLE tbZelmar_Plafonds (
+    rubrica_id             INTEGER PRIMARY KEY AUTOINCREMENT,
+    rubrica_id_main        INTEGER,
+    code                   VARCHAR(10),
+    descrit                VARCHAR(80),
+    percent                DOUBLE,                        -- 0 to 1, a fraction
+    agregado               MONEY,
+    socio                  MONEY,
+    familiar               MONEY,
+    total_familia          MONEY,
+    nomax_recibos_socio    INTEGER,
+    nomax_recibos_familiar INTEGER,
+    socio_min_lan          MONEY,
+    socio_max_lan          MONEY,
+    familiar_min_lan       MONEY,
+    familiar_max_lan       MONEY,
+    franquia               MONEY
+);
+
+CREATE TABLE tbHospitais (
+    hospital_id INTEGER PRIMARY KEY AUTOINCREMENT,
+    code        VARCHAR(10),
+    nome        VARCHAR(80),
+    morada      VARCHAR(100),
+    code_postal VARCHAR(10),
+    localidade  VARCHAR(50),
+    telefone1   VARCHAR(20),
+    telefone2   VARCHAR(20),
+    fax         VARCHAR(20)
+);
+
+-- Counters ---------------------------------------------------------------------------------------
+-- One row each, read whole and without a key.
+
+CREATE TABLE tbContadores (
+    zelmars INTEGER                                       -- the next movement number
+);
+
+CREATE TABLE tbCheques (
+    cheque_no BIGINT                                      -- the next cheque number to offer
+);
+
+-- Member file ------------------------------------------------------------------------------------
+
+CREATE TABLE tbSocios (
+    socio_id             INTEGER PRIMARY KEY AUTOINCREMENT,
+    no_kor               VARCHAR(10),                     -- staff number, what people type
+    nome                 VARCHAR(100),
+    nome_guerra          VARCHAR(40),
+    nib                  VARCHAR(30),                     -- valid with 21 characters
+    zelmar               SMALLINT DEFAULT 0,              -- not 0: enrolled in the plan
+    zelmar_data_carencia DATETIME,                        -- last day of the waiting period
+    no_contribuinte      VARCHAR(15),
+    morada1              VARCHAR(100),
+    code_postal1         VARCHAR(10),
+    localidade1          VARCHAR(50)
+);
+-- Typing a staff number: WHERE no_kor = ?
+CREATE INDEX ixSocios_no_kor ON tbSocios (no_kor);
+
+CREATE TABLE tbSocios_Inactivos (
+    socio_id             INTEGER PRIMARY KEY,
+    no_kor               VARCHAR(10),
+    nome                 VARCHAR(100),
+    nome_guerra          VARCHAR(40),
+    nib                  VARCHAR(30),
+    zelmar               SMALLINT DEFAULT 0,
+    zelmar_data_carencia DATETIME,
+    no_contribuinte      VARCHAR(15),
+    morada1              VARCHAR(100),
+    code_postal1         VARCHAR(10),
+    localidade1          VARCHAR(50)
+);
+
+-- A member's relatives, the member himself (codABC 'A') among them.
+CREATE TABLE tbSocios_Familias (
+    socio_familia_id INTEGER PRIMARY KEY AUTOINCREMENT,
+    socio_id         INTEGER,
+    codABC           VARCHAR(4),
+    nome             VARCHAR(100),
+    data_nascimento  DATETIME,
+    data_carencia    DATETIME                             -- last day of the waiting period
+);
+-- Choosing a person: WHERE socio_id = ?; names beside movements: ON socio_id AND codABC
+CREATE INDEX ixFamilias_socio ON tbSocios_Familias (socio_id, codABC);
+
+CREATE TABLE tbSocios_Familias_Inactivos (
+    socio_familia_id INTEGER PRIMARY KEY,
+    socio_id         INTEGER,
+    codABC           VARCHAR(4),
+    nome             VARCHAR(100),
+    data_nascimento  DATETIME,
+    data_carencia    DATETIME
+);
+-- Names beside movements, as above.
+CREATE INDEX ixFamilias_Inactivos_socio ON tbSocios_Familias_Inactivos (socio_id, codABC);
+
+-- The premium: one row per member who ever paid it.
+CREATE TABLE tbQuotas_Socios (
+    socio_id     INTEGER PRIMARY KEY,
+    ult_ano      INTEGER,                                 -- year and month last paid
+    ult_mes      INTEGER,
+    total_quotas MONEY,                                   -- due
+    total_pago   MONEY                                    -- paid
+);
+
+CREATE TABLE tbQuotas_Movimentos (
+    quota_id INTEGER PRIMARY KEY AUTOINCREMENT,
+    socio_id INTEGER,
+    data     DATETIME,                                    -- day of the payment
+    ano      INTEGER,                                     -- month paid for
+    mes      INTEGER,
+    valor    MONEY,
+    descrit  VARCHAR(80)
+);
+-- Statement of the premium: WHERE tbQuotas_Movimentos.socio_id = ?
+CREATE INDEX ixQuotas_Movimentos_socio ON tbQuotas_Movimentos (socio_id);
+
+-- Code lists -------------------------------------------------------------------------------------
+
+CREATE TABLE tbZelmar_movimentos_tipos (
+    code    VARCHAR(3) PRIMARY KEY,
+    descrit VARCHAR(40)
+);
+
+CREATE TABLE tbModos_Pagamento (
+    code    VARCHAR(3) PRIMARY KEY,
+    descrit VARCHAR(40)
+);
+
+-- `descrit` is the code compared with codABC: with an A the member himself, with a C a child.
+CREATE TABLE tbSocios_Familias_CodeABC (
+    descrit VARCHAR(4) PRIMARY KEY,
+    grau    VARCHAR(40)
+);
+
+CREATE TABLE tbOutrasInstituicoes (
+    oe_id   INTEGER PRIMARY KEY AUTOINCREMENT,
+    descrit VARCHAR(60)
+);
+
+CREATE TABLE tbLocalidades (
+    code    VARCHAR(10) PRIMARY KEY,                      -- postal code
+    descrit VARCHAR(50)
+);
+
+-- Movements in force: the current plan year's, of members and of those who have left, whatever
+-- their type; what an annulment marked or wrote is among them until the year closes.
+-- Opening one: WHERE movimento_id = ?, which reaches the key of either table. The relative's name
+-- is looked up, not joined, so that a code given twice in a family does not double a movement.
+CREATE VIEW vwZelmars_Movimentos_Vigor AS
+SELECT m.*, 'ACTIVO' AS ficheiro, s.no_kor, s.nome,
+       (SELECT f.nome FROM tbSocios_Familias f
+         WHERE f.socio_id = m.socio_id AND f.codABC = m.codABC
+         ORDER BY f.socio_familia_id LIMIT 1) AS familiar
+  FROM tbZelmar_Movimentos m LEFT JOIN tbSocios s ON s.socio_id = m.socio_id
+UNION ALL
+SELECT m.*, 'INACTIVO' AS ficheiro, s.no_kor, s.nome,
+       (SELECT f.nome FROM tbSocios_Familias_Inactivos f
+         WHERE f.socio_id = m.socio_id AND f.codABC = m.codABC
+         ORDER BY f.socio_familia_id LIMIT 1) AS familiar
+  FROM tbZelmar_Movimentos_Inactivos m LEFT JOIN tbSocios_Inactivos s ON s.socio_id = m.socio_id;
