@@ -23,7 +23,7 @@ struct MemberRow {
     QVariant nome_guerra = QStringLiteral("António Matos");
     QVariant nib = QStringLiteral("001300000000000000186");
     QVariant zelmar = 1;
-    QVariant zelmar_data_carencia;
+    QVariant zelmar_data_carencia = {};
     QVariant no_contribuinte = QStringLiteral("123456789");
     QVariant morada1 = QStringLiteral("Rua das Flores, 12");
     QVariant code_postal1 = QStringLiteral("1050-012");
@@ -35,28 +35,28 @@ struct PersonRow {
     qint64 socio_id = 0;
     QVariant codABC = QStringLiteral("B");
     QVariant nome = QStringLiteral("Maria da Luz Matos");
-    QVariant data_nascimento;
-    QVariant data_carencia;
+    QVariant data_nascimento = {};
+    QVariant data_carencia = {};
 };
 
 /// Without rubrica_id_main a main rubric. Without a ceiling there is none, but mind that a child
 /// rubric with a null `socio` or `familiar` leaves that person nothing.
 struct RubricRow {
-    QVariant rubrica_id_main;
+    QVariant rubrica_id_main = {};
     QVariant code = QStringLiteral("01");
     QVariant descrit = QStringLiteral("Consultas");
-    QVariant percent;  // 0..1, a fraction
-    QVariant agregado;
-    QVariant socio;
-    QVariant familiar;
-    QVariant total_familia;
-    QVariant nomax_recibos_socio;
-    QVariant nomax_recibos_familiar;
-    QVariant socio_min_lan;
-    QVariant socio_max_lan;
-    QVariant familiar_min_lan;
-    QVariant familiar_max_lan;
-    QVariant franquia;
+    QVariant percent = {};  // 0..1, a fraction
+    QVariant agregado = {};
+    QVariant socio = {};
+    QVariant familiar = {};
+    QVariant total_familia = {};
+    QVariant nomax_recibos_socio = {};
+    QVariant nomax_recibos_familiar = {};
+    QVariant socio_min_lan = {};
+    QVariant socio_max_lan = {};
+    QVariant familiar_min_lan = {};
+    QVariant familiar_max_lan = {};
+    QVariant franquia = {};
 };
 
 /// A book of its own for one test: a temporary folder, the schema with its code lists, and a
