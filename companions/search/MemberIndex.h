@@ -1,0 +1,58 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QByteArray>
+#include <QString>
+#include <string>
+#include <vector>
+
+#include "platform/ado/Connection.h"
+
+namespace companions {
+
+/// A member as the search window shows him.
+struct Member {
+    qint32 socioId = 0;
+    QString number;
+    QString name;
+    QString shortName;
+    QString locality;
+    bool enrolled = false;  ///< takes part in the plan
+};
+
+/// The active members, held for searching: some 150 bytes a member, so that a keystroke among
+/// 100,000 of them costs milliseconds and no statement.
+class MemberIndex {
+public:
+    /// Takes all active members in, by name. What was held before goes.
+    void load(const ado::ConnectionPtr& connection);
+    void add(const Member& member);
+
+    int size() const { return static_cast<int>(entries_.size()); }
+    Member at(int position) const;
+    qint32 socioId(int position) const { return entries_[static_cast<size_t>(position)].socioId; }
+
+    /// Positions of the members for whom each typed word begins a word of the name or the number,
+    /// in any order, without regard to accents and case. All members when nothing is typed. A
+    /// number typed in full comes first.
+    std::vector<int> matching(const QString& typed) const;
+
+private:
+    struct Entry {
+        qint32 socioId;
+        bool enrolled;
+        quint32 shownEnd;  // end of this member's texts in shown_
+        quint32 wordsEnd;  // end of this member's words in words_
+    };
+    std::string_view words(size_t position) const;
+
+    std::vector<Entry> entries_;
+    QByteArray shown_;   // UTF-8: number, name, short name, locality, one a line
+    std::string words_;  // folded: " number word word …"
+};
+
+/// Lower case without accents; each word behind one blank, everything but letters and digits
+/// parts words.
+std::string folded(const QString& text);
+
+}  // namespace companions

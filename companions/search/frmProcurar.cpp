@@ -1,0 +1,140 @@
+// SPDX-License-Identifier: MIT
+#include "companions/search/frmProcurar.h"
+
+#include <QBoxLayout>
+#include <QHeaderView>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QTableView>
+
+#include "companions/search/MemberList.h"
+#include "platform/core/Format.h"
+#include "platform/forms/Controls.h"
+#include "platform/forms/TextBox.h"
+
+using namespace Qt::StringLiterals;
+
+namespace companions {
+
+int frmProcurar::choose(const ado::ConnectionPtr& connection) {
+    int chosen = 0;
+    auto* window = new frmProcurar(connection);
+    window->taken_ = [&chosen](int socioId) { chosen = socioId; };
+    window->ShowModal();
+    return chosen;
+}
+
+frmProcurar::frmProcurar(const ado::ConnectionPtr& connection)
+    : Form(u"frmProcurar"_s, u"Procurar Associado"_s),
+      connection_(connection),
+      members_(new MemberList(this)),
+      txtProcurar(new forms::TextBox(u"txtProcurar"_s, this)),
+      lstSocios(new QTableView(this)),
+      lblEncontrados(new QLabel(this)),
+      cmdActualizar(new forms::Button(u"cmdActualizar"_s, u"Actualizar (F5)"_s, this)),
+      cmdEscolher(new forms::Button(u"cmdEscolher"_s, u"&Escolher"_s, this)),
+      cmdDesistir(new forms::Button(u"cmdDesistir"_s, u"&Desistir"_s, this)) {
+    layOut();
+    connectHandlers();
+    reload();
+}
+
+void frmProcurar::layOut() {
+    txtProcurar->setMaxLength(200);
+    txtProcurar->setPlaceholderText(u"número, ou palavras do nome por qualquer ordem"_s);
+    txtProcurar->installEventFilter(this);
+
+    lstSocios->setObjectName(u"lstSocios"_s);
+    lstSocios->setModel(members_);
+    lstSocios->setFocusPolicy(Qt::NoFocus);
+    lstSocios->setSelectionBehavior(QAbstractItemView::SelectRows);
+    lstSocios->setSelectionMode(QAbstractItemView::SingleSelection);
+    lstSocios->setAlternatingRowColors(true);
+    lstSocios->setShowGrid(false);
+    lstSocios->setWordWrap(false);
+    lstSocios->verticalHeader()->hide();
+    lstSocios->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    lstSocios->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 6);
+    const int character = fontMetrics().averageCharWidth();
+    lstSocios->setColumnWidth(MemberList::Number, 15 * character);
+    lstSocios->setColumnWidth(MemberList::ShortName, 26 * character);
+    lstSocios->setColumnWidth(MemberList::Locality, 24 * character);
+    lstSocios->setColumnWidth(MemberList::Enrolled, 12 * character);
+    lstSocios->horizontalHeader()->setSectionResizeMode(MemberList::Name, QHeaderView::Stretch);
+    lstSocios->horizontalHeader()->setHighlightSections(false);
+
+    lblEncontrados->setObjectName(u"lblEncontrados"_s);
+    cmdEscolher->setDefault(true);
+    cmdActualizar->setShortcut(Qt::Key_F5);
+    setCancelButton(cmdDesistir);
+
+    auto* search = new QHBoxLayout;
+    search->addWidget(forms::fieldLabel(u"&Procurar:"_s, txtProcurar, u"lblProcurar"_s));
+    search->addWidget(txtProcurar, 1);
+    auto* buttons = new QHBoxLayout;
+    buttons->addWidget(lblEncontrados, 1);
+    for (auto* button : {cmdActualizar, cmdEscolher, cmdDesistir}) buttons->addWidget(button);
+
+    auto* content = new QVBoxLayout;
+    content->setContentsMargins(12, 6, 12, 12);
+    content->setSpacing(8);
+    content->addLayout(search);
+    content->addWidget(lstSocios, 1);
+    content->addLayout(buttons);
+    auto* whole = new QVBoxLayout(this);
+    whole->setContentsMargins(0, 0, 0, 0);
+    whole->addWidget(forms::headingBand(
+        u"Procurar Associado"_s,
+        u"Escreva o início do número ou de palavras do nome; as setas percorrem a lista."_s,
+        u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
+    whole->addLayout(content);
+    resize(130 * character, 32 * fontMetrics().height());
+}
+
+void frmProcurar::connectHandlers() {
+    connect(txtProcurar, &QLineEdit::textChanged, this, &frmProcurar::filter);
+    connect(lstSocios, &QTableView::doubleClicked, this, &frmProcurar::take);
+    cmdActualizar->onClick = [this] { reload(); };
+    cmdEscolher->onClick = [this] { take(); };
+    cmdDesistir->onClick = [this] { Unload(); };
+}
+
+void frmProcurar::reload() {
+    members_->load(connection_);
+    filter();
+    txtProcurar->setFocus();
+}
+
+void frmProcurar::filter() {
+    members_->setFilter(txtProcurar->Text());
+    const int found = members_->rowCount();
+    lstSocios->selectRow(0);
+    cmdEscolher->setEnabled(found > 0);
+    const QLocale locale = core::userLocale();
+    lblEncontrados->setText(
+        u"%1 de %2 associados"_s.arg(locale.toString(found), locale.toString(members_->total())));
+}
+
+void frmProcurar::take() {
+    const QModelIndex current = lstSocios->currentIndex();
+    if (!current.isValid()) return;
+    taken_(members_->socioId(current.row()));
+    Unload();
+}
+
+bool frmProcurar::eventFilter(QObject* watched, QEvent* event) {
+    if (watched != txtProcurar || event->type() != QEvent::KeyPress)
+        return Form::eventFilter(watched, event);
+    switch (static_cast<QKeyEvent*>(event)->key()) {
+        case Qt::Key_Up:
+        case Qt::Key_Down:
+        case Qt::Key_PageUp:
+        case Qt::Key_PageDown:
+            QCoreApplication::sendEvent(lstSocios, event);
+            return true;
+        default:
+            return Form::eventFilter(watched, event);
+    }
+}
+
+}  // namespace companions

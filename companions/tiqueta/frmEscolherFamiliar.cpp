@@ -1,0 +1,163 @@
+// SPDX-License-Identifier: MIT
+#include "companions/tiqueta/frmEscolherFamiliar.h"
+
+#include <QBoxLayout>
+#include <QHeaderView>
+#include <QKeyEvent>
+#include <QTableWidget>
+
+#include "platform/ado/Recordset.h"
+#include "platform/core/Format.h"
+#include "platform/core/Values.h"
+#include "platform/forms/Controls.h"
+
+using namespace Qt::StringLiterals;
+
+namespace tiqueta {
+namespace {
+
+enum Column { Position, Code, Kinship, Name, Birth, Waiting, ColumnCount };
+
+// The member's number and name.
+QString memberStatement(int socioId) {
+    return u"SELECT no_kor, nome FROM tbSocios WHERE socio_id = %1"_s.arg(socioId);
+}
+
+// One row a person: the member himself and his relatives. The member's own waiting period stands
+// in his record, a relative's in the family.
+QString familyStatement(int socioId) {
+    return u"SELECT tbSocios_Familias.socio_familia_id, tbSocios_Familias.codABC, "
+           "tbSocios_Familias_CodeABC.grau, tbSocios_Familias.nome, "
+           "tbSocios_Familias.data_nascimento, tbSocios_Familias.data_carencia, "
+           "tbSocios.zelmar_data_carencia "
+           "FROM tbSocios_Familias "
+           "LEFT JOIN tbSocios_Familias_CodeABC "
+           "ON tbSocios_Familias_CodeABC.descrit = tbSocios_Familias.codABC "
+           "LEFT JOIN tbSocios ON tbSocios.socio_id = tbSocios_Familias.socio_id "
+           "WHERE tbSocios_Familias.socio_id = %1 "
+           "ORDER BY tbSocios_Familias.codABC, tbSocios_Familias.nome"_s.arg(socioId);
+}
+
+// The same test as on the entry screen: a child's code comes before the member's.
+bool isMemberHimself(const QString& code) {
+    return code.contains(u'A', Qt::CaseInsensitive) && !code.contains(u'C', Qt::CaseInsensitive);
+}
+
+QString memberLine(const ado::ConnectionPtr& connection, int socioId) {
+    const auto member = ado::Recordset::create();
+    member->Open(memberStatement(socioId), connection);
+    if (member->atEnd()) return u"Este associado não se encontra na tabela de activos."_s;
+    return u"Associado %1, %2"_s.arg(core::toText(member->value(0)),
+                                     core::toText(member->value(1)));
+}
+
+}  // namespace
+
+int frmEscolherFamiliar::choose(const ado::ConnectionPtr& connection, int socioId) {
+    int chosen = 0;
+    auto* window = new frmEscolherFamiliar(connection, socioId);
+    window->taken_ = [&chosen](int familyId) { chosen = familyId; };
+    window->ShowModal();
+    return chosen;
+}
+
+frmEscolherFamiliar::frmEscolherFamiliar(const ado::ConnectionPtr& connection, int socioId)
+    : Form(u"frmEscolherFamiliar"_s, u"Escolher Familiar"_s),
+      lstFamiliares(new QTableWidget(0, ColumnCount, this)),
+      cmdEscolher(new forms::Button(u"cmdEscolher"_s, u"&Escolher"_s, this)),
+      cmdDesistir(new forms::Button(u"cmdDesistir"_s, u"&Desistir"_s, this)) {
+    layOut(memberLine(connection, socioId));
+    connectHandlers();
+    fill(connection, socioId);
+}
+
+void frmEscolherFamiliar::layOut(const QString& member) {
+    lstFamiliares->setObjectName(u"lstFamiliares"_s);
+    lstFamiliares->setHorizontalHeaderLabels({u"Nº"_s, u"Código"_s, u"Grau de parentesco"_s,
+                                              u"Nome"_s, u"Nascimento"_s, u"Carência até"_s});
+    lstFamiliares->setEditTriggers(QAbstractItemView::NoEditTriggers);
+    lstFamiliares->setSelectionBehavior(QAbstractItemView::SelectRows);
+    lstFamiliares->setSelectionMode(QAbstractItemView::SingleSelection);
+    lstFamiliares->setTabKeyNavigation(false);
+    lstFamiliares->setAlternatingRowColors(true);
+    lstFamiliares->setShowGrid(false);
+    lstFamiliares->verticalHeader()->hide();
+    lstFamiliares->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 8);
+    auto* header = lstFamiliares->horizontalHeader();
+    header->setHighlightSections(false);
+    header->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
+    const int character = fontMetrics().averageCharWidth();
+    for (const auto [column, width] :
+         {std::pair{Position, 5}, {Code, 10}, {Kinship, 24}, {Birth, 15}, {Waiting, 15}})
+        lstFamiliares->setColumnWidth(column, width * character);
+    header->setSectionResizeMode(Name, QHeaderView::Stretch);
+    lstFamiliares->installEventFilter(this);
+
+    cmdEscolher->setDefault(true);
+    setCancelButton(cmdDesistir);
+    auto* buttons = new QHBoxLayout;
+    buttons->addStretch(1);
+    buttons->addWidget(cmdEscolher);
+    buttons->addWidget(cmdDesistir);
+    auto* content = new QVBoxLayout;
+    content->setContentsMargins(12, 6, 12, 12);
+    content->setSpacing(8);
+    content->addWidget(lstFamiliares, 1);
+    content->addLayout(buttons);
+    auto* whole = new QVBoxLayout(this);
+    whole->setContentsMargins(0, 0, 0, 0);
+    whole->addWidget(forms::headingBand(u"Para quem é o documento?"_s, member, u"lblTitulo"_s,
+                                        u"lblExplicacao"_s, u"picTitulo"_s));
+    whole->addLayout(content);
+    resize(115 * character, 22 * fontMetrics().height());
+}
+
+void frmEscolherFamiliar::connectHandlers() {
+    connect(lstFamiliares, &QTableWidget::cellDoubleClicked, this, &frmEscolherFamiliar::take);
+    cmdEscolher->onClick = [this] { take(); };
+    cmdDesistir->onClick = [this] { Unload(); };
+}
+
+void frmEscolherFamiliar::fill(const ado::ConnectionPtr& connection, int socioId) {
+    const auto family = ado::Recordset::create();
+    for (family->Open(familyStatement(socioId), connection); !family->atEnd(); family->MoveNext()) {
+        const QString code = core::toText(family->value(1));
+        const QVariant waiting = family->value(isMemberHimself(code) ? 6 : 5);
+        const int row = lstFamiliares->rowCount();
+        const QStringList texts{QString::number(row + 1),
+                                code,
+                                core::toText(family->value(2)),
+                                core::toText(family->value(3)),
+                                core::formatted(family->value(4), core::format::Date),
+                                core::formatted(waiting, core::format::Date)};
+        lstFamiliares->insertRow(row);
+        for (int column = 0; column < ColumnCount; ++column)
+            lstFamiliares->setItem(row, column, new QTableWidgetItem(texts[column]));
+        lstFamiliares->item(row, Position)->setData(Qt::UserRole, family->value(0));
+    }
+    lstFamiliares->setCurrentCell(0, Code);
+    lstFamiliares->setFocus();
+    cmdEscolher->setEnabled(lstFamiliares->rowCount() > 0);
+}
+
+void frmEscolherFamiliar::take() {
+    const auto* row = lstFamiliares->item(lstFamiliares->currentRow(), Position);
+    if (!row) return;
+    taken_(row->data(Qt::UserRole).toInt());
+    Unload();
+}
+
+// Letters are left to the list itself, which looks for them in the column of the cursor: the code.
+bool frmEscolherFamiliar::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == lstFamiliares && event->type() == QEvent::KeyPress) {
+        const QString typed = static_cast<QKeyEvent*>(event)->text();
+        const int position = typed.toInt();
+        if (position >= 1 && position <= lstFamiliares->rowCount()) {
+            lstFamiliares->setCurrentCell(position - 1, Code);
+            return true;
+        }
+    }
+    return Form::eventFilter(watched, event);
+}
+
+}  // namespace tiqueta

@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/Connection.h"
+#include "platform/forms/Form.h"
+
+class QTableWidget;
+
+namespace tiqueta {
+
+/// The member and his relatives, one to be picked: a digit moves to the row with that number, a
+/// letter to the next row whose code begins with it, Enter takes, Esc gives up.
+class frmEscolherFamiliar : public forms::Form {
+    Q_OBJECT
+public:
+    /// Shows the window and waits. The socio_familia_id picked, 0 when the operator gave up.
+    static int choose(const ado::ConnectionPtr& connection, int socioId);
+
+private:
+    frmEscolherFamiliar(const ado::ConnectionPtr& connection, int socioId);
+    void layOut(const QString& member);
+    void connectHandlers();
+    void fill(const ado::ConnectionPtr& connection, int socioId);
+    void take();
+    bool eventFilter(QObject* watched, QEvent* event) override;
+
+    std::function<void(int)> taken_;
+
+    QTableWidget* lstFamiliares;
+    forms::Button* cmdEscolher;
+    forms::Button* cmdDesistir;
+};
+
+}  // namespace tiqueta
