@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QObject>
+#include <QPointer>
 #include <QString>
 
 #include "platform/ado/Recordset.h"
@@ -43,15 +44,18 @@ public:
     const QString& DataField() const { return field_; }
 
 protected:
-    /// Shows the row's value.
+    /// Shows the row's value; what a person is typing stays.
     virtual void refreshFromRow() = 0;
+    /// Another row: shows its value, and what was being typed for the former row goes.
+    virtual void rowReplaced() { refreshFromRow(); }
     /// True when the control is bound and a row is current.
     bool hasRow() const;
     QVariant rowValue() const;
+    /// Only while hasRow(); fails as Recordset::setCollect does.
     void writeRow(const QVariant& value);
 
 private:
-    DataControl* source_ = nullptr;
+    QPointer<DataControl> source_;
     QString field_;
     QMetaObject::Connection onRow_;
     QMetaObject::Connection onField_;

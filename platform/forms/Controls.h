@@ -3,6 +3,7 @@
 
 #include <QCheckBox>
 #include <QGroupBox>
+#include <QListWidget>
 #include <QProgressBar>
 #include <QPushButton>
 #include <QRadioButton>
@@ -11,7 +12,10 @@
 
 namespace forms {
 
-/// A push button; "&" in the caption makes Alt+letter press it.
+// Each handler (onClick, onTimer, …) runs through forms::handle: what it throws is shown in a box.
+
+/// A push button; "&" in the caption makes Alt+letter press it, and so does Enter while it has the
+/// focus. Only a button that was told so (setDefault) answers to Enter in a field.
 class Button : public QPushButton {
     Q_OBJECT
 public:
@@ -19,6 +23,9 @@ public:
     QString Caption() const { return text(); }
     void setCaption(const QString& caption) { setText(caption); }
     std::function<void()> onClick;
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
 };
 
 /// One option of its frame.
@@ -26,6 +33,30 @@ class OptionButton : public QRadioButton {
     Q_OBJECT
 public:
     OptionButton(const QString& name, const QString& caption, QWidget* parent = nullptr);
+    /// Runs when a person chooses it, not when code does.
+    std::function<void()> onClick;
+};
+
+class CheckBox : public QCheckBox {
+    Q_OBJECT
+public:
+    CheckBox(const QString& name, const QString& caption, QWidget* parent = nullptr);
+    bool Value() const { return isChecked(); }
+    void setValue(bool ticked) { setChecked(ticked); }
+    std::function<void()> onClick;
+};
+
+/// A list of texts of which one can be chosen.
+class ListBox : public QListWidget {
+    Q_OBJECT
+public:
+    explicit ListBox(const QString& name, QWidget* parent = nullptr);
+    void AddItem(const QString& text) { addItem(text); }
+    void Clear() { clear(); }
+    /// The chosen text; null when none is chosen.
+    QVariant Text() const;
+    /// Chooses the entry with exactly that text; without one nothing is chosen.
+    void setText(const QString& text);
     std::function<void()> onClick;
 };
 
@@ -41,14 +72,20 @@ public:
     explicit ProgressBar(const QString& name, QWidget* parent = nullptr);
 };
 
-/// Fires again and again while enabled; a new interval counts from now on. Interval 0 stops it.
+/// Fires again and again while enabled. It is made disabled; a new interval counts from now on;
+/// with interval 0 it does not fire.
 class Timer : public QTimer {
     Q_OBJECT
 public:
     Timer(const QString& name, int milliseconds, QObject* parent);
     void setEnabled(bool enabled);
-    bool isEnabled() const { return isActive(); }
+    bool isEnabled() const { return enabled_; }
+    void setInterval(int milliseconds);
     std::function<void()> onTimer;
+
+private:
+    void restart();
+    bool enabled_ = false;
 };
 
 }  // namespace forms

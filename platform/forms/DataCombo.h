@@ -11,13 +11,14 @@ namespace forms {
 
 /// A list from a row set: shows one column, stores another in the column it is bound to. A person
 /// types the beginning (or, with the list open, any part) of an entry and Tab takes it; Alt+Down
-/// opens the list; an emptied text is no choice. When the list's row set is opened again the combo
-/// takes the list anew and keeps what was chosen.
+/// opens the list; an emptied text is no choice, and so is a text that fits no entry. When the
+/// list's row set is opened again the combo takes the list anew and keeps what was chosen.
 class DataCombo : public QComboBox, public Bound, public Validating {
     Q_OBJECT
 public:
     explicit DataCombo(const QString& name, QWidget* parent = nullptr);
 
+    /// The rows may be closed still: the list comes when they are opened.
     void setList(const ado::RecordsetPtr& rows, const QString& listField,
                  const QString& boundColumn);
 
@@ -28,6 +29,7 @@ public:
     /// is not in the list is written all the same and shown as no choice.
     void setBoundText(const QVariant& value);
 
+    /// Locked: shown, but nobody can choose. Code still can.
     void setLocked(bool locked);
 
     /// Runs on receiving the focus and on a click into the list.
@@ -35,10 +37,13 @@ public:
     /// Runs when the focus leaves, after the choice was written to the row.
     std::function<void()> onLostFocus;
 
+    /// Takes the entry that was typed and writes it. Refuses only when the row cannot take it, with
+    /// a box that says why; in a row that cannot be written a change goes nowhere.
     bool leave() override;
 
 protected:
     void refreshFromRow() override;
+    void rowReplaced() override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -47,11 +52,17 @@ protected:
 
 private:
     void fill();
+    void choose(const QVariant& value);
     void settleTypedText();
+    int entryFor(const QString& typed) const;
+    bool writeChoice();
     ado::RecordsetPtr list_;
     QString listField_;
     QString boundColumn_;
+    QVariant chosen_;  ///< the stored value, also one that is not in the list
     bool locked_ = false;
+    bool edited_ = false;   ///< a person has typed since the choice was last settled
+    bool entered_ = false;  ///< has the focus, also while another window is active
 };
 
 }  // namespace forms

@@ -11,8 +11,8 @@ namespace forms {
 struct GridColumn {
     QString field;
     QString heading;
-    QString format;            ///< a display format of core/Format.h; empty for plain text
-    int width = 12;            ///< in characters of the grid's font; the last column stretches
+    QString format;  ///< a display format of core/Format.h; empty for plain text
+    int width = 12;  ///< in characters of the grid's font; the last column stretches
     bool rightAligned = false;
 };
 
@@ -30,7 +30,7 @@ public:
     QVariant currentValue(const QString& field) const;
 
 signals:
-    /// Enter or a double click on a row.
+    /// Enter or a double click on a row. What is connected runs through forms::handle.
     void chosen();
 
 protected:

@@ -16,9 +16,10 @@ enum class BackColor { Menu, Window };
 ///
 /// A bound box shows its column's value in the display format, and the plain number while it has
 /// the focus. Leaving it runs, in this order: the validation handler, which may refuse; then, if a
-/// person has changed the text, the write to the column. A text that the column's type does not
-/// take is refused with a box that says so, and the focus stays. An empty text is written as null
-/// to a column that is no text.
+/// person has changed the text, the conversion to the column's type and the write to the column. A
+/// text that the column does not take is refused with a box that says so, and the focus stays. So
+/// does a handler that fails. An empty text is written as null to a column that is no text. In a
+/// row that cannot be written a change goes nowhere: the box shows the row's value again.
 ///
 /// In a box with a number format the decimal key of the numeric pad types the locale's mark.
 class TextBox : public QLineEdit, public Bound, public Validating {
@@ -35,8 +36,10 @@ public:
     void setValue(const QVariant& value);
     void Clear() { setText(QString()); }
 
-    /// A display format of core/Format.h.
+    /// A display format of core/Format.h. Number formats align right.
     void setFormat(QStringView format);
+    /// Cuts what is typed to the length of the bound column (Field::DefinedSize).
+    void limitToColumn();
     /// Locked: shown and selectable, but nobody can type into it. Code still can.
     void setLocked(bool locked);
     /// Display only: locked, out of the tab order, and told apart by colour.
@@ -47,23 +50,30 @@ public:
     void SelectAll() { selectAll(); }
 
     std::function<void()> onGotFocus;
-    /// Sets `cancel` to keep the focus in the box.
+    /// Sets `cancel` to keep the focus in the box. Runs at each leaving, changed or not.
     std::function<void(bool& cancel)> onValidate;
 
     bool leave() override;
 
 protected:
+    /// The value that a typed text stands for. Fails with TypeMismatch and a text for the operator.
+    virtual QVariant convert(const QString& text) const;
     void refreshFromRow() override;
+    void rowReplaced() override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+    void initStyleOption(QStyleOptionFrame* option) const override;
 
 private:
-    QVariant convert(const QString& text) const;
     void showValue(const QVariant& value);
+    bool isNumeric() const;
     QString format_;
-    QVariant shown_;
-    bool edited_ = false;
+    QVariant shown_;              ///< the value behind the text, as long as nobody types
+    bool edited_ = false;         ///< a person has changed the text since it was last shown
+    bool entered_ = false;        ///< has the focus, also while another window is active
+    bool keepSelection_ = false;  ///< the click that brought the focus leaves the selection alone
     BackColor backColor_ = BackColor::Window;
 };
 

@@ -12,14 +12,20 @@ namespace forms {
 /// window pass: a person can always give up.
 class Validating {
 public:
-    Validating();
+    Validating() = default;
+    Validating(const Validating&) = delete;
+    Validating& operator=(const Validating&) = delete;
     virtual ~Validating();
     /// Runs the validation and writes what was typed; false keeps the focus.
     virtual bool leave() = 0;
 };
 
 class Button;
-/// The button's click never waits for a validation ("&Cancelar").
+/// The button's click never waits for a validation ("&Cancelar"). The field that it passed by is
+/// asked when the focus goes on from the button to another control.
 void passesValidation(Button* button);
+
+/// Starts the filter of the application; install() does it.
+void keepFocus();
 
 }  // namespace forms

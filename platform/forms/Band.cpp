@@ -1,0 +1,106 @@
+// SPDX-License-Identifier: MIT
+// The heading band of the screens, and the mark on it.
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPainter>
+#include <QVBoxLayout>
+
+#include "platform/forms/Emblem.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
+
+namespace forms {
+
+namespace {
+
+class Band : public QWidget {
+public:
+    using QWidget::QWidget;
+
+protected:
+    void paintEvent(QPaintEvent*) override {
+        QPainter painter(this);
+        const QColor ground = palette().color(QPalette::Base);
+        const QColor accent = palette().color(QPalette::Highlight);
+        QLinearGradient sweep(0, 0, width(), 0);
+        sweep.setColorAt(0, blended(ground, accent, 0.30));
+        sweep.setColorAt(1, blended(ground, accent, 0.08));
+        painter.fillRect(rect(), sweep);
+        const int line = qMax(2, fontMetrics().height() / 7);
+        painter.fillRect(0, height() - line, width(), line, accent);
+    }
+};
+
+/// The mark as a control, drawn afresh at each paint, so that it is sharp at any scale.
+class Picture : public QWidget {
+public:
+    Picture(const QString& name, int edge) {
+        setObjectName(name);
+        setFixedSize(edge, edge);
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override {
+        const int pixels = qRound(width() * devicePixelRatioF());
+        QPainter(this).drawPixmap(rect(), emblem(pixels, palette().color(QPalette::Highlight)));
+    }
+};
+
+QLabel* bandLabel(const QString& text, const QString& name) {
+    auto* label = new QLabel;
+    label->setObjectName(name);
+    label->setTextFormat(Qt::PlainText);
+    label->setText(text);
+    return label;
+}
+
+}  // namespace
+
+QPixmap emblem(int size, const QColor& color) {
+    QPixmap picture(size, size);
+    picture.fill(Qt::transparent);
+    QPainter painter(&picture);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.scale(size / 16.0, size / 16.0);
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(color);
+    painter.drawRoundedRect(QRectF(0.5, 0.5, 15, 15), 3.5, 3.5);
+    painter.setBrush(Qt::white);
+    painter.drawRoundedRect(QRectF(6.6, 3.2, 2.8, 9.6), 0.6, 0.6);
+    painter.drawRoundedRect(QRectF(3.2, 6.6, 9.6, 2.8), 0.6, 0.6);
+    return picture;
+}
+
+QWidget* headingBand(const QString& title, const QString& explanation, const QString& titleName,
+                     const QString& explanationName, const QString& pictureName) {
+    auto* band = new Band;
+    QLabel* titleLabel = bandLabel(title, titleName);
+    QFont large = titleLabel->font();
+    large.setPointSizeF(large.pointSizeF() * 1.35);
+    large.setBold(true);
+    titleLabel->setFont(large);
+    QLabel* explanationLabel = bandLabel(explanation, explanationName);
+    explanationLabel->setVisible(!explanation.isEmpty());
+
+    auto* texts = new QVBoxLayout;
+    texts->setSpacing(2);
+    texts->addWidget(titleLabel);
+    texts->addWidget(explanationLabel);
+    auto* row = new QHBoxLayout(band);
+    row->setContentsMargins(14, 9, 14, 11);
+    row->setSpacing(12);
+    row->addWidget(new Picture(pictureName, band->fontMetrics().height() * 2 + 4));
+    row->addLayout(texts, 1);
+    return band;
+}
+
+QLabel* fieldLabel(const QString& text, QWidget* field, const QString& name) {
+    auto* label = new QLabel(text);
+    label->setObjectName(name);
+    label->setTextFormat(Qt::PlainText);
+    label->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    label->setBuddy(field);
+    return label;
+}
+
+}  // namespace forms

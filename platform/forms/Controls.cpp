@@ -1,0 +1,85 @@
+// SPDX-License-Identifier: MIT
+#include "platform/forms/Controls.h"
+
+#include <QKeyEvent>
+#include <QVariant>
+
+#include "platform/forms/Form.h"
+
+namespace forms {
+
+Button::Button(const QString& name, const QString& caption, QWidget* parent)
+    : QPushButton(caption, parent) {
+    setObjectName(name);
+    // A dialog would otherwise choose a default button of its own.
+    setAutoDefault(false);
+    connect(this, &QPushButton::clicked, this, [this] { handle(onClick); });
+}
+
+void Button::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        click();
+    else
+        QPushButton::keyPressEvent(event);
+}
+
+OptionButton::OptionButton(const QString& name, const QString& caption, QWidget* parent)
+    : QRadioButton(caption, parent) {
+    setObjectName(name);
+    connect(this, &QRadioButton::clicked, this, [this] { handle(onClick); });
+}
+
+CheckBox::CheckBox(const QString& name, const QString& caption, QWidget* parent)
+    : QCheckBox(caption, parent) {
+    setObjectName(name);
+    connect(this, &QCheckBox::clicked, this, [this] { handle(onClick); });
+}
+
+ListBox::ListBox(const QString& name, QWidget* parent) : QListWidget(parent) {
+    setObjectName(name);
+    connect(this, &QListWidget::itemClicked, this, [this] { handle(onClick); });
+}
+
+QVariant ListBox::Text() const {
+    return currentItem() ? currentItem()->text() : QVariant();
+}
+
+void ListBox::setText(const QString& text) {
+    const QList<QListWidgetItem*> found =
+        findItems(text, Qt::MatchFixedString | Qt::MatchCaseSensitive);
+    setCurrentItem(found.isEmpty() ? nullptr : found.first());
+}
+
+Frame::Frame(const QString& name, const QString& caption, QWidget* parent)
+    : QGroupBox(caption, parent) {
+    setObjectName(name);
+}
+
+ProgressBar::ProgressBar(const QString& name, QWidget* parent) : QProgressBar(parent) {
+    setObjectName(name);
+}
+
+Timer::Timer(const QString& name, int milliseconds, QObject* parent) : QTimer(parent) {
+    setObjectName(name);
+    QTimer::setInterval(milliseconds);
+    connect(this, &QTimer::timeout, this, [this] { handle(onTimer); });
+}
+
+void Timer::setEnabled(bool enabled) {
+    enabled_ = enabled;
+    restart();
+}
+
+void Timer::setInterval(int milliseconds) {
+    QTimer::setInterval(milliseconds);
+    restart();
+}
+
+void Timer::restart() {
+    if (enabled_ && interval() > 0)
+        start();
+    else
+        stop();
+}
+
+}  // namespace forms

@@ -1,0 +1,151 @@
+// SPDX-License-Identifier: MIT
+#include "platform/forms/Form.h"
+
+#include <QApplication>
+#include <QCloseEvent>
+#include <QEventLoop>
+#include <QKeyEvent>
+#include <QWindow>
+#include <vector>
+
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+#include "platform/forms/Controls.h"
+#include "platform/forms/MsgBoxes.h"
+#include "platform/forms/Validation.h"
+
+using namespace Qt::StringLiterals;
+
+namespace forms {
+
+namespace {
+
+/// Handlers and modal screens on the stack: while one runs, it may use a screen that was unloaded.
+int running = 0;
+std::vector<QPointer<Form>> unloadedScreens;
+
+class Running {
+public:
+    Running() { ++running; }
+    ~Running() {
+        if (--running > 0) return;
+        for (const QPointer<Form>& screen : unloadedScreens)
+            if (screen) screen->deleteLater();
+        unloadedScreens.clear();
+    }
+    Running(const Running&) = delete;
+    Running& operator=(const Running&) = delete;
+};
+
+}  // namespace
+
+bool handle(const std::function<void()>& handler) {
+    if (!handler) return true;
+    const Running scope;
+    const core::HandlerScope pending;
+    QString text;
+    try {
+        handler();
+        return true;
+    } catch (const core::Failure& failure) {
+        text = failure.text();
+    } catch (const std::exception& failure) {
+        text = QString::fromUtf8(failure.what());
+    } catch (...) {
+        text = u"Erro inesperado."_s;
+    }
+    core::MsgBox(text, core::Icon::Critical);
+    return false;
+}
+
+Form::Form(const QString& name, const QString& caption) {
+    install();
+    setObjectName(name);
+    setWindowTitle(caption);
+}
+
+Form::~Form() {
+    if (modalLoop_) modalLoop_->quit();
+}
+
+void Form::Show() {
+    show();
+    raise();
+    activateWindow();
+}
+
+void Form::ShowModal() {
+    if (unloaded_ || modalLoop_) return;
+    const Running scope;
+    const QPointer<Form> self = this;
+    const QPointer<QWidget> before = QApplication::activeWindow();
+    if (isVisible()) hide();
+    setWindowModality(Qt::ApplicationModal);
+    if (before && before != this) {
+        winId();  // makes the window, so that it can be told what it stands in front of
+        windowHandle()->setTransientParent(before->windowHandle());
+    }
+    QEventLoop loop;
+    modalLoop_ = &loop;
+    Show();
+    if (self && isVisible()) loop.exec();
+    if (self) {
+        modalLoop_ = nullptr;
+        windowHandle()->setTransientParent(nullptr);
+        setWindowModality(Qt::NonModal);
+    }
+    // Without a window manager nobody else gives the focus back.
+    if (before && before->isVisible()) before->activateWindow();
+}
+
+void Form::Hide() {
+    hide();
+}
+
+void Form::Unload() {
+    if (unloaded_) return;
+    const Running scope;
+    unloaded_ = true;
+    handle(onUnload);
+    hide();
+    unloadedScreens.emplace_back(this);
+}
+
+void Form::setVisible(bool visible) {
+    if (visible && unloaded_) return;
+    if (visible && !loaded_) {
+        loaded_ = true;
+        handle(onLoad);
+        if (unloaded_) return;
+    }
+    QDialog::setVisible(visible);
+    if (!visible && modalLoop_) modalLoop_->quit();
+}
+
+void Form::setCancelButton(Button* button) {
+    cancel_ = button;
+    passesValidation(button);
+}
+
+QWidget* Form::ActiveControl() const {
+    return focusWidget();
+}
+
+void Form::reject() {
+    Unload();
+}
+
+void Form::closeEvent(QCloseEvent* event) {
+    Unload();
+    event->accept();
+}
+
+void Form::keyPressEvent(QKeyEvent* event) {
+    if (event->key() != Qt::Key_Escape) return QDialog::keyPressEvent(event);
+    if (!cancel_ || !cancel_->isVisible())
+        close();
+    else
+        cancel_->click();
+}
+
+}  // namespace forms

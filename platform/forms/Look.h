@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QColor>
+
+namespace forms {
+
+/// Settles style, colours, locale, the window icon and the Portuguese of the toolkit's own texts.
+void settleLook();
+
+/// `part` of `over`, the rest of `under`; 0..1.
+QColor blended(const QColor& under, const QColor& over, double part);
+
+}  // namespace forms

@@ -1,0 +1,167 @@
+// SPDX-License-Identifier: MIT
+#include "platform/forms/TextBox.h"
+
+#include <QFocusEvent>
+#include <QKeyEvent>
+#include <QStyleOptionFrame>
+
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
+#include "platform/forms/TypedText.h"
+
+namespace forms {
+
+namespace {
+
+/// True for the focus that goes to, or comes back from, another window or a menu.
+bool isAnotherWindows(const QFocusEvent* event) {
+    return event->reason() == Qt::ActiveWindowFocusReason ||
+           event->reason() == Qt::PopupFocusReason || event->reason() == Qt::MenuBarFocusReason;
+}
+
+}  // namespace
+
+TextBox::TextBox(const QString& name, QWidget* parent) : QLineEdit(parent) {
+    setObjectName(name);
+    connect(this, &QLineEdit::textEdited, this, [this] { edited_ = true; });
+}
+
+void TextBox::setText(const QString& text) {
+    edited_ = false;
+    if (hasRow())
+        setValue(convert(text));
+    else
+        showValue(text.isEmpty() ? QVariant() : QVariant(text));
+}
+
+void TextBox::setValue(const QVariant& value) {
+    edited_ = false;
+    if (hasRow()) writeRow(value);
+    showValue(hasRow() ? rowValue() : value);
+}
+
+void TextBox::setFormat(QStringView format) {
+    format_ = format.toString();
+    setAlignment((isNumeric() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignVCenter);
+    if (!edited_) showValue(shown_);
+}
+
+bool TextBox::isNumeric() const {
+    return format_ == core::format::Money || format_ == core::format::Amount ||
+           format_ == core::format::Rate;
+}
+
+void TextBox::limitToColumn() {
+    if (!hasRow()) return;
+    const int size = DataSource()->Recordset()->Fields(DataField()).DefinedSize();
+    if (size > 0) setMaxLength(size);
+}
+
+void TextBox::setLocked(bool locked) {
+    setReadOnly(locked);
+}
+
+void TextBox::setDisplayOnly() {
+    setLocked(true);
+    setFocusPolicy(Qt::ClickFocus);
+    setBackColor(BackColor::Menu);
+}
+
+void TextBox::setBackColor(BackColor color) {
+    backColor_ = color;
+    update();
+}
+
+void TextBox::initStyleOption(QStyleOptionFrame* option) const {
+    QLineEdit::initStyleOption(option);
+    const QColor window = option->palette.color(QPalette::Window);
+    const QColor base = option->palette.color(QPalette::Base);
+    const QColor accent = option->palette.color(QPalette::Highlight);
+    if (backColor_ == BackColor::Menu)
+        option->palette.setColor(QPalette::Base, window);
+    else if (hasFocus() && !isReadOnly())
+        option->palette.setColor(QPalette::Base, blended(base, accent, 0.12));
+}
+
+QVariant TextBox::convert(const QString& text) const {
+    if (hasRow()) return fromTypedText(text, DataSource()->Recordset()->Fields(DataField()).Type());
+    if (text.isEmpty()) return {};
+    const std::optional<double> number =
+        isNumeric() ? core::parseNumber(text) : std::optional<double>();
+    return number ? QVariant(*number) : QVariant(text);
+}
+
+void TextBox::showValue(const QVariant& value) {
+    shown_ = value;
+    edited_ = false;
+    const QString text = core::formatted(value, entered_ ? QStringView() : QStringView(format_));
+    if (text != QLineEdit::text()) QLineEdit::setText(text);
+}
+
+void TextBox::refreshFromRow() {
+    if (!edited_) showValue(rowValue());
+}
+
+void TextBox::rowReplaced() {
+    showValue(rowValue());
+}
+
+bool TextBox::leave() {
+    bool cancel = false;
+    if (onValidate && !handle([this, &cancel] { onValidate(cancel); })) return false;
+    if (cancel) return false;
+    if (!edited_) return true;
+    try {
+        setValue(convert(QLineEdit::text()));
+    } catch (const core::Failure& failure) {
+        if (failure.number() == core::NotUpdatable) {
+            rowReplaced();
+            return true;
+        }
+        edited_ = true;
+        core::MsgBox(failure.text(), core::Icon::Exclamation);
+        return false;
+    }
+    return true;
+}
+
+void TextBox::focusInEvent(QFocusEvent* event) {
+    const bool entering = !entered_;
+    entered_ = true;
+    if (entering && !edited_) showValue(shown_);
+    QLineEdit::focusInEvent(event);
+    if (entering && !isAnotherWindows(event))
+        keepSelection_ = event->reason() == Qt::MouseFocusReason;
+    if (entering) handle(onGotFocus);
+}
+
+void TextBox::focusOutEvent(QFocusEvent* event) {
+    QLineEdit::focusOutEvent(event);
+    if (isAnotherWindows(event)) return;
+    entered_ = false;
+    keepSelection_ = false;
+    if (!edited_) showValue(shown_);
+}
+
+void TextBox::keyPressEvent(QKeyEvent* event) {
+    const bool mark = event->key() == Qt::Key_Period || event->key() == Qt::Key_Comma;
+    if (mark && (event->modifiers() & Qt::KeypadModifier) && isNumeric() && !isReadOnly()) {
+        insert(core::decimalMark());
+        edited_ = true;
+        return;
+    }
+    QLineEdit::keyPressEvent(event);
+}
+
+void TextBox::mousePressEvent(QMouseEvent* event) {
+    const bool keep = keepSelection_ && hasSelectedText();
+    keepSelection_ = false;
+    QLineEdit::mousePressEvent(event);
+    if (keep) selectAll();
+}
+
+}  // namespace forms
