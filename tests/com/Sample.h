@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QDateTime>
+#include <QObject>
+#include <QVariant>
+
+#include "platform/core/Failure.h"
+
+/// A component with members of every kind that is in use between components.
+class Sample : public QObject {
+    Q_OBJECT
+public:
+    Q_INVOKABLE void nothing() { ++calls; }
+    Q_INVOKABLE QString join(const QString& a, const QString& b = QStringLiteral("x"), int c = 7) {
+        return QStringLiteral("%1-%2-%3").arg(a, b).arg(c);
+    }
+    Q_INVOKABLE void swapTexts(QString* a, QString* b) { std::swap(*a, *b); }
+    Q_INVOKABLE bool leftOut(QString* text = nullptr) { return text == nullptr; }
+    Q_INVOKABLE void openRecord(int* id) { ++*id; }
+    Q_INVOKABLE void change(QVariant* value) { *value = QStringLiteral("novo"); }
+    Q_INVOKABLE int sixteenBits(qint16 number) { return number; }
+    Q_INVOKABLE int length(const QString& text) { return static_cast<int>(text.size()); }
+    Q_INVOKABLE double half(double number) { return number / 2; }
+    Q_INVOKABLE QDateTime midnight(const QDateTime& at) {
+        return {at.date(), QTime(0, 0), Qt::UTC};
+    }
+    Q_INVOKABLE QVariant echo(const QVariant& value) { return value; }
+    Q_INVOKABLE QObject* self() { return this; }
+    Q_INVOKABLE QString nameOf(QObject* object) {
+        return object ? object->objectName() : QStringLiteral("nenhum");
+    }
+    /// As a search window is called: an argument in the middle may be left out.
+    Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& a = {},
+                                 const QVariant& b = {}, const QVariant& c = {}) {
+        return QStringLiteral("%1:%2:%3:%4")
+            .arg(code, a.toString(), b.isValid() ? b.toString() : QStringLiteral("-"),
+                 c.toString());
+    }
+    Q_INVOKABLE void fail() { throw core::Failure(core::RowInUse, QStringLiteral("em uso")); }
+
+    int calls = 0;
+
+signals:
+    void changed();
+
+private slots:
+    void hidden() {}
+};
