@@ -1,0 +1,147 @@
+// SPDX-License-Identifier: MIT
+#include "boundary/General.h"
+
+#include <QApplication>
+
+#include "boundary/Login.h"
+#include "boundary/environment/LoginState.h"
+#include "boundary/environment/dtZelmars.h"
+#include "entry/EntryRoute.h"
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+#include "platform/forms/MsgBoxes.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QString notYetText(const QString& operation) {
+    return u"A operação %1 ainda não está disponível nesta versão."_s.arg(operation);
+}
+
+[[noreturn]] void notYet(const QString& operation) {
+    throw core::Failure(core::InvalidCall, notYetText(operation));
+}
+
+/// How every operation but the login begins.
+void openingPreamble() {
+    const ado::ConnectionPtr server = environment::dtZelmars::instance().SqlServer();
+    if (server->State() != ado::adStateClosed) server->Close();
+    boundary::Login();
+}
+
+/// The preamble of the operations that do nothing without a valid login.
+bool loggedInOrRefused() {
+    openingPreamble();
+    if (environment::loginState().bLoggedIn) return true;
+    core::MsgBox(
+        u"Não foi registado um utilizador ou palavra passe válida. Não é possível "
+        "executar o pedido."_s,
+        core::Icon::Critical, u"Bad Login"_s);
+    return false;
+}
+
+/// Screens abort a process without an application; a host that has none hears of it instead.
+void requireApplication() {
+    if (!qobject_cast<QApplication*>(QCoreApplication::instance()))
+        throw core::Failure(core::InvalidCall,
+                            u"O programa que chamou esta operação não pode mostrar janelas."_s);
+}
+
+/// An operation whose screen is still to come.
+void openLater(const QString& operation) {
+    const core::HandlerScope scope;
+    if (loggedInOrRefused()) notYet(operation);
+}
+
+/// One of the operations whose failures say nothing and give false. That its screen is still to
+/// come is said in a box, as nobody would hear of it otherwise.
+bool openLaterInSilence(const QString& operation) {
+    const core::HandlerScope scope;
+    try {
+        openingPreamble();
+        core::MsgBox(notYetText(operation), core::Icon::Critical);
+    } catch (const std::exception&) {
+        // The host hears of it by the result.
+    }
+    return false;
+}
+
+}  // namespace
+
+General::General() {
+    forms::install();
+}
+
+void General::CallPlafonds(QString*, QString*) {
+    openLater(u"CallPlafonds"_s);
+}
+
+void General::CallHospitais(QString*, QString*) {
+    openLater(u"CallHospitais"_s);
+}
+
+void General::CallManutencaoDados() {
+    openLater(u"CallManutencaoDados"_s);
+}
+
+void General::CallIRS() {
+    openLater(u"CallIRS"_s);
+}
+
+void General::CallFechoAno() {
+    openLater(u"CallFechoAno"_s);
+}
+
+bool General::Login(QString*, QString*, QString*, QString*, QString*) {
+    const core::HandlerScope scope;
+    return boundary::Login();
+}
+
+void General::Registo(const QVariant&, const QVariant& Pkey, QString*, QString*, QObject* Caller) {
+    const core::HandlerScope scope;
+    try {
+        openingPreamble();
+        requireApplication();
+        entry::openRegisto(Pkey, Caller);
+    } catch (const std::exception& failure) {
+        core::MsgBox(QString::fromUtf8(failure.what()));
+    }
+}
+
+void General::NewMovimento(bool bHospital, QString* strConMember, QString* strSQL) {
+    const core::HandlerScope scope;
+    if (!loggedInOrRefused()) return;
+    requireApplication();
+    QString leftOut[2];
+    entry::openNewMovimento(bHospital, strConMember ? *strConMember : leftOut[0],
+                            strSQL ? *strSQL : leftOut[1]);
+}
+
+void General::Correcao(QString*, QString*) {
+    openLater(u"Correcao"_s);
+}
+
+void General::Recebimento(QString*, QString*) {
+    openLater(u"Recebimento"_s);
+}
+
+void General::Extratos(QString*, QString*) {
+    openLater(u"Extratos"_s);
+}
+
+void General::LPagamentos() {
+    openLater(u"LPagamentos"_s);
+}
+
+bool General::Ldividas() {
+    return openLaterInSilence(u"Ldividas"_s);
+}
+
+bool General::Lcartasdividas() {
+    return openLaterInSilence(u"Lcartasdividas"_s);
+}
+
+bool General::Lhospitais() {
+    return openLaterInSilence(u"Lhospitais"_s);
+}
