@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: MIT
+// The surroundings of every test: no display, the Portuguese locale that an unset one falls back
+// to, one time zone, and folders of its own, so that no test touches what belongs to the user.
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <QTemporaryDir>
+
+namespace {
+
+void settleSurroundings(const QTemporaryDir& folder) {
+    const QByteArray path = folder.path().toUtf8();  // readable by its owner only
+    if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
+    qputenv("LC_ALL", "C.UTF-8");
+    qputenv("TZ", "Europe/Lisbon");
+    qputenv("XDG_RUNTIME_DIR", path);
+    qputenv("XDG_CONFIG_HOME", path + "/config");
+    qputenv("XDG_DATA_HOME", path + "/data");
+    qputenv("ZELMARS_REGISTRY", path + "/registry");
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    const QTemporaryDir folder;
+    settleSurroundings(folder);
+    testing::InitGoogleTest(&argc, argv);
+    QApplication application(argc, argv);
+    QApplication::setQuitOnLastWindowClosed(false);
+    return RUN_ALL_TESTS();
+}
