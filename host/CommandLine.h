@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QStringList>
+
+#include "host/Operations.h"
+
+namespace host {
+
+/// What a command line asks for.
+struct CommandLine {
+    enum class Task { Window, Operation, Init, Register, Tour, Help, Version, Wrong };
+    Task task = Task::Window;
+    OperationCall call = {};  ///< of Operation
+    QString folder = {};      ///< of Init and Tour
+    bool sample = false;      ///< of Init: with the sample content
+    bool ifNeeded = false;    ///< of Init: only when no book is set up for this user
+    bool undo = false;        ///< of Register
+
+    /// @param words  without the program's name
+    static CommandLine parsed(const QStringList& words);
+
+    /// True when the task shows windows.
+    bool needsScreen() const;
+};
+
+/// The text of --help.
+QString helpText();
+
+}  // namespace host

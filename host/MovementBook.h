@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QVariant>
+#include <memory>
+#include <stop_token>
+#include <vector>
+
+#include "host/BookSettings.h"
+#include "host/MovementSearch.h"
+#include "platform/ado/Connection.h"
+
+namespace host {
+
+/// One movement as the list shows it.
+struct MovementRow {
+    enum Column {
+        Number,
+        Date,
+        StaffNumber,
+        Name,
+        Person,
+        Type,
+        Document,
+        Value,
+        Credit,
+        Debit,
+        ColumnCount
+    };
+    qint32 movimento_id = 0;
+    QVariant values[ColumnCount];
+};
+
+/// Reads the movements in force of one book, on a connection of its own. Reads only. Every failure
+/// is a core::Failure. One object belongs to one thread.
+class MovementBook {
+public:
+    explicit MovementBook(const BookSettings& settings);
+
+    /// The newest movements, at most `count`, with the names of their persons.
+    std::shared_ptr<MovementSearch> newest(int count) const;
+    /// All movements and the names of all persons; null when it was stopped.
+    std::shared_ptr<MovementSearch> all(std::stop_token stop) const;
+    /// Takes in what was posted for active members since; returns how many movements that was.
+    int takeNewer(MovementSearch& search) const;
+
+    /// What the list shows of some movements, in any order; missing ones are left out.
+    std::vector<MovementRow> rows(const std::vector<qint32>& keys) const;
+
+private:
+    ado::ConnectionPtr connection_;
+};
+
+}  // namespace host

@@ -1,0 +1,139 @@
+// SPDX-License-Identifier: MIT
+#include "host/MovementList.h"
+
+#include <QApplication>
+
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+namespace {
+
+struct ColumnLook {
+    QString heading;
+    QStringView format;
+    Qt::Alignment alignment;
+};
+
+const ColumnLook& look(int column) {
+    static const ColumnLook looks[MovementRow::ColumnCount] = {
+        {u"Nº"_s, {}, Qt::AlignRight},
+        {u"Data"_s, core::format::Date, Qt::AlignHCenter},
+        {u"Nº KOR"_s, {}, Qt::AlignRight},
+        {u"Associado"_s, {}, Qt::AlignLeft},
+        {u"Familiar"_s, {}, Qt::AlignLeft},
+        {u"Tipo"_s, {}, Qt::AlignHCenter},
+        {u"Documento"_s, {}, Qt::AlignLeft},
+        {u"Valor"_s, core::format::Money, Qt::AlignRight},
+        {u"Crédito"_s, core::format::Money, Qt::AlignRight},
+        {u"Débito"_s, core::format::Money, Qt::AlignRight},
+    };
+    return looks[column];
+}
+
+constexpr int BlockSize = 64;
+constexpr int MostRowsKept = 4096;
+
+}  // namespace
+
+void MovementList::setBook(std::shared_ptr<MovementBook> book,
+                           std::shared_ptr<MovementSearch> search) {
+    book_ = std::move(book);
+    search_ = std::move(search);
+    refilter();
+}
+
+void MovementList::setFilter(const QString& filter) {
+    filter_ = filter;
+    refilter();
+}
+
+void MovementList::takeNewer() {
+    if (book_ && search_ && book_->takeNewer(*search_) > 0)
+        refilter();
+    else
+        forgetRows();
+}
+
+void MovementList::forgetRows() {
+    read_.clear();
+    if (rowCount() > 0) emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
+}
+
+void MovementList::refilter() {
+    beginResetModel();
+    read_.clear();
+    found_ = search_ ? search_->find(filter_) : std::vector<quint32>();
+    endResetModel();
+}
+
+qint32 MovementList::movimento_id(int row) const {
+    return search_->movimento_id(found_[std::size_t(row)]);
+}
+
+int MovementList::rowOf(qint32 movimento_id) const {
+    for (std::size_t row = 0; row < found_.size(); ++row)
+        if (search_->movimento_id(found_[row]) == movimento_id) return int(row);
+    return -1;
+}
+
+int MovementList::rowCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : int(found_.size());
+}
+
+int MovementList::columnCount(const QModelIndex& parent) const {
+    return parent.isValid() ? 0 : MovementRow::ColumnCount;
+}
+
+QVariant MovementList::data(const QModelIndex& index, int role) const {
+    if (role == Qt::TextAlignmentRole)
+        return int(look(index.column()).alignment | Qt::AlignVCenter);
+    if (role != Qt::DisplayRole && role != Qt::ForegroundRole && role != Qt::FontRole) return {};
+    const MovementRow& row = rowAt(index.row());
+    if (role == Qt::DisplayRole)
+        return core::formatted(row.values[index.column()], look(index.column()).format);
+    const QString tipo = row.values[MovementRow::Type].toString();
+    if (role == Qt::ForegroundRole && (tipo == "ANL"_L1 || tipo == "COR"_L1))
+        return QApplication::palette().color(QPalette::PlaceholderText);
+    if (role == Qt::FontRole && tipo == "ANL"_L1) {
+        QFont struck = QApplication::font("QTableView");
+        struck.setStrikeOut(true);
+        return struck;
+    }
+    return {};
+}
+
+QVariant MovementList::headerData(int section, Qt::Orientation orientation, int role) const {
+    if (orientation != Qt::Horizontal) return {};
+    if (role == Qt::DisplayRole) return look(section).heading;
+    if (role == Qt::TextAlignmentRole) return int(look(section).alignment | Qt::AlignVCenter);
+    return {};
+}
+
+const MovementRow& MovementList::rowAt(int row) const {
+    const qint32 key = movimento_id(row);
+    if (!read_.contains(key)) readBlock(row);
+    return read_[key];
+}
+
+/// Reads the rows around one that is looked at. A row that is gone, or a failure, leaves them
+/// empty.
+void MovementList::readBlock(int row) const {
+    if (read_.size() > MostRowsKept) read_.clear();
+    std::vector<qint32> keys;
+    const int first = row / BlockSize * BlockSize;
+    for (int each = first; each < std::min(first + BlockSize, rowCount()); ++each)
+        keys.push_back(movimento_id(each));
+    for (const qint32 key : keys) read_.insert(key, {});
+    try {
+        for (const MovementRow& read : book_->rows(keys)) read_.insert(read.movimento_id, read);
+    } catch (const core::Failure& failure) {
+        emit failed(failure.text());
+    }
+}
+
+}  // namespace host

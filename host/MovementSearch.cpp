@@ -1,0 +1,215 @@
+// SPDX-License-Identifier: MIT
+#include "host/MovementSearch.h"
+
+#include <QStringList>
+#include <algorithm>
+
+#include "platform/core/Format.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+QByteArray folded(const QString& text) {
+    const auto isPlain = [](QChar letter) { return letter.unicode() < 128; };
+    if (std::all_of(text.begin(), text.end(), isPlain)) return text.toLatin1().toLower();
+    QString plain;
+    for (const QChar letter : text.normalized(QString::NormalizationForm_KD))
+        if (letter.category() != QChar::Mark_NonSpacing) plain += letter;
+    return plain.toCaseFolded().toUtf8();
+}
+
+namespace {
+
+/// The words of a name, each behind a blank, so that " ana" finds the beginning of a word only.
+QByteArray wordsOf(const QString& name) {
+    QByteArray words;
+    bool inWord = false;
+    for (const char letter : folded(name)) {
+        const bool isLetter = static_cast<uchar>(letter) >= 128 || std::isalnum(uchar(letter));
+        if (isLetter && !inWord) words += ' ';
+        if (isLetter) words += letter;
+        inWord = isLetter;
+    }
+    return words;
+}
+
+/// Where a text stands in a short list; it is added when it is new.
+quint16 positionOf(const QByteArray& text, std::vector<QByteArray>& list) {
+    const auto known = std::find(list.begin(), list.end(), text);
+    if (known != list.end()) return quint16(known - list.begin());
+    list.push_back(text);
+    return quint16(list.size() - 1);
+}
+
+constexpr qsizetype LongestText = 1000;  // what can be searched for, in bytes
+
+/// A day as somebody types it into a filter; a part that was left out is 0.
+struct TypedDay {
+    int day = 0;
+    int month = 0;
+    int year = 0;
+
+    bool isGiven() const { return month != 0; }
+    bool fits(QDate date) const {
+        return (day == 0 || date.day() == day) && date.month() == month &&
+               (year == 0 || date.year() == year);
+    }
+};
+
+TypedDay typedDay(const QString& word) {
+    const QStringList parts = QString(word)
+                                  .replace('/'_L1, '-'_L1)
+                                  .replace('.'_L1, '-'_L1)
+                                  .split('-'_L1, Qt::SkipEmptyParts);
+    if (parts.size() == 3 || (parts.size() == 1 && word.size() == 8)) {
+        const auto date = core::parseDate(word);
+        return date ? TypedDay{date->day(), date->month(), date->year()} : TypedDay{};
+    }
+    if (parts.size() != 2) return {};
+    const int first = parts[0].toInt();
+    const int second = parts[1].toInt();
+    const auto isMonth = [](int month) { return month >= 1 && month <= 12; };
+    if (parts[1].size() == 4) return isMonth(first) ? TypedDay{0, first, second} : TypedDay{};
+    return isMonth(second) && first >= 1 && first <= 31 ? TypedDay{first, second, 0} : TypedDay{};
+}
+
+}  // namespace
+
+/// One word of a filter. What it says of a person is worked out once a person, when first asked.
+class MovementSearch::Word {
+public:
+    Word(const MovementSearch& search, const QString& text)
+        : search_(search),
+          text_(folded(text)),
+          beginning_(wordsOf(text)),
+          inDocument_(' ' + text_),
+          day_(typedDay(text)),
+          persons_(search.persons_.size(), Unknown) {
+        for (const QByteArray& type : search.types_) types_.push_back(type == text_);
+        bool isNumber = false;
+        number_ = text.toUInt(&isNumber);
+        if (!isNumber || text.startsWith('0'_L1)) number_ = 0;
+    }
+
+    bool fits(const Entry& entry) const {
+        return types_[entry.type] || fitsPerson(entry.person) || fitsNumber(entry.number) ||
+               fitsDocument(entry) || fitsDay(entry.day);
+    }
+
+private:
+    enum State : quint8 { Unknown, No, Yes };
+
+    bool fitsPerson(quint32 person) const {
+        quint8& state = persons_[person];
+        if (state == Unknown) state = isNamed(person) ? Yes : No;
+        return state == Yes;
+    }
+    bool isNamed(quint32 person) const {
+        const Person& known = search_.persons_[person];
+        if (beginning_.isEmpty()) return false;
+        return search_.text(known.words, known.wordsSize).contains(beginning_) ||
+               (known.member != person && fitsPerson(known.member));
+    }
+    bool fitsNumber(qint32 number) const {
+        if (number_ == 0 || number <= 0) return false;
+        auto rest = static_cast<quint32>(number);
+        while (rest > number_) rest /= 10;
+        return rest == number_;
+    }
+    bool fitsDocument(const Entry& entry) const {
+        return search_.text(entry.document, entry.documentSize).contains(inDocument_);
+    }
+    bool fitsDay(qint32 day) const {
+        return day_.isGiven() && day != 0 && day_.fits(QDate::fromJulianDay(day));
+    }
+
+    const MovementSearch& search_;
+    QByteArray text_;
+    QByteArray beginning_;
+    QByteArray inDocument_;
+    TypedDay day_;
+    quint32 number_ = 0;
+    std::vector<bool> types_;
+    mutable std::vector<quint8> persons_;
+};
+
+void MovementSearch::append(const MovementKey& movement) {
+    entries_.push_back(entryOf(movement));
+}
+
+void MovementSearch::prepend(const std::vector<MovementKey>& movements) {
+    std::vector<Entry> newer;
+    for (const MovementKey& movement : movements) newer.push_back(entryOf(movement));
+    entries_.insert(entries_.begin(), newer.begin(), newer.end());
+}
+
+void MovementSearch::nameMember(qint32 socio_id, const QString& no_kor, const QString& nome) {
+    name(memberAt(socio_id), wordsOf(no_kor) + wordsOf(nome));
+}
+
+void MovementSearch::nameRelative(qint32 socio_id, const QString& codABC, const QString& nome) {
+    if (codABC.isEmpty()) return;
+    name(relativeAt(socio_id, codABC), wordsOf(nome));
+}
+
+std::vector<quint32> MovementSearch::find(const QString& filter) const {
+    std::vector<Word> words;
+    for (const QString& text : filter.simplified().split(' '_L1, Qt::SkipEmptyParts))
+        words.emplace_back(*this, text);
+    std::vector<quint32> found;
+    for (std::size_t position = 0; position < entries_.size(); ++position) {
+        const auto fits = [&](const Word& word) { return word.fits(entries_[position]); };
+        if (std::all_of(words.begin(), words.end(), fits)) found.push_back(quint32(position));
+    }
+    return found;
+}
+
+MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
+    if (movement.activo) newest_ = std::max(newest_, movement.movimento_id);
+    const QByteArray document = ' ' + folded(movement.doc_no.simplified()).left(LongestText);
+    const Entry entry{movement.movimento_id,
+                      movement.movimento_no,
+                      relativeAt(movement.socio_id, movement.codABC),
+                      movement.data.isValid() ? qint32(movement.data.toJulianDay()) : 0,
+                      quint32(texts_.size()),
+                      quint16(document.size()),
+                      positionOf(folded(movement.tipo), types_)};
+    texts_ += document;
+    return entry;
+}
+
+quint32 MovementSearch::memberAt(qint32 socio_id) {
+    return personAt(quint64(quint32(socio_id)) << 16);
+}
+
+quint32 MovementSearch::relativeAt(qint32 socio_id, const QString& codABC) {
+    const quint32 member = memberAt(socio_id);
+    if (codABC.isEmpty()) return member;
+    const auto code = quint64(positionOf(codABC.toUtf8(), codes_)) + 1;
+    const quint32 relative = personAt(quint64(quint32(socio_id)) << 16 | code);
+    persons_[relative].member = member;
+    return relative;
+}
+
+quint32 MovementSearch::personAt(quint64 key) {
+    const auto known = personAt_.constFind(key);
+    if (known != personAt_.constEnd()) return *known;
+    const auto person = quint32(persons_.size());
+    persons_.push_back({person, 0, 0});
+    personAt_.insert(key, person);
+    return person;
+}
+
+void MovementSearch::name(quint32 person, const QByteArray& words) {
+    if (text(persons_[person].words, persons_[person].wordsSize) == words) return;
+    persons_[person].words = quint32(texts_.size());
+    persons_[person].wordsSize = quint16(std::min(words.size(), LongestText));
+    texts_ += words;
+}
+
+QByteArrayView MovementSearch::text(quint32 from, quint16 size) const {
+    return QByteArrayView(texts_).sliced(from, size);
+}
+
+}  // namespace host

@@ -1,0 +1,86 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QByteArray>
+#include <QDate>
+#include <QHash>
+#include <QString>
+#include <vector>
+
+namespace host {
+
+/// What the list looks a movement up by.
+struct MovementKey {
+    qint32 movimento_id = 0;
+    qint32 movimento_no = 0;  ///< 0 for none
+    qint32 socio_id = 0;
+    QString codABC;
+    QDate data;
+    QString tipo;
+    QString doc_no;
+    bool activo = true;  ///< stands in the table of the active members
+};
+
+/// Letters as people compare them while typing: no accents, no case. UTF-8.
+QByteArray folded(const QString& text);
+
+/// All movements in force, newest first, in about 40 bytes each, so that a million of them answer
+/// a keystroke without asking the database.
+///
+/// A filter is a list of words; a movement fits when every word fits one of: the beginning of its
+/// number, of the staff number, of a word in the member's or relative's name, of a word in the
+/// document's number; its type; its date (day-month-year, day-month or month-year with "-", "/" or
+/// ".", or the eight digits of a day).
+class MovementSearch {
+public:
+    /// Adds a movement older than all others.
+    void append(const MovementKey& movement);
+    /// Adds movements newer than all others, the newest first.
+    void prepend(const std::vector<MovementKey>& movements);
+    /// Names a member or a relative, before or after his movements; the last name given counts.
+    /// A relative without a code is nobody.
+    void nameMember(qint32 socio_id, const QString& no_kor, const QString& nome);
+    void nameRelative(qint32 socio_id, const QString& codABC, const QString& nome);
+
+    std::size_t size() const { return entries_.size(); }
+    qint32 movimento_id(std::size_t position) const { return entries_[position].id; }
+    /// The greatest key among the movements of active members, 0 without any.
+    qint32 newest() const { return newest_; }
+
+    /// Positions of the movements that fit, newest first.
+    std::vector<quint32> find(const QString& filter) const;
+
+private:
+    struct Entry {
+        qint32 id;
+        qint32 number;
+        quint32 person;
+        qint32 day;        // Julian day, 0 for none
+        quint32 document;  // where its folded text begins in texts_
+        quint16 documentSize;
+        quint16 type;  // position in types_
+    };
+    struct Person {
+        quint32 member;  // whose relative he is; a member is his own
+        quint32 words;   // where his words begin in texts_
+        quint16 wordsSize;
+    };
+    class Word;
+
+    Entry entryOf(const MovementKey& movement);
+    quint32 memberAt(qint32 socio_id);
+    quint32 relativeAt(qint32 socio_id, const QString& codABC);
+    quint32 personAt(quint64 key);
+    void name(quint32 person, const QByteArray& words);
+    QByteArrayView text(quint32 from, quint16 size) const;
+
+    std::vector<Entry> entries_;
+    std::vector<Person> persons_;
+    QHash<quint64, quint32> personAt_;
+    std::vector<QByteArray> types_;
+    std::vector<QByteArray> codes_;
+    QByteArray texts_;  // folded; each word behind a blank
+    qint32 newest_ = 0;
+};
+
+}  // namespace host

@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: MIT
+#include "host/Tasks.h"
+
+#include <QLibrary>
+#include <QTextStream>
+
+#include "database/Book.h"
+#include "host/BookSettings.h"
+#include "host/Tour.h"
+#include "host/frmPrincipal.h"
+#include "platform/core/Failure.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/MsgBoxes.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+namespace {
+
+void say(const QString& text) {
+    QTextStream(stdout) << text << Qt::endl;
+}
+
+void complain(const QString& text) {
+    QTextStream(stderr) << text << Qt::endl;
+}
+
+int init(const CommandLine& line) {
+    const QString folder = QDir(line.folder).absolutePath();
+    if (line.ifNeeded && BookSettings::read().isComplete) return Done;
+    const QString catalogue = u"zelmars"_s;
+    if (line.ifNeeded && QFile::exists(database::bookFile(folder, catalogue))) {
+        database::writeSettings(folder, catalogue);
+        return Done;
+    }
+    database::initBook(folder, line.sample);
+    say(u"Livro feito em %1"_s.arg(database::bookFile(folder, catalogue)));
+    return Done;
+}
+
+bool hasWindow() {
+    const QWidgetList windows = QApplication::topLevelWidgets();
+    return std::any_of(windows.begin(), windows.end(),
+                       [](const QWidget* window) { return window->isVisible(); });
+}
+
+/// Ends the program when the last window went, also one that was only hidden.
+class LastWindow : public QObject {
+protected:
+    bool eventFilter(QObject*, QEvent* event) override {
+        if (event->type() == QEvent::Hide)
+            QTimer::singleShot(0, this, [] {
+                if (!hasWindow()) QApplication::exit(Done);
+            });
+        return false;
+    }
+};
+
+int showOperation(const CommandLine& line) {
+    forms::install();
+    Operations operations;
+    QVariant result;
+    bool passed = false;
+    forms::handle([&] {
+        result = operations.call(line.call);
+        passed = true;
+    });
+    if (line.call.operation == "Login"_L1)
+        say(result.toBool() ? u"Ligado ao livro."_s : u"Não foi possível ligar ao livro."_s);
+    const bool isRefused = result.typeId() == QMetaType::Bool && !result.toBool();
+    if (!passed || isRefused) return Failed;
+    if (!hasWindow()) return Done;
+    LastWindow last;
+    qApp->installEventFilter(&last);
+    return QApplication::exec();
+}
+
+int showWindow() {
+    forms::install();
+    frmPrincipal window;
+    window.show();
+    return QApplication::exec();
+}
+
+int performUntrapped(const CommandLine& line) {
+    using Task = CommandLine::Task;
+    switch (line.task) {
+        case Task::Window:
+            return showWindow();
+        case Task::Operation:
+            return showOperation(line);
+        case Task::Init:
+            return init(line);
+        case Task::Register:
+            registerComponents(line.undo);
+            return Done;
+        case Task::Tour:
+            return playTour(line.folder);
+        case Task::Help:
+            say(helpText());
+            return Done;
+        case Task::Version:
+            say(u"zelmars "_s + QCoreApplication::applicationVersion());
+            return Done;
+        case Task::Wrong:
+            break;
+    }
+    complain(helpText());
+    return WrongUse;
+}
+
+}  // namespace
+
+void registerComponents(bool undo) {
+    const char* entry = undo ? "DllUnregisterServer" : "DllRegisterServer";
+    for (const QString& name : {u"Zelmars"_s, u"Lumbra"_s, u"Tiqueta"_s, u"Vorlane"_s}) {
+        QLibrary library(QCoreApplication::applicationDirPath() + u"/lib%1.so"_s.arg(name));
+        const auto run = reinterpret_cast<com::Status (*)()>(library.resolve(entry));
+        if (!run) throw core::Failure(core::CannotCreateObject, library.errorString());
+        if (run() != com::Ok)
+            throw core::Failure(
+                core::CannotCreateObject,
+                u"O componente %1 não se deixou registar."_s.arg(library.fileName()));
+    }
+}
+
+int perform(const CommandLine& line) {
+    try {
+        return performUntrapped(line);
+    } catch (const core::Failure& failure) {
+        complain(failure.text());
+        return Failed;
+    }
+}
+
+}  // namespace host

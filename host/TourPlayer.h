@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QObject>
+#include <QString>
+#include <QTimer>
+#include <QWidget>
+#include <functional>
+#include <vector>
+
+namespace host {
+
+/// Plays a script through the screens of this process: waits for the screen that a step names to
+/// come to the front, takes its picture, and then acts as a person at the keyboard would. Message
+/// boxes are screens too.
+class TourPlayer : public QObject {
+    Q_OBJECT
+public:
+    /// @param folder  where the pictures go
+    explicit TourPlayer(const QString& folder);
+
+    /// @param screen   objectName of the screen; for a message box "box:" and what its text begins
+    ///                 with
+    /// @param picture  name of the picture without ending; empty for none
+    /// @param act      what is done then; gets the screen
+    /// @param ready    a further condition that the screen must meet first; may be empty
+    void step(const QString& screen, const QString& picture,
+              const std::function<void(QWidget*)>& act,
+              const std::function<bool(QWidget*)>& ready = {});
+
+    /// Plays all steps. False when a screen did not come; what was in front instead is said on the
+    /// standard error stream.
+    bool play();
+
+    /// Types words and keys into a screen: a text, or a name of a key in angle brackets, such as
+    /// "<Tab>", "<Alt+O>", "<Return>".
+    static void type(QWidget* screen, const QStringList& keys);
+
+private:
+    struct Step {
+        QString screen;
+        QString picture;
+        std::function<void(QWidget*)> act;
+        std::function<bool(QWidget*)> ready;
+    };
+    void tick();
+    bool fits(const Step& step, QWidget* front) const;
+    void take(const QString& picture, QWidget* screen);
+
+    QString folder_;
+    std::vector<Step> steps_;
+    std::size_t at_ = 0;
+    int patience_ = 0;
+    bool acting_ = false;
+    bool failed_ = false;
+    QTimer clock_;
+    std::function<void()> finished_;
+};
+
+}  // namespace host

@@ -1,0 +1,221 @@
+// SPDX-License-Identifier: MIT
+#include "host/frmPrincipal.h"
+
+#include <QAction>
+#include <QCloseEvent>
+#include <QMenu>
+#include <QMenuBar>
+#include <QSettings>
+#include <QStandardPaths>
+#include <QStatusBar>
+
+#include "host/BookSettings.h"
+#include "host/MovementsView.h"
+#include "platform/core/MsgBox.h"
+#include "platform/forms/Form.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+namespace {
+
+/// The component's entry screen with something typed into it, if there is one. A screen that only
+/// shows a movement is none: its main button reads "&Sair".
+QWidget* entryUnderWay() {
+    for (QWidget* window : QApplication::topLevelWidgets()) {
+        if (!window->isVisible() || window->objectName() != "frmMovimentos"_L1) continue;
+        const auto* button = window->findChild<QPushButton*>(u"Command3"_s);
+        if (!button || button->text() != "&Sair"_L1) return window;
+    }
+    return nullptr;
+}
+
+void bringForward(QWidget* window) {
+    window->raise();
+    window->activateWindow();
+}
+
+QSettings windowSettings() {
+    const QString folder =
+        QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation) + u"/zelmars"_s;
+    return QSettings(folder + u"/janela.ini"_s, QSettings::IniFormat);
+}
+
+}  // namespace
+
+frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
+    setObjectName(u"frmPrincipal"_s);
+    setWindowTitle(u"Zelmars - Plano de Saúde"_s);
+    addEntryMenu();
+    addListingMenus();
+    addYearMenus();
+    addHelpMenu();
+    auto* page = new QWidget;
+    auto* column = new QVBoxLayout(page);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(0);
+    column->addWidget(forms::headingBand(u"Plano de Saúde"_s, u"Movimentos em vigor"_s,
+                                         u"Label25"_s, u"Label26"_s, u"Image1"_s));
+    column->addWidget(movements_, 1);
+    setCentralWidget(page);
+    addStatusLine();
+    connect(movements_, &MovementsView::countChanged, this, &frmPrincipal::showCount);
+    connect(movements_, &MovementsView::chosen, this,
+            [this](qint32 key) { run(Operations::movement(key, this)); });
+    restoreLook();
+    reload();
+    movements_->focusFilter();
+}
+
+frmPrincipal::~frmPrincipal() = default;
+
+void frmPrincipal::addEntryMenu() {
+    QMenu* menu = menuBar()->addMenu(u"&Lançamentos"_s);
+    addOperation(menu, u"&Novo documento"_s, u"Ctrl+N"_s, Operations::newDocument(false));
+    addOperation(menu, u"Novo documento de &hospital"_s, u"Ctrl+H"_s, Operations::newDocument(true),
+                 u"NewMovimentoHospital"_s);
+    addOperation(menu, u"&Recebimento"_s, u"Ctrl+R"_s, {u"Recebimento"_s, {}});
+    addOperation(menu, u"&Correcção"_s, u"Ctrl+K"_s, {u"Correcao"_s, {}});
+    menu->addSeparator();
+    addItem(menu, u"Registo"_s, u"&Abrir movimento"_s, u"Ctrl+O"_s,
+            [this] { movements_->chooseCurrent(); });
+    menu->addSeparator();
+    addItem(menu, u"Login"_s, u"&Ligar novamente"_s, {}, [this] { login(); });
+    addItem(menu, u"Sair"_s, u"&Sair"_s, u"Ctrl+Q"_s, [this] { close(); });
+}
+
+void frmPrincipal::addListingMenus() {
+    QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
+    addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
+    QMenu* statements = menuBar()->addMenu(u"&Extratos"_s);
+    addOperation(statements, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
+    addOperation(statements, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
+    QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
+    addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
+    addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});
+}
+
+void frmPrincipal::addYearMenus() {
+    QMenu* tables = menuBar()->addMenu(u"&Tabelas"_s);
+    addOperation(tables, u"&Rúbricas e plafonds"_s, {}, Operations::rubrics());
+    addOperation(tables, u"&Hospitais"_s, {}, Operations::hospitals());
+    QMenu* year = menuBar()->addMenu(u"&Anual"_s);
+    addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
+    addOperation(year, u"&Manutenção de dados"_s, {}, {u"CallManutencaoDados"_s, {}});
+    addOperation(year, u"&Fecho do ano"_s, {}, {u"CallFechoAno"_s, {}});
+}
+
+void frmPrincipal::addHelpMenu() {
+    QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
+    addItem(menu, u"Actualizar"_s, u"&Actualizar a lista"_s, u"F5"_s, [this] { reload(); });
+    addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
+    menu->addSeparator();
+    addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [] {
+        core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(
+                         QApplication::applicationVersion()),
+                     core::Icon::Information);
+    });
+}
+
+void frmPrincipal::addStatusLine() {
+    count_ = new QLabel;
+    count_->setObjectName(u"Contagem"_s);
+    book_ = new QLabel;
+    book_->setObjectName(u"Livro"_s);
+    user_ = new QLabel;
+    user_->setObjectName(u"Utilizador"_s);
+    statusBar()->addWidget(count_, 1);
+    statusBar()->addPermanentWidget(book_);
+    statusBar()->addPermanentWidget(user_);
+}
+
+QAction* frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& caption,
+                               const QString& shortcut, const std::function<void()>& handler) {
+    QAction* action = menu->addAction(caption);
+    action->setObjectName(name);
+    action->setShortcut(QKeySequence(shortcut));
+    connect(action, &QAction::triggered, this, [handler] { forms::handle(handler); });
+    return action;
+}
+
+QAction* frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
+                                    const OperationCall& call, const QString& name) {
+    return addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
+                   [this, call] { run(call); });
+}
+
+void frmPrincipal::run(const OperationCall& call) {
+    QWidget* entry = entryUnderWay();
+    const bool takesTheScreen =
+        call.operation == "NewMovimento"_L1 || call.operation == "Registo"_L1;
+    if (entry && takesTheScreen) {
+        bringForward(entry);
+        core::MsgBox(u"Já há um lançamento aberto.\nTermine-o ou cancele-o antes de abrir outro."_s,
+                     core::Icon::Information);
+        return;
+    }
+    forms::handle([&] { operations_.call(call); });
+    movements_->takeNewer();
+}
+
+void frmPrincipal::login() {
+    const bool isLoggedIn = operations_.call({u"Login"_s, {}}).toBool();
+    reload();
+    if (isLoggedIn)
+        statusBar()->showMessage(u"Ligado ao livro."_s, 5000);
+    else
+        core::MsgBox(u"Não foi possível ligar ao livro: faltam valores na configuração."_s,
+                     core::Icon::Critical);
+}
+
+void frmPrincipal::RemoteKey(const QVariant&) {
+    movements_->refresh();
+}
+
+void frmPrincipal::reload() {
+    const BookSettings settings = BookSettings::read();
+    book_->setText(settings.isComplete ? u"Livro: "_s + settings.bookText() : u"Sem livro"_s);
+    user_->setText(u"Utilizador: "_s + settings.user);
+    user_->setVisible(!settings.user.isEmpty());
+    movements_->open(settings);
+}
+
+void frmPrincipal::showCount(const QString& text) {
+    count_->setText(text);
+}
+
+bool frmPrincipal::event(QEvent* event) {
+    const bool isTaken = QMainWindow::event(event);
+    if (event->type() == QEvent::WindowActivate) movements_->takeNewer();
+    return isTaken;
+}
+
+void frmPrincipal::closeEvent(QCloseEvent* event) {
+    if (QWidget* entry = entryUnderWay()) {
+        const auto answer = core::MsgBox(
+            u"Há um lançamento aberto, que se perde ao sair.\nQuer voltar ao lançamento?"_s,
+            core::Icon::Question, {}, core::Buttons::YesNo);
+        if (answer == core::Answer::Yes) {
+            event->ignore();
+            return bringForward(entry);
+        }
+    }
+    saveLook();
+    event->accept();
+    QApplication::exit();
+}
+
+void frmPrincipal::restoreLook() {
+    const QSettings settings = windowSettings();
+    if (!restoreGeometry(settings.value(u"janela"_s).toByteArray())) resize(1180, 700);
+    movements_->setColumns(settings.value(u"colunas"_s).toByteArray());
+}
+
+void frmPrincipal::saveLook() const {
+    QSettings settings = windowSettings();
+    settings.setValue(u"janela"_s, saveGeometry());
+    settings.setValue(u"colunas"_s, movements_->columns());
+}
+
+}  // namespace host

@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QMainWindow>
+#include <QVariant>
+
+#include "host/Operations.h"
+
+class QLabel;
+class QMenu;
+
+namespace host {
+
+class MovementsView;
+
+/// The window a person starts with: the movements in force, and a menu with every operation of the
+/// component.
+class frmPrincipal : public QMainWindow {
+    Q_OBJECT
+public:
+    frmPrincipal();
+    ~frmPrincipal() override;
+
+    /// Called by the component after a movement was annulled.
+    Q_INVOKABLE void RemoteKey(const QVariant& movimento_id);
+
+    /// Reads the settings and the book afresh.
+    void reload();
+    /// Runs an operation of the component; a failure is shown in a box. An entry under way is
+    /// brought forward in place of an operation that would take its screen away.
+    void run(const OperationCall& call);
+
+protected:
+    bool event(QEvent* event) override;
+    void closeEvent(QCloseEvent* event) override;
+
+private:
+    QAction* addItem(QMenu* menu, const QString& name, const QString& caption,
+                     const QString& shortcut, const std::function<void()>& handler);
+    QAction* addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
+                          const OperationCall& call, const QString& name = {});
+    void addEntryMenu();
+    void addListingMenus();
+    void addYearMenus();
+    void addHelpMenu();
+    void addStatusLine();
+
+    void login();
+    void showCount(const QString& text);
+    void restoreLook();
+    void saveLook() const;
+
+    Operations operations_;
+    MovementsView* movements_;
+    QLabel* count_;
+    QLabel* book_;
+    QLabel* user_;
+};
+
+}  // namespace host
