@@ -15,8 +15,8 @@ enum CursorType {
 enum LockType {
     adLockUnspecified = -1,  ///< read only
     adLockReadOnly = 1,
-    adLockPessimistic = 2,   ///< the current row is held from the moment it is current
-    adLockOptimistic = 3,    ///< no lock; Update writes the changed columns only
+    adLockPessimistic = 2,  ///< the current row is held from the moment it is current
+    adLockOptimistic = 3,   ///< no lock; Update writes the changed columns only
 };
 
 enum CommandType { adCmdUnspecified = -1, adCmdText = 1, adCmdUnknown = 8 };

@@ -14,7 +14,17 @@ class Recordset;
 using RecordsetPtr = std::shared_ptr<Recordset>;
 
 /// What a column keeps.
-enum class ColumnType { Integer16, Integer32, Integer64, Single, Double, Money, DateTime, Text, Other };
+enum class ColumnType {
+    Integer16,
+    Integer32,
+    Integer64,
+    Single,
+    Double,
+    Money,
+    DateTime,
+    Text,
+    Other
+};
 
 /// One column of a row set; a light view that stays valid while the row set stays open.
 class Field {

@@ -1,22 +1,26 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QStringList>
 #include <QVariant>
 #include <memory>
 #include <vector>
 
+#include "platform/ado/Cell.h"
 #include "platform/ado/Recordset.h"
 
-/// What an engine offers to the row sets. One session is one open connection of one engine; all
-/// statement texts that come here are translated already. Failures are core::Failure with the
-/// engine's text.
+/// What an engine offers to the row sets. One session is one open connection of one engine.
+/// Failures are core::Failure with the engine's text.
 namespace ado {
+
+class Statement;
+class RowStore;
 
 /// A column of a result as the engine describes it.
 struct Column {
     QString name;
     ColumnType type = ColumnType::Other;
-    int definedSize = 0;
+    int definedSize = 0;  ///< characters of a text (0 without a limit); bytes of other types
 };
 
 /// Which row of a table: the engine's own identity of it (SQLite's rowid, a generated column on
@@ -27,13 +31,24 @@ using RowIdentity = qint64;
 class Pass {
 public:
     virtual ~Pass() = default;
-    virtual const std::vector<Column>& columns() const = 0;
-    /// Steps to the next (at first: the first) row; false when there is none.
+
+    // The columns are described when asked for, and also after release().
+    virtual int columnCount() const = 0;
+    virtual const Column& column(int column) const = 0;
+    /// Position of a column, its name compared without regard to case; -1 when there is none.
+    virtual int indexOf(QStringView name) const = 0;
+
+    /// Steps to the next (at first: the first) row; false when there is none. After that only
+    /// restart() and release() are left.
     virtual bool step() = 0;
-    /// A value of the row stepped to; converted when asked for.
-    virtual QVariant value(int column) const = 0;
-    /// Identity of the row stepped to; only for a pass opened with a table.
+    /// A value of the row stepped to, good until the next step.
+    virtual Cell cell(int column) const = 0;
+    /// Identity of the row stepped to; 0 for a pass that was not opened with a table.
     virtual RowIdentity identity() const = 0;
+    /// Stands before the first row again; the rows are the same, whatever was written since.
+    virtual void restart() = 0;
+    /// Lets go of the engine; no row can be stepped to any more.
+    virtual void release() = 0;
 };
 
 /// A row held against everybody else; let go when destroyed, and by a crash.
@@ -46,18 +61,16 @@ class Session {
 public:
     virtual ~Session() = default;
 
-    /// The dialect of this engine for a statement of the original dialect.
-    virtual QString translate(const QString& statement) const = 0;
-
-    /// Opens a pass. With `table` not empty the statement is a `SELECT *` over that one table and
-    /// the pass knows each row's identity.
-    virtual std::unique_ptr<Pass> open(const QString& translated, const QString& table) = 0;
+    /// Opens a pass over a statement of the original dialect. With `table` not empty the statement
+    /// is a `SELECT *` over that one table and the pass knows each row's identity.
+    virtual std::shared_ptr<Pass> open(const Statement& statement, const QString& table) = 0;
 
     /// True when rows of that name can be written: an existing table, not a view.
-    virtual bool isTable(const QString& name) = 0;
+    virtual bool isTable(QStringView name) = 0;
 
-    /// Reads one row of a table afresh, in the order of the table's columns; empty when it is gone.
-    virtual std::vector<QVariant> read(const QString& table, RowIdentity row) = 0;
+    /// Reads one row of a table afresh and appends it, in the order of the table's columns; false
+    /// when it is gone.
+    virtual bool read(const QString& table, RowIdentity row, RowStore& into) = 0;
 
     // One statement, one commit each. `columns` names what is written, `values` runs beside it.
     virtual RowIdentity insert(const QString& table, const QStringList& columns,
@@ -74,6 +87,9 @@ public:
 
     /// Seconds that a statement may wait for another program before it fails.
     virtual void setTimeout(int seconds) = 0;
+
+    /// Names the book, so that a row's identity is never used on another one.
+    virtual const QString& book() const = 0;
 };
 
 }  // namespace ado

@@ -1,0 +1,112 @@
+// SPDX-License-Identifier: MIT
+// Writing of row sets.
+#include "platform/ado/ColumnValue.h"
+#include "platform/ado/RecordsetImplementation.h"
+#include "platform/core/Failure.h"
+
+namespace ado {
+
+using namespace Qt::StringLiterals;
+
+void Recordset::Implementation::requireTable() const {
+    if (readOnly())
+        throw core::Failure(core::NotUpdatable, u"O conjunto de linhas é só de leitura."_s);
+    if (table.isEmpty())
+        throw core::Failure(core::NotUpdatable,
+                            u"As linhas desta consulta não podem ser gravadas."_s);
+}
+
+bool Recordset::Implementation::setValue(int column, const QVariant& value) {
+    requireRow();
+    if (readOnly()) requireTable();
+    const QVariant kept = toColumn(value, rows->columns().column(column));
+    if (at != At::New) {
+        settled = false;
+        look();
+        if (!changes.find(column) && this->value(column) == kept) return false;
+    }
+    changes.set(column, kept);
+    return true;
+}
+
+void Recordset::Implementation::addNew() {
+    requireOpen();
+    if (readOnly()) requireTable();
+    leaveRow();
+    before = at;
+    at = At::New;
+}
+
+void Recordset::Implementation::update() {
+    requireRow();
+    if (at == At::New) {
+        insertNew();
+    } else {
+        if (!changes.isEmpty()) updateCurrent();
+        held.reset();
+        settled = true;
+    }
+}
+
+void Recordset::Implementation::insertNew() {
+    requireTable();
+    QStringList columns;
+    std::vector<QVariant> values;
+    for (const auto& [column, value] : changes.values()) {
+        columns += rows->columns().column(column).name;
+        values.push_back(value);
+    }
+    added.push_back(session()->insert(table, columns, values));
+    addedAt = static_cast<qint64>(added.size()) - 1;
+    at = At::Added;
+    changes.clear();
+    settled = true;
+    wantsFresh = true;
+}
+
+void Recordset::Implementation::updateCurrent() {
+    requireTable();
+    QStringList columns;
+    std::vector<QVariant> values;
+    for (const auto& [column, value] : changes.values()) {
+        columns += rows->columns().column(column).name;
+        values.push_back(value);
+    }
+    if (!session()->update(table, identity(), columns, values))
+        throw core::Failure(core::DatabaseFailure,
+                            u"A linha foi entretanto apagada por outro posto; não foi gravada."_s);
+    if (at == At::Row)
+        for (const auto& [column, value] : changes.values()) stored[rows->row()].set(column, value);
+    wantsFresh = at == At::Added || fresh.count() > 0;
+    fresh.clear();
+    changes.clear();
+}
+
+void Recordset::Implementation::cancel() {
+    requireOpen();
+    changes.clear();
+    if (at != At::New) return;
+    at = before;
+    wantsFresh = at == At::Added;
+}
+
+void Recordset::Implementation::remove() {
+    requireRow();
+    requireTable();
+    if (at == At::New) return cancel();
+    look();
+    if (!session()->remove(table, identity()))
+        throw core::Failure(core::DatabaseFailure,
+                            u"A linha já tinha sido apagada por outro posto."_s);
+    if (at == At::Row) {
+        gone.insert(std::upper_bound(gone.begin(), gone.end(), rows->row()), rows->row());
+    } else {
+        added.erase(added.begin() + addedAt);
+        --addedAt;  // the next move comes to the row behind
+    }
+    changes.clear();
+    held.reset();
+    deleted = true;
+}
+
+}  // namespace ado

@@ -1,0 +1,90 @@
+// SPDX-License-Identifier: MIT
+#include "platform/ado/Rows.h"
+
+#include <limits>
+
+namespace ado {
+
+namespace {
+
+/// Rows that are taken in at once; a set with no more of them holds on to nothing.
+constexpr qint64 FewRows = 32;
+
+}  // namespace
+
+Rows::Rows(std::shared_ptr<Pass> pass, bool all)
+    : pass_(std::move(pass)), store_(std::make_shared<RowStore>()) {
+    take(all ? std::numeric_limits<qint64>::max() : FewRows);
+}
+
+Rows::Rows(std::shared_ptr<Pass> description, std::shared_ptr<RowStore> store)
+    : pass_(std::move(description)), store_(std::move(store)), complete_(true) {
+    count_ = store_->count();
+}
+
+void Rows::take(qint64 most) {
+    while (store_->count() < most) {
+        if (!pass_->step()) {
+            count_ = store_->count();
+            complete_ = true;
+            pass_->release();
+            return;
+        }
+        store_->append(*pass_);
+        ++passRow_;
+    }
+}
+
+void Rows::takeAll() {
+    if (complete_) return;
+    if (kept(0)) seek(store_->count() - 1);
+    take(std::numeric_limits<qint64>::max());
+}
+
+bool Rows::seek(qint64 row) {
+    if (row < passRow_) {
+        pass_->restart();
+        passRow_ = -1;
+    }
+    while (passRow_ < row) {
+        ++passRow_;
+        if (!pass_->step()) {
+            count_ = passRow_;
+            return false;
+        }
+    }
+    return true;
+}
+
+bool Rows::toFirst() {
+    row_ = 0;
+    return kept(0);
+}
+
+bool Rows::toNext() {
+    ++row_;
+    if (kept(row_)) return true;
+    if (count_ >= 0 && row_ >= count_) return false;
+    return seek(row_);
+}
+
+// The last row is stood on without being read: whoever only wants the count goes back to the first.
+bool Rows::toLast() {
+    if (count_ < 0) seek(std::numeric_limits<qint64>::max());
+    row_ = count_ - 1;
+    return count_ > 0;
+}
+
+Cell Rows::cell(int column) {
+    if (kept(row_)) return store_->cell(row_, column);
+    if (passRow_ != row_) seek(row_);
+    return pass_->cell(column);
+}
+
+RowIdentity Rows::identity() {
+    if (kept(row_)) return store_->identity(row_);
+    if (passRow_ != row_) seek(row_);
+    return pass_->identity();
+}
+
+}  // namespace ado

@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/RowStore.h"
+
+namespace ado {
+
+/// The rows of one statement and a place among them. Few rows are taken in at once and the engine
+/// is let go; of many the first are kept and the others come from the pass, so that memory does not
+/// grow with the table.
+class Rows {
+public:
+    /// @param all  takes in every row, however many
+    Rows(std::shared_ptr<Pass> pass, bool all);
+    /// Rows that are in memory already; `description` tells their columns.
+    Rows(std::shared_ptr<Pass> description, std::shared_ptr<RowStore> store);
+
+    const Pass& columns() const { return *pass_; }
+
+    bool toFirst();
+    bool toNext();
+    bool toLast();
+    /// Number of rows; -1 as long as nobody has seen the last one.
+    qint64 count() const { return count_; }
+    /// The row stood on, from 0.
+    qint64 row() const { return row_; }
+
+    // Of the row stood on.
+    Cell cell(int column);
+    RowIdentity identity();
+
+    bool inMemory() const { return complete_; }
+    /// Takes in all rows; the place stays.
+    void takeAll();
+    void toRow(qint64 row) { row_ = row; }
+    Cell cellAt(qint64 row, int column) const { return store_->cell(row, column); }
+    RowIdentity identityAt(qint64 row) const { return store_->identity(row); }
+
+private:
+    void take(qint64 most);
+    bool kept(qint64 row) const { return row < store_->count(); }
+    /// Makes the pass stand on a row behind the kept ones; false when there is no such row.
+    bool seek(qint64 row);
+
+    std::shared_ptr<Pass> pass_;
+    std::shared_ptr<RowStore> store_;
+    bool complete_ = false;  ///< all rows are in the store
+    qint64 count_ = -1;
+    qint64 row_ = 0;
+    qint64 passRow_ = -1;  ///< the row that the pass stands on
+};
+
+}  // namespace ado

@@ -1,0 +1,97 @@
+// SPDX-License-Identifier: MIT
+#include "platform/ado/SqliteHandle.h"
+
+#include "platform/ado/SqliteCollation.h"
+#include "platform/core/Failure.h"
+
+namespace ado {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Statements of this layer that stay prepared; more than these and all are prepared anew.
+constexpr int CachedStatements = 64;
+/// Bytes to which the journal shrinks again after a long scan made it grow.
+constexpr auto JournalLimit = "PRAGMA journal_size_limit=16777216";
+
+/// An enlarged bind that is blank or a comment holds no second statement.
+bool isBlank(const char* text) {
+    while (*text == ' ' || *text == '\n' || *text == '\t' || *text == '\r' || *text == ';') ++text;
+    return *text == '\0';
+}
+
+}  // namespace
+
+SqliteHandle::SqliteHandle(const QString& path, Role role, int timeoutSeconds) {
+    const int flags = SQLITE_OPEN_READWRITE | SQLITE_OPEN_NOMUTEX | SQLITE_OPEN_EXRESCODE;
+    try {
+        if (sqlite3_open_v2(path.toUtf8().constData(), &db_, flags, nullptr) != SQLITE_OK) fail();
+        setTimeout(timeoutSeconds);
+        installCollation(db_);
+        execute(role == Role::Reader ? "PRAGMA query_only=1" : "PRAGMA synchronous=FULL");
+        if (role == Role::Writer) execute(JournalLimit);
+    } catch (...) {
+        sqlite3_close_v2(db_);
+        throw;
+    }
+}
+
+SqliteHandle::~SqliteHandle() {
+    cache_.clear();
+    // Row sets may still hold their statements; the last of them closes for good.
+    sqlite3_close_v2(db_);
+}
+
+void SqliteHandle::setTimeout(int seconds) {
+    if (seconds == timeout_) return;
+    timeout_ = seconds;
+    sqlite3_busy_timeout(db_, seconds * 1000);
+}
+
+SqliteStatement SqliteHandle::prepare(const QByteArray& text) {
+    sqlite3_stmt* statement = nullptr;
+    const char* tail = nullptr;
+    if (sqlite3_prepare_v2(db_, text.constData(), static_cast<int>(text.size()) + 1, &statement,
+                           &tail) != SQLITE_OK)
+        fail();
+    SqliteStatement owned(statement);
+    if (!isBlank(tail) || (statement && !sqlite3_stmt_readonly(statement)))
+        throw core::Failure(core::InvalidCall, u"Só é aceite uma consulta de cada vez."_s);
+    return owned;
+}
+
+sqlite3_stmt* SqliteHandle::cached(const QByteArray& text) {
+    auto found = cache_.constFind(text);
+    if (found == cache_.constEnd()) {
+        if (cache_.size() >= CachedStatements) cache_.clear();
+        sqlite3_stmt* statement = nullptr;
+        if (sqlite3_prepare_v3(db_, text.constData(), static_cast<int>(text.size()) + 1,
+                               SQLITE_PREPARE_PERSISTENT, &statement, nullptr) != SQLITE_OK)
+            fail();
+        found = cache_.insert(text, std::shared_ptr<sqlite3_stmt>(statement, sqlite3_finalize));
+    }
+    sqlite3_reset(found->get());
+    return found->get();
+}
+
+void SqliteHandle::execute(const char* text) {
+    if (sqlite3_exec(db_, text, nullptr, nullptr, nullptr) != SQLITE_OK) fail();
+}
+
+void SqliteHandle::run(sqlite3_stmt* statement) {
+    const int result = sqlite3_step(statement);
+    if (result != SQLITE_DONE && result != SQLITE_ROW) {
+        const QString text = QString::fromUtf8(sqlite3_errmsg(db_));
+        sqlite3_reset(statement);
+        throw core::Failure(core::DatabaseFailure, text, QString::number(result));
+    }
+    sqlite3_reset(statement);
+}
+
+void SqliteHandle::fail() {
+    throw core::Failure(core::DatabaseFailure, QString::fromUtf8(sqlite3_errmsg(db_)),
+                        QString::number(sqlite3_extended_errcode(db_)));
+}
+
+}  // namespace ado

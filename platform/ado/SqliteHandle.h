@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <sqlite3.h>
+
+#include <QByteArray>
+#include <QHash>
+#include <QString>
+#include <memory>
+
+namespace ado {
+
+/// A prepared statement; finalised when destroyed.
+struct SqliteFinalize {
+    void operator()(sqlite3_stmt* statement) const { sqlite3_finalize(statement); }
+};
+using SqliteStatement = std::unique_ptr<sqlite3_stmt, SqliteFinalize>;
+
+/// One open handle on a book, with the collation of this system and its settings. Failures carry
+/// the engine's text and its extended result code.
+class SqliteHandle {
+public:
+    enum class Role { Reader, Writer };
+
+    /// Opens an existing file; never makes one.
+    SqliteHandle(const QString& path, Role role, int timeoutSeconds);
+    ~SqliteHandle();
+    SqliteHandle(const SqliteHandle&) = delete;
+    SqliteHandle& operator=(const SqliteHandle&) = delete;
+
+    sqlite3* get() const { return db_; }
+    void setTimeout(int seconds);
+
+    /// Prepares the text, all of it: a second statement in it is refused.
+    SqliteStatement prepare(const QByteArray& text);
+    /// A statement of this layer's own, prepared once and reset; valid until the next call.
+    sqlite3_stmt* cached(const QByteArray& text);
+    void execute(const char* text);
+    /// Runs a cached statement that gives no row.
+    void run(sqlite3_stmt* statement);
+    [[noreturn]] void fail();
+
+private:
+    sqlite3* db_ = nullptr;
+    int timeout_ = -1;
+    QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
+};
+
+}  // namespace ado

@@ -1,0 +1,178 @@
+// SPDX-License-Identifier: MIT
+#include "platform/ado/SqliteSession.h"
+
+#include <QDir>
+
+#include "platform/ado/RowStore.h"
+#include "platform/ado/SqlitePass.h"
+#include "platform/ado/SqliteTypes.h"
+#include "platform/core/Failure.h"
+
+namespace ado {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Idle readers that are kept open for the next pass.
+constexpr std::size_t IdleReaders = 4;
+
+QByteArray quoted(QStringView name) {
+    return '"' + name.toUtf8().replace('"', "\"\"") + '"';
+}
+
+}  // namespace
+
+SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds)
+    : path_(QDir(folder).absoluteFilePath(catalog + u".db"_s)),
+      timeout_(timeoutSeconds),
+      locks_(path_) {
+    try {
+        SqliteHandle& handle = reader();
+        // The first read tells a book from a file that is none.
+        handle.run(handle.cached("SELECT count(*) FROM sqlite_schema"));
+        // A book that cannot be written is still readable as it is.
+        sqlite3_exec(handle.get(), "PRAGMA journal_mode=WAL", nullptr, nullptr, nullptr);
+    } catch (const core::Failure& failure) {
+        throw core::Failure(failure.number(),
+                            u"Não foi possível abrir o livro «%1»: %2"_s.arg(
+                                QDir::toNativeSeparators(path_), failure.text()),
+                            failure.code());
+    }
+}
+
+std::unique_ptr<SqliteHandle> SqliteSession::takeReader() {
+    reader();
+    std::unique_ptr<SqliteHandle> taken = std::move(readers_.back());
+    readers_.pop_back();
+    return taken;
+}
+
+void SqliteSession::giveBack(std::unique_ptr<SqliteHandle> reader) {
+    if (readers_.size() < IdleReaders) readers_.push_back(std::move(reader));
+}
+
+SqliteHandle& SqliteSession::reader() {
+    if (readers_.empty())
+        readers_.push_back(
+            std::make_unique<SqliteHandle>(path_, SqliteHandle::Role::Reader, timeout_));
+    readers_.back()->setTimeout(timeout_);
+    return *readers_.back();
+}
+
+SqliteHandle& SqliteSession::writer() {
+    if (!writer_)
+        writer_ = std::make_unique<SqliteHandle>(path_, SqliteHandle::Role::Writer, timeout_);
+    writer_->setTimeout(timeout_);
+    return *writer_;
+}
+
+void SqliteSession::setTimeout(int seconds) {
+    timeout_ = seconds;
+}
+
+std::shared_ptr<Pass> SqliteSession::open(const Statement& statement, const QString& table) {
+    const bool withIdentity = !table.isEmpty();
+    const QString text = translate(statement, *this, withIdentity);
+    return std::make_shared<SqlitePass>(shared_from_this(), text.toUtf8(), withIdentity);
+}
+
+bool SqliteSession::isTable(QStringView name) {
+    if (sqlite3_table_column_metadata(reader().get(), "main", name.toUtf8().constData(), Identity,
+                                      nullptr, nullptr, nullptr, nullptr, nullptr) == SQLITE_OK)
+        return true;
+    // The handle may know the book from before the table was made; a read looks at it anew.
+    sqlite3_stmt* found = reader().cached(
+        "SELECT 1 FROM sqlite_schema WHERE type='table' AND name=?1 COLLATE NOCASE "
+        "AND sql NOT LIKE '%WITHOUT ROWID'");
+    bind(found, 1, name.toString());
+    const bool table = sqlite3_step(found) == SQLITE_ROW;
+    sqlite3_reset(found);
+    return table;
+}
+
+std::optional<ColumnType> SqliteSession::columnType(QStringView table, QStringView column) {
+    const char* declared = nullptr;
+    if (sqlite3_table_column_metadata(reader().get(), "main", table.toUtf8().constData(),
+                                      column.toUtf8().constData(), &declared, nullptr, nullptr,
+                                      nullptr, nullptr) == SQLITE_OK)
+        return typeOfDeclaration(declared);
+    return isTable(table) ? std::nullopt : viewColumnType(table, column);
+}
+
+std::optional<ColumnType> SqliteSession::viewColumnType(QStringView view, QStringView column) {
+    sqlite3_stmt* statement = nullptr;
+    sqlite3_prepare_v2(reader().get(), ("SELECT * FROM " + quoted(view)).constData(), -1,
+                       &statement, nullptr);
+    const SqliteStatement owned(statement);
+    const QByteArray wanted = column.toUtf8();
+    for (int i = 0; i < sqlite3_column_count(statement); ++i)
+        if (sqlite3_stricmp(sqlite3_column_name(statement, i), wanted.constData()) == 0)
+            return typeOfDeclaration(sqlite3_column_decltype(statement, i));
+    return std::nullopt;
+}
+
+bool SqliteSession::read(const QString& table, RowIdentity row, RowStore& into) {
+    SqliteHandle& handle = reader();
+    sqlite3_stmt* statement = handle.cached("SELECT * FROM " + quoted(table) + " WHERE _rowid_=?1");
+    sqlite3_bind_int64(statement, 1, row);
+    const int result = sqlite3_step(statement);
+    if (result == SQLITE_ROW) {
+        into.beginRow(row);
+        const int columns = sqlite3_column_count(statement);
+        for (int column = 0; column < columns; ++column) into.add(cellOf(statement, column));
+    } else if (result != SQLITE_DONE) {
+        sqlite3_reset(statement);
+        handle.fail();
+    }
+    sqlite3_reset(statement);
+    return result == SQLITE_ROW;
+}
+
+RowIdentity SqliteSession::insert(const QString& table, const QStringList& columns,
+                                  const std::vector<QVariant>& values) {
+    QByteArray text = "INSERT INTO " + quoted(table);
+    if (columns.isEmpty()) {
+        text += " DEFAULT VALUES";
+    } else {
+        QByteArray names;
+        QByteArray marks;
+        for (const QString& column : columns) {
+            names += (names.isEmpty() ? "(" : ",") + quoted(column);
+            marks += marks.isEmpty() ? "?" : ",?";
+        }
+        text += names + ") VALUES(" + marks + ')';
+    }
+    write(text, values);
+    return sqlite3_last_insert_rowid(writer().get());
+}
+
+bool SqliteSession::update(const QString& table, RowIdentity row, const QStringList& columns,
+                           const std::vector<QVariant>& values) {
+    QByteArray changes;
+    for (const QString& column : columns)
+        changes += (changes.isEmpty() ? "" : ",") + quoted(column) + "=?";
+    std::vector<QVariant> bound = values;
+    bound.emplace_back(row);
+    return write("UPDATE " + quoted(table) + " SET " + changes + " WHERE _rowid_=?", bound) > 0;
+}
+
+bool SqliteSession::remove(const QString& table, RowIdentity row) {
+    return write("DELETE FROM " + quoted(table) + " WHERE _rowid_=?", {QVariant(row)}) > 0;
+}
+
+int SqliteSession::write(const QByteArray& text, const std::vector<QVariant>& values) {
+    SqliteHandle& handle = writer();
+    sqlite3_stmt* statement = handle.cached(text);
+    int parameter = 0;
+    for (const QVariant& value : values) bind(statement, ++parameter, value);
+    handle.run(statement);
+    return sqlite3_changes(handle.get());
+}
+
+std::unique_ptr<RowLock> SqliteSession::lock(const QString& table, RowIdentity row,
+                                             int timeoutSeconds) {
+    return locks_.lock(table, row, timeoutSeconds);
+}
+
+}  // namespace ado

@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/SqliteHandle.h"
+#include "platform/ado/SqliteLocks.h"
+#include "platform/ado/StatementTranslator.h"
+
+namespace ado {
+
+/// A book in one SQLite file. Each pass reads on a handle of its own as long as it lasts, writes go
+/// through another one: so a scan never hides later writes from the other reads, and a write never
+/// stands in the way of a scan.
+class SqliteSession final : public Session,
+                            public Schema,
+                            public std::enable_shared_from_this<SqliteSession> {
+public:
+    /// Opens the existing book FOLDER/catalog.db.
+    SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds);
+
+    std::shared_ptr<Pass> open(const Statement& statement, const QString& table) override;
+    bool isTable(QStringView name) override;
+    bool read(const QString& table, RowIdentity row, RowStore& into) override;
+    RowIdentity insert(const QString& table, const QStringList& columns,
+                       const std::vector<QVariant>& values) override;
+    bool update(const QString& table, RowIdentity row, const QStringList& columns,
+                const std::vector<QVariant>& values) override;
+    bool remove(const QString& table, RowIdentity row) override;
+    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row,
+                                  int timeoutSeconds) override;
+    void setTimeout(int seconds) override;
+    const QString& book() const override { return path_; }
+
+    std::optional<ColumnType> columnType(QStringView table, QStringView column) override;
+
+    // For the passes: a reader that nobody else steps on, and its way back.
+    std::unique_ptr<SqliteHandle> takeReader();
+    void giveBack(std::unique_ptr<SqliteHandle> reader);
+
+private:
+    SqliteHandle& reader();
+    SqliteHandle& writer();
+    /// Runs a write with its values; gives the number of rows that it touched.
+    int write(const QByteArray& text, const std::vector<QVariant>& values);
+    /// Declared type of a view's column.
+    std::optional<ColumnType> viewColumnType(QStringView view, QStringView column);
+
+    QString path_;
+    int timeout_;
+    std::vector<std::unique_ptr<SqliteHandle>> readers_;  ///< idle ones
+    std::unique_ptr<SqliteHandle> writer_;                ///< opened by the first write
+    SqliteLocks locks_;
+};
+
+}  // namespace ado
