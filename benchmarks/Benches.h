@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "benchmarks/Report.h"
+
+namespace benchmarks {
+
+void measureCoverage(Report& report);
+void measureScreens(Report& report);
+void measureSearches(Report& report);
+
+}  // namespace benchmarks

@@ -1,0 +1,168 @@
+// SPDX-License-Identifier: MIT
+// Try-out and posting at the level of the rules, against the bare engine that prepares and runs the
+// same statements with the same settings.
+#include <QObject>
+
+#include "benchmarks/Bare.h"
+#include "benchmarks/Benches.h"
+#include "benchmarks/Books.h"
+#include "boundary/environment/dtZelmars.h"
+#include "coverage/Posting.h"
+#include "coverage/Statements.h"
+#include "platform/core/MsgBox.h"
+
+using namespace Qt::StringLiterals;
+
+namespace benchmarks {
+
+namespace {
+
+/// Takes cases in turn, for ever.
+class Turn {
+public:
+    explicit Turn(std::vector<Case> cases) : cases_(std::move(cases)) {}
+    const Case& next() { return cases_[at_++ % cases_.size()]; }
+
+private:
+    std::vector<Case> cases_;
+    std::size_t at_ = 0;
+};
+
+core::Answer yes(const QString&, core::Icon, const QString&, core::Buttons buttons) {
+    return buttons == core::Buttons::YesNo ? core::Answer::Yes : core::Answer::Ok;
+}
+
+ado::RecordsetPtr pendingRow() {
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(u"select * from tbzelmar_movimentos where movimento_id = 0"_s,
+               environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
+               ado::adLockPessimistic, ado::adCmdUnknown);
+    rows->AddNew();
+    const QDateTime day(QDate(2026, 11, 20), QTime(0, 0), Qt::UTC);
+    rows->setCollect(u"data"_s, day);
+    rows->setCollect(u"tipo"_s, u"DOC"_s);
+    rows->setCollect(u"doc_data"_s, day);
+    rows->setCollect(u"doc_no"_s, u"1234"_s);
+    rows->setCollect(u"doc_valor"_s, 40);
+    rows->setCollect(u"recebido"_s, 0);
+    rows->setCollect(u"modo_pagamento"_s, u"TRF"_s);
+    return rows;
+}
+
+coverage::Entry entryFor(const Case& of, const ado::RecordsetPtr& record) {
+    coverage::Entry entry;
+    entry.record = record;
+    entry.Socio_ID = of.socio_id;
+    entry.caption = u"Medição"_s;
+    entry.Text3 = of.codABC;
+    entry.Text6 = u"40"_s;
+    entry.Text9 = u"0"_s;
+    entry.DataCombo1 = u"rúbrica"_s;
+    entry.rubrica_id = of.rubrica_id;
+    record->setCollect(u"codABC"_s, of.codABC);
+    record->setCollect(u"rubrica_id"_s, of.rubrica_id);
+    return entry;
+}
+
+void runTryOut(const Case& of, const ado::RecordsetPtr& record) {
+    coverage::TryOut run;
+    coverage::tryOut(entryFor(of, record), run);
+}
+
+/// The statements of one try-out.
+void runBareTryOut(Bare& bare, const Case& of) {
+    using namespace coverage::statements;
+    const auto run = [&bare](const QString& statement) { return bare.run(statement.toUtf8()); };
+    const double main = bare.run(rubric(of.rubrica_id).toUtf8(), 1);
+    run(accumulator(of.rubrica_id, of.socio_id, of.codABC));
+    run(accumulator(of.rubrica_id, of.socio_id, of.codABC));
+    run(creditOfHousehold(of.rubrica_id, of.socio_id));
+    run(creditOfRelatives(of.rubrica_id, of.socio_id));
+    run(groupCreditOfPerson(main, of.codABC, of.socio_id));
+    run(groupCreditOfHousehold(main, of.socio_id));
+    run(groupCreditOfRelatives(main, of.socio_id));
+    run(rubric(main));
+    run(balance(of.socio_id));
+}
+
+/// What a posting adds to its try-out.
+void runBarePosting(Bare& bare, const Case& of) {
+    runBareTryOut(bare, of);
+    bare.run(coverage::statements::member(of.socio_id).toUtf8());
+    const auto number = static_cast<qint64>(bare.run("SELECT zelmars FROM tbContadores"));
+    bare.run("UPDATE tbContadores SET zelmars = " + QByteArray::number(number + 1));
+    bare.run(
+        "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, data, tipo, "
+        "doc_data, doc_no, doc_valor, recebido, incidencia, comparticipacao, saldo_plafond, "
+        "saldo_acumulado, iliquido, liquido, credito, debito, modo_pagamento, created_by) VALUES "
+        "(" +
+        QByteArray::number(number) + ", " + QByteArray::number(of.socio_id) + ", '" +
+        of.codABC.toUtf8() + "', " + QByteArray::number(of.rubrica_id) +
+        ", '2026-11-20 00:00:00', 'DOC', '2026-11-20 00:00:00', '1234', 40, 0, 40, 28, 100, 0, "
+        "28, 28, 28, 28, 'TRF', 'ana')");
+    bare.run(coverage::statements::accumulator(of.rubrica_id, of.socio_id, of.codABC).toUtf8());
+    bare.run(
+        "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac + 28, debito_ac = debito_ac + "
+        "28, no_docs = no_docs + 1 WHERE rubrica_id = " +
+        QByteArray::number(of.rubrica_id) + " AND socio_id = " + QByteArray::number(of.socio_id) +
+        " AND codABC = '" + of.codABC.toUtf8() + "'");
+}
+
+void runPosting(const Case& of) {
+    coverage::PostingEntry posting;
+    posting.entry = entryFor(of, pendingRow());
+    posting.DataCombo3 = u"TRF - Transferência"_s;
+    posting.modo_pagamento = u"TRF"_s;
+    posting.Text7 = posting.Text1 = u"20-11-2026"_s;
+    posting.Text5 = u"1234"_s;
+    coverage::TryOut run;
+    coverage::post(posting, run);
+}
+
+/// A person's first try-out of a rubric; the row it adds is taken away again, unmeasured by itself
+/// but the same on both books.
+void compareBooks(Report& report, const QString& name, bool fresh) {
+    if (!report.wanted(name)) return;
+    const Book sample = sampleBook();
+    const Book large = largeBook();
+    const auto timeOn = [&](const Book& book) {
+        use(book);
+        Turn turn(fresh ? freshCases(book, 2000) : usedCases(book, 500));
+        const ado::RecordsetPtr record = pendingRow();
+        return report.median(fresh ? 40 : 200, [&] { runTryOut(turn.next(), record); });
+    };
+    const double onLarge = timeOn(large);
+    const double onSample = timeOn(sample);
+    report.ratio(name, 1.3, onLarge, onSample);
+}
+
+}  // namespace
+
+void measureCoverage(Report& report) {
+    core::setMsgBoxPresenter(yes);
+    if (report.wanted(u"try-out"_s)) {
+        const Book sample = sampleBook();
+        use(sample);
+        Bare bare(sample.file());
+        Turn ours(usedCases(sample, 500));
+        Turn theirs(usedCases(sample, 500));
+        const ado::RecordsetPtr record = pendingRow();
+        report.pair(
+            u"try-out"_s, 1.5, 200, [&] { runTryOut(ours.next(), record); },
+            [&] { runBareTryOut(bare, theirs.next()); });
+    }
+    if (report.wanted(u"posting"_s)) {
+        const Book sample = sampleBook();
+        use(sample);
+        Bare bare(sample.file());
+        Turn ours(usedCases(sample, 500));
+        Turn theirs(usedCases(sample, 500));
+        report.pair(
+            u"posting"_s, 1.5, 20, [&] { runPosting(ours.next()); },
+            [&] { runBarePosting(bare, theirs.next()); });
+    }
+    compareBooks(report, u"large-book/try-out"_s, false);
+    compareBooks(report, u"large-book/first try-out of a person"_s, true);
+}
+
+}  // namespace benchmarks

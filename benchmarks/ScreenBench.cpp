@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: MIT
+// From the call of an operation until its screen is painted.
+#include <QApplication>
+#include <QElapsedTimer>
+#include <QEvent>
+
+#include "benchmarks/Benches.h"
+#include "benchmarks/Books.h"
+#include "boundary/General.h"
+#include "platform/forms/Form.h"
+
+using namespace Qt::StringLiterals;
+
+namespace benchmarks {
+
+namespace {
+
+/// Notes that a window was painted.
+class PaintWatch : public QObject {
+public:
+    explicit PaintWatch(const QString& window) : window_(window) { qApp->installEventFilter(this); }
+    bool painted() const { return painted_; }
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        if (event->type() == QEvent::Paint && watched->objectName() == window_) painted_ = true;
+        return false;
+    }
+
+private:
+    QString window_;
+    bool painted_ = false;
+};
+
+forms::Form* entryScreen() {
+    for (QWidget* each : QApplication::topLevelWidgets())
+        if (auto* form = qobject_cast<forms::Form*>(each);
+            form && form->objectName() == u"frmMovimentos" && !form->isUnloaded())
+            return form;
+    return nullptr;
+}
+
+/// Milliseconds from the call to the painted screen.
+double openEntry(boundary::General& general) {
+    QElapsedTimer clock;
+    clock.start();
+    const PaintWatch watch(u"frmMovimentos"_s);
+    general.NewMovimento(false);
+    while (!watch.painted()) QCoreApplication::processEvents();
+    const double milliseconds = static_cast<double>(clock.nsecsElapsed()) / 1e6;
+    entryScreen()->Unload();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    QCoreApplication::processEvents();
+    return milliseconds;
+}
+
+double medianOpening(Report& report, const Book& book) {
+    use(book);
+    boundary::General general;
+    return report.medianOf(15, [&] { return openEntry(general); });
+}
+
+}  // namespace
+
+void measureScreens(Report& report) {
+    if (!report.wanted(u"NewMovimento"_s)) return;
+    const double onLarge = medianOpening(report, largeBook());
+    const double onSample = medianOpening(report, sampleBook());
+    report.ratio(u"NewMovimento, large book against sample"_s, 1.3, onLarge, onSample);
+    report.value(u"NewMovimento, large book, painted"_s, u"ms"_s, 150, onLarge);
+}
+
+}  // namespace benchmarks

@@ -1,0 +1,229 @@
+# SPDX-License-Identifier: MIT
+"""A medical document and a hospital bill, from the main window to the book, by key presses alone.
+
+The amounts in the book are compared with a calculation of this script's own, from the rubric's row.
+Usage: road_of_one_document.py FOLDER_OF_THE_PROGRAMS [FOLDER_FOR_PICTURES]
+"""
+
+import os
+import sqlite3
+import struct
+import subprocess
+import sys
+import tempfile
+from datetime import date
+from decimal import ROUND_HALF_UP, Decimal
+
+from desktop import Desktop, Failed, wait_until
+
+MEMBER = "100015"
+ENTRY = "Lançamento (Plano de Saúde)"
+EXIT = "Sair de Lançamentos"
+MAIN = "Zelmars"
+
+
+def single(value):
+    """The nearest 32-bit float, as the calculation works."""
+    return struct.unpack("f", struct.pack("f", value))[0]
+
+
+def money(value):
+    """What a money column keeps of a number: four decimals."""
+    return float(Decimal(value).quantize(Decimal("0.0001"), ROUND_HALF_UP))
+
+
+class Book:
+    def __init__(self, file):
+        self.file = file
+
+    def row(self, statement, *values):
+        with sqlite3.connect(f"file:{self.file}?mode=ro", uri=True) as book:
+            book.row_factory = sqlite3.Row
+            return book.execute(statement, values).fetchone()
+
+    def rubric(self):
+        """A rubric that takes the documents below: no minimum above them, ceilings well above."""
+        return self.row(
+            "SELECT p.* FROM tbZelmar_Plafonds p JOIN tbZelmar_Plafonds m "
+            "ON m.rubrica_id = p.rubrica_id_main WHERE p.percent < 1 AND p.socio > 60 "
+            "AND p.familiar > 60 AND coalesce(p.socio_min_lan, 0) < 87 "
+            "AND coalesce(p.nomax_recibos_socio, 9) > 0 "
+            "AND coalesce(p.nomax_recibos_familiar, 9) > 0 ORDER BY p.code LIMIT 1")
+
+    def room(self, rubric, person):
+        """The lowest ceiling of a family that has used nothing yet."""
+        main = self.row("SELECT * FROM tbZelmar_Plafonds WHERE rubrica_id = ?",
+                        rubric["rubrica_id_main"])
+        own = "socio" if person == "A" else "familiar"
+        ceilings = [rubric[own] or 0, rubric["agregado"], main[own], main["agregado"],
+                    rubric[own + "_max_lan"]]
+        if person != "A":
+            ceilings += [rubric["total_familia"], main["total_familia"]]
+        return min(c for c in ceilings if c is not None)
+
+
+def expect(row, **wanted):
+    for column, value in wanted.items():
+        if row[column] != value:
+            raise Failed(f"{column} is {row[column]!r} and not {value!r}")
+        print(f"  {column:16} {row[column]}")
+
+
+def choose_member_and_person(desktop, *way_to_person):
+    desktop.at(ENTRY)
+    desktop.type(MEMBER)
+    desktop.keys("Tab")
+    desktop.at("Quotizações")
+    desktop.keys("alt+n")
+    desktop.at(ENTRY)
+    choose_person(desktop, *way_to_person)
+
+
+def choose_person(desktop, *way):
+    desktop.keys("alt+i")
+    desktop.at("Escolher Familiar")
+    desktop.keys(*way, "Return")
+    desktop.at(ENTRY)
+
+
+def fill_in_fields(desktop, *texts):
+    """Types one field after the other, beginning behind «Indicar Familiar»."""
+    desktop.keys("Tab")
+    for text in texts:
+        if text:
+            desktop.type(text)
+        desktop.keys("Tab")
+
+
+def post(desktop):
+    desktop.keys("alt+o")
+    desktop.at(ENTRY)  # the question bears the screen's caption
+    desktop.keys("alt+s")
+
+
+def medical_document(desktop, book, rubric, today):
+    """A document of 87,35 at rate 23 for the member himself."""
+    desktop.at(MAIN)
+    desktop.keys("ctrl+n")
+    choose_member_and_person(desktop)
+    fill_in_fields(desktop, today, "4711", "87,35", "0", "23", "", "Consulta", rubric["code"], "")
+    desktop.keys("alt+e")
+    wait_until("the try-out has added its accumulator row", lambda: book.row(
+        "SELECT 1 FROM tbSocios_Acumulados a JOIN tbSocios s ON s.socio_id = a.socio_id "
+        "WHERE s.no_kor = ? AND a.rubrica_id = ? AND a.codABC = 'A'", MEMBER,
+        rubric["rubrica_id"]))
+    desktop.show("ensaio")
+    post(desktop)
+    desktop.at(EXIT)
+
+    share = money(87.35 * single(rubric["percent"]))
+    room = money(single(book.room(rubric, "A")))
+    net = money(min(single(share), single(87.35), single(room)))
+    franchise = single(rubric["franquia"] or 0)
+    credit = money(single(single(net) - franchise)) if franchise < single(net) else 0.0
+    row = newest(book)
+    expect(row, tipo="DOC", codABC="A", doc_no="4711", doc_valor=87.35, doc_tx_iva=23,
+           doc_iva=money(round((single(87.35) - single(87.35) / 1.23) * 100) / 100), recebido=0,
+           incidencia=87.35, comparticipacao=share, saldo_plafond=room, saldo_acumulado=0,
+           iliquido=share, liquido=net, credito=credit, debito=credit, modo_pagamento="TRF",
+           rubrica_id=rubric["rubrica_id"], cheque=None)
+    return row
+
+
+def hospital_bill(desktop, book, rubric, today):
+    """A bill of 1.250,00 with an incidence of 100 for the spouse, by cheque 500."""
+    hospital = book.row("SELECT * FROM tbHospitais ORDER BY nome LIMIT 1")
+    desktop.at(MAIN)
+    desktop.keys("ctrl+h")
+    choose_member_and_person(desktop, "Down")
+    fill_in_fields(desktop, today, "H-2001", "1250", "100", "6", "", "Internamento",
+                   rubric["code"], hospital["code"], "")
+    desktop.keys("alt+e")
+    desktop.show("ensaio-hospital")
+    post(desktop)
+    desktop.at("Pagamento por Cheque")
+    desktop.keys("ctrl+a")
+    desktop.type("500")
+    desktop.keys("Return")
+    desktop.at(EXIT)
+
+    share = money(100 * single(rubric["percent"]))
+    room = money(single(book.room(rubric, "B")))
+    net = money(min(single(share), single(room)))
+    row = newest(book)
+    expect(row, tipo="HOS", codABC="B", doc_no="H-2001", doc_valor=1250, incidencia=100,
+           comparticipacao=share, saldo_plafond=room, saldo_acumulado=None, iliquido=share,
+           liquido=net, debito=1250, modo_pagamento="CHQ", cheque=500,
+           hospital_id=hospital["hospital_id"])
+    expect(book.row("SELECT * FROM tbCheques"), cheque_no=501)
+    return row
+
+
+def newest(book):
+    return book.row("SELECT * FROM tbZelmar_Movimentos ORDER BY movimento_id DESC LIMIT 1")
+
+
+def check_accumulators(book, *rows):
+    for row in rows:
+        expect(book.row("SELECT * FROM tbSocios_Acumulados WHERE socio_id = ? AND codABC = ? "
+                        "AND rubrica_id = ?", row["socio_id"], row["codABC"], row["rubrica_id"]),
+               credito_ac=single(row["credito"]), debito_ac=single(row["debito"]), no_docs=1)
+
+
+def road(desktop, programs, book):
+    today = date.today().strftime("%d-%m-%Y")
+    rubric = book.rubric()
+    counter = book.row("SELECT zelmars FROM tbContadores")["zelmars"]
+    desktop.start([os.path.join(programs, "zelmars")])
+
+    document = medical_document(desktop, book, rubric, today)
+    expect(document, movimento_no=counter)
+    desktop.keys("Return")  # «Continuar a registar com o mesmo Associado» is chosen already
+    desktop.at(ENTRY)
+    # The member is known: the person can be chosen at once.
+    choose_person(desktop)
+    desktop.show("mesmo-associado")
+    desktop.keys("alt+c")
+    leave(desktop)
+
+    bill = hospital_bill(desktop, book, rubric, today)
+    expect(bill, movimento_no=counter + 1)
+    expect(book.row("SELECT zelmars FROM tbContadores"), zelmars=counter + 2)
+    check_accumulators(book, document, bill)
+    leave(desktop)
+
+    # The newest movement stands on top of the list, and Enter opens it read-only.
+    desktop.at(MAIN)
+    desktop.keys("Home", "Return")
+    desktop.at(ENTRY + " - Hospital")
+    desktop.show("movimento")
+    desktop.keys("alt+s")
+    desktop.at(MAIN)
+    desktop.show("lista")
+
+
+def leave(desktop):
+    desktop.at(EXIT)
+    desktop.keys("alt+s", "Return")
+    desktop.gone(EXIT)
+
+
+def main(programs, pictures=None):
+    with tempfile.TemporaryDirectory() as own:
+        environment = dict(os.environ, ZELMARS_REGISTRY=own + "/registry", XDG_CONFIG_HOME=own,
+                           XDG_RUNTIME_DIR=own, TZ="Europe/Lisbon", LC_ALL="C.UTF-8",
+                           PICTURES=pictures or "")
+        zelmars = os.path.join(programs, "zelmars")
+        for command in ([zelmars, "init", "--sample", own + "/book"], [zelmars, "register"]):
+            subprocess.run(command, env=dict(environment, QT_QPA_PLATFORM="offscreen"), check=True)
+        with Desktop(environment) as desktop:
+            try:
+                road(desktop, programs, Book(own + "/book/zelmars.db"))
+            except Failed as failure:
+                desktop.show("falhou")
+                sys.exit(f"failed: {failure}")
+    print("1 passed, 0 failed")
+
+
+if __name__ == "__main__":
+    main(*sys.argv[1:])
