@@ -38,10 +38,10 @@ std::string folded(const QString& text) {
         if (c.isMark()) continue;
         const bool part = c.isLetterOrNumber() || c.isSurrogate();
         if (part && between) plain += u' ';
-        if (part) plain += c;
+        if (part) plain += c.toCaseFolded();
         between = !part;
     }
-    return plain.toCaseFolded().toStdString();
+    return plain.toStdString();
 }
 
 void MemberIndex::load(const ado::ConnectionPtr& connection) {

@@ -87,7 +87,7 @@ void frmEscolherFamiliar::layOut(const QString& member) {
     header->setHighlightSections(false);
     header->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     const int character = fontMetrics().averageCharWidth();
-    for (const auto [column, width] :
+    for (const auto& [column, width] :
          {std::pair{Position, 5}, {Code, 10}, {Kinship, 24}, {Birth, 15}, {Waiting, 15}})
         lstFamiliares->setColumnWidth(column, width * character);
     header->setSectionResizeMode(Name, QHeaderView::Stretch);

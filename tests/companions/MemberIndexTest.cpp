@@ -1,0 +1,77 @@
+// SPDX-License-Identifier: MIT
+#include <gtest/gtest.h>
+
+#include "companions/search/MemberIndex.h"
+
+using namespace Qt::StringLiterals;
+using companions::MemberIndex;
+
+namespace {
+
+MemberIndex fourMembers() {
+    MemberIndex index;
+    index.add(
+        {11, u"100015"_s, u"António João d'Almeida"_s, u"António Almeida"_s, u"Évora"_s, true});
+    index.add({12, u"10001"_s, u"Inês Conceição Sá-Carneiro"_s, u""_s, u""_s, false});
+    index.add({13, u"200100"_s, u"Joana ANTÓNIA da Silva"_s, u"Joana Silva"_s, u"Faro"_s, true});
+    index.add({14, u"300\n7"_s, u"😀 Ωmega"_s, u"x"_s, u"y"_s, true});
+    return index;
+}
+
+std::vector<int> socios(const QString& typed) {
+    const MemberIndex index = fourMembers();
+    std::vector<int> keys;
+    for (const int position : index.matching(typed)) keys.push_back(index.socioId(position));
+    return keys;
+}
+
+using Keys = std::vector<int>;
+
+}  // namespace
+
+TEST(MemberIndex, FindsWordsByTheirBeginningInAnyOrder) {
+    const struct {
+        const char* what;
+        QString typed;
+        Keys expected;
+    } rows[] = {
+        {"nothing typed", u""_s, {11, 12, 13, 14}},
+        {"only blanks and signs", u" ' - % "_s, {11, 12, 13, 14}},
+        {"accents folded away", u"antonio"_s, {11}},
+        {"accents typed, none stored", u"síLVÁ"_s, {13}},
+        {"case", u"ANTÓNI"_s, {11, 13}},
+        {"words swapped", u"joa ant"_s, {11, 13}},
+        {"the same word twice", u"ant ant"_s, {11, 13}},
+        {"part of a word is no beginning", u"lmeida"_s, {}},
+        {"apostrophe parts words", u"D'Alm"_s, {11}},
+        {"hyphen parts words", u"carneiro sa"_s, {12}},
+        {"number and name together", u"2001 sil"_s, {13}},
+        {"inside of a number is no beginning", u"0001"_s, {}},
+        {"number typed in full comes first", u"10001"_s, {12, 11}},
+        {"beyond the first plane", u"😀"_s, {14}},
+        {"other scripts", u"ΩMEG"_s, {14}},
+        {"an unclosed quote is nothing special", u"ant'; drop"_s, {}},
+    };
+    for (const auto& row : rows) EXPECT_EQ(socios(row.typed), row.expected) << row.what;
+}
+
+TEST(MemberIndex, GivesBackWhatItHolds) {
+    const MemberIndex index = fourMembers();
+    const auto first = index.at(0);
+    EXPECT_EQ(first.socioId, 11);
+    EXPECT_EQ(first.number, u"100015"_s);
+    EXPECT_EQ(first.name, u"António João d'Almeida"_s);
+    EXPECT_EQ(first.shortName, u"António Almeida"_s);
+    EXPECT_EQ(first.locality, u"Évora"_s);
+    EXPECT_TRUE(first.enrolled);
+    EXPECT_FALSE(index.at(1).enrolled);
+    EXPECT_EQ(index.at(1).locality, u""_s);
+    EXPECT_EQ(index.at(3).number, u"300 7"_s) << "a line break would shift the texts behind it";
+    EXPECT_EQ(index.at(3).locality, u"y"_s);
+}
+
+TEST(MemberIndex, TakesATextOfAnyLength) {
+    EXPECT_EQ(socios(u"ant "_s.repeated(2500)), (Keys{11, 13}));
+    EXPECT_EQ(socios(QString(10000, u'a')), Keys{});
+    EXPECT_EQ(socios(u"ant"_s + QChar(0) + u"joa"_s), (Keys{11, 13})) << "a NUL parts words";
+}

@@ -1,0 +1,236 @@
+// SPDX-License-Identifier: MIT
+#include <QCheckBox>
+#include <QLineEdit>
+
+#include "platform/ado/Connection.h"
+#include "platform/registry/Registry.h"
+#include "tests/companions/Companion.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr auto ValidNib = "001300000000000000186";
+
+class TiquetaTest : public CompanionTest {
+protected:
+    TiquetaTest() : tiqueta(companion(u"Tiqueta"_s)) {
+        socio = book.member({.no_kor = u"100015"_s,
+                             .nome = u"António Matos"_s,
+                             .nib = u"0013"_s,
+                             .zelmar_data_carencia = QDate(2026, 3, 31)});
+    }
+
+    QVariant connection() {
+        auto opened = std::make_shared<ado::Connection>(u"MSAccess"_s);
+        opened->ConnectionString = book.connectionString();
+        opened->Open();
+        return QVariant::fromValue(opened);
+    }
+    QVariant forgetSettings() {
+        registry::removeKey(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s);
+        return {};
+    }
+
+    void edit(const std::function<void()>& steps) {
+        person.onScreen(u"frmFichaSocio"_s, steps);
+        tiqueta.call(u"AbrirRegisto"_s, {QVariant::fromValue(static_cast<qint16>(socio))});
+        EXPECT_FALSE(person.isShown(u"frmFichaSocio"_s));
+    }
+    int choose(const std::function<void()>& steps) {
+        person.onScreen(u"frmEscolherFamiliar"_s, steps);
+        return tiqueta.call(u"EscolherFamiliar"_s, {static_cast<int>(socio)}).toInt();
+    }
+    QVariant stored(const QString& column) {
+        return book.value(u"select %1 from tbSocios where socio_id = %2"_s.arg(column).arg(socio));
+    }
+    QString field(const QString& name) { return person.find<QLineEdit>(name)->text(); }
+
+    com::Object tiqueta;
+    qint64 socio = 0;
+};
+
+class TiquetaFile : public TiquetaTest {
+protected:
+    TiquetaFile() { tiqueta.call(u"Login"_s); }
+};
+
+class TiquetaFamily : public TiquetaFile {
+protected:
+    TiquetaFamily() {
+        himself = book.person({.socio_id = socio,
+                               .codABC = u"A"_s,
+                               .nome = u"António Matos"_s,
+                               .data_nascimento = QDate(1970, 5, 6)});
+        wife = book.person({.socio_id = socio, .codABC = u"B"_s, .nome = u"Conceição Matos"_s});
+        first = book.person({.socio_id = socio,
+                             .codABC = u"C1"_s,
+                             .nome = u"Rui Matos"_s,
+                             .data_carencia = QDate(2026, 1, 9)});
+        second = book.person({.socio_id = socio, .codABC = u"C2"_s, .nome = u"Inês Matos"_s});
+        book.person({.socio_id = socio + 1, .codABC = u"A"_s, .nome = u"Estranho"_s});
+    }
+    qint64 himself, wife, first, second;
+};
+
+}  // namespace
+
+TEST_F(TiquetaTest, LoginTakesNothingOrAConnectionInEitherOrder) {
+    const auto finds = [&] {
+        person.onScreen(u"frmProcurar"_s, [&] {
+            person.type(u"antonio"_s);
+            person.enter();
+        });
+        return tiqueta.call(u"FindSocios"_s).toLongLong() == socio;
+    };
+    tiqueta.call(u"Login"_s);
+    EXPECT_TRUE(finds());
+    forgetSettings();
+    tiqueta = companion(u"Tiqueta"_s);
+    tiqueta.call(u"Login"_s, {u"MSAccess"_s, connection()});
+    EXPECT_TRUE(finds());
+    tiqueta = companion(u"Tiqueta"_s);
+    tiqueta.call(u"Login"_s, {connection(), u"MSAccess"_s});
+    EXPECT_TRUE(finds());
+}
+
+TEST_F(TiquetaTest, LoginRefusesAnythingElse) {
+    const QVariantList wrong[] = {{u"MSAccess"_s},
+                                  {connection()},
+                                  {u"SqlServer"_s, connection()},
+                                  {u"MSAccess"_s, 7},
+                                  {u"MSAccess"_s, QVariant::fromValue(ado::ConnectionPtr())}};
+    for (const auto& arguments : wrong)
+        EXPECT_EQ(failureOf(tiqueta, u"Login"_s, arguments).number(), core::TypeMismatch);
+    EXPECT_EQ(failureOf(tiqueta, u"FindSocios"_s).number(), core::InvalidCall);
+    forgetSettings();
+    EXPECT_EQ(failureOf(tiqueta, u"Login"_s).number(), core::NoSuchItem);
+}
+
+TEST_F(TiquetaFile, OkWritesWhatWasChangedAndNothingElse) {
+    edit([&] {
+        EXPECT_EQ(field(u"txtNumero"_s), u"100015"_s);
+        EXPECT_TRUE(person.find<QLineEdit>(u"txtNumero"_s)->isReadOnly());
+        person.fill(u"txtNib"_s, u"PT50 0013 0000 00000000001 86"_s);
+        EXPECT_EQ(field(u"txtNib"_s), QString::fromLatin1(ValidNib));
+        person.fill(u"txtCarencia"_s, u"1-2-2027"_s);
+        EXPECT_EQ(field(u"txtCarencia"_s), u"01-02-2027"_s);
+        person.fill(u"txtLocalidade"_s, u"Évora d'Além"_s);
+        person.click(u"chkZelmar"_s);
+        book.exec(u"update tbSocios set nome = 'Mudado por outro posto'"_s);
+        person.accelerator(u'O');
+    });
+    EXPECT_EQ(stored(u"nib"_s), QString::fromLatin1(ValidNib));
+    EXPECT_EQ(stored(u"zelmar_data_carencia"_s), u"2027-02-01 00:00:00"_s);
+    EXPECT_EQ(stored(u"localidade1"_s), u"Évora d'Além"_s);
+    EXPECT_EQ(stored(u"zelmar"_s).toInt(), 0);
+    EXPECT_EQ(stored(u"nome"_s), u"Mudado por outro posto"_s);
+}
+
+TEST_F(TiquetaFile, EnterInAFieldStoresItToo) {
+    edit([&] {
+        person.put(u"txtNib"_s, QString::fromLatin1(ValidNib));
+        person.enter();
+    });
+    EXPECT_EQ(stored(u"nib"_s), QString::fromLatin1(ValidNib));
+}
+
+TEST_F(TiquetaFile, CancelAbandons) {
+    const auto change = [&] {
+        person.fill(u"txtNome"_s, u"Outro"_s);
+        person.put(u"txtMorada"_s, u"Outra"_s);
+        person.click(u"chkZelmar"_s);
+    };
+    edit([&] { change(), person.accelerator(u'C'); });
+    edit([&] { change(), person.escape(); });
+    edit([&] { change(), person.here()->close(); });
+    EXPECT_EQ(stored(u"nome || '/' || morada1 || '/' || zelmar"_s),
+              u"António Matos/Rua das Flores, 12/1"_s);
+}
+
+TEST_F(TiquetaFile, TellsOfTheBankNumberWhileTyping) {
+    const std::pair<QString, QString> rows[] = {
+        {u"0013"_s, u"faltam 17 de 21 algarismos"_s},
+        {u"0013 0000.0000-0000 0001 86"_s, u"faltam 1 de 21 algarismos"_s},
+        {u"001300000000000000186"_s, u"✓ NIB válido"_s},
+        {u"pt50 0013 0000 00000000001 86"_s, u"✓ NIB válido"_s},
+        {u"001300000000000000187"_s, u"não conferem"_s},
+        {u"0013000000000000001860"_s, u"1 algarismos a mais"_s},
+        {u"0013A"_s, u"só pode ter algarismos"_s},
+    };
+    edit([&] {
+        EXPECT_TRUE(label(u"lblControloNib"_s).contains(rows[0].second)) << "as it was stored";
+        for (const auto& [typed, hint] : rows) {
+            person.put(u"txtNib"_s, typed);
+            EXPECT_TRUE(label(u"lblControloNib"_s).contains(hint)) << typed.toStdString();
+        }
+        person.put(u"txtNib"_s, u""_s);
+        EXPECT_EQ(label(u"lblControloNib"_s), QString());
+        person.escape();
+    });
+}
+
+TEST_F(TiquetaFile, WhatTheColumnDoesNotTakeStaysOnTheScreen) {
+    edit([&] {
+        person.expectBox({.text = {}, .partly = true});
+        person.fill(u"txtCarencia"_s, u"31-02-2026"_s);
+        EXPECT_EQ(focus(), u"txtCarencia"_s);
+        EXPECT_EQ(field(u"txtCarencia"_s), u"31-02-2026"_s);
+        person.escape();
+    });
+    EXPECT_EQ(stored(u"zelmar_data_carencia"_s), u"2026-03-31 00:00:00"_s);
+}
+
+TEST_F(TiquetaFile, AWriteTheBookRefusesLeavesTheScreenAsItIs) {
+    book.exec(
+        u"create trigger refuses before update on tbSocios "
+        "begin select raise(abort, 'o livro recusa'); end"_s);
+    edit([&] {
+        person.fill(u"txtNome"_s, u"Novo Nome"_s);
+        person.expectBox(
+            {.text = u"o livro recusa"_s, .icon = core::Icon::Critical, .partly = true});
+        person.accelerator(u'O');
+        EXPECT_EQ(field(u"txtNome"_s), u"Novo Nome"_s);
+        book.exec(u"drop trigger refuses"_s);
+        person.accelerator(u'O');
+    });
+    EXPECT_EQ(stored(u"nome"_s), u"Novo Nome"_s);
+}
+
+TEST_F(TiquetaFile, AnUnknownMemberIsAFailureWithAText) {
+    const auto failure = failureOf(tiqueta, u"AbrirRegisto"_s, {4711});
+    EXPECT_TRUE(failure.text().contains(u"4711"_s)) << failure.what();
+}
+
+TEST_F(TiquetaFamily, OffersTheMemberHimselfAndHisRelatives) {
+    EXPECT_EQ(choose([&] {
+                  EXPECT_EQ(label(u"lblExplicacao"_s), u"Associado 100015, António Matos"_s);
+                  EXPECT_EQ(shown(u"lstFamiliares"_s),
+                            u"1|A|Titular|António Matos|06-05-1970|31-03-2026\n"
+                            "2|B|Cônjuge|Conceição Matos||\n"
+                            "3|C1|1.º filho(a)|Rui Matos||09-01-2026\n"
+                            "4|C2|2.º filho(a)|Inês Matos||"_s);
+                  person.enter();
+              }),
+              himself);
+}
+
+TEST_F(TiquetaFamily, KeysJumpAndEnterTakes) {
+    EXPECT_EQ(choose([&] { person.type(u"4"_s), person.enter(); }), second);
+    EXPECT_EQ(choose([&] { person.type(u"b"_s), person.enter(); }), wife);
+    EXPECT_EQ(choose([&] { person.type(u"9"_s), person.type(u"c"_s), person.enter(); }), first);
+    EXPECT_EQ(choose([&] { person.press(Qt::Key_End), person.accelerator(u'E'); }), second);
+    EXPECT_EQ(choose([&] { person.doubleClick(u"lstFamiliares"_s); }), second);
+}
+
+TEST_F(TiquetaFamily, GivingUpIsZero) {
+    EXPECT_EQ(choose([&] { person.escape(); }), 0);
+    EXPECT_EQ(choose([&] { person.accelerator(u'D'); }), 0);
+    socio = 4711;
+    EXPECT_EQ(choose([&] {
+                  EXPECT_EQ(shown(u"lstFamiliares"_s), QString());
+                  person.enter();
+                  person.escape();
+              }),
+              0);
+}
