@@ -1,13 +1,18 @@
 // SPDX-License-Identifier: MIT
 #include "host/Tour.h"
 
-#include <QElapsedTimer>
+#include <QAbstractButton>
+#include <QDir>
+#include <QLineEdit>
 #include <QTemporaryDir>
 #include <QTextStream>
 
 #include "database/Book.h"
+#include "host/Operations.h"
 #include "host/Tasks.h"
+#include "host/TourPlayer.h"
 #include "host/frmPrincipal.h"
+#include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
 
@@ -17,62 +22,159 @@ namespace host {
 
 namespace {
 
-/// The steps of the tour, each with its picture.
-class Tour {
+using Keys = QStringList;
+
+// Members of the sample book: one with everything in order, one without a bank number.
+const QString GoodMember = u"100015"_s;
+const QString MemberWithoutNib = u"100023"_s;
+
+std::function<void(QWidget*)> typing(const Keys& keys) {
+    return [keys](QWidget* screen) { TourPlayer::type(screen, keys); };
+}
+
+/// A field of the screen shows something.
+std::function<bool(QWidget*)> shows(const QString& field) {
+    return [field](QWidget* screen) {
+        const auto* box = screen->findChild<QLineEdit*>(field);
+        return box && !box->text().isEmpty();
+    };
+}
+
+std::function<bool(QWidget*)> canPress(const QString& button) {
+    return [button](QWidget* screen) {
+        const auto* found = screen->findChild<QAbstractButton*>(button);
+        return found && found->isEnabled();
+    };
+}
+
+/// The script of the tour, road by road.
+class Script {
 public:
-    explicit Tour(const QString& folder) : folder_(folder) {
-        if (!folder_.mkpath(u"."_s))
-            throw core::Failure(core::InvalidCall,
-                                u"A pasta %1 não pode ser feita."_s.arg(folder_.path()));
+    explicit Script(TourPlayer& player) : player_(player) {}
+
+    void document() {
+        open(u"01-janela-principal"_s, Operations::newDocument(false));
+        player_.step(u"frmMovimentos"_s, u"02-novo-documento"_s, {}, shows(u"Text8"_s));
+        chooseMember(u"03-pergunta-quotizacoes"_s);
+        choosePerson(u"04-escolher-familiar"_s, {u"<Return>"_s});
+        fillIn({u"4711"_s, u"87,35"_s, u"0"_s, u"23"_s, {}, u"Consulta"_s, u"01.01"_s, {}});
+        player_.step(u"frmMovimentos"_s, u"05-ensaio"_s, typing({u"<Alt+O>"_s}),
+                     shows(u"Debito"_s));
+        player_.step(u"box:Deseja finalizar o registo?"_s, u"06-confirmar"_s,
+                     typing({u"<Alt+S>"_s}));
+        player_.step(u"frmMovimentosF"_s, u"07-sair-de-lancamentos"_s, typing({u"<Return>"_s}));
+        player_.step(u"frmMovimentos"_s, u"08-mesmo-associado"_s, typing({u"<Escape>"_s}),
+                     shows(u"Text2"_s));
+        leave();
     }
 
-    void openBook() {
-        qputenv("ZELMARS_REGISTRY", book_.filePath(u"registry"_s).toUtf8());
-        database::initBook(book_.filePath(u"livro"_s), true);
-        registerComponents(false);
-        say(u"Livro de exemplo numa pasta provisória"_s);
+    void hospitalBill() {
+        open({}, Operations::newDocument(true));
+        chooseMember({});
+        choosePerson({}, {u"<Down>"_s, u"<Return>"_s});
+        fillIn({u"H-2001"_s,
+                u"1250"_s,
+                u"1000"_s,
+                u"6"_s,
+                {},
+                u"Internamento"_s,
+                u"01.01"_s,
+                u"<Down>"_s,
+                {}});
+        player_.step(u"frmMovimentos"_s, u"09-hospital"_s, typing({u"<Alt+O>"_s}),
+                     shows(u"Debito"_s));
+        player_.step(u"box:Deseja finalizar o registo?"_s, {}, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmPagamentoCheque"_s, u"10-cheque"_s,
+                     typing({u"<Ctrl+A>"_s, u"500"_s, u"<Return>"_s}));
+        leave();
     }
 
-    void showMovements() {
-        window_ = std::make_unique<frmPrincipal>();
-        window_->resize(1280, 800);
-        window_->show();
-        picture(*window_, u"principal"_s, u"Movimentos em vigor"_s);
+    void view() {
+        player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Home>"_s, u"<Return>"_s}));
+        player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
+    }
+
+    void otherWindows() {
+        open({}, Operations::newDocument(false));
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<Alt+P>"_s}), shows(u"Text8"_s));
+        player_.step(u"frmProcurar"_s, {}, typing({u"silva ant"_s}));
+        player_.step(u"frmProcurar"_s, u"13-procurar"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmMovimentos"_s, {},
+                     typing({u"<Shift+Tab>"_s, MemberWithoutNib, u"<Tab>"_s}));
+        player_.step(u"box:Quer ver o extrato"_s, {}, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Este Associado não tem NIB!"_s, u"14-sem-nib"_s,
+                     typing({u"<Return>"_s}));
+        player_.step(u"box:Quer abrir a ficha"_s, {}, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmFichaSocio"_s, u"15-ficha-de-associado"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmQuotas"_s, u"16-quotizacoes"_s, [](QWidget* screen) { screen->close(); });
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<Escape>"_s}));
+        leave();
+        player_.step(u"frmPrincipal"_s, {}, {});
     }
 
 private:
-    /// Lets the screen settle and takes its picture.
-    void picture(QWidget& screen, const QString& name, const QString& explanation) {
-        settle();
-        const QString file =
-            folder_.filePath(u"%1-%2.png"_s.arg(++pictures_, 2, 10, '0'_L1).arg(name));
-        if (!screen.grab().save(file))
-            throw core::Failure(core::InvalidCall, u"%1 não pode ser escrito."_s.arg(file));
-        say(u"%1: %2"_s.arg(explanation, file));
+    void open(const QString& picture, const OperationCall& call) {
+        player_.step(u"frmPrincipal"_s, picture,
+                     [this, call](QWidget*) { operations_.call(call); });
     }
 
-    static void settle() {
-        QElapsedTimer clock;
-        for (clock.start(); clock.elapsed() < 200;)
-            QCoreApplication::processEvents(QEventLoop::AllEvents, 20);
+    /// Types the member's number, with the question about his premium that always comes.
+    void chooseMember(const QString& picture) {
+        player_.step(u"frmMovimentos"_s, {}, typing({GoodMember, u"<Tab>"_s}), shows(u"Text8"_s));
+        player_.step(u"box:Quer ver o extrato"_s, picture, typing({u"<Alt+N>"_s}));
     }
 
-    static void say(const QString& text) { QTextStream(stdout) << text << Qt::endl; }
+    void choosePerson(const QString& picture, const Keys& way) {
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<Alt+I>"_s}), canPress(u"Command2"_s));
+        player_.step(u"frmEscolherFamiliar"_s, picture, typing(way));
+    }
 
-    QDir folder_;
-    QTemporaryDir book_;
-    std::unique_ptr<frmPrincipal> window_;
-    int pictures_ = 0;
+    /// Today and then one field after the other; tries the document out.
+    void fillIn(const Keys& texts) {
+        Keys keys{u"<Tab>"_s, core::today().toString(u"dd-MM-yyyy"_s)};
+        for (const QString& text : texts) {
+            keys << u"<Tab>"_s;
+            if (!text.isEmpty()) keys << text;
+        }
+        keys << u"<Alt+E>"_s;
+        player_.step(u"frmMovimentos"_s, {}, typing(keys), shows(u"Text3"_s));
+    }
+
+    void leave() { player_.step(u"frmMovimentosF"_s, {}, typing({u"<Alt+S>"_s, u"<Return>"_s})); }
+
+    TourPlayer& player_;
+    Operations operations_;
 };
+
+void say(const QString& text) {
+    QTextStream(stdout) << text << Qt::endl;
+}
 
 }  // namespace
 
 int playTour(const QString& folder) {
     forms::install();
-    Tour tour(folder);
-    tour.openBook();
-    tour.showMovements();
-    return Done;
+    const QTemporaryDir own;
+    if (!own.isValid() || !QDir().mkpath(folder))
+        throw core::Failure(core::InvalidCall, u"A pasta %1 não pode ser feita."_s.arg(folder));
+    qputenv("ZELMARS_REGISTRY", own.filePath(u"registry"_s).toUtf8());
+    database::initBook(own.filePath(u"livro"_s), true);
+    registerComponents(false);
+    say(u"Um documento médico, uma conta de hospital e as janelas do caminho, num livro de exemplo "
+        "que não fica:"_s);
+
+    frmPrincipal principal;
+    principal.resize(1280, 800);
+    principal.show();
+    TourPlayer player(folder);
+    Script script(player);
+    script.document();
+    script.hospitalBill();
+    script.view();
+    script.otherWindows();
+    const bool played = player.play();
+    say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
+    return played ? Done : Failed;
 }
 
 }  // namespace host
