@@ -44,16 +44,17 @@ void reopen(const ado::ConnectionPtr& connection, const QString& connectionStrin
 
 // The texts go in as they stand, without quoting.
 QString plainConnectionString(const LoginState& state) {
-    return u"Provider=SQLOLEDB.1;Persist Security Info=" + state.dtSecurityInfo + u";User ID=" +
-           state.dtUser + u";Password=" + state.dtPassword + u";Initial Catalog=" +
-           state.dtInitialCatalog + u";Data Source=" + state.dtDataSource + u";Connect Timeout=15";
+    return u"Provider=SQLOLEDB.1;Persist Security Info="_s + state.dtSecurityInfo + u";User ID="_s +
+           state.dtUser + u";Password="_s + state.dtPassword + u";Initial Catalog="_s +
+           state.dtInitialCatalog + u";Data Source="_s + state.dtDataSource +
+           u";Connect Timeout=15"_s;
 }
 
 QString shapingConnectionString(const LoginState& state) {
-    return u"Provider=MSDataShape.1;Persist Security Info=" + state.dtSecurityInfo +
-           u";Connect Timeout=15;Data Source=" + state.dtDataSource + u";User ID=" + state.dtUser +
-           u";Password=" + state.dtPassword + u";Initial Catalog=" + state.dtInitialCatalog +
-           u";Data Provider=SQLOLEDB.1";
+    return u"Provider=MSDataShape.1;Persist Security Info="_s + state.dtSecurityInfo +
+           u";Connect Timeout=15;Data Source="_s + state.dtDataSource + u";User ID="_s +
+           state.dtUser + u";Password="_s + state.dtPassword + u";Initial Catalog="_s +
+           state.dtInitialCatalog + u";Data Provider=SQLOLEDB.1"_s;
 }
 
 void reopenLists() {

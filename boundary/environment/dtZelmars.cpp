@@ -13,7 +13,7 @@ struct Designed {
 /// The commands in the order of their design. The lists of the combo boxes show their column
 /// `completo` (`descrit` for the institutions). The reports set a text of their own before they
 /// open theirs, except for the debts; the texts here then only give the columns.
-constexpr Designed Commands[] = {
+constexpr Designed Designs[] = {
     {u"msRubricas",
      u"SELECT tbZelmar_Plafonds.*, code + '  -  ' + descrit AS completo "
      u"FROM tbZelmar_Plafonds "
@@ -119,7 +119,7 @@ constexpr Designed Commands[] = {
 dtZelmars::dtZelmars() {
     addConnection(QStringLiteral("MSAccess"));
     addConnection(QStringLiteral("SqlServer"));
-    for (const Designed& command : Commands)
+    for (const Designed& command : Designs)
         addCommand(command.name.toString(), command.text.toString());
 }
 

@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <gtest/gtest.h>
+
+#include "boundary/environment/LoginState.h"
+#include "boundary/environment/dtZelmars.h"
+#include "platform/core/Failure.h"
+#include "platform/registry/Registry.h"
+#include "tests/support/Book.h"
+
+/// A book with the five values that name it. Afterwards the component is as it was when loaded.
+class Configured : public testing::Test {
+protected:
+    void TearDown() override {
+        using environment::dtZelmars;
+        for (const auto& connection :
+             {dtZelmars::instance().MSAccess(), dtZelmars::instance().SqlServer()})
+            if (connection->State() != ado::adStateClosed) connection->Close();
+        environment::loginState() = {};
+    }
+
+    static QString keyPath() { return QStringLiteral("SOFTWARE\\Norvanta\\Corvenda"); }
+    static void set(const QString& name, const QString& value) {
+        registry::writeValue(registry::Hive::LocalMachine, keyPath(), name, value);
+    }
+    static void remove(const QString& name) {
+        registry::removeKey(registry::Hive::LocalMachine, keyPath() + u'\\' + name);
+    }
+
+    /// The text with which an operation fails; empty when it passes.
+    template <class Operation>
+    static QString failureOf(const Operation& operation) {
+        try {
+            operation();
+        } catch (const core::Failure& failure) {
+            return failure.text();
+        }
+        return {};
+    }
+
+    support::Book book;
+};

@@ -1,0 +1,155 @@
+// SPDX-License-Identifier: MIT
+#include "boundary/General.h"
+
+#include <QApplication>
+
+#include "entry/frmMovimentos.h"
+#include "platform/com/Component.h"
+#include "tests/boundary/Configured.h"
+#include "tests/support/Operator.h"
+
+using namespace Qt::StringLiterals;
+using environment::dtZelmars;
+using environment::loginState;
+
+namespace {
+
+const QString RefusalText =
+    u"Não foi registado um utilizador ou palavra passe válida. Não é possível executar o pedido."_s;
+
+/// Operations that do nothing without a valid login, and the arguments that they need.
+const std::pair<QString, QVariantList> Refusing[] = {
+    {u"CallPlafonds"_s, {u""_s, u""_s}},
+    {u"CallHospitais"_s, {u""_s, u""_s}},
+    {u"CallManutencaoDados"_s, {}},
+    {u"CallIRS"_s, {}},
+    {u"CallFechoAno"_s, {}},
+    {u"NewMovimento"_s, {false}},
+    {u"Correcao"_s, {}},
+    {u"Recebimento"_s, {}},
+    {u"Extratos"_s, {u"x"_s, u"y"_s}},
+    {u"LPagamentos"_s, {}},
+};
+
+class PublicClass : public Configured {
+protected:
+    void TearDown() override {
+        forms::DefaultInstance<entry::frmMovimentos>::unload();
+        Configured::TearDown();
+    }
+    bool isEntryShown() const { return person.isShown(u"frmMovimentos"_s); }
+    qint64 movement(const QString& tipo) {
+        return book.insert(u"tbZelmar_Movimentos"_s,
+                           {{"movimento_no", 1}, {"socio_id", 1}, {"tipo", tipo}});
+    }
+
+    General general;
+    support::Operator person;
+};
+
+TEST_F(PublicClass, TenOperationsAreRefusedWithoutSettings) {
+    remove(u"dtDataSource"_s);
+    for (const auto& [operation, arguments] : Refusing) {
+        person.expectBox(
+            {.text = RefusalText, .icon = core::Icon::Critical, .title = u"Bad Login"_s});
+        EXPECT_NO_THROW(com::call(&general, operation, QVariantList(arguments)))
+            << qPrintable(operation);
+    }
+    person.expectNoBoxesLeft();
+    EXPECT_FALSE(isEntryShown());
+    EXPECT_EQ(com::call(&general, u"Login"_s), false);
+}
+
+TEST_F(PublicClass, EveryOperationClosesTheShapingConnectionFirst) {
+    ASSERT_TRUE(general.Login());
+    remove(u"dtUser"_s);
+    person.expectBox({.text = RefusalText});
+    general.CallIRS();
+    EXPECT_EQ(dtZelmars::instance().SqlServer()->State(), ado::adStateClosed);
+    EXPECT_EQ(dtZelmars::instance().MSAccess()->State(), ado::adStateOpen);
+}
+
+TEST_F(PublicClass, WhatIsStillToComeSaysSo) {
+    for (const auto& [operation, arguments] : Refusing) {
+        if (operation == u"NewMovimento"_s) continue;
+        EXPECT_EQ(failureOf([&] { com::call(&general, operation, QVariantList(arguments)); }),
+                  u"A operação %1 ainda não está disponível nesta versão."_s.arg(operation));
+        EXPECT_TRUE(loginState().bLoggedIn);
+    }
+    for (const QString& operation : {u"Ldividas"_s, u"Lcartasdividas"_s, u"Lhospitais"_s}) {
+        person.expectBox({.text = operation, .partly = true});
+        EXPECT_EQ(com::call(&general, operation), false);
+    }
+}
+
+TEST_F(PublicClass, ABookThatDoesNotOpenIsToldByThoseThatMayTell) {
+    set(u"dtDataSource"_s, u"sqlite:/nada/nenhures"_s);
+    const QString text = failureOf([&] { general.CallIRS(); });
+    EXPECT_FALSE(text.isEmpty());
+    EXPECT_EQ(failureOf([&] { general.NewMovimento(false); }), text);
+    person.expectBox({.text = text, .icon = core::Icon::None, .title = u"Zelmars"_s});
+    EXPECT_NO_THROW(general.Registo({}, 1));
+    EXPECT_FALSE(general.Ldividas());
+    EXPECT_FALSE(general.Lhospitais());
+}
+
+TEST_F(PublicClass, APendingFailureIsRefusedOnce) {
+    {
+        const core::HandlerScope handler;
+        core::err().set(core::RowInUse, u"em uso"_s);
+        person.expectBox({.text = RefusalText});
+        general.NewMovimento(false);
+    }
+    EXPECT_FALSE(isEntryShown());
+    general.NewMovimento(false);
+    EXPECT_TRUE(isEntryShown());
+}
+
+TEST_F(PublicClass, NewMovimentoGivesItsDefaultsBack) {
+    QVariantList arguments{false, u""_s, u""_s};
+    com::call(&general, u"NewMovimento"_s, arguments);
+    EXPECT_EQ(arguments[1], u"MSAccess"_s);
+    EXPECT_EQ(arguments[2], u"select * from tbzelmar_movimentos where movimento_id = 0"_s);
+    EXPECT_TRUE(isEntryShown());
+}
+
+TEST_F(PublicClass, AnUnknownConnectionFailsAfterAGoodLogin) {
+    QString connection = u"Nenhuma"_s;
+    const QString text = failureOf([&] { general.NewMovimento(false, &connection); });
+    EXPECT_TRUE(text.contains(u"Nenhuma"_s)) << qPrintable(text);
+    EXPECT_TRUE(loginState().bLoggedIn);
+    EXPECT_FALSE(isEntryShown());
+}
+
+TEST_F(PublicClass, RegistoIsSilentAboutWhatItDoesNotShow) {
+    const qint64 balance = movement(u"SA"_s);
+    for (const QVariant& key : {QVariant(999), QVariant(balance)}) general.Registo({}, key);
+    EXPECT_FALSE(isEntryShown());
+
+    general.Registo({}, movement(u"DOC"_s));
+    EXPECT_TRUE(isEntryShown());
+}
+
+TEST_F(PublicClass, RegistoGoesOnWithTheConnectionsThatAreThere) {
+    const qint64 document = movement(u"DOC"_s);
+    ASSERT_TRUE(general.Login());
+    remove(u"dtSecurityInfo"_s);
+    general.Registo({}, document);
+    EXPECT_TRUE(isEntryShown());
+
+    forms::DefaultInstance<entry::frmMovimentos>::unload();
+    dtZelmars::instance().MSAccess()->Close();
+    person.expectBox({.text = {}, .icon = core::Icon::None, .partly = true});
+    general.Registo({}, document);
+    EXPECT_FALSE(isEntryShown());
+}
+
+TEST_F(PublicClass, RegistoTellsOfAKeyThatIsNone) {
+    for (const QVariant& key : {QVariant(u"abc'"_s), QVariant()}) {
+        person.expectBox({.text = {}, .partly = true});
+        general.Registo({}, key);
+    }
+    EXPECT_FALSE(isEntryShown());
+}
+
+}  // namespace

@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: MIT
+#include "boundary/Login.h"
+
+#include <QDir>
+#include <QFile>
+
+#include "tests/boundary/Configured.h"
+
+using namespace Qt::StringLiterals;
+using environment::dtZelmars;
+using environment::loginState;
+
+namespace {
+
+const QStringList Names{u"dtSecurityInfo"_s, u"dtUser"_s, u"dtPassword"_s, u"dtInitialCatalog"_s,
+                        u"dtDataSource"_s};
+const QStringList Lists{u"msRubricas"_s,   u"msHospitais"_s, u"msModosPagamento"_s,
+                        u"msFamiliares"_s, u"msTipos"_s,     u"msOutrasInstituicoes"_s};
+
+class Login : public Configured {
+protected:
+    static ado::ObjectState state(const ado::ConnectionPtr& connection) {
+        return connection->State();
+    }
+    static QStringList textsOfState() {
+        const environment::LoginState& now = loginState();
+        return {now.dtSecurityInfo, now.dtUser, now.dtPassword, now.dtInitialCatalog,
+                now.dtDataSource};
+    }
+    /// Everything in a folder, with sizes.
+    static QStringList contents(const QString& folder) {
+        QStringList found;
+        for (const QFileInfo& entry : QDir(folder).entryInfoList(
+                 QDir::AllEntries | QDir::NoDotAndDotDot | QDir::Hidden, QDir::Name))
+            found << u"%1 %2"_s.arg(entry.fileName()).arg(entry.size());
+        return found;
+    }
+};
+
+TEST_F(Login, OpensBothConnectionsAndTheSixLists) {
+    set(u"dtUser"_s, u"ana"_s);
+    set(u"dtPassword"_s, u"p w"_s);
+    ASSERT_TRUE(boundary::Login());
+    EXPECT_TRUE(loginState().bLoggedIn);
+    EXPECT_EQ(state(dtZelmars::instance().MSAccess()), ado::adStateOpen);
+    EXPECT_EQ(state(dtZelmars::instance().SqlServer()), ado::adStateOpen);
+    EXPECT_EQ(
+        dtZelmars::instance().MSAccess()->ConnectionString,
+        u"Provider=SQLOLEDB.1;Persist Security Info=True;User ID=ana;Password=p w;"
+        "Initial Catalog=zelmars;Data Source=sqlite:%1;Connect Timeout=15"_s.arg(book.folder()));
+    EXPECT_EQ(dtZelmars::instance().SqlServer()->ConnectionString,
+              u"Provider=MSDataShape.1;Persist Security Info=True;Connect Timeout=15;"
+              "Data Source=sqlite:%1;User ID=ana;Password=p w;Initial Catalog=zelmars;"
+              "Data Provider=SQLOLEDB.1"_s.arg(book.folder()));
+    for (const QString& list : Lists)
+        EXPECT_EQ(dtZelmars::instance().Recordsets(list)->State(), ado::adStateOpen);
+    EXPECT_TRUE(boundary::Login());
+}
+
+TEST_F(Login, AMissingValueEndsItAndKeepsWhatWasRead) {
+    ASSERT_TRUE(boundary::Login());
+    const QStringList texts = textsOfState();
+    for (int missing = 0; missing < Names.size(); ++missing) {
+        for (int at = 0; at < Names.size(); ++at) set(Names[at], texts[at]);
+        ASSERT_TRUE(boundary::Login());
+        const QString before = dtZelmars::instance().MSAccess()->ConnectionString;
+        for (const QString& name : Names) set(name, u"outro"_s);
+        remove(Names[missing]);
+
+        EXPECT_FALSE(boundary::Login()) << qPrintable(Names[missing]);
+        EXPECT_FALSE(loginState().bLoggedIn);
+        for (int at = 0; at < Names.size(); ++at)
+            EXPECT_EQ(textsOfState()[at], at < missing ? u"outro"_s : texts[at]);
+        EXPECT_EQ(state(dtZelmars::instance().MSAccess()), ado::adStateOpen);
+        EXPECT_EQ(state(dtZelmars::instance().SqlServer()), ado::adStateOpen);
+        EXPECT_EQ(dtZelmars::instance().MSAccess()->ConnectionString, before);
+    }
+}
+
+TEST_F(Login, AnEmptyValueIsAValue) {
+    for (const QString& name : {u"dtSecurityInfo"_s, u"dtUser"_s, u"dtPassword"_s})
+        set(name, u""_s);
+    EXPECT_TRUE(boundary::Login());
+
+    set(u"dtDataSource"_s, u""_s);
+    const QString text = failureOf([] { boundary::Login(); });
+    EXPECT_TRUE(text.contains(u"sqlite:"_s)) << qPrintable(text);
+    EXPECT_FALSE(loginState().bLoggedIn);
+}
+
+TEST_F(Login, WhatIsNoBookFailsAndMakesNothing) {
+    const auto expectFailure = [](const char* what) {
+        const QString text = failureOf([] { boundary::Login(); });
+        EXPECT_FALSE(text.isEmpty()) << what;
+        EXPECT_FALSE(loginState().bLoggedIn) << what;
+    };
+    const QTemporaryDir elsewhere;
+    const QString missing = elsewhere.filePath(u"nada"_s);
+    set(u"dtDataSource"_s, u"sqlite:"_s + missing);
+    expectFailure("no such folder");
+    EXPECT_FALSE(QFile::exists(missing));
+
+    set(u"dtDataSource"_s, u"sqlite:"_s + elsewhere.path());
+    expectFailure("no such file");
+    set(u"dtInitialCatalog"_s, u""_s);
+    expectFailure("an empty name");
+    EXPECT_EQ(contents(elsewhere.path()), QStringList());
+
+    QFile garbage(elsewhere.filePath(u"zelmars.db"_s));
+    ASSERT_TRUE(garbage.open(QFile::WriteOnly));
+    garbage.write(QByteArray(5000, 'x'));
+    garbage.close();
+    set(u"dtInitialCatalog"_s, u"zelmars"_s);
+    expectFailure("no database");
+    EXPECT_EQ(contents(elsewhere.path()), QStringList{u"zelmars.db 5000"_s});
+}
+
+TEST_F(Login, ABookWithoutTablesFailsAfterTheLoginCounted) {
+    book.exec(u"alter table tbHospitais rename to guardada"_s);
+    const QString text = failureOf([] { boundary::Login(); });
+    EXPECT_TRUE(text.contains(u"tbHospitais"_s)) << qPrintable(text);
+    EXPECT_TRUE(loginState().bLoggedIn);
+    EXPECT_EQ(dtZelmars::instance().Recordsets(u"msRubricas"_s)->State(), ado::adStateOpen);
+}
+
+TEST_F(Login, APendingFailureCountsAsAFailedLogin) {
+    const core::HandlerScope handler;
+    core::err().set(core::RowInUse, u"em uso"_s);
+    EXPECT_FALSE(boundary::Login());
+    EXPECT_FALSE(loginState().bLoggedIn);
+    EXPECT_EQ(state(dtZelmars::instance().MSAccess()), ado::adStateOpen);
+    EXPECT_EQ(state(dtZelmars::instance().SqlServer()), ado::adStateOpen);
+    core::err().clear();
+    EXPECT_TRUE(boundary::Login());
+}
+
+}  // namespace
