@@ -57,7 +57,7 @@ public:
         player_.step(u"frmMovimentos"_s, u"02-novo-documento"_s, {}, shows(u"Text8"_s));
         chooseMember(u"03-pergunta-quotizacoes"_s);
         choosePerson(u"04-escolher-familiar"_s, {u"<Return>"_s});
-        fillIn({u"4711"_s, u"87,35"_s, u"0"_s, u"23"_s, {}, u"Consulta"_s, u"01.01"_s, {}});
+        fillIn({u"4711"_s, u"87,35"_s, u"0"_s, u"23"_s, {}, u"Lentes"_s, u"5.02"_s, {}});
         player_.step(u"frmMovimentos"_s, u"05-ensaio"_s, typing({u"<Alt+O>"_s}),
                      shows(u"Debito"_s));
         player_.step(u"box:Deseja finalizar o registo?"_s, u"06-confirmar"_s,
@@ -78,7 +78,7 @@ public:
                 u"6"_s,
                 {},
                 u"Internamento"_s,
-                u"01.01"_s,
+                u"7.01"_s,
                 u"<Down>"_s,
                 {}});
         player_.step(u"frmMovimentos"_s, u"09-hospital"_s, typing({u"<Alt+O>"_s}),

@@ -41,14 +41,8 @@ class Book:
             book.row_factory = sqlite3.Row
             return book.execute(statement, values).fetchone()
 
-    def rubric(self):
-        """A rubric that takes the documents below: no minimum above them, ceilings well above."""
-        return self.row(
-            "SELECT p.* FROM tbZelmar_Plafonds p JOIN tbZelmar_Plafonds m "
-            "ON m.rubrica_id = p.rubrica_id_main WHERE p.percent < 1 AND p.socio > 60 "
-            "AND p.familiar > 60 AND coalesce(p.socio_min_lan, 0) < 87 "
-            "AND coalesce(p.nomax_recibos_socio, 9) > 0 "
-            "AND coalesce(p.nomax_recibos_familiar, 9) > 0 ORDER BY p.code LIMIT 1")
+    def rubric(self, code):
+        return self.row("SELECT * FROM tbZelmar_Plafonds WHERE code = ?", code)
 
     def room(self, rubric, person):
         """The lowest ceiling of a family that has used nothing yet."""
@@ -101,12 +95,13 @@ def post(desktop):
     desktop.keys("alt+s")
 
 
-def medical_document(desktop, book, rubric, today):
-    """A document of 87,35 at rate 23 for the member himself."""
+def medical_document(desktop, book, today):
+    """Glasses for 87,35 at rate 23, for the member himself."""
+    rubric = book.rubric("5.02")
     desktop.at(MAIN)
     desktop.keys("ctrl+n")
     choose_member_and_person(desktop)
-    fill_in_fields(desktop, today, "4711", "87,35", "0", "23", "", "Consulta", rubric["code"], "")
+    fill_in_fields(desktop, today, "4711", "87,35", "0", "23", "", "Lentes", rubric["code"], "")
     desktop.keys("alt+e")
     wait_until("the try-out has added its accumulator row", lambda: book.row(
         "SELECT 1 FROM tbSocios_Acumulados a JOIN tbSocios s ON s.socio_id = a.socio_id "
@@ -130,13 +125,14 @@ def medical_document(desktop, book, rubric, today):
     return row
 
 
-def hospital_bill(desktop, book, rubric, today):
-    """A bill of 1.250,00 with an incidence of 100 for the spouse, by cheque 500."""
+def hospital_bill(desktop, book, today):
+    """A bill of 1.250,00 with an incidence of 1.000,00 for the spouse, by cheque 500."""
+    rubric = book.rubric("7.01")
     hospital = book.row("SELECT * FROM tbHospitais ORDER BY nome LIMIT 1")
     desktop.at(MAIN)
     desktop.keys("ctrl+h")
     choose_member_and_person(desktop, "Down")
-    fill_in_fields(desktop, today, "H-2001", "1250", "100", "6", "", "Internamento",
+    fill_in_fields(desktop, today, "H-2001", "1250", "1000", "6", "", "Internamento",
                    rubric["code"], hospital["code"], "")
     desktop.keys("alt+e")
     desktop.show("ensaio-hospital")
@@ -147,11 +143,11 @@ def hospital_bill(desktop, book, rubric, today):
     desktop.keys("Return")
     desktop.at(EXIT)
 
-    share = money(100 * single(rubric["percent"]))
+    share = money(1000 * single(rubric["percent"]))
     room = money(single(book.room(rubric, "B")))
     net = money(min(single(share), single(room)))
     row = newest(book)
-    expect(row, tipo="HOS", codABC="B", doc_no="H-2001", doc_valor=1250, incidencia=100,
+    expect(row, tipo="HOS", codABC="B", doc_no="H-2001", doc_valor=1250, incidencia=1000,
            comparticipacao=share, saldo_plafond=room, saldo_acumulado=None, iliquido=share,
            liquido=net, debito=1250, modo_pagamento="CHQ", cheque=500,
            hospital_id=hospital["hospital_id"])
@@ -172,11 +168,10 @@ def check_accumulators(book, *rows):
 
 def road(desktop, programs, book):
     today = date.today().strftime("%d-%m-%Y")
-    rubric = book.rubric()
     counter = book.row("SELECT zelmars FROM tbContadores")["zelmars"]
     desktop.start([os.path.join(programs, "zelmars")])
 
-    document = medical_document(desktop, book, rubric, today)
+    document = medical_document(desktop, book, today)
     expect(document, movimento_no=counter)
     desktop.keys("Return")  # «Continuar a registar com o mesmo Associado» is chosen already
     desktop.at(ENTRY)
@@ -186,7 +181,7 @@ def road(desktop, programs, book):
     desktop.keys("alt+c")
     leave(desktop)
 
-    bill = hospital_bill(desktop, book, rubric, today)
+    bill = hospital_bill(desktop, book, today)
     expect(bill, movimento_no=counter + 1)
     expect(book.row("SELECT zelmars FROM tbContadores"), zelmars=counter + 2)
     check_accumulators(book, document, bill)
