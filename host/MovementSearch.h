@@ -14,10 +14,10 @@ struct MovementKey {
     qint32 movimento_id = 0;
     qint32 movimento_no = 0;  ///< 0 for none
     qint32 socio_id = 0;
-    QString codABC;
-    QDate data;
-    QString tipo;
-    QString doc_no;
+    QString codABC = {};
+    QDate data = {};
+    QString tipo = {};
+    QString doc_no = {};
     bool activo = true;  ///< stands in the table of the active members
 };
 

@@ -57,20 +57,23 @@ protected:
     }
 };
 
-int showOperation(const CommandLine& line) {
+/// The one operation without a screen: says what came of it.
+int login(Operations& operations, const OperationCall& call) {
+    const bool isLoggedIn = operations.call(call).toBool();
+    say(isLoggedIn ? u"Ligado ao livro."_s : u"Não foi possível ligar ao livro."_s);
+    return isLoggedIn ? Done : Failed;
+}
+
+int showOperation(const OperationCall& call) {
     forms::install();
     Operations operations;
-    QVariant result;
-    bool passed = false;
+    if (call.operation == "Login"_L1) return login(operations, call);
+    bool isDone = false;
     forms::handle([&] {
-        result = operations.call(line.call);
-        passed = true;
+        const QVariant result = operations.call(call);
+        isDone = result.typeId() != QMetaType::Bool || result.toBool();
     });
-    if (line.call.operation == "Login"_L1)
-        say(result.toBool() ? u"Ligado ao livro."_s : u"Não foi possível ligar ao livro."_s);
-    const bool isRefused = result.typeId() == QMetaType::Bool && !result.toBool();
-    if (!passed || isRefused) return Failed;
-    if (!hasWindow()) return Done;
+    if (!hasWindow()) return isDone ? Done : Failed;
     LastWindow last;
     qApp->installEventFilter(&last);
     return QApplication::exec();
@@ -89,7 +92,7 @@ int performUntrapped(const CommandLine& line) {
         case Task::Window:
             return showWindow();
         case Task::Operation:
-            return showOperation(line);
+            return showOperation(line.call);
         case Task::Init:
             return init(line);
         case Task::Register:

@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+// The program itself, started as a person starts it.
+#include <gtest/gtest.h>
+
+#include <QProcess>
+#include <QTemporaryDir>
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// The program with settings of its own, in a temporary folder.
+class Program : public testing::Test {
+protected:
+    int run(const QStringList& words) {
+        QProcess program;
+        QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+        environment.insert(u"ZELMARS_REGISTRY"_s, folder_.filePath(u"registry"_s));
+        program.setProcessEnvironment(environment);
+        program.start(QCoreApplication::applicationDirPath() + u"/zelmars"_s, words);
+        EXPECT_TRUE(program.waitForFinished(60'000));
+        output_ = QString::fromUtf8(program.readAllStandardOutput());
+        errors_ = QString::fromUtf8(program.readAllStandardError());
+        return program.exitCode();
+    }
+    QString book() const { return folder_.filePath(u"livro"_s); }
+
+    QTemporaryDir folder_;
+    QString output_;
+    QString errors_;
+};
+
+}  // namespace
+
+TEST_F(Program, RefusesWhatItDoesNotKnow) {
+    EXPECT_EQ(run({u"Despesas"_s}), 2);
+    EXPECT_TRUE(errors_.contains(u"NewMovimento"_s));
+    EXPECT_TRUE(output_.isEmpty());
+    EXPECT_EQ(run({u"--version"_s}), 0);
+    EXPECT_TRUE(output_.startsWith(u"zelmars "_s));
+}
+
+TEST_F(Program, MakesABookOnceAndNeverOverIt) {
+    EXPECT_EQ(run({u"init"_s, book()}), 0) << errors_.toStdString();
+    QFile file(book() + u"/zelmars.db"_s);
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    const QByteArray made = file.readAll();
+    EXPECT_EQ(run({u"init"_s, u"--sample"_s, book()}), 1);
+    EXPECT_FALSE(errors_.isEmpty());
+    file.seek(0);
+    EXPECT_EQ(file.readAll(), made);
+    // A set-up that runs again leaves the book that is in use alone.
+    EXPECT_EQ(run({u"init"_s, u"--if-needed"_s, folder_.filePath(u"outro"_s)}), 0);
+    EXPECT_FALSE(QFile::exists(folder_.filePath(u"outro"_s)));
+}
+
+TEST_F(Program, LogsInThroughTheRegisteredComponent) {
+    EXPECT_EQ(run({u"Login"_s}), 1);  // nothing is registered
+    EXPECT_EQ(run({u"register"_s}), 0) << errors_.toStdString();
+    EXPECT_EQ(run({u"Login"_s}), 1);  // no settings
+    ASSERT_EQ(run({u"init"_s, book()}), 0);
+    EXPECT_EQ(run({u"login"_s}), 0) << errors_.toStdString();
+    EXPECT_EQ(run({u"register"_s, u"--undo"_s}), 0);
+    EXPECT_EQ(run({u"Login"_s}), 1);
+}

@@ -1,0 +1,287 @@
+// SPDX-License-Identifier: MIT
+#include "host/frmPrincipal.h"
+
+#include <gtest/gtest.h>
+
+#include <QAction>
+#include <QCloseEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QTableView>
+
+#include "platform/com/Component.h"
+#include "platform/core/Failure.h"
+#include "platform/forms/MsgBoxes.h"
+#include "tests/support/Book.h"
+#include "tests/support/Operator.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Stands for the component: writes down what it is asked for, and fails when told to.
+class Recorder : public QObject {
+    Q_OBJECT
+public:
+    static inline QStringList calls;
+    static inline QString failure;
+    static inline QPointer<QObject> caller;
+
+    Q_INVOKABLE void CallPlafonds(QString* connection, QString* statement) {
+        note(u"CallPlafonds %1 %2"_s.arg(*connection, *statement));
+    }
+    Q_INVOKABLE void CallHospitais(QString* connection, QString* statement) {
+        note(u"CallHospitais %1 %2"_s.arg(*connection, *statement));
+    }
+    Q_INVOKABLE void CallManutencaoDados() { note(u"CallManutencaoDados"_s); }
+    Q_INVOKABLE void CallIRS() { note(u"CallIRS"_s); }
+    Q_INVOKABLE void CallFechoAno() { note(u"CallFechoAno"_s); }
+    Q_INVOKABLE bool Login() { return note(u"Login"_s); }
+    Q_INVOKABLE void Registo(const QVariant&, const QVariant& key, QString* = nullptr,
+                             QString* = nullptr, QObject* given = nullptr) {
+        caller = given;
+        note(u"Registo %1"_s.arg(key.toInt()));
+    }
+    Q_INVOKABLE void NewMovimento(bool hospital) {
+        note(hospital ? u"NewMovimento true"_s : u"NewMovimento false"_s);
+    }
+    Q_INVOKABLE void Correcao() { note(u"Correcao"_s); }
+    Q_INVOKABLE void Recebimento() { note(u"Recebimento"_s); }
+    Q_INVOKABLE void Extratos() { note(u"Extratos"_s); }
+    Q_INVOKABLE void LPagamentos() { note(u"LPagamentos"_s); }
+    Q_INVOKABLE bool Ldividas() { return note(u"Ldividas"_s); }
+    Q_INVOKABLE bool Lcartasdividas() { return note(u"Lcartasdividas"_s); }
+    Q_INVOKABLE bool Lhospitais() { return note(u"Lhospitais"_s); }
+
+private:
+    static bool note(const QString& call) {
+        calls.append(call);
+        if (!failure.isEmpty()) throw core::Failure(core::DatabaseFailure, failure);
+        return true;
+    }
+};
+
+class PrincipalWindow : public testing::Test {
+protected:
+    void SetUp() override {
+        forms::install();
+        com::registerRunning(u"Zelmars.General"_s, [] { return new Recorder; });
+        Recorder::calls.clear();
+        Recorder::failure.clear();
+        member_ = book_.member({.no_kor = u"100015"_s, .nome = u"António Silva"_s});
+        const qint64 other = book_.member({.no_kor = u"100023"_s, .nome = u"Inês Araújo"_s});
+        book_.person({.socio_id = member_, .codABC = u"C1"_s, .nome = u"Rui Silva"_s});
+        post(1, member_, "DOC", 87.35);
+        post(2, other, "HOS", 12000);
+        last_ = post(3, member_, "ANL", 5);
+    }
+    void TearDown() override { com::registerRunning(u"Zelmars.General"_s, {}); }
+
+    qint64 post(int number, qint64 socio, const char* tipo, double value) {
+        return book_.insert("tbZelmar_Movimentos", {{"movimento_no", number},
+                                                    {"socio_id", socio},
+                                                    {"codABC", u"C1"_s},
+                                                    {"data", QDate(2026, 11, 20)},
+                                                    {"tipo", QString::fromLatin1(tipo)},
+                                                    {"doc_no", u"FT %1"_s.arg(number)},
+                                                    {"doc_valor", value}});
+    }
+    /// The window as a person meets it, with all movements read.
+    std::unique_ptr<host::frmPrincipal> opened() {
+        auto window = std::make_unique<host::frmPrincipal>();
+        window->show();
+        person_.screen(u"frmPrincipal"_s);
+        person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
+        return window;
+    }
+    QString count() { return person_.find<QLabel>(u"Contagem"_s)->text(); }
+    QString cell(int row, int column) {
+        const auto* model = person_.find<QTableView>(u"Lista"_s)->model();
+        return model->index(row, column).data().toString();
+    }
+    int rows() { return person_.find<QTableView>(u"Lista"_s)->model()->rowCount(); }
+
+    support::Book book_;
+    support::Operator person_;
+    qint64 member_ = 0;
+    qint64 last_ = 0;
+};
+
+}  // namespace
+
+TEST_F(PrincipalWindow, ShowsTheNewestFirstAsPeopleReadThem) {
+    const auto window = opened();
+    ASSERT_EQ(rows(), 3);
+    const char* const expected[] = {
+        "2", "20-11-2026", "100023", "Inês Araújo", "", "HOS", "FT 2", "€ 12.000,00", "", ""};
+    for (int column = 0; column < 10; ++column)
+        EXPECT_EQ(cell(1, column).toStdString(), expected[column]) << column;
+    EXPECT_EQ(cell(0, 0), u"3"_s);
+    EXPECT_EQ(cell(2, 4), u"Rui Silva"_s);
+    EXPECT_TRUE(person_.find<QLabel>(u"Livro"_s)->text().contains(book_.folder()));
+}
+
+TEST_F(PrincipalWindow, AnnulledRowsAreToldApart) {
+    const auto window = opened();
+    const auto* model = person_.find<QTableView>(u"Lista"_s)->model();
+    EXPECT_TRUE(model->index(0, 0).data(Qt::FontRole).value<QFont>().strikeOut());
+    EXPECT_FALSE(model->index(1, 0).data(Qt::FontRole).isValid());
+}
+
+TEST_F(PrincipalWindow, FiltersWhileOneTypesAndOpensByEnter) {
+    const auto window = opened();
+    person_.type(u"ines"_s);
+    EXPECT_EQ(rows(), 1);
+    EXPECT_EQ(count(), u"1 de 3 movimentos"_s);
+    person_.enter();
+    EXPECT_EQ(Recorder::calls.last(), u"Registo %1"_s.arg(last_ - 1));
+    EXPECT_EQ(Recorder::caller, window.get());
+    person_.escape();
+    EXPECT_EQ(rows(), 3);
+    // Over the list, letters go on in the filter.
+    person_.press(Qt::Key_Down);
+    EXPECT_TRUE(person_.find<QTableView>(u"Lista"_s)->hasFocus());
+    person_.type(u"anl"_s);
+    EXPECT_EQ(person_.find<QLineEdit>(u"Filtro"_s)->text(), u"anl"_s);
+    EXPECT_EQ(rows(), 1);
+}
+
+TEST_F(PrincipalWindow, EveryOperationIsInTheMenu) {
+    const auto window = opened();
+    const struct {
+        const char* action;
+        const char* call;
+    } cases[] = {
+        {"NewMovimento", "NewMovimento false"},
+        {"NewMovimentoHospital", "NewMovimento true"},
+        {"Recebimento", "Recebimento"},
+        {"Correcao", "Correcao"},
+        {"LPagamentos", "LPagamentos"},
+        {"Extratos", "Extratos"},
+        {"Lhospitais", "Lhospitais"},
+        {"Ldividas", "Ldividas"},
+        {"Lcartasdividas", "Lcartasdividas"},
+        {"CallIRS", "CallIRS"},
+        {"CallManutencaoDados", "CallManutencaoDados"},
+        {"CallFechoAno", "CallFechoAno"},
+        {"CallPlafonds",
+         "CallPlafonds MSAccess select * from tbZelmar_Plafonds where rubrica_id_main is null "
+         "order by code"},
+        {"CallHospitais",
+         "CallHospitais MSAccess select tbHospitais.*, code_postal as Codigo_Postal from "
+         "tbHospitais order by nome"},
+        {"Login", "Login"},
+    };
+    for (const auto& each : cases) {
+        auto* action = window->findChild<QAction*>(QString::fromLatin1(each.action));
+        ASSERT_TRUE(action) << each.action;
+        action->trigger();
+        EXPECT_EQ(Recorder::calls.last().toStdString(), each.call);
+    }
+}
+
+TEST_F(PrincipalWindow, AcceleratorsAndShortcutsDoNotClash) {
+    const auto window = opened();
+    QSet<QString> shortcuts;
+    for (const QAction* menu : window->menuBar()->actions()) {
+        QSet<QChar> letters;
+        for (const QAction* action : menu->menu()->actions()) {
+            if (action->isSeparator()) continue;
+            const QString text = action->text();
+            const QChar letter = text.at(text.indexOf(u'&') + 1).toLower();
+            EXPECT_FALSE(letters.contains(letter)) << text.toStdString();
+            letters.insert(letter);
+            const QString keys = action->shortcut().toString();
+            EXPECT_FALSE(!keys.isEmpty() && shortcuts.contains(keys)) << keys.toStdString();
+            shortcuts.insert(keys);
+        }
+    }
+    person_.press(Qt::Key_H, Qt::ControlModifier);
+    EXPECT_EQ(Recorder::calls.last(), u"NewMovimento true"_s);
+}
+
+TEST_F(PrincipalWindow, AFailingOperationShowsItsTextAndGoesOn) {
+    const auto window = opened();
+    Recorder::failure = u"disk I/O error"_s;
+    person_.expectBox({.text = u"disk I/O error"_s, .icon = core::Icon::Critical});
+    person_.press(Qt::Key_N, Qt::ControlModifier);
+    person_.expectNoBoxesLeft();
+    EXPECT_EQ(rows(), 3);
+}
+
+TEST_F(PrincipalWindow, AMissingComponentIsToldOf) {
+    const auto window = opened();
+    com::registerRunning(u"Zelmars.General"_s, {});
+    person_.expectBox({.text = u"Zelmars.General"_s, .partly = true});
+    person_.press(Qt::Key_N, Qt::ControlModifier);
+}
+
+TEST_F(PrincipalWindow, AnAnnulmentRefreshesTheList) {
+    const auto window = opened();
+    book_.exec(u"update tbZelmar_Movimentos set tipo = 'ANL' where movimento_no = 1"_s);
+    post(4, member_, "COR", -87.35);
+    com::call(window.get(), u"RemoteKey"_s, {1});
+    EXPECT_EQ(rows(), 4);
+    EXPECT_EQ(cell(0, 5), u"COR"_s);
+    EXPECT_EQ(cell(0, 7), u"(€ 87,35)"_s);
+    EXPECT_EQ(cell(3, 5), u"ANL"_s);
+    person_.type(u"anl"_s);
+    person_.waitUntil([&] { return rows() == 2; }, u"the annulled movement is found as such"_s);
+}
+
+TEST_F(PrincipalWindow, APostedMovementAppearsWhenThePersonComesBack) {
+    const auto window = opened();
+    post(4, member_, "DOC", 1);
+    QEvent back(QEvent::WindowActivate);
+    QCoreApplication::sendEvent(window.get(), &back);
+    EXPECT_EQ(rows(), 4);
+    EXPECT_EQ(cell(0, 0), u"4"_s);
+}
+
+TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
+    const auto window = opened();
+    QWidget entry;
+    entry.setObjectName(u"frmMovimentos"_s);
+    auto* button = new QPushButton(u"&OK"_s, &entry);
+    button->setObjectName(u"Command3"_s);
+    entry.show();
+    for (const char* name : {"NewMovimento", "NewMovimentoHospital", "Registo"}) {
+        person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
+        window->findChild<QAction*>(QString::fromLatin1(name))->trigger();
+    }
+    person_.expectNoBoxesLeft();
+    EXPECT_TRUE(Recorder::calls.isEmpty());
+
+    person_.expectBox(
+        {.text = u"Quer voltar ao lançamento?"_s, .answer = core::Answer::Yes, .partly = true});
+    EXPECT_FALSE(window->close());
+
+    button->setText(u"&Sair"_s);  // shows a movement: nothing to lose
+    window->findChild<QAction*>(u"NewMovimento"_s)->trigger();
+    EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
+}
+
+TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
+    const auto window = opened();
+    book_.exec(u"drop view vwZelmars_Movimentos_Vigor"_s);
+    person_.press(Qt::Key_F5);
+    EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"vwZelmars"_s));
+    EXPECT_TRUE(window->isVisible());
+
+    ASSERT_TRUE(QFile::remove(book_.registryFolder() + u"/HKEY_LOCAL_MACHINE.ini"_s));
+    person_.press(Qt::Key_F5);
+    EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"Ainda não há um livro"_s));
+    EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(), u"Sem livro"_s);
+}
+
+TEST_F(PrincipalWindow, RemembersItsSize) {
+    auto window = opened();
+    window->resize(903, 604);
+    window->close();
+    window.reset();
+    window = opened();
+    EXPECT_EQ(window->size(), QSize(903, 604));
+}
+
+#include "frmPrincipalTest.moc"
