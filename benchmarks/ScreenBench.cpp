@@ -41,7 +41,7 @@ forms::Form* entryScreen() {
 }
 
 /// Milliseconds from the call to the painted screen.
-double openEntry(boundary::General& general) {
+double openEntry(General& general) {
     QElapsedTimer clock;
     clock.start();
     const PaintWatch watch(u"frmMovimentos"_s);
@@ -56,7 +56,7 @@ double openEntry(boundary::General& general) {
 
 double medianOpening(Report& report, const Book& book) {
     use(book);
-    boundary::General general;
+    General general;
     return report.medianOf(15, [&] { return openEntry(general); });
 }
 

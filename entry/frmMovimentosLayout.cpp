@@ -187,6 +187,7 @@ void frmMovimentos::layOut() {
     // Enter tries the document out, which does no harm; posting wants its own key.
     Command5->setDefault(true);
     setTabOrders();
+    No_Kor->setFocus();
 }
 
 void frmMovimentos::setTabOrders() {
