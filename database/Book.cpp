@@ -6,6 +6,8 @@
 #include <QScopeGuard>
 
 #include "database/Sqlite.h"
+#include "database/SqliteBookWriter.h"
+#include "database/sample/SampleBook.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
@@ -86,8 +88,17 @@ void writeSettings(const QString& folder, const QString& catalogue) {
     write(u"dtDataSource"_s, u"sqlite:"_s + QDir(folder).absolutePath());
 }
 
-void fillSample(const QString&, const QString&, const BookSizes&, QDate) {
-    throw core::Failure(core::InvalidCall, u"O livro de exemplo ainda não existe."_s);
+void fillSample(const QString& folder, const QString& catalogue, const BookSizes& sizes,
+                QDate asOf) {
+    sqlite::Database book(bookFile(folder, catalogue), sqlite::Database::Mode::OpenExisting);
+    if (book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)"
+                    " OR EXISTS (SELECT 1 FROM tbZelmar_Movimentos)") != 0)
+        throw core::Failure(core::InvalidCall,
+                            u"A base de dados %1 já tem associados ou movimentos."_s.arg(
+                                bookFile(folder, catalogue)));
+    SqliteBookWriter writer(book);
+    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
+    writer.commit();
 }
 
 void initBook(const QString& folder, bool sample) {
