@@ -178,7 +178,6 @@ RecordsetPtr Recordset::Chapter(const QString& name) const {
 void Recordset::readAll() {
     d->requireOpen();
     d->rows->takeAll();
-    emit opened();
 }
 
 qint64 Recordset::rowsInMemory() const {
