@@ -113,6 +113,17 @@ TEST_F(PublicClass, NewMovimentoGivesItsDefaultsBack) {
     EXPECT_TRUE(isEntryShown());
 }
 
+TEST_F(PublicClass, AnotherLoginLeavesAnOpenEntryItsRow) {
+    general.NewMovimento(false);
+    const ado::RecordsetPtr row =
+        forms::DefaultInstance<entry::frmMovimentos>::get().Adodc1->Recordset();
+    row->setCollect(u"doc_no"_s, u"FT 17"_s);
+    EXPECT_FALSE(failureOf([&] { general.CallIRS(); }).isEmpty());
+    EXPECT_TRUE(row->isNewRow());
+    row->Update();
+    EXPECT_EQ(book.value(u"select doc_no from tbZelmar_Movimentos"_s), u"FT 17"_s);
+}
+
 TEST_F(PublicClass, AnUnknownConnectionFailsAfterAGoodLogin) {
     QString connection = u"Nenhuma"_s;
     const QString text = failureOf([&] { general.NewMovimento(false, &connection); });
