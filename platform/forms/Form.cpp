@@ -91,7 +91,7 @@ void Form::ShowModal() {
     if (self && isVisible()) loop.exec();
     if (self) {
         modalLoop_ = nullptr;
-        windowHandle()->setTransientParent(nullptr);
+        if (windowHandle()) windowHandle()->setTransientParent(nullptr);
         setWindowModality(Qt::NonModal);
     }
     // Without a window manager nobody else gives the focus back.

@@ -93,8 +93,9 @@ private:
         asking_.append(field);
         const QPointer<QWidget> alive = field;
         const bool agreed = dynamic_cast<Validating*>(field)->leave();
-        asking_.removeOne(field);
         agreed_ = agreed ? alive : nullptr;
+        if (!agreed && alive && !alive->hasFocus()) alive->setFocus(Qt::OtherFocusReason);
+        asking_.removeOne(field);
         return agreed;
     }
 
@@ -158,12 +159,10 @@ private:
         const bool agreedBefore = agreed_ == field;
         agreed_.clear();
         if (agreedBefore || !field->isVisible() || !field->isEnabled()) return;
-        if (agrees(field)) return;
-        asking_.append(field);
+        // The control that got the focus without leave is not asked before it loses it again.
         asking_.append(now);
-        field->setFocus(Qt::OtherFocusReason);
+        agrees(field);
         asking_.removeOne(now);
-        asking_.removeOne(field);
     }
 
     QList<QWidget*> asking_;    ///< fields whose leave() runs, the innermost last
