@@ -50,8 +50,7 @@ void makeStaged(const QString& file) {
         book.run("COMMIT");
     }
     if (!QFile::rename(staged, file))  // never over an existing file
-        throw core::Failure(core::InvalidCall,
-                            u"Não foi possível criar a base de dados %1."_s.arg(file));
+        throw core::Failure(core::InvalidCall, u"Não foi possível criar o livro «%1»."_s.arg(file));
     cleanup.dismiss();
 }
 
@@ -65,10 +64,11 @@ void createBook(const QString& folder, const QString& catalogue) {
     const QString file = bookFile(folder, catalogue);
     if (QFile::exists(file) || QFileInfo(file).isSymLink())
         throw core::Failure(core::InvalidCall,
-                            u"Já existe uma base de dados em %1. Não foi alterada."_s.arg(file));
+                            u"Já existe o livro «%1». Não foi alterado."_s.arg(file));
     const bool madeFolder = !QDir(folder).exists();
     if (!QDir().mkpath(folder))
-        throw core::Failure(core::InvalidCall, u"Não foi possível criar a pasta %1."_s.arg(folder));
+        throw core::Failure(core::InvalidCall,
+                            u"Não foi possível criar a pasta «%1»."_s.arg(folder));
     auto cleanup = qScopeGuard([&] {
         if (madeFolder) QDir().rmdir(folder);
     });
@@ -93,9 +93,9 @@ void fillSample(const QString& folder, const QString& catalogue, const BookSizes
     sqlite::Database book(bookFile(folder, catalogue), sqlite::Database::Mode::OpenExisting);
     if (book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)"
                     " OR EXISTS (SELECT 1 FROM tbZelmar_Movimentos)") != 0)
-        throw core::Failure(core::InvalidCall,
-                            u"A base de dados %1 já tem associados ou movimentos."_s.arg(
-                                bookFile(folder, catalogue)));
+        throw core::Failure(
+            core::InvalidCall,
+            u"O livro «%1» já tem associados ou movimentos."_s.arg(bookFile(folder, catalogue)));
     SqliteBookWriter writer(book);
     sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
     writer.commit();

@@ -124,7 +124,7 @@ CREATE TABLE tbZelmar_Movimentos_Historico (
     morada              VARCHAR(100),
     localidade_completo VARCHAR(70)
 );
--- List of closed years: GROUP BY ano; year close: WHERE ano > ?; tax declaration of one year.
+-- List of closed years: GROUP BY ano; tax declarations: WHERE ano = ? GROUP BY …, no_kor
 CREATE INDEX ixHistorico_ano ON tbZelmar_Movimentos_Historico (ano, no_kor);
 -- Tax declaration, whether a member has any: WHERE no_kor = ?
 CREATE INDEX ixHistorico_no_kor ON tbZelmar_Movimentos_Historico (no_kor);
