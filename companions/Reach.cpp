@@ -27,12 +27,14 @@ ado::ConnectionPtr reach() {
 }
 
 ado::ConnectionPtr reach(const QString& user, const QString& password) {
+    const QString security = setting(u"dtSecurityInfo"_s);
+    const QString catalogue = setting(u"dtInitialCatalog"_s);
+    const QString source = setting(u"dtDataSource"_s);
     auto connection = std::make_shared<ado::Connection>();
-    connection->ConnectionString = u"Provider=SQLOLEDB.1;Persist Security Info="_s +
-                                   setting(u"dtSecurityInfo"_s) + u";User ID="_s + user +
-                                   u";Password="_s + password + u";Initial Catalog="_s +
-                                   setting(u"dtInitialCatalog"_s) + u";Data Source="_s +
-                                   setting(u"dtDataSource"_s) + u";Connect Timeout=15"_s;
+    connection->ConnectionString = u"Provider=SQLOLEDB.1;Persist Security Info="_s + security +
+                                   u";User ID="_s + user + u";Password="_s + password +
+                                   u";Initial Catalog="_s + catalogue + u";Data Source="_s +
+                                   source + u";Connect Timeout=15"_s;
     connection->Open();
     return connection;
 }

@@ -3,7 +3,6 @@
 
 #include <QBoxLayout>
 #include <QHeaderView>
-#include <QKeyEvent>
 #include <QTableWidget>
 
 #include "platform/ado/Recordset.h"
@@ -16,7 +15,7 @@ using namespace Qt::StringLiterals;
 namespace tiqueta {
 namespace {
 
-enum Column { Position, Code, Kinship, Name, Birth, Waiting, ColumnCount };
+enum Column { Code, Kinship, Name, Birth, Waiting, ColumnCount };
 
 // The member's number and name.
 QString memberStatement(int socioId) {
@@ -73,8 +72,8 @@ frmEscolherFamiliar::frmEscolherFamiliar(const ado::ConnectionPtr& connection, i
 
 void frmEscolherFamiliar::layOut(const QString& member) {
     lstFamiliares->setObjectName(u"lstFamiliares"_s);
-    lstFamiliares->setHorizontalHeaderLabels({u"Nº"_s, u"Código"_s, u"Grau de parentesco"_s,
-                                              u"Nome"_s, u"Nascimento"_s, u"Carência até"_s});
+    lstFamiliares->setHorizontalHeaderLabels(
+        {u"Código"_s, u"Grau de parentesco"_s, u"Nome"_s, u"Nascimento"_s, u"Carência até"_s});
     lstFamiliares->setEditTriggers(QAbstractItemView::NoEditTriggers);
     lstFamiliares->setSelectionBehavior(QAbstractItemView::SelectRows);
     lstFamiliares->setSelectionMode(QAbstractItemView::SingleSelection);
@@ -88,10 +87,9 @@ void frmEscolherFamiliar::layOut(const QString& member) {
     header->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     const int character = fontMetrics().averageCharWidth();
     for (const auto& [column, width] :
-         {std::pair{Position, 5}, {Code, 10}, {Kinship, 24}, {Birth, 15}, {Waiting, 15}})
+         {std::pair{Code, 10}, {Kinship, 24}, {Birth, 15}, {Waiting, 15}})
         lstFamiliares->setColumnWidth(column, width * character);
     header->setSectionResizeMode(Name, QHeaderView::Stretch);
-    lstFamiliares->installEventFilter(this);
 
     cmdEscolher->setDefault(true);
     setCancelButton(cmdDesistir);
@@ -124,16 +122,14 @@ void frmEscolherFamiliar::fill(const ado::ConnectionPtr& connection, int socioId
         const QString code = core::toText(family->value(1));
         const QVariant waiting = family->value(isMemberHimself(code) ? 6 : 5);
         const int row = lstFamiliares->rowCount();
-        const QStringList texts{QString::number(row + 1),
-                                code,
-                                core::toText(family->value(2)),
+        const QStringList texts{code, core::toText(family->value(2)),
                                 core::toText(family->value(3)),
                                 core::formatted(family->value(4), core::format::Date),
                                 core::formatted(waiting, core::format::Date)};
         lstFamiliares->insertRow(row);
         for (int column = 0; column < ColumnCount; ++column)
             lstFamiliares->setItem(row, column, new QTableWidgetItem(texts[column]));
-        lstFamiliares->item(row, Position)->setData(Qt::UserRole, family->value(0));
+        lstFamiliares->item(row, Code)->setData(Qt::UserRole, family->value(0));
     }
     lstFamiliares->setCurrentCell(0, Code);
     lstFamiliares->setFocus();
@@ -141,23 +137,10 @@ void frmEscolherFamiliar::fill(const ado::ConnectionPtr& connection, int socioId
 }
 
 void frmEscolherFamiliar::take() {
-    const auto* row = lstFamiliares->item(lstFamiliares->currentRow(), Position);
+    const auto* row = lstFamiliares->item(lstFamiliares->currentRow(), Code);
     if (!row) return;
     taken_(row->data(Qt::UserRole).toInt());
     Unload();
-}
-
-// Letters are left to the list itself, which looks for them in the column of the cursor: the code.
-bool frmEscolherFamiliar::eventFilter(QObject* watched, QEvent* event) {
-    if (watched == lstFamiliares && event->type() == QEvent::KeyPress) {
-        const QString typed = static_cast<QKeyEvent*>(event)->text();
-        const int position = typed.toInt();
-        if (position >= 1 && position <= lstFamiliares->rowCount()) {
-            lstFamiliares->setCurrentCell(position - 1, Code);
-            return true;
-        }
-    }
-    return Form::eventFilter(watched, event);
 }
 
 }  // namespace tiqueta

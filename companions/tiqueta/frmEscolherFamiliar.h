@@ -8,8 +8,8 @@ class QTableWidget;
 
 namespace tiqueta {
 
-/// The member and his relatives, one to be picked: a digit moves to the row with that number, a
-/// letter to the next row whose code begins with it, Enter takes, Esc gives up.
+/// The member and his relatives, one to be picked: typing a code moves to its row, Enter takes,
+/// Esc gives up.
 class frmEscolherFamiliar : public forms::Form {
     Q_OBJECT
 public:
@@ -22,7 +22,6 @@ private:
     void connectHandlers();
     void fill(const ado::ConnectionPtr& connection, int socioId);
     void take();
-    bool eventFilter(QObject* watched, QEvent* event) override;
 
     std::function<void(int)> taken_;
 

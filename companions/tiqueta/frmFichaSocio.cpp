@@ -52,7 +52,7 @@ frmFichaSocio::frmFichaSocio(const ado::RecordsetPtr& member)
       txtContribuinte(new forms::TextBox(u"txtContribuinte"_s, this)),
       txtNib(new forms::TextBox(u"txtNib"_s, this)),
       lblNib(new QLabel(this)),
-      chkZelmar(new forms::CheckBox(u"chkZelmar"_s, u"&Inscrito no plano de Saúde"_s, this)),
+      chkZelmar(new forms::CheckBox(u"chkZelmar"_s, u"Inscrito no plano de &Saúde"_s, this)),
       txtCarencia(new forms::TextBox(u"txtCarencia"_s, this)),
       txtMorada(new forms::TextBox(u"txtMorada"_s, this)),
       txtCodigoPostal(new forms::TextBox(u"txtCodigoPostal"_s, this)),
@@ -94,7 +94,7 @@ QWidget* frmFichaSocio::identification() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação:"_s, this);
     auto* grid = new QGridLayout(frame);
     addField(grid, 0, 0, u"Número KOR:"_s, txtNumero, 14);
-    addField(grid, 0, 2, u"N.º &Contribuinte:"_s, txtContribuinte, 16);
+    addField(grid, 0, 2, u"N.º cont&ribuinte:"_s, txtContribuinte, 16);
     addField(grid, 1, 0, u"&Nome:"_s, txtNome, 60, 3);
     addField(grid, 2, 0, u"Nome a&breviado:"_s, txtNomeGuerra, 40, 3);
     return frame;

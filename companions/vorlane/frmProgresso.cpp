@@ -42,14 +42,18 @@ frmProgresso::frmProgresso(int total, const QString& message, const QString& tit
 }
 
 void frmProgresso::layOut(const QString& message, const QString& title) {
+    auto* lblMensagem = new QLabel(message, this);
+    lblMensagem->setObjectName(u"lblMensagem"_s);
     auto* content = new QVBoxLayout;
-    auto* whole = new QVBoxLayout(this);
-    whole->addWidget(
-        forms::headingBand(title, message, u"lblTitulo"_s, u"lblMensagem"_s, u"picTitulo"_s));
-    whole->addLayout(content);
-    whole->setContentsMargins(0, 0, 0, 0);
-    content->setContentsMargins(16, 8, 16, 16);
+    content->setContentsMargins(16, 12, 16, 16);
+    content->setSpacing(8);
+    content->addWidget(lblMensagem);
     content->addWidget(ProgressBar1);
+    auto* whole = new QVBoxLayout(this);
+    whole->setContentsMargins(0, 0, 0, 0);
+    whole->addWidget(
+        forms::headingBand(title, {}, u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
+    whole->addLayout(content);
     setMinimumWidth(60 * fontMetrics().averageCharWidth());
     adjustSize();
     move(middleOf(QApplication::activeWindow()) - rect().center());

@@ -70,7 +70,10 @@ TEST_F(VorlaneTest, LeavesTheFocusWhereItIs) {
     field.activateWindow();
     field.setFocus();
     ASSERT_TRUE(person.waitUntil([&] { return field.hasFocus(); }, u"the field has the focus"_s));
+    person.settle();
+    EXPECT_TRUE(field.hasFocus());
     start(2);
+    EXPECT_TRUE(field.hasFocus());
     advance(1);
     EXPECT_TRUE(field.hasFocus());
     EXPECT_EQ(QApplication::activeWindow(), &field);
