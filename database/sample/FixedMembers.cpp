@@ -32,8 +32,6 @@ constexpr std::array<std::array<const char*, 2>, FixedMembers> Names{{
     {"Luísa Margarida Paz Leal", "Luísa Leal"},
 }};
 
-constexpr int ChildLimitDays = 9132;  // a child of exactly so many days is refused
-
 Person person(const char* codABC, const char* given, const Household& household, QDate birth) {
     const QByteArray last = household.nome.mid(household.nome.lastIndexOf(' ') + 1);
     return {codABC, QByteArray(given) + ' ' + last, birth, {}};

@@ -12,7 +12,6 @@ namespace {
 
 constexpr quint64 Seed = 0x5A454C4D41525321;
 constexpr int MostRelatives = 7;
-constexpr int ChildLimitDays = 9132;
 
 /// Kinship in the order in which a family is filled, and how many of a hundred have it. Children
 /// are numbered as they come.
@@ -29,10 +28,6 @@ constexpr std::array<Kin, 9> Kinship{{{"B", 75},
                                       {"E2", 8},
                                       {"C", 10},
                                       {"H", 5}}};
-
-QDate daysBefore(QDate day, int low, int high, Random& random) {
-    return day.addDays(-random.between(low, high));
-}
 
 Person relative(const Household& household, const QByteArray& codABC, QDate asOf, Random& random) {
     const QDate parent = household.persons.front().birth;
@@ -96,8 +91,9 @@ void describeMember(Household& household, QDate asOf, Random& random) {
                                         : Premium::Never;
     household.monthsBehind = random.between(2, 9);
     if (random.chance(4)) household.waiting = asOf.addDays(random.between(-90, 120));
-    household.persons.push_back(
-        {"A", household.nome, daysBefore(asOf, 25 * 365, 68 * 365, random), household.waiting});
+    household.persons.push_back({"A", household.nome,
+                                 asOf.addDays(-random.between(25 * 365, 68 * 365)),
+                                 household.waiting});
 }
 
 }  // namespace

@@ -21,6 +21,9 @@ struct Person {
     bool coveredOn(QDate day) const;
 };
 
+/// A child of so many days is refused; one of a day less is accepted.
+inline constexpr int ChildLimitDays = 9132;
+
 /// How a member stands with the premium.
 enum class Premium { InOrder, Arrears, Unpaid, Never };
 
