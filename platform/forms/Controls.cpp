@@ -2,9 +2,11 @@
 #include "platform/forms/Controls.h"
 
 #include <QKeyEvent>
+#include <QStyleOptionGroupBox>
 #include <QVariant>
 
 #include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
 
 namespace forms {
 
@@ -14,6 +16,11 @@ Button::Button(const QString& name, const QString& caption, QWidget* parent)
     // A dialog would otherwise choose a default button of its own.
     setAutoDefault(false);
     connect(this, &QPushButton::clicked, this, [this] { handle(onClick); });
+}
+
+QSize Button::sizeHint() const {
+    // Room beside the caption.
+    return QPushButton::sizeHint() + QSize(fontMetrics().averageCharWidth() * 2, 2);
 }
 
 void Button::keyPressEvent(QKeyEvent* event) {
@@ -53,6 +60,12 @@ void ListBox::setText(const QString& text) {
 Frame::Frame(const QString& name, const QString& caption, QWidget* parent)
     : QGroupBox(caption, parent) {
     setObjectName(name);
+}
+
+void Frame::initStyleOption(QStyleOptionGroupBox* option) const {
+    QGroupBox::initStyleOption(option);
+    option->textColor = blended(option->palette.color(QPalette::WindowText),
+                                option->palette.color(QPalette::Highlight), 0.85);
 }
 
 ProgressBar::ProgressBar(const QString& name, QWidget* parent) : QProgressBar(parent) {

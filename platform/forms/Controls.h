@@ -24,6 +24,8 @@ public:
     void setCaption(const QString& caption) { setText(caption); }
     std::function<void()> onClick;
 
+    QSize sizeHint() const override;
+
 protected:
     void keyPressEvent(QKeyEvent* event) override;
 };
@@ -60,10 +62,14 @@ public:
     std::function<void()> onClick;
 };
 
+/// A group of controls with a caption.
 class Frame : public QGroupBox {
     Q_OBJECT
 public:
     Frame(const QString& name, const QString& caption, QWidget* parent = nullptr);
+
+protected:
+    void initStyleOption(QStyleOptionGroupBox* option) const override;
 };
 
 class ProgressBar : public QProgressBar {

@@ -13,6 +13,7 @@
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
 
 namespace forms {
 
@@ -174,6 +175,7 @@ void DataCombo::focusInEvent(QFocusEvent* event) {
     const bool entering = !entered_;
     entered_ = true;
     QComboBox::focusInEvent(event);
+    tint(true);
     if (entering) handle(onGotFocus);
 }
 
@@ -181,8 +183,16 @@ void DataCombo::focusOutEvent(QFocusEvent* event) {
     QComboBox::focusOutEvent(event);
     if (isAnotherWindows(event) || !entered_) return;
     entered_ = false;
+    tint(false);
     leave();
     handle(onLostFocus);
+}
+
+/// The ground of the field that has the focus, as in the text boxes.
+void DataCombo::tint(bool focused) {
+    QPalette colours;
+    if (focused && !locked_) colours.setColor(QPalette::Base, focusedGround(palette()));
+    lineEdit()->setPalette(colours);
 }
 
 void DataCombo::keyPressEvent(QKeyEvent* event) {

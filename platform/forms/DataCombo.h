@@ -53,6 +53,7 @@ protected:
 private:
     void fill();
     void choose(const QVariant& value);
+    void tint(bool focused);
     void settleTypedText();
     int entryFor(const QString& typed) const;
     bool writeChoice();

@@ -35,9 +35,9 @@ QIcon calendarIcon(const QPalette& palette) {
 
 DatePicker::DatePicker(const QString& name, QWidget* parent) : TextBox(name, parent) {
     setFormat(core::format::Date);
-    QAction* open = addAction(calendarIcon(palette()), TrailingPosition);
-    open->setToolTip(u"Calendário"_s);
-    connect(open, &QAction::triggered, this, [this] { handle([this] { openCalendar(); }); });
+    open_ = addAction(calendarIcon(palette()), TrailingPosition);
+    open_->setToolTip(u"Calendário"_s);
+    connect(open_, &QAction::triggered, this, [this] { handle([this] { openCalendar(); }); });
 }
 
 QVariant DatePicker::Value() const {
@@ -54,6 +54,11 @@ void DatePicker::keyPressEvent(QKeyEvent* event) {
         handle([this] { openCalendar(); });
     else
         TextBox::keyPressEvent(event);
+}
+
+void DatePicker::changeEvent(QEvent* event) {
+    if (event->type() == QEvent::PaletteChange && open_) open_->setIcon(calendarIcon(palette()));
+    TextBox::changeEvent(event);
 }
 
 void DatePicker::openCalendar() {

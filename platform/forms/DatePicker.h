@@ -17,9 +17,11 @@ public:
 protected:
     QVariant convert(const QString& text) const override;
     void keyPressEvent(QKeyEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
 private:
     void openCalendar();
+    QAction* open_ = nullptr;
 };
 
 }  // namespace forms

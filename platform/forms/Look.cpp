@@ -70,6 +70,10 @@ QColor blended(const QColor& under, const QColor& over, double part) {
                   mix(under.blue(), over.blue()));
 }
 
+QColor focusedGround(const QPalette& palette) {
+    return blended(palette.color(QPalette::Base), palette.color(QPalette::Highlight), 0.12);
+}
+
 void settleLook() {
     QApplication::setStyle(QStyleFactory::create(u"Fusion"_s));
     QApplication::setPalette(withAccent(QApplication::palette()));

@@ -3,6 +3,8 @@
 
 #include <QColor>
 
+class QPalette;
+
 namespace forms {
 
 /// Settles style, colours, locale, the window icon and the Portuguese of the toolkit's own texts.
@@ -10,5 +12,8 @@ void settleLook();
 
 /// `part` of `over`, the rest of `under`; 0..1.
 QColor blended(const QColor& under, const QColor& over, double part);
+
+/// The ground of the field that a person types into.
+QColor focusedGround(const QPalette& palette);
 
 }  // namespace forms

@@ -78,13 +78,10 @@ void TextBox::setBackColor(BackColor color) {
 
 void TextBox::initStyleOption(QStyleOptionFrame* option) const {
     QLineEdit::initStyleOption(option);
-    const QColor window = option->palette.color(QPalette::Window);
-    const QColor base = option->palette.color(QPalette::Base);
-    const QColor accent = option->palette.color(QPalette::Highlight);
     if (backColor_ == BackColor::Menu)
-        option->palette.setColor(QPalette::Base, window);
+        option->palette.setColor(QPalette::Base, option->palette.color(QPalette::Window));
     else if (hasFocus() && !isReadOnly())
-        option->palette.setColor(QPalette::Base, blended(base, accent, 0.12));
+        option->palette.setColor(QPalette::Base, focusedGround(option->palette));
 }
 
 QVariant TextBox::convert(const QString& text) const {
