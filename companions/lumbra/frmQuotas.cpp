@@ -122,7 +122,7 @@ void frmQuotas::showMember(const ado::ConnectionPtr& connection, const QString& 
 
 void frmQuotas::showTotals(const ado::ConnectionPtr& connection) {
     const auto sum = sumOf(payments_, u"valor"_s);
-    lblTotais->setText(u"Total de %1 pagamentos: %2"_s.arg(payments_->RecordCount())
+    lblTotais->setText(u"Pagamentos: %1    Total: %2"_s.arg(payments_->RecordCount())
                            .arg(money(QVariant::fromValue(sum))));
     const auto premium = ado::Recordset::create();
     premium->Open(premiumStatement(socioId_), connection);

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QByteArray>
 #include <QString>
 #include <string>
 #include <vector>
@@ -27,6 +26,8 @@ public:
     /// Takes all active members in, by name. What was held before goes.
     void load(const ado::ConnectionPtr& connection);
     void add(const Member& member);
+    /// Puts the members in the order of their names, without regard to accents and case.
+    void sort();
 
     int size() const { return static_cast<int>(entries_.size()); }
     Member at(int position) const;
@@ -38,16 +39,18 @@ public:
     std::vector<int> matching(const QString& typed) const;
 
 private:
+    // Stretches of shown_ and words_.
     struct Entry {
         qint32 socioId;
         bool enrolled;
-        quint32 shownEnd;  // end of this member's texts in shown_
-        quint32 wordsEnd;  // end of this member's words in words_
+        quint32 shownBegin, shownEnd;
+        quint32 wordsBegin, nameBegin, wordsEnd;
     };
-    std::string_view words(size_t position) const;
+    std::string_view words(const Entry& entry) const;
+    std::string_view nameWords(const Entry& entry) const;
 
     std::vector<Entry> entries_;
-    QByteArray shown_;   // UTF-8: number, name, short name, locality, one a line
+    std::string shown_;  // UTF-8: number, name, short name, locality, one a line
     std::string words_;  // folded: " number word word …"
 };
 

@@ -32,8 +32,8 @@ QString nibHint(const QString& typed) {
     const auto missing = NibLength - nib.size();
     if (nib.isEmpty()) return {};
     if (!std::all_of(nib.begin(), nib.end(), isDigit)) return u"✗ só pode ter algarismos"_s;
-    if (missing > 0) return u"✗ faltam %1 de %2 algarismos"_s.arg(missing).arg(NibLength);
-    if (missing < 0) return u"✗ tem %1 algarismos a mais"_s.arg(-missing);
+    if (missing > 0) return u"✗ algarismos em falta: %1"_s.arg(missing);
+    if (missing < 0) return u"✗ algarismos a mais: %1"_s.arg(-missing);
     return isValidNib(nib) ? u"✓ NIB válido"_s : u"✗ os algarismos de controlo não conferem"_s;
 }
 

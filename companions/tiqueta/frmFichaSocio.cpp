@@ -25,8 +25,9 @@ QString memberStatement(int socioId) {
 void addField(QGridLayout* grid, int row, int column, const QString& label, forms::TextBox* field,
               int width, int span = 1) {
     field->setMinimumWidth(width * field->fontMetrics().averageCharWidth());
-    grid->addWidget(forms::fieldLabel(label, field, u"lbl"_s + field->objectName().mid(3)), row,
-                    column);
+    auto* text = forms::fieldLabel(label, field, u"lbl"_s + field->objectName().mid(3));
+    if (column == 0) text->setMinimumWidth(19 * field->fontMetrics().averageCharWidth());
+    grid->addWidget(text, row, column);
     grid->addWidget(field, row, column + 1, 1, span);
 }
 
@@ -94,16 +95,16 @@ QWidget* frmFichaSocio::identification() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação:"_s, this);
     auto* grid = new QGridLayout(frame);
     addField(grid, 0, 0, u"Número KOR:"_s, txtNumero, 14);
-    addField(grid, 0, 2, u"N.º cont&ribuinte:"_s, txtContribuinte, 16);
     addField(grid, 1, 0, u"&Nome:"_s, txtNome, 60, 3);
-    addField(grid, 2, 0, u"Nome a&breviado:"_s, txtNomeGuerra, 40, 3);
+    addField(grid, 2, 0, u"Nome a&breviado:"_s, txtNomeGuerra, 30);
+    addField(grid, 2, 2, u"N.º cont&ribuinte:"_s, txtContribuinte, 16);
     return frame;
 }
 
 QWidget* frmFichaSocio::plan() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Plano de Saúde e pagamentos:"_s, this);
     auto* grid = new QGridLayout(frame);
-    addField(grid, 0, 0, u"N&IB:"_s, txtNib, 28);
+    addField(grid, 0, 0, u"N&IB:"_s, txtNib, 30);
     grid->addWidget(lblNib, 0, 2, 1, 2);
     addField(grid, 1, 0, u"Carência a&té:"_s, txtCarencia, 14);
     grid->addWidget(chkZelmar, 1, 2, 1, 2);

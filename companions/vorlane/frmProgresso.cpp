@@ -61,7 +61,9 @@ void frmProgresso::layOut(const QString& message, const QString& title) {
 
 void frmProgresso::advance(int steps) {
     const int value = ProgressBar1->value() + steps;
+    ProgressBar1->setUpdatesEnabled(false);  // or the bar would paint itself at every step
     ProgressBar1->setValue(std::clamp(value, ProgressBar1->minimum(), ProgressBar1->maximum()));
+    ProgressBar1->setUpdatesEnabled(true);
     if (painted_.hasExpired(MillisecondsBetweenPaints)) paintNow();
 }
 

@@ -108,7 +108,7 @@ TEST_F(LumbraTest, PremiumStatementStaysWhileTheObjectIsKept) {
               u"15-03-2026|2026|3|€ 12,50|Prémio\n"
               "15-02-2026|2026|2|€ 12,50|Prémio\n"
               "15-01-2026|2026|1|€ 12,50|Prémio"_s);
-    EXPECT_EQ(label(u"lblTotais"_s), u"Total de 3 pagamentos: € 37,50"_s);
+    EXPECT_EQ(label(u"lblTotais"_s), u"Pagamentos: 3    Total: € 37,50"_s);
     EXPECT_TRUE(label(u"lblSituacao"_s).contains(u"3/2026"_s));
     EXPECT_TRUE(label(u"lblSituacao"_s).contains(u"€ 50,00"_s));
     lumbra = {};
@@ -119,7 +119,7 @@ TEST_F(LumbraTest, PremiumStatementOfOneWhoNeverPaidStillNamesHim) {
     lumbra.call(u"appShow"_s, premiumsOf(u"tbQuotas_Movimentos.socio_id=%1"_s.arg(joao)));
     person.screen(u"frmQuotas"_s);
     EXPECT_EQ(label(u"lblAssociado"_s), u"Associado 100020, João Sá Carneiro"_s);
-    EXPECT_EQ(label(u"lblTotais"_s), u"Total de 0 pagamentos: € 0,00"_s);
+    EXPECT_EQ(label(u"lblTotais"_s), u"Pagamentos: 0    Total: € 0,00"_s);
     person.escape();
     EXPECT_FALSE(person.isShown(u"frmQuotas"_s));
 }

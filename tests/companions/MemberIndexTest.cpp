@@ -70,6 +70,17 @@ TEST(MemberIndex, GivesBackWhatItHolds) {
     EXPECT_EQ(index.at(3).locality, u"y"_s);
 }
 
+TEST(MemberIndex, SortsByNameWithoutRegardToAccentsAndCase) {
+    MemberIndex index;
+    index.add({1, u"5"_s, u"Zulmira"_s, {}, {}, true});
+    index.add({2, u"9"_s, u"Álvaro Sá"_s, {}, {}, true});
+    index.add({3, u"1"_s, u"alvaro Reis"_s, {}, {}, true});
+    index.sort();
+    EXPECT_EQ((Keys{index.socioId(0), index.socioId(1), index.socioId(2)}), (Keys{3, 2, 1}));
+    EXPECT_EQ(index.at(1).number, u"9"_s) << "the texts move with the member";
+    EXPECT_EQ(index.matching(u"9"_s), (std::vector<int>{1}));
+}
+
 TEST(MemberIndex, TakesATextOfAnyLength) {
     EXPECT_EQ(socios(u"ant "_s.repeated(2500)), (Keys{11, 13}));
     EXPECT_EQ(socios(QString(10000, u'a')), Keys{});

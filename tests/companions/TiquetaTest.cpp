@@ -150,12 +150,12 @@ TEST_F(TiquetaFile, CancelAbandons) {
 
 TEST_F(TiquetaFile, TellsOfTheBankNumberWhileTyping) {
     const std::pair<QString, QString> rows[] = {
-        {u"0013"_s, u"faltam 17 de 21 algarismos"_s},
-        {u"0013 0000.0000-0000 018"_s, u"faltam 2 de 21 algarismos"_s},
+        {u"0013"_s, u"em falta: 17"_s},
+        {u"0013 0000.0000-0000 018"_s, u"em falta: 2"_s},
         {u"001300000000000000186"_s, u"✓ NIB válido"_s},
         {u"pt50 0013 0000 00000000001 86"_s, u"✓ NIB válido"_s},
         {u"001300000000000000187"_s, u"não conferem"_s},
-        {u"0013000000000000001860"_s, u"1 algarismos a mais"_s},
+        {u"0013000000000000001860"_s, u"a mais: 1"_s},
         {u"0013A"_s, u"só pode ter algarismos"_s},
     };
     edit([&] {
