@@ -60,21 +60,47 @@ QTime parseTime(QStringView text, qsizetype& at) {
     return at == text.size() ? QTime(hour, minute, second) : QTime();
 }
 
+/// A number of two or four digits; a negative one when there is another character among them.
+int fixedDigits(const char* at, int length) {
+    int value = 0;
+    for (; length > 0; --length, ++at) {
+        const int digit = *at - '0';
+        if (digit < 0 || digit > 9) return -10000;
+        value = value * 10 + digit;
+    }
+    return value;
+}
+
+/// Days from 1970-01-01 of a day of the proleptic Gregorian calendar (Howard Hinnant's
+/// days_from_civil, for years from 1 on).
+qint64 daysFromCivil(int year, int month, int day) {
+    year -= month <= 2;
+    const int era = year / 400;
+    const int yearOfEra = year - era * 400;
+    const int dayOfYear = (153 * (month + (month > 2 ? -3 : 9)) + 2) / 5 + day - 1;
+    const int dayOfEra = yearOfEra * 365 + yearOfEra / 4 - yearOfEra / 100 + dayOfYear;
+    return qint64{era} * 146097 + dayOfEra - 719468;
+}
+
 /// The form that the book stores, read without detours: every list and report goes through here.
 QVariant storedMoment(std::string_view text) {
-    const auto number = [&](std::size_t at, std::size_t length) {
-        int value = 0;
-        for (std::size_t i = at; i < at + length; ++i) {
-            if (text[i] < '0' || text[i] > '9') return -1;
-            value = value * 10 + (text[i] - '0');
+    const char* c = text.data();
+    if (text.size() == 19 && c[4] == '-' && c[7] == '-' && c[13] == ':' && c[16] == ':') {
+        const int year = fixedDigits(c, 4);
+        const int month = fixedDigits(c + 5, 2);
+        const int day = fixedDigits(c + 8, 2);
+        const int hour = fixedDigits(c + 11, 2);
+        const int minute = fixedDigits(c + 14, 2);
+        const int second = fixedDigits(c + 17, 2);
+        const bool moment = year > 0 && month > 0 && month <= 12 && day > 0 &&
+                            (day <= 28 || day <= QDate(year, month, 1).daysInMonth()) &&
+                            hour >= 0 && hour < 24 && minute >= 0 && minute < 60 && second >= 0 &&
+                            second < 60;
+        if (moment) {
+            const qint64 seconds =
+                daysFromCivil(year, month, day) * 86400 + hour * 3600 + minute * 60 + second;
+            return QDateTime::fromMSecsSinceEpoch(seconds * 1000, Qt::UTC);
         }
-        return value;
-    };
-    const bool fits = text.size() == 19 && text[4] == '-' && text[7] == '-' && text[13] == ':';
-    if (fits) {
-        const QDate day(number(0, 4), number(5, 2), number(8, 2));
-        const QTime time(number(11, 2), number(14, 2), number(17, 2));
-        if (day.isValid() && time.isValid()) return QDateTime(day, time, Qt::UTC);
     }
     const QString plain = QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
     const QDateTime moment = parseMoment(plain);
@@ -105,10 +131,15 @@ QVariant integerVariant(qint64 number, ColumnType type) {
 
 QVariant realVariant(double number, ColumnType type) {
     switch (type) {
-        case ColumnType::Money:
+        case ColumnType::Money: {
+            // What was stored as an amount is at most a hair beside its fourth decimal.
+            const double nearest = std::nearbyint(number * 10000);
+            if (std::fabs(number) < 1e10 && std::fabs(number * 10000 - nearest) < 0.01)
+                return QVariant::fromValue(core::Money::fromUnits(static_cast<qint64>(nearest)));
             if (std::fabs(number) < 9e14)
                 return QVariant::fromValue(core::Money::fromDouble(number));
             return number;
+        }
         case ColumnType::Single:
             return static_cast<float>(number);
         default:

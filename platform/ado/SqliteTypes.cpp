@@ -76,22 +76,24 @@ Column describe(const char* name, const char* declared) {
 }
 
 Cell cellOf(sqlite3_stmt* statement, int column) {
+    // Asked of the value itself: half the cost of asking the statement twice.
+    sqlite3_value* value = sqlite3_column_value(statement, column);
     Cell cell;
-    switch (sqlite3_column_type(statement, column)) {
+    switch (sqlite3_value_type(value)) {
         case SQLITE_INTEGER:
             cell.kind = Cell::Integer;
-            cell.integer = sqlite3_column_int64(statement, column);
+            cell.integer = sqlite3_value_int64(value);
             break;
         case SQLITE_FLOAT:
             cell.kind = Cell::Real;
-            cell.real = sqlite3_column_double(statement, column);
+            cell.real = sqlite3_value_double(value);
             break;
         case SQLITE_NULL:
             break;
         default: {
             cell.kind = Cell::Text;
-            const auto* text = static_cast<const char*>(sqlite3_column_blob(statement, column));
-            cell.text = {text, static_cast<std::size_t>(sqlite3_column_bytes(statement, column))};
+            const auto* text = static_cast<const char*>(sqlite3_value_blob(value));
+            cell.text = {text, static_cast<std::size_t>(sqlite3_value_bytes(value))};
         }
     }
     return cell;

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/StatementTranslator.h"
 
+#include <QDateTime>
+
 #include "platform/ado/ColumnValue.h"
 #include "platform/ado/Edits.h"
 

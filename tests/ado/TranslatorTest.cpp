@@ -1,0 +1,133 @@
+// SPDX-License-Identifier: MIT
+// Each rule of the translator is a row: name, statement as authors write it, statement for SQLite.
+#include <gtest/gtest.h>
+
+#include <QHash>
+
+#include "platform/ado/StatementTranslator.h"
+#include "platform/core/Failure.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Tables tbA and tbB with columns of each kind, and a view vwA of tbA.
+class SmallSchema : public ado::Schema {
+public:
+    bool isTable(QStringView name) override {
+        return name.compare(u"tbA", Qt::CaseInsensitive) == 0 ||
+               name.compare(u"tbB", Qt::CaseInsensitive) == 0;
+    }
+    std::optional<ado::ColumnType> columnType(QStringView table, QStringView column) override {
+        static const QHash<QString, ado::ColumnType> columns = {
+            {u"id"_s, ado::ColumnType::Integer32},  {u"nome"_s, ado::ColumnType::Text},
+            {u"code"_s, ado::ColumnType::Text},     {u"debito"_s, ado::ColumnType::Money},
+            {u"credito"_s, ado::ColumnType::Money}, {u"credito_ac"_s, ado::ColumnType::Single}};
+        if (!isTable(table) && table.compare(u"vwA", Qt::CaseInsensitive) != 0) return {};
+        const auto found = columns.constFind(column.toString().toLower());
+        return found == columns.constEnd() ? std::nullopt : std::optional(*found);
+    }
+};
+
+struct Rule {
+    const char* name;
+    QString before;
+    QString after;
+};
+
+class Translator : public testing::TestWithParam<Rule> {};
+
+const Rule Rules[] = {
+    {"PlainAggregatePasses", u"SELECT count(*) FROM tbA"_s, u"SELECT count(*) FROM tbA"_s},
+    {"ClosingSemicolonGoes", u"SELECT count(*) FROM tbA ; "_s, u"SELECT count(*) FROM tbA"_s},
+    {"CommentStays", u"SELECT count(*) /* ; */ FROM tbA"_s, u"SELECT count(*) /* ; */ FROM tbA"_s},
+    {"UnknownFunctionPasses", u"SELECT max(datepart(yy, d)) FROM tbA"_s,
+     u"SELECT max(datepart(yy, d)) FROM tbA"_s},
+
+    {"ConvertWithTimeAndStyle",
+     u"SELECT max(id) FROM tbA WHERE d >= CONVERT(DATETIME,'03/31/2001 00:00:00', 102)"_s,
+     u"SELECT max(id) FROM tbA WHERE d >= '2001-03-31 00:00:00'"_s},
+    {"ConvertWithoutTime", u"SELECT max(id) FROM tbA WHERE d < convert(datetime , '1/2/2001')"_s,
+     u"SELECT max(id) FROM tbA WHERE d < '2001-01-02 00:00:00'"_s},
+    {"ConvertOfNoDatePasses",
+     u"SELECT max(id) FROM tbA WHERE d < CONVERT(DATETIME,'31/12/2001',102)"_s,
+     u"SELECT max(id) FROM tbA WHERE d < CONVERT(DATETIME,'31/12/2001',102)"_s},
+    {"DateBetweenSigns", u"SELECT max(id) FROM tbA WHERE d=#2/22/2000#"_s,
+     u"SELECT max(id) FROM tbA WHERE d='2000-02-22 00:00:00'"_s},
+    {"DoubleQuotedText", u"SELECT max(id) FROM tbA WHERE tipo=\"D'E\""_s,
+     u"SELECT max(id) FROM tbA WHERE tipo='D''E'"_s},
+    {"KeywordAsName", u"SELECT max(tbA.order) FROM tbA"_s, u"SELECT max(tbA.\"order\") FROM tbA"_s},
+
+    {"TextsAreJoined", u"SELECT max(code + '  -  ' + nome) FROM tbA"_s,
+     u"SELECT max(code || '  -  ' || nome) FROM tbA"_s},
+    {"WholeChainIsJoined", u"SELECT max(a.b + c + f(d) + ' ' + (e)) FROM tbA"_s,
+     u"SELECT max(a.b || c || f(d) || ' ' || (e)) FROM tbA"_s},
+    {"NumbersAreAdded", u"SELECT max(a + b), max(c + ' ') FROM tbA"_s,
+     u"SELECT max(a + b), max(c || ' ') FROM tbA"_s},
+    {"PlusInsideTextStays", u"SELECT max(nome) FROM tbA WHERE nome = 'a + b'"_s,
+     u"SELECT max(nome) FROM tbA WHERE nome = 'a + b'"_s},
+
+    {"DifferenceOfSums",
+     u"SELECT id FROM tbA GROUP BY id HAVING ((SUM(debito) - SUM(credito)) > 0.1)"_s,
+     u"SELECT id FROM tbA GROUP BY id HAVING ((ROUND(SUM(debito) - SUM(credito),4)) > 0.1)"_s},
+    {"SumOfDifference", u"SELECT Sum(tbA.debito-credito) AS d FROM tbA"_s,
+     u"SELECT ROUND(Sum(tbA.debito-credito),4) AS d FROM tbA"_s},
+    {"SumOfFloatsKeepsItsDigits", u"SELECT Sum(credito_ac) FROM tbA"_s,
+     u"SELECT Sum(credito_ac) FROM tbA"_s},
+    {"CountedSumStays", u"SELECT Sum(id) FROM tbA"_s, u"SELECT Sum(id) FROM tbA"_s},
+
+    {"TextOrder", u"SELECT * FROM tbA ORDER BY nome"_s,
+     u"SELECT * FROM tbA ORDER BY nome COLLATE portuguese"_s},
+    {"TextOrderWithDirections", u"SELECT * FROM vwA ORDER BY id, vwA.Nome DESC, code;"_s,
+     u"SELECT * FROM vwA ORDER BY id, vwA.Nome COLLATE portuguese DESC, code COLLATE portuguese"_s},
+    {"NumberOrderStays", u"SELECT * FROM tbA ORDER BY id"_s, u"SELECT * FROM tbA ORDER BY id"_s},
+    {"OrderByJoinedText", u"SELECT id, code + ' ' + nome AS completo FROM tbA ORDER BY completo"_s,
+     u"SELECT id, code || ' ' || nome AS completo FROM tbA ORDER BY completo COLLATE portuguese"_s},
+    {"OrderByAliasOfText", u"SELECT max(id), nome AS quem FROM tbA GROUP BY nome ORDER BY quem"_s,
+     u"SELECT max(id), nome AS quem FROM tbA GROUP BY nome ORDER BY quem COLLATE portuguese"_s},
+    {"OrderBehindUnion",
+     u"SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM tbB ORDER BY "
+     u"tbA.nome"_s,
+     u"SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM tbB ORDER BY "
+     u"quem COLLATE portuguese"_s},
+    {"OrderBehindUnionWithoutAlias",
+     u"SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ORDER BY tbA.id"_s,
+     u"SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ORDER BY id"_s},
+
+    {"InsertionOrder", u"Select id from TBA where id > 5"_s,
+     u"Select id from TBA where id > 5 ORDER BY \"TBA\"._rowid_"_s},
+    {"InsertionOrderOfJoin", u"SELECT x.id FROM tbA AS x LEFT JOIN tbB ON x.id = tbB.id"_s,
+     u"SELECT x.id FROM tbA AS x LEFT JOIN tbB ON x.id = tbB.id ORDER BY \"x\"._rowid_"_s},
+    {"ViewHasNoInsertionOrder", u"SELECT * FROM vwA WHERE id = 1"_s,
+     u"SELECT * FROM vwA WHERE id = 1"_s},
+    {"GroupsHaveNoInsertionOrder", u"SELECT id FROM tbA GROUP BY id"_s,
+     u"SELECT id FROM tbA GROUP BY id"_s},
+};
+
+}  // namespace
+
+TEST_P(Translator, Rule) {
+    SmallSchema schema;
+    EXPECT_EQ(ado::translate(ado::Statement(GetParam().before), schema, false), GetParam().after);
+}
+
+INSTANTIATE_TEST_SUITE_P(, Translator, testing::ValuesIn(Rules),
+                         [](const auto& rule) { return std::string(rule.param.name); });
+
+TEST(WritableStatement, IdentityStandsBeforeTheColumns) {
+    SmallSchema schema;
+    EXPECT_EQ(ado::translate(ado::Statement(u"select * from tbA where id=1;"_s), schema, true),
+              u"select _rowid_,* from tbA where id=1 ORDER BY \"tbA\"._rowid_"_s);
+}
+
+TEST(WritableStatement, IsASelectStarOverOneTable) {
+    const auto table = [](const QString& text) { return ado::Statement(text).singleTable(); };
+    EXPECT_EQ(table(u"SELECT * From [tbA]"_s), u"tbA"_s);
+    EXPECT_EQ(table(u"select * from tbA where x in (1,2) order by y;"_s), u"tbA"_s);
+    for (const QString& other :
+         {u"select id from tbA"_s, u"select *, 1 from tbA"_s, u"select * from tbA, tbB"_s,
+          u"select * from tbA left join tbB on 1=1"_s, u"select * from (select 1)"_s,
+          u"select * from tbA where 1=1 union select * from tbB"_s,
+          u"select * from tbA where 1=1 group by id"_s})
+        EXPECT_EQ(table(other), QString()) << other.toStdString();
+}
