@@ -133,8 +133,8 @@ bool Operator::eventFilter(QObject* watched, QEvent* event) {
 void Operator::visit(const QPointer<QWidget>& shown, const std::function<void()>& steps) {
     if (!shown) return;
     const QPointer<QWidget> before = current_;
-    current_ = shown;
     try {
+        turnTo(shown);
         steps();
     } catch (const std::exception& failure) {
         ADD_FAILURE() << "on " << plain(shown ? shown->objectName() : QString()) << ": "
@@ -167,8 +167,19 @@ void Operator::answer(const QPointer<QWidget>& shown) {
 QWidget* Operator::screen(const QString& name) {
     if (!QTest::qWaitFor([&name] { return shownWindow(name) != nullptr; }, Patience))
         missing(name, "is not shown");
-    current_ = shownWindow(name);
+    turnTo(shownWindow(name));
     return current_;
+}
+
+/// On a real display a window takes keys only once the window manager has made it the active one.
+void Operator::turnTo(QWidget* window) {
+    current_ = window;
+    const QWidget* modal = QApplication::activeModalWidget();
+    if (modal && modal != window) return;
+    window->activateWindow();
+    const auto isActive = [this] { return !current_ || current_->isActiveWindow(); };
+    EXPECT_TRUE(QTest::qWaitFor(isActive, Patience))
+        << "not active: " << plain(window->objectName());
 }
 
 void Operator::onScreen(const QString& name, const std::function<void()>& steps) {
@@ -213,7 +224,8 @@ void Operator::doubleClick(const QString& name) {
 void Operator::put(const QString& name, const QString& text) {
     auto* field = find(name);
     if (!field->hasFocus()) clickOn(field);
-    if (!field->hasFocus()) missing(name, "does not get the focus");
+    if (!QTest::qWaitFor([field] { return field->hasFocus(); }, Patience / 10))
+        missing(name, "does not get the focus");
     press(Qt::Key_A, Qt::ControlModifier);
     press(Qt::Key_Delete);
     type(text);

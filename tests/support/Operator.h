@@ -125,6 +125,7 @@ private:
     };
     [[noreturn]] void missing(const QString& name, const char* how) const;
     QWindow* keyWindow() const;
+    void turnTo(QWidget* window);
     void clickOn(QWidget* control);
     void answer(const QPointer<QWidget>& shown);
     void visit(const QPointer<QWidget>& shown, const std::function<void()>& steps);
