@@ -6,7 +6,7 @@
 #include <QEventLoop>
 #include <QMessageBox>
 #include <QTest>
-#include <cstdio>
+#include <QTextStream>
 
 using namespace Qt::StringLiterals;
 
@@ -15,7 +15,11 @@ namespace host {
 namespace {
 
 constexpr int TickMilliseconds = 25;
-constexpr int TicksOfPatience = 1200;  // half a minute for one step
+constexpr int TicksOfPatience = 400;  // ten seconds for one step
+
+void say(const QString& text) {
+    QTextStream(stdout) << text << Qt::endl;
+}
 
 /// The screen that a person would be typing into.
 QWidget* frontScreen(const QString& wanted) {
@@ -34,6 +38,7 @@ QString described(QWidget* screen) {
 }  // namespace
 
 TourPlayer::TourPlayer(const QString& folder) : folder_(folder) {
+    clock_.setSingleShot(true);
     connect(&clock_, &QTimer::timeout, this, &TourPlayer::tick);
 }
 
@@ -58,18 +63,22 @@ bool TourPlayer::fits(const Step& step, QWidget* front) const {
 }
 
 void TourPlayer::tick() {
-    // A step that opens a modal screen is still on the stack while the next ones are played.
+    // A step that opens a modal screen is still on the stack while the next ones are played; a timer
+    // never fires inside its own handler, so each tick starts the next one.
+    clock_.start(TickMilliseconds);
     if (acting_) return;
+    if (failed_) return giveUp();
     if (at_ == steps_.size()) return finished_();
     const Step step = steps_[at_];
     QWidget* front = frontScreen(step.screen);
     if (!fits(step, front)) {
-        if (++patience_ < TicksOfPatience) return;
-        std::fprintf(stderr, "O ecrã «%s» não apareceu; à frente está «%s».\n",
-                     qUtf8Printable(step.screen), qUtf8Printable(described(front)));
-        failed_ = true;
-        at_ = steps_.size();
-        return finished_();
+        if (++patience_ == TicksOfPatience) {
+            say(u"O ecrã «%1» não apareceu; à frente está «%2»."_s.arg(step.screen,
+                                                                       described(front)));
+            if (front) take(u"parou-aqui"_s, front);
+            failed_ = true;
+        }
+        return;
     }
     patience_ = 0;
     ++at_;
@@ -81,14 +90,22 @@ void TourPlayer::tick() {
     if (step.act) step.act(front);
 }
 
+/// Closes what is modal, one after the other, so that their callers come back.
+void TourPlayer::giveUp() {
+    if (QWidget* modal = QApplication::activeModalWidget())
+        modal->close();
+    else
+        finished_();
+}
+
 void TourPlayer::take(const QString& picture, QWidget* screen) {
     const QString file = QDir(folder_).filePath(picture + u".png"_s);
-    if (!screen->grab().save(file)) {
-        std::fprintf(stderr, "Não foi possível gravar %s.\n", qUtf8Printable(file));
+    if (screen->grab().save(file)) {
+        say(u"  "_s + file);
+    } else {
+        say(u"Não foi possível gravar %1."_s.arg(file));
         failed_ = true;
-        return;
     }
-    std::printf("  %s\n", qUtf8Printable(file));
 }
 
 void TourPlayer::type(QWidget* screen, const QStringList& keys) {

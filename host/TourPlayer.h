@@ -28,8 +28,7 @@ public:
               const std::function<void(QWidget*)>& act,
               const std::function<bool(QWidget*)>& ready = {});
 
-    /// Plays all steps. False when a screen did not come; what was in front instead is said on the
-    /// standard error stream.
+    /// Plays all steps. False when a screen did not come; what was in front instead is said.
     bool play();
 
     /// Types words and keys into a screen: a text, or a name of a key in angle brackets, such as
@@ -44,6 +43,7 @@ private:
         std::function<bool(QWidget*)> ready;
     };
     void tick();
+    void giveUp();
     bool fits(const Step& step, QWidget* front) const;
     void take(const QString& picture, QWidget* screen);
 

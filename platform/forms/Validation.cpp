@@ -128,10 +128,9 @@ private:
         const auto* label = qobject_cast<QLabel*>(widget);
         const QPointer<QWidget> target = label && label->buddy() ? label->buddy() : widget;
         QWidget* field = fieldBefore(target);
-        if (!field) return false;
-        if (!agrees(field)) return true;
+        if (field && !agrees(field)) return true;
         // A pressed accelerator takes the focus along, as a click does.
-        if (target && (target->focusPolicy() & Qt::TabFocus))
+        if (target && target->isEnabled() && (target->focusPolicy() & Qt::TabFocus))
             target->setFocus(Qt::ShortcutFocusReason);
         return false;
     }
