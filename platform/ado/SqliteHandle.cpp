@@ -10,8 +10,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// Statements of this layer that stay prepared; more than these and all are prepared anew.
-constexpr int CachedStatements = 64;
+/// Statements that stay prepared; more than these and all are prepared anew.
+constexpr std::size_t CachedStatements = 64;
 /// Bytes to which the journal shrinks again after a long scan made it grow.
 constexpr auto JournalLimit = "PRAGMA journal_size_limit=16777216";
 
@@ -39,6 +39,7 @@ SqliteHandle::SqliteHandle(const QString& path, Role role, int timeoutSeconds) {
 
 SqliteHandle::~SqliteHandle() {
     cache_.clear();
+    queries_.clear();
     // Row sets may still hold their statements; the last of them closes for good.
     sqlite3_close_v2(db_);
 }
@@ -61,10 +62,27 @@ SqliteStatement SqliteHandle::prepare(const QByteArray& text) {
     return owned;
 }
 
+std::unique_ptr<SqliteQuery> SqliteHandle::take(const QString& key) {
+    const auto found = queries_.find(key);
+    if (found == queries_.end()) return nullptr;
+    std::unique_ptr<SqliteQuery> query = std::move(found->second);
+    queries_.erase(found);
+    return query;
+}
+
+void SqliteHandle::keep(std::unique_ptr<SqliteQuery> query) {
+    if (query->key.isEmpty()) return;
+    sqlite3_reset(query->statement.get());
+    sqlite3_clear_bindings(query->statement.get());
+    if (queries_.size() >= CachedStatements) queries_.clear();
+    QString key = query->key;
+    queries_.insert_or_assign(std::move(key), std::move(query));
+}
+
 sqlite3_stmt* SqliteHandle::cached(const QByteArray& text) {
     auto found = cache_.constFind(text);
     if (found == cache_.constEnd()) {
-        if (cache_.size() >= CachedStatements) cache_.clear();
+        if (static_cast<std::size_t>(cache_.size()) >= CachedStatements) cache_.clear();
         sqlite3_stmt* statement = nullptr;
         if (sqlite3_prepare_v3(db_, text.constData(), static_cast<int>(text.size()) + 1,
                                SQLITE_PREPARE_PERSISTENT, &statement, nullptr) != SQLITE_OK)

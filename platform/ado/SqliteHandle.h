@@ -7,6 +7,9 @@
 #include <QHash>
 #include <QString>
 #include <memory>
+#include <unordered_map>
+
+#include "platform/ado/Session.h"
 
 namespace ado {
 
@@ -15,6 +18,14 @@ struct SqliteFinalize {
     void operator()(sqlite3_stmt* statement) const { sqlite3_finalize(statement); }
 };
 using SqliteStatement = std::unique_ptr<sqlite3_stmt, SqliteFinalize>;
+
+/// A query that stays prepared, with what was asked about its columns. `key` is empty for one that
+/// is not worth keeping.
+struct SqliteQuery {
+    QString key;
+    SqliteStatement statement;
+    std::vector<Column> described;
+};
 
 /// One open handle on a book, with the collation of this system and its settings. Failures carry
 /// the engine's text and its extended result code.
@@ -33,6 +44,9 @@ public:
 
     /// Prepares the text, all of it: a second statement in it is refused.
     SqliteStatement prepare(const QByteArray& text);
+    /// A query kept by keep() under that text; null when there is none, or it is in use.
+    std::unique_ptr<SqliteQuery> take(const QString& key);
+    void keep(std::unique_ptr<SqliteQuery> query);
     /// A statement of this layer's own, prepared once and reset; valid until the next call.
     sqlite3_stmt* cached(const QByteArray& text);
     void execute(const char* text);
@@ -44,6 +58,7 @@ private:
     sqlite3* db_ = nullptr;
     int timeout_ = -1;
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
+    std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
 };
 
 }  // namespace ado

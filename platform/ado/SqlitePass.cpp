@@ -12,36 +12,45 @@ constexpr qint64 LongPass = 32;
 
 }  // namespace
 
-SqlitePass::SqlitePass(std::shared_ptr<SqliteSession> session, const QByteArray& text,
+SqlitePass::SqlitePass(std::shared_ptr<SqliteSession> session, const Statement& statement,
                        bool withIdentity)
     : session_(std::move(session)), reader_(session_->takeReader()), first_(withIdentity ? 1 : 0) {
     try {
-        statement_ = reader_->prepare(text);
+        query_ = session_->prepare(*reader_, statement, withIdentity);
     } catch (...) {
-        session_->giveBack(std::move(reader_));
+        session_->giveBack(reader_);
         throw;
     }
-    columns_ = sqlite3_column_count(statement_.get()) - first_;
+    statement_ = query_->statement.get();
+    columns_ = sqlite3_column_count(statement_) - first_;
 }
 
 SqlitePass::~SqlitePass() {
     release();
+    reader_->keep(std::move(query_));
+}
+
+/// The table was altered since the query was prepared.
+void SqlitePass::describeAnew() {
+    query_->described.clear();
+    columns_ = sqlite3_column_count(statement_) - first_;
 }
 
 const Column& SqlitePass::column(int column) const {
-    if (described_.empty()) described_.resize(static_cast<std::size_t>(columns_));
-    Column& known = described_[static_cast<std::size_t>(column)];
+    std::vector<Column>& described = query_->described;
+    if (described.empty()) described.resize(static_cast<std::size_t>(columns_));
+    Column& known = described[static_cast<std::size_t>(column)];
     if (known.name.isNull())
-        known = describe(sqlite3_column_name(statement_.get(), column + first_),
-                         sqlite3_column_decltype(statement_.get(), column + first_));
+        known = describe(sqlite3_column_name(statement_, column + first_),
+                         sqlite3_column_decltype(statement_, column + first_));
     return known;
 }
 
 int SqlitePass::indexOf(QStringView name) const {
     const QByteArray wanted = name.toUtf8();
     for (int column = 0; column < columns_; ++column)
-        if (sqlite3_stricmp(sqlite3_column_name(statement_.get(), column + first_),
-                            wanted.constData()) == 0)
+        if (sqlite3_stricmp(sqlite3_column_name(statement_, column + first_), wanted.constData()) ==
+            0)
             return column;
     return -1;
 }
@@ -51,25 +60,28 @@ bool SqlitePass::step() {
         reader_->run(reader_->cached("BEGIN"));
         held_ = true;
     }
-    const int result = sqlite3_step(statement_.get());
+    const int result = sqlite3_step(statement_);
+    if (steps_ == 1 && sqlite3_stmt_status(statement_, SQLITE_STMTSTATUS_REPREPARE, 1) > 0)
+        describeAnew();
     if (result == SQLITE_ROW) return true;
     if (result != SQLITE_DONE) reader_->fail();
     return false;
 }
 
 Cell SqlitePass::cell(int column) const {
-    return cellOf(statement_.get(), column + first_);
+    return cellOf(statement_, column + first_);
 }
 
 void SqlitePass::restart() {
-    sqlite3_reset(statement_.get());
+    sqlite3_reset(statement_);
 }
 
 void SqlitePass::release() {
-    if (!reader_) return;
-    sqlite3_reset(statement_.get());
+    if (!leased_) return;
+    leased_ = false;
+    sqlite3_reset(statement_);
     if (held_) sqlite3_exec(reader_->get(), "COMMIT", nullptr, nullptr, nullptr);
-    session_->giveBack(std::move(reader_));
+    session_->giveBack(reader_);
 }
 
 }  // namespace ado

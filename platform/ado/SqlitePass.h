@@ -8,8 +8,9 @@ namespace ado {
 /// A statement being stepped on a reader of its own.
 class SqlitePass final : public Pass {
 public:
-    /// `withIdentity`: the statement's first column is the row identity.
-    SqlitePass(std::shared_ptr<SqliteSession> session, const QByteArray& text, bool withIdentity);
+    /// `withIdentity`: the row identity stands before the statement's columns.
+    SqlitePass(std::shared_ptr<SqliteSession> session, const Statement& statement,
+               bool withIdentity);
     ~SqlitePass() override;
 
     int columnCount() const override { return columns_; }
@@ -18,20 +19,23 @@ public:
     bool step() override;
     Cell cell(int column) const override;
     RowIdentity identity() const override {
-        return first_ == 0 ? 0 : sqlite3_column_int64(statement_.get(), 0);
+        return first_ == 0 ? 0 : sqlite3_column_int64(statement_, 0);
     }
     void restart() override;
     void release() override;
 
 private:
+    void describeAnew();
+
     std::shared_ptr<SqliteSession> session_;
-    std::unique_ptr<SqliteHandle> reader_;
-    SqliteStatement statement_;
-    int first_;  ///< the statement's column that is this pass's column 0
-    int columns_;
+    std::shared_ptr<SqliteHandle> reader_;  ///< outlives the query, also when others step on it
+    std::unique_ptr<SqliteQuery> query_;
+    sqlite3_stmt* statement_ = nullptr;  ///< of the query
+    int first_;                          ///< the statement's column that is this pass's column 0
+    int columns_ = 0;
     qint64 steps_ = 0;
-    bool held_ = false;  ///< a transaction keeps the rows as they were at the start
-    mutable std::vector<Column> described_;
+    bool leased_ = true;  ///< nobody else steps on the reader
+    bool held_ = false;   ///< a transaction keeps the rows as they were at the start
 };
 
 }  // namespace ado

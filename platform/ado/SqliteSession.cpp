@@ -3,6 +3,7 @@
 
 #include <QDir>
 
+#include "platform/ado/LiftedStatement.h"
 #include "platform/ado/RowStore.h"
 #include "platform/ado/SqlitePass.h"
 #include "platform/ado/SqliteTypes.h"
@@ -41,21 +42,21 @@ SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int 
     }
 }
 
-std::unique_ptr<SqliteHandle> SqliteSession::takeReader() {
+std::shared_ptr<SqliteHandle> SqliteSession::takeReader() {
     reader();
-    std::unique_ptr<SqliteHandle> taken = std::move(readers_.back());
+    std::shared_ptr<SqliteHandle> taken = std::move(readers_.back());
     readers_.pop_back();
     return taken;
 }
 
-void SqliteSession::giveBack(std::unique_ptr<SqliteHandle> reader) {
+void SqliteSession::giveBack(std::shared_ptr<SqliteHandle> reader) {
     if (readers_.size() < IdleReaders) readers_.push_back(std::move(reader));
 }
 
 SqliteHandle& SqliteSession::reader() {
     if (readers_.empty())
         readers_.push_back(
-            std::make_unique<SqliteHandle>(path_, SqliteHandle::Role::Reader, timeout_));
+            std::make_shared<SqliteHandle>(path_, SqliteHandle::Role::Reader, timeout_));
     readers_.back()->setTimeout(timeout_);
     return *readers_.back();
 }
@@ -73,8 +74,30 @@ void SqliteSession::setTimeout(int seconds) {
 
 std::shared_ptr<Pass> SqliteSession::open(const Statement& statement, const QString& table) {
     const bool withIdentity = !table.isEmpty();
-    const QString text = translate(statement, *this, withIdentity);
-    return std::make_shared<SqlitePass>(shared_from_this(), text.toUtf8(), withIdentity);
+    return std::make_shared<SqlitePass>(shared_from_this(), statement, withIdentity);
+}
+
+// Translating and preparing cost more than running a small statement. Those that the daily work
+// sends again and again differ only in the values of their conditions and are prepared once.
+std::unique_ptr<SqliteQuery> SqliteSession::prepare(SqliteHandle& handle,
+                                                    const Statement& statement, bool withIdentity) {
+    const auto lifted = LiftedStatement::from(statement);
+    if (!lifted) {
+        auto query = std::make_unique<SqliteQuery>();
+        query->statement = handle.prepare(translate(statement, *this, withIdentity).toUtf8());
+        return query;
+    }
+    const QString key = withIdentity ? u'*' + lifted->text : lifted->text;
+    std::unique_ptr<SqliteQuery> query = handle.take(key);
+    if (!query) {
+        const QString text = translate(Statement(lifted->text), *this, withIdentity);
+        query = std::make_unique<SqliteQuery>();
+        query->statement = handle.prepare(text.toUtf8());
+        query->key = key;
+    }
+    int parameter = 0;
+    for (const Cell& value : lifted->values) bind(query->statement.get(), ++parameter, value);
+    return query;
 }
 
 bool SqliteSession::isTable(QStringView name) {

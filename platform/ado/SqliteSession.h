@@ -33,8 +33,11 @@ public:
     std::optional<ColumnType> columnType(QStringView table, QStringView column) override;
 
     // For the passes: a reader that nobody else steps on, and its way back.
-    std::unique_ptr<SqliteHandle> takeReader();
-    void giveBack(std::unique_ptr<SqliteHandle> reader);
+    std::shared_ptr<SqliteHandle> takeReader();
+    void giveBack(std::shared_ptr<SqliteHandle> reader);
+    /// The statement, prepared on that reader, its values bound.
+    std::unique_ptr<SqliteQuery> prepare(SqliteHandle& reader, const Statement& statement,
+                                         bool withIdentity);
 
 private:
     SqliteHandle& reader();
@@ -46,7 +49,7 @@ private:
 
     QString path_;
     int timeout_;
-    std::vector<std::unique_ptr<SqliteHandle>> readers_;  ///< idle ones
+    std::vector<std::shared_ptr<SqliteHandle>> readers_;  ///< idle ones
     std::unique_ptr<SqliteHandle> writer_;                ///< opened by the first write
     SqliteLocks locks_;
 };

@@ -122,4 +122,21 @@ void bind(sqlite3_stmt* statement, int parameter, const QVariant& value) {
     }
 }
 
+void bind(sqlite3_stmt* statement, int parameter, const Cell& value) {
+    switch (value.kind) {
+        case Cell::Null:
+            sqlite3_bind_null(statement, parameter);
+            break;
+        case Cell::Integer:
+            sqlite3_bind_int64(statement, parameter, value.integer);
+            break;
+        case Cell::Real:
+            sqlite3_bind_double(statement, parameter, value.real);
+            break;
+        case Cell::Text:
+            sqlite3_bind_text(statement, parameter, value.text.data(),
+                              static_cast<int>(value.text.size()), SQLITE_TRANSIENT);
+    }
+}
+
 }  // namespace ado

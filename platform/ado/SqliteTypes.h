@@ -22,5 +22,6 @@ Cell cellOf(sqlite3_stmt* statement, int column);
 /// Binds a value that was converted to its column's type. Amounts that a binary number does not
 /// hold to the fourth decimal fail with Overflow.
 void bind(sqlite3_stmt* statement, int parameter, const QVariant& value);
+void bind(sqlite3_stmt* statement, int parameter, const Cell& value);
 
 }  // namespace ado
