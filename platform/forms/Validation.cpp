@@ -65,7 +65,9 @@ protected:
                 // The second half of a press that was swallowed.
                 return watched->isWindowType() && swallowed_;
             case QEvent::Shortcut:
-                return watched->isWidgetType() && holdsShortcut(static_cast<QWidget*>(watched));
+                return watched->isWidgetType() &&
+                       holdsShortcut(static_cast<QWidget*>(watched),
+                                     static_cast<QShortcutEvent*>(event));
             case QEvent::KeyPress:
                 return watched->isWidgetType() &&
                        holdsKey(static_cast<QWidget*>(watched), static_cast<QKeyEvent*>(event));
@@ -123,7 +125,7 @@ private:
             QMetaObject::invokeMethod(receiver, "click", Qt::QueuedConnection);
     }
 
-    bool holdsShortcut(QWidget* widget) {
+    bool holdsShortcut(QWidget* widget, const QShortcutEvent* shortcut) {
         agreed_.clear();
         const auto* label = qobject_cast<QLabel*>(widget);
         const QPointer<QWidget> target = label && label->buddy() ? label->buddy() : widget;
@@ -132,7 +134,12 @@ private:
         // A pressed accelerator takes the focus along, as a click does.
         if (target && target->isEnabled() && (target->focusPolicy() & Qt::TabFocus))
             target->setFocus(Qt::ShortcutFocusReason);
-        return false;
+        auto* button = qobject_cast<QAbstractButton*>(target);
+        if (!button || shortcut->isAmbiguous()) return false;
+        // At once: by itself the button would stay pressed for a moment first, and what a quick
+        // typist does next would come before the click.
+        button->click();
+        return true;
     }
 
     bool holdsKey(QWidget* widget, const QKeyEvent* key) {
