@@ -41,8 +41,8 @@ private:
     forms::TextBox* txtContribuinte;
     forms::TextBox* txtNib;
     QLabel* lblNib;
-    forms::CheckBox* chkZelmar;
     forms::TextBox* txtCarencia;
+    forms::CheckBox* chkZelmar;
     forms::TextBox* txtMorada;
     forms::TextBox* txtCodigoPostal;
     forms::TextBox* txtLocalidade;

@@ -113,7 +113,9 @@ TEST_F(TiquetaFile, OkWritesWhatWasChangedAndNothingElse) {
         EXPECT_TRUE(person.find<QLineEdit>(u"txtNumero"_s)->isReadOnly());
         person.fill(u"txtNib"_s, u"PT50 0013 0000 00000000001 86"_s);
         EXPECT_EQ(field(u"txtNib"_s), QString::fromLatin1(ValidNib));
+        EXPECT_EQ(focus(), u"txtCarencia"_s);
         person.fill(u"txtCarencia"_s, u"1-2-2027"_s);
+        EXPECT_EQ(focus(), u"chkZelmar"_s);
         EXPECT_EQ(field(u"txtCarencia"_s), u"01-02-2027"_s);
         person.fill(u"txtLocalidade"_s, u"Évora d'Além"_s);
         person.click(u"chkZelmar"_s);
