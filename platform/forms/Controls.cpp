@@ -64,8 +64,10 @@ Frame::Frame(const QString& name, const QString& caption, QWidget* parent)
 
 void Frame::initStyleOption(QStyleOptionGroupBox* option) const {
     QGroupBox::initStyleOption(option);
-    option->textColor = blended(option->palette.color(QPalette::WindowText),
-                                option->palette.color(QPalette::Highlight), 0.85);
+    // The style draws the caption in this role and does not look at the option's text colour.
+    option->palette.setColor(QPalette::WindowText,
+                             blended(option->palette.color(QPalette::WindowText),
+                                     option->palette.color(QPalette::Highlight), 0.85));
 }
 
 ProgressBar::ProgressBar(const QString& name, QWidget* parent) : QProgressBar(parent) {

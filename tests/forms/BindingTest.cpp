@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
+#include <QApplication>
 #include <QDateTime>
 
 #include "platform/core/Failure.h"
@@ -241,6 +242,21 @@ TEST_F(Binding, ADateFieldCanBeEmptied) {
     EXPECT_EQ(screen.Desde.Text(), u"01-04-2026"_s);
     person.fill(u"Desde"_s, u""_s);
     EXPECT_TRUE(core::isNull(screen.Desde.Value()));
+}
+
+TEST_F(Binding, ADayIsPickedFromTheCalendarByKey) {
+    screen.Desde.setValue(core::fromDate({2026, 3, 5}));
+    person.click(u"Desde"_s);
+    person.press(Qt::Key_Down, Qt::AltModifier);
+    ASSERT_TRUE(QApplication::activePopupWidget());
+    person.press(Qt::Key_Right);
+    person.press(Qt::Key_Return);
+    EXPECT_FALSE(QApplication::activePopupWidget());
+    EXPECT_EQ(screen.Desde.Text(), u"06-03-2026"_s);
+    EXPECT_EQ(screen.finished, 0);
+    screen.Desde.setLocked(true);
+    person.press(Qt::Key_Down, Qt::AltModifier);
+    EXPECT_FALSE(QApplication::activePopupWidget());
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 
 #include <QApplication>
 #include <QLabel>
+#include <QMenu>
 #include <QPalette>
 
 #include "tests/forms/SampleBook.h"
@@ -64,6 +65,16 @@ TEST(Look, FieldsAreToldApartByColourInALightAndInADarkPalette) {
             person.screenshot(folder + (dark ? u"/dark.png"_s : u"/light.png"_s));
     }
     QApplication::setPalette(light);
+}
+
+TEST(Look, TheToolkitsOwnMenusSpeakPortuguese) {
+    const Held<SampleScreen> held;
+    const std::unique_ptr<QMenu> menu(held->Livre.createStandardContextMenu());
+    QStringList captions;
+    for (const QAction* action : menu->actions())
+        if (!action->isSeparator()) captions << action->text().section(u'\t', 0, 0);
+    EXPECT_EQ(captions.join(u' ').toStdString(),
+              "&Anular &Refazer Cor&tar &Copiar Co&lar Eliminar Seleccionar tudo");
 }
 
 TEST(Look, ALargerFontMakesALargerScreenWithoutCutting) {
