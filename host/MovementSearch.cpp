@@ -74,42 +74,53 @@ TypedDay typedDay(const QString& word) {
     return isMonth(second) && first >= 1 && first <= 31 ? TypedDay{first, second, 0} : TypedDay{};
 }
 
+/// A number without leading zeros; 0 for anything else.
+quint32 wholeNumber(const QString& word) {
+    return word.startsWith('0'_L1) ? 0 : word.toUInt();
+}
+
 }  // namespace
 
-/// One word of a filter. What it says of a person is worked out once a person, when first asked.
+/// One word of a filter. What it says of the persons is worked out once for all, in the order in
+/// which their names lie in memory.
 class MovementSearch::Word {
 public:
     Word(const MovementSearch& search, const QString& text)
         : search_(search),
-          text_(folded(text)),
-          beginning_(wordsOf(text)),
-          inDocument_(' ' + text_),
+          inDocument_(' ' + folded(text).toStdString()),
           day_(typedDay(text)),
-          persons_(search.persons_.size(), Unknown) {
-        for (const QByteArray& type : search.types_) types_.push_back(type == text_);
-        bool isNumber = false;
-        number_ = text.toUInt(&isNumber);
-        if (!isNumber || text.startsWith('0'_L1)) number_ = 0;
+          number_(wholeNumber(text)) {
+        for (const QByteArray& type : search.types_)
+            fitsType_.push_back(type == folded(text) ? 1 : 0);
+        askPersons(wordsOf(text).toStdString());
     }
 
     bool fits(const Entry& entry) const {
-        return types_[entry.type] || fitsPerson(entry.person) || fitsNumber(entry.number) ||
-               fitsDocument(entry) || fitsDay(entry.day);
+        return fitsType_[entry.type] || fitsPerson_[entry.person] || fitsNumber(entry.number) ||
+               isIn(inDocument_, search_.text(entry.document, entry.documentSize)) ||
+               fitsDay(entry.day);
     }
 
 private:
-    enum State : quint8 { Unknown, No, Yes };
-
-    bool fitsPerson(quint32 person) const {
-        quint8& state = persons_[person];
-        if (state == Unknown) state = isNamed(person) ? Yes : No;
-        return state == Yes;
+    /// Whether a word of the text begins so. Looks at the blanks only, one before each word.
+    static bool isIn(std::string_view beginning, std::string_view text) {
+        if (beginning.size() < 2) return false;
+        std::size_t at = 0;
+        while (at != std::string_view::npos && at + beginning.size() <= text.size()) {
+            if (text[at + 1] == beginning[1] && text.substr(at, beginning.size()) == beginning)
+                return true;
+            at = text.find(' ', at + 1);
+        }
+        return false;
     }
-    bool isNamed(quint32 person) const {
-        const Person& known = search_.persons_[person];
-        if (beginning_.isEmpty()) return false;
-        return search_.text(known.words, known.wordsSize).contains(beginning_) ||
-               (known.member != person && fitsPerson(known.member));
+    void askPersons(const std::string& words) {
+        fitsPerson_.resize(search_.persons_.size(), 0);
+        for (std::size_t at = 0; at < fitsPerson_.size(); ++at) {
+            const Person& person = search_.persons_[at];
+            fitsPerson_[at] = isIn(words, search_.text(person.words, person.wordsSize)) ? 1 : 0;
+        }
+        for (std::size_t at = 0; at < fitsPerson_.size(); ++at)
+            fitsPerson_[at] |= fitsPerson_[search_.persons_[at].member];
     }
     bool fitsNumber(qint32 number) const {
         if (number_ == 0 || number <= 0) return false;
@@ -117,21 +128,16 @@ private:
         while (rest > number_) rest /= 10;
         return rest == number_;
     }
-    bool fitsDocument(const Entry& entry) const {
-        return search_.text(entry.document, entry.documentSize).contains(inDocument_);
-    }
     bool fitsDay(qint32 day) const {
         return day_.isGiven() && day != 0 && day_.fits(QDate::fromJulianDay(day));
     }
 
     const MovementSearch& search_;
-    QByteArray text_;
-    QByteArray beginning_;
-    QByteArray inDocument_;
+    std::string inDocument_;
     TypedDay day_;
-    quint32 number_ = 0;
-    std::vector<bool> types_;
-    mutable std::vector<quint8> persons_;
+    quint32 number_;  // 0 for none
+    std::vector<quint8> fitsType_;
+    std::vector<quint8> fitsPerson_;
 };
 
 void MovementSearch::append(const MovementKey& movement) {
@@ -175,41 +181,41 @@ MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
                       quint32(texts_.size()),
                       quint16(document.size()),
                       positionOf(folded(movement.tipo), types_)};
-    texts_ += document;
+    texts_.append(document.constData(), size_t(document.size()));
     return entry;
 }
 
 quint32 MovementSearch::memberAt(qint32 socio_id) {
-    return personAt(quint64(quint32(socio_id)) << 16);
+    const quint64 key = quint64(quint32(socio_id)) << 16;
+    const auto known = personAt_.constFind(key);
+    return known != personAt_.constEnd() ? *known : addPerson(key, quint32(persons_.size()));
 }
 
 quint32 MovementSearch::relativeAt(qint32 socio_id, const QString& codABC) {
-    const quint32 member = memberAt(socio_id);
-    if (codABC.isEmpty()) return member;
+    if (codABC.isEmpty()) return memberAt(socio_id);
     const auto code = quint64(positionOf(codABC.toUtf8(), codes_)) + 1;
-    const quint32 relative = personAt(quint64(quint32(socio_id)) << 16 | code);
-    persons_[relative].member = member;
-    return relative;
+    const quint64 key = quint64(quint32(socio_id)) << 16 | code;
+    const auto known = personAt_.constFind(key);
+    return known != personAt_.constEnd() ? *known : addPerson(key, memberAt(socio_id));
 }
 
-quint32 MovementSearch::personAt(quint64 key) {
-    const auto known = personAt_.constFind(key);
-    if (known != personAt_.constEnd()) return *known;
+quint32 MovementSearch::addPerson(quint64 key, quint32 member) {
     const auto person = quint32(persons_.size());
-    persons_.push_back({person, 0, 0});
+    persons_.push_back({member, 0, 0});
     personAt_.insert(key, person);
     return person;
 }
 
 void MovementSearch::name(quint32 person, const QByteArray& words) {
-    if (text(persons_[person].words, persons_[person].wordsSize) == words) return;
+    const std::string_view known = text(persons_[person].words, persons_[person].wordsSize);
+    if (known == std::string_view(words.constData(), size_t(words.size()))) return;
     persons_[person].words = quint32(texts_.size());
     persons_[person].wordsSize = quint16(std::min(words.size(), LongestText));
-    texts_ += words;
+    texts_.append(words.constData(), persons_[person].wordsSize);
 }
 
-QByteArrayView MovementSearch::text(quint32 from, quint16 size) const {
-    return QByteArrayView(texts_).sliced(from, size);
+std::string_view MovementSearch::text(quint32 from, quint16 size) const {
+    return std::string_view(texts_).substr(from, size);
 }
 
 }  // namespace host

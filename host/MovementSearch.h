@@ -5,6 +5,8 @@
 #include <QDate>
 #include <QHash>
 #include <QString>
+#include <string>
+#include <string_view>
 #include <vector>
 
 namespace host {
@@ -70,16 +72,16 @@ private:
     Entry entryOf(const MovementKey& movement);
     quint32 memberAt(qint32 socio_id);
     quint32 relativeAt(qint32 socio_id, const QString& codABC);
-    quint32 personAt(quint64 key);
+    quint32 addPerson(quint64 key, quint32 member);
     void name(quint32 person, const QByteArray& words);
-    QByteArrayView text(quint32 from, quint16 size) const;
+    std::string_view text(quint32 from, quint16 size) const;
 
     std::vector<Entry> entries_;
     std::vector<Person> persons_;
-    QHash<quint64, quint32> personAt_;
+    QHash<quint64, quint32> personAt_;  // by socio_id and, below it, the position in codes_ plus 1
     std::vector<QByteArray> types_;
     std::vector<QByteArray> codes_;
-    QByteArray texts_;  // folded; each word behind a blank
+    std::string texts_;  // folded; each word behind a blank
     qint32 newest_ = 0;
 };
 

@@ -19,8 +19,8 @@ namespace {
 
 constexpr int FirstMovements = 300;  // more than any screen shows
 
-// Usual widths, in characters of the list's font; the name takes what is left.
-constexpr int Widths[MovementRow::ColumnCount] = {8, 11, 10, 30, 28, 6, 15, 13, 13, 13};
+// Usual widths, in digits of the list's font; the name takes what is left.
+constexpr int Widths[MovementRow::ColumnCount] = {8, 12, 9, 34, 34, 6, 14, 13, 13, 13};
 
 QTableView* movementTable(MovementList* movements) {
     auto* list = new QTableView;
@@ -39,7 +39,8 @@ QTableView* movementTable(MovementList* movements) {
     list->horizontalHeader()->setHighlightSections(false);
     list->horizontalHeader()->setSectionsMovable(false);
     for (int column = 0; column < MovementRow::ColumnCount; ++column)
-        list->setColumnWidth(column, list->fontMetrics().averageCharWidth() * Widths[column]);
+        list->setColumnWidth(column,
+                             list->fontMetrics().horizontalAdvance('0'_L1) * Widths[column]);
     list->horizontalHeader()->setSectionResizeMode(MovementRow::Name, QHeaderView::Stretch);
     return list;
 }
@@ -70,6 +71,7 @@ void MovementsView::layOut() {
     filter_->setClearButtonEnabled(true);
     auto* filterRow = new QHBoxLayout;
     filterRow->setContentsMargins(10, 8, 10, 8);
+    filterRow->setSpacing(8);
     filterRow->addWidget(forms::fieldLabel(u"&Filtro:"_s, filter_, u"Label1"_s));
     filterRow->addWidget(filter_);
 

@@ -4,6 +4,7 @@
 #include <QAbstractButton>
 #include <QDir>
 #include <QLineEdit>
+#include <QTableView>
 #include <QTemporaryDir>
 #include <QTextStream>
 
@@ -44,6 +45,18 @@ std::function<bool(QWidget*)> canPress(const QString& button) {
     return [button](QWidget* screen) {
         const auto* found = screen->findChild<QAbstractButton*>(button);
         return found && found->isEnabled();
+    };
+}
+
+/// The first row of the screen's list has such a text in one of its columns.
+std::function<bool(QWidget*)> listBeginsWith(const QString& text) {
+    return [text](QWidget* screen) {
+        const auto* list = screen->findChild<QTableView*>();
+        if (!list || !list->model()) return false;
+        const QAbstractItemModel& rows = *list->model();
+        for (int column = 0; column < rows.columnCount(); ++column)
+            if (rows.index(0, column).data().toString() == text) return true;
+        return false;
     };
 }
 
@@ -90,7 +103,9 @@ public:
     }
 
     void view() {
-        player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Home>"_s, u"<Return>"_s}));
+        player_.step(u"frmPrincipal"_s, {}, typing({u"<F5>"_s}));
+        player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Home>"_s, u"<Return>"_s}),
+                     listBeginsWith(u"H-2001"_s));
         player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
     }
 
@@ -98,7 +113,8 @@ public:
         open({}, Operations::newDocument(false));
         player_.step(u"frmMovimentos"_s, {}, typing({u"<Alt+P>"_s}), shows(u"Text8"_s));
         player_.step(u"frmProcurar"_s, {}, typing({u"silva ant"_s}));
-        player_.step(u"frmProcurar"_s, u"13-procurar"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmProcurar"_s, u"13-procurar"_s, typing({u"<Escape>"_s}),
+                     listBeginsWith(GoodMember));
         player_.step(u"frmMovimentos"_s, {},
                      typing({u"<Shift+Tab>"_s, MemberWithoutNib, u"<Tab>"_s}));
         player_.step(u"box:Quer ver o extrato"_s, {}, typing({u"<Alt+S>"_s}));

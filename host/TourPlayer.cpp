@@ -63,8 +63,8 @@ bool TourPlayer::fits(const Step& step, QWidget* front) const {
 }
 
 void TourPlayer::tick() {
-    // A step that opens a modal screen is still on the stack while the next ones are played; a timer
-    // never fires inside its own handler, so each tick starts the next one.
+    // A step that opens a modal screen is still on the stack while the next ones are played; a
+    // timer never fires inside its own handler, so each tick starts the next one.
     clock_.start(TickMilliseconds);
     if (acting_) return;
     if (failed_) return giveUp();

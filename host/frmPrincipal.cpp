@@ -125,6 +125,7 @@ void frmPrincipal::addStatusLine() {
     book_->setObjectName(u"Livro"_s);
     user_ = new QLabel;
     user_->setObjectName(u"Utilizador"_s);
+    for (QLabel* label : {count_, book_, user_}) label->setContentsMargins(8, 0, 8, 0);
     statusBar()->addWidget(count_, 1);
     statusBar()->addPermanentWidget(book_);
     statusBar()->addPermanentWidget(user_);
