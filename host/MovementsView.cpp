@@ -219,16 +219,18 @@ void MovementsView::filterChanged(const QString& text) {
     showCount();
 }
 
-/// Changes the list and puts the person back onto the same movement at the same height.
+/// Changes the list and puts the person back onto the same movement at the same height. Who looks
+/// at the top goes on looking at the top, where what is new appears.
 template <class Change>
 void MovementsView::keepingPlace(Change&& change) {
     const QModelIndex current = list_->currentIndex();
     const qint32 key = current.isValid() ? movements_->movimento_id(current.row()) : 0;
-    const int rowsAbove = current.row() - list_->verticalScrollBar()->value();
+    const int above = list_->verticalScrollBar()->value();
+    const int rowsAbove = current.row() - above;
     change();
-    const int row = movements_->rowOf(key);
-    list_->selectRow(std::max(row, 0));
-    if (row > 0) list_->verticalScrollBar()->setValue(row - rowsAbove);
+    const int row = std::max(movements_->rowOf(key), 0);
+    list_->selectRow(row);
+    list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
 }
 
 void MovementsView::showUnreadable(const QString& text) {

@@ -239,6 +239,19 @@ TEST_F(PrincipalWindow, APostedMovementAppearsWhenThePersonComesBack) {
     EXPECT_EQ(cell(0, 0), u"4"_s);
 }
 
+TEST_F(PrincipalWindow, NewMovementsShowAtTheTopAndKeepTheOneInHand) {
+    for (int number = 10; number < 110; ++number) post(number, member_, "DOC", 1);
+    const auto window = opened();
+    auto* list = person_.find<QTableView>(u"Lista"_s);
+    person_.press(Qt::Key_Down);  // to the list
+    person_.press(Qt::Key_Down);
+    post(200, member_, "DOC", 1);
+    QEvent back(QEvent::WindowActivate);
+    QCoreApplication::sendEvent(window.get(), &back);
+    EXPECT_EQ(list->indexAt({5, 5}).data().toString(), u"200"_s);
+    EXPECT_EQ(list->currentIndex().siblingAtColumn(0).data().toString(), u"108"_s);
+}
+
 TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
     const auto window = opened();
     QWidget entry;
