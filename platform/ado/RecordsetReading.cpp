@@ -64,7 +64,7 @@ void Recordset::Implementation::openShape(const Statement& statement) {
     // One pass over the children; those of no parent are not kept.
     chapter->description = engine.open(child, {});
     const int childColumn = requireColumn(*chapter->description, shape.childColumn);
-    while (chapter->description->step()) {
+    while (!chapter->byKey.isEmpty() && chapter->description->step()) {
         const auto of = chapter->byKey.constFind(keyOf(chapter->description->cell(childColumn)));
         if (of != chapter->byKey.constEnd()) (*of)->append(*chapter->description);
     }

@@ -284,6 +284,11 @@ std::optional<ColumnType> Translation::typeOf(const ColumnName& column) {
 }
 
 void Translation::orderTerms() {
+    // The engine takes an order of its own kind behind a UNION of groups only from around it.
+    if (compound_) {
+        edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
+        edits_.insert(s.token(order_).at, u") "_s);
+    }
     const int end = limit_ > order_ ? limit_ : s.count();
     int depth = 0;
     int first = order_ + 2;

@@ -84,6 +84,23 @@ TEST(Reading, KeepsDifferencesOfAmountsExact) {
     EXPECT_EQ(all(rows, u"s"_s), u"2"_s);
 }
 
+TEST(Reading, OrdersAUnionOfGroupsByAColumnOfItsFirstPart) {
+    SmallBook book;
+    book.exec(
+        u"INSERT INTO tbHosp VALUES(1,'a','Luz'), (2,'b','Évora'); CREATE TABLE tbVelho AS SELECT "
+        u"* "
+        u"FROM tbMov; INSERT INTO tbMov(socio, valor) VALUES(1, 5), (2, 6); INSERT INTO "
+        u"tbVelho(socio, valor) VALUES(1, 7)"_s);
+    const QString part =
+        u"SELECT %1.socio, tbHosp.nome AS hospital FROM %1 LEFT JOIN tbHosp ON %1.socio = "
+        u"tbHosp.hosp_id GROUP BY %1.socio, tbHosp.nome "_s;
+    const auto rows = openRows(
+        part.arg(u"tbMov"_s) + u"UNION "_s + part.arg(u"tbVelho"_s) + u"ORDER BY tbHosp.nome"_s,
+        book.connect());
+    EXPECT_EQ(rows->Fields(u"hospital"_s).DefinedSize(), 40);
+    EXPECT_EQ(all(rows, u"hospital"_s), u"Évora,Luz"_s);
+}
+
 TEST(Reading, ReadsDatesOfStatementsAsMonthDayYear) {
     SmallBook book;
     book.exec(u"INSERT INTO tbMov(data) VALUES('2001-03-31 00:00:00'), ('2001-04-01 00:00:00')"_s);
@@ -188,6 +205,43 @@ TEST(Lists, ShowRowsWithoutMovingAndJumpToOne) {
     rows->MoveTo(70);
     EXPECT_EQ(rows->Collect(u"id"_s), QVariant(71));
     EXPECT_EQ(failureNumberOf([&] { rows->MoveTo(80); }), core::NoCurrentRow);
+}
+
+// Statements that differ in the values of their conditions only share one prepared query.
+TEST(RepeatedStatements, ReadWhatTheirOwnValuesSay) {
+    SmallBook book;
+    book.exec(
+        u"INSERT INTO tbMov(socio, nome, valor) VALUES(5,'5',1.5), (6,'x''y',-2), (7,'5.0',3)"_s);
+    const auto connection = book.connect();
+    const auto ids = [&](const QString& condition) {
+        return all(openRows(u"select * from tbMov where "_s + condition, connection), u"id"_s);
+    };
+    EXPECT_EQ(ids(u"socio = 5"_s), u"1"_s);
+    EXPECT_EQ(ids(u"socio = 6"_s), u"2"_s);
+    EXPECT_EQ(ids(u"socio = '6'"_s), u"2"_s);
+    EXPECT_EQ(ids(u"nome = '5'"_s), u"1"_s);
+    EXPECT_EQ(ids(u"nome = 5"_s), u"1"_s);
+    EXPECT_EQ(ids(u"nome = 'x''y'"_s), u"2"_s);
+    EXPECT_EQ(ids(u"valor = 1.5"_s), u"1"_s);
+    EXPECT_EQ(ids(u"valor < -1"_s), u"2"_s);
+    EXPECT_EQ(ids(u"socio = 1e0 * 7"_s), u"3"_s);
+    EXPECT_EQ(ids(u"socio = 99999999999999999999"_s), QString());
+    const auto first = openRows(u"select nome from tbMov where socio = 5"_s, connection);
+    const auto second = openRows(u"select nome from tbMov where socio = 6"_s, connection);
+    EXPECT_EQ(first->value(0), u"5"_s);
+    EXPECT_EQ(second->value(0), u"x'y"_s);
+}
+
+TEST(RepeatedStatements, FollowATableThatIsAltered) {
+    SmallBook book;
+    const auto connection = book.connect();
+    const QString text = u"select * from tbConta where proximo = 1"_s;
+    EXPECT_EQ(openRows(text, connection)->columnCount(), 1);
+    book.exec(
+        u"ALTER TABLE tbConta ADD COLUMN nota VARCHAR(7); INSERT INTO tbConta VALUES(1, 'a')"_s);
+    const auto rows = openRows(text, connection);
+    EXPECT_EQ(rows->Collect(u"nota"_s), u"a"_s);
+    EXPECT_EQ(rows->Fields(u"nota"_s).DefinedSize(), 7);
 }
 
 TEST(Recordsets, AreOpenOrClosed) {

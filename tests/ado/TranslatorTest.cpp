@@ -88,11 +88,11 @@ const Rule Rules[] = {
     {"OrderBehindUnion",
      u"SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM tbB ORDER BY "
      u"tbA.nome"_s,
-     u"SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM tbB ORDER BY "
-     u"quem COLLATE portuguese"_s},
+     u"SELECT * FROM (SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM "
+     u"tbB ) ORDER BY quem COLLATE portuguese"_s},
     {"OrderBehindUnionWithoutAlias",
      u"SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ORDER BY tbA.id"_s,
-     u"SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ORDER BY id"_s},
+     u"SELECT * FROM (SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ) ORDER BY id"_s},
 
     {"InsertionOrder", u"Select id from TBA where id > 5"_s,
      u"Select id from TBA where id > 5 ORDER BY \"TBA\"._rowid_"_s},
