@@ -46,7 +46,10 @@ target_compile_definitions(zelmars_warnings INTERFACE QT_NO_CAST_TO_ASCII QT_NO_
 
 # Precompiled headers: one for code without widgets, one for screens.
 function(zelmars_precompiled name qt headers)
-    file(WRITE ${CMAKE_BINARY_DIR}/pch/${name}.cpp "")
+    # Written once: a fresher file would have everything built anew.
+    if(NOT EXISTS ${CMAKE_BINARY_DIR}/pch/${name}.cpp)
+        file(WRITE ${CMAKE_BINARY_DIR}/pch/${name}.cpp "")
+    endif()
     add_library(${name} STATIC ${CMAKE_BINARY_DIR}/pch/${name}.cpp)
     target_link_libraries(${name} PRIVATE ${qt} zelmars_warnings)
     target_include_directories(${name} PRIVATE ${CMAKE_SOURCE_DIR})

@@ -12,21 +12,34 @@ namespace core {
 
 namespace {
 
-/// `magnitude` with two decimals, grouped or not, at least `wholeDigits` digits before the mark.
-QString twoDecimals(double magnitude, bool grouped, int wholeDigits) {
-    const QString plain = QString::number(magnitude, 'f', 2);
-    QString whole = plain.chopped(3).rightJustified(wholeDigits, u'0');
-    if (grouped)
-        for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, thousandsMark());
-    return whole + decimalMark() + plain.right(2);
+/// A number cut to cents for the eye, halves away from zero.
+struct Cents {
+    bool negative = false;
+    QString whole;  ///< digits before the mark
+    QString part;   ///< the two behind it
+    bool isZero() const { return whole == QStringLiteral("0") && part == QStringLiteral("00"); }
+};
+
+Cents cents(const QVariant& value) {
+    if (value.typeId() == qMetaTypeId<Money>()) {
+        // From the exact digits: a double does not hold all of them.
+        const qint64 units = value.value<Money>().units();
+        const qint64 rest = units % 100;
+        const qint64 rounded = units / 100 + (rest >= 50 ? 1 : rest <= -50 ? -1 : 0);
+        const QString digits = QString::number(rounded < 0 ? -rounded : rounded);
+        const QString padded = digits.rightJustified(3, u'0');
+        return {units < 0, padded.chopped(2), padded.right(2)};
+    }
+    const double number = toDouble(value);
+    const QString plain = QString::number(std::abs(number), 'f', 2);
+    return {number < 0, plain.chopped(3), plain.right(2)};
 }
 
-/// Amounts are cut to cents for the eye with halves away from zero, from their exact digits.
-double toCents(const QVariant& value) {
-    if (value.typeId() != qMetaTypeId<Money>()) return toDouble(value);
-    const qint64 units = value.value<Money>().units();
-    const qint64 cents = (units + (units < 0 ? -50 : 50)) / 100;
-    return static_cast<double>(cents) / 100.0;
+QString shown(const Cents& cents, bool grouped, int wholeDigits) {
+    QString whole = cents.whole.rightJustified(wholeDigits, u'0');
+    if (grouped)
+        for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, thousandsMark());
+    return whole + decimalMark() + cents.part;
 }
 
 bool isNumber(const QVariant& value) {
@@ -43,16 +56,17 @@ bool isNumber(const QVariant& value) {
 }
 
 QString formattedNumber(const QVariant& value, QStringView format) {
-    const double number = toCents(value);
+    if (format != format::Money && format != format::Amount && format != format::Rate)
+        return toText(value).replace(u'.', decimalMark());
+    const Cents rounded = cents(value);
+    // What shows as nothing has no sign.
+    const bool negative = rounded.negative && !rounded.isZero();
     if (format == format::Money) {
-        const QString shown = QStringLiteral("€ ") + twoDecimals(std::abs(number), true, 1);
-        // What shows as nothing has no sign.
-        return number < 0 && std::abs(number) >= 0.005 ? u'(' + shown + u')' : shown;
+        const QString amount = QStringLiteral("€ ") + shown(rounded, true, 1);
+        return negative ? u'(' + amount + u')' : amount;
     }
-    const QString sign = number < 0 && std::abs(number) >= 0.005 ? QStringLiteral("-") : QString();
-    if (format == format::Amount) return sign + twoDecimals(std::abs(number), true, 1);
-    if (format == format::Rate) return sign + twoDecimals(std::abs(number), false, 2);
-    return toText(value).replace(u'.', decimalMark());
+    const QString sign = negative ? QStringLiteral("-") : QString();
+    return sign + (format == format::Amount ? shown(rounded, true, 1) : shown(rounded, false, 2));
 }
 
 /// Takes the currency sign, brackets and sign off; false when they do not pair.
@@ -83,8 +97,7 @@ bool stripThousands(QString& whole) {
 }
 
 bool onlyDigits(QStringView text) {
-    return std::all_of(text.begin(), text.end(),
-                       [](QChar c) { return c >= u'0' && c <= u'9'; });
+    return std::all_of(text.begin(), text.end(), [](QChar c) { return c >= u'0' && c <= u'9'; });
 }
 
 }  // namespace
@@ -95,9 +108,13 @@ QLocale userLocale() {
                                            : system;
 }
 
-QChar decimalMark() { return userLocale().decimalPoint() == QStringLiteral(".") ? u'.' : u','; }
+QChar decimalMark() {
+    return userLocale().decimalPoint() == QStringLiteral(".") ? u'.' : u',';
+}
 
-QChar thousandsMark() { return decimalMark() == u',' ? u'.' : u','; }
+QChar thousandsMark() {
+    return decimalMark() == u',' ? u'.' : u',';
+}
 
 QString formatted(const QVariant& value, QStringView format) {
     if (isNull(value)) return {};
@@ -119,8 +136,8 @@ std::optional<QString> parseDecimal(const QString& typed) {
         return std::nullopt;
     QString plain = whole.isEmpty() ? QStringLiteral("0") : whole;
     if (!decimals.isEmpty()) plain += u'.' + decimals;
-    const bool zero = std::all_of(plain.begin(), plain.end(),
-                                  [](QChar c) { return c == u'0' || c == u'.'; });
+    const bool zero =
+        std::all_of(plain.begin(), plain.end(), [](QChar c) { return c == u'0' || c == u'.'; });
     return negative && !zero ? u'-' + plain : plain;
 }
 

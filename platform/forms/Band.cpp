@@ -80,7 +80,7 @@ QWidget* headingBand(const QString& title, const QString& explanation, const QSt
     large.setBold(true);
     titleLabel->setFont(large);
     QLabel* explanationLabel = bandLabel(explanation, explanationName);
-    explanationLabel->setVisible(!explanation.isEmpty());
+    if (explanation.isEmpty()) explanationLabel->hide();
 
     auto* texts = new QVBoxLayout;
     texts->setSpacing(2);
