@@ -2,6 +2,7 @@
 #include "tests/coverage/Desk.h"
 
 #include "boundary/environment/dtZelmars.h"
+#include "platform/com/Component.h"
 #include "platform/core/Clock.h"
 #include "platform/core/UserName.h"
 #include "platform/core/Values.h"
@@ -65,9 +66,24 @@ void Boxes::ask(const QString& text, core::Icon icon, const QString& title, core
     queue() << Box{text, icon, title, core::Buttons::YesNo, answer};
 }
 
+QStringList& FakeVorlane::calls() {
+    static QStringList calls;
+    return calls;
+}
+
+void FakeVorlane::Iniciar(qint16 steps, const QString& text, const QString& title) {
+    calls() << u"Iniciar(%1, %2, %3)"_s.arg(QString::number(steps), text, title);
+}
+
+void FakeVorlane::setvalor(qint16 steps) {
+    calls() << u"setvalor(%1)"_s.arg(steps);
+}
+
 const QString Desk::caption = u"Lançamento (Plano de Saúde)"_s;
 
 Desk::Desk() : socio(static_cast<qint32>(book.member({}))) {
+    FakeVorlane::calls().clear();
+    com::registerRunning(u"Vorlane.General"_s, [] { return new FakeVorlane; });
     core::setToday(QDate(2026, 5, 15));
     core::setUserName("operador");
     auto& environment = environment::dtZelmars::instance();
@@ -79,6 +95,7 @@ Desk::~Desk() {
     auto& environment = environment::dtZelmars::instance();
     environment.MSAccess()->Close();
     environment.SqlServer()->Close();
+    com::registerRunning(u"Vorlane.General"_s, {});
     core::setUserName({});
     core::setToday({});
     core::err().clear();

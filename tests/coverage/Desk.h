@@ -3,13 +3,14 @@
 
 #include <gtest/gtest.h>
 
+#include <QObject>
+#include <QStringList>
 #include <functional>
 #include <string>
 
 #include "coverage/Posting.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
-#include "tests/coverage/Companions.h"
 #include "tests/support/Book.h"
 
 inline void PrintTo(const QString& text, std::ostream* out) {
@@ -32,6 +33,22 @@ public:
     void ask(const QString& text, core::Icon icon, const QString& title, core::Answer answer);
 };
 
+/// Stands for the progress window. It notes what it is asked, one line a call: "setvalor(1)";
+/// "made" and "gone" tell of the object itself.
+class FakeVorlane : public QObject {
+    Q_OBJECT
+public:
+    FakeVorlane() { calls() << QStringLiteral("made"); }
+    ~FakeVorlane() override { calls() << QStringLiteral("gone"); }
+    static QStringList& calls();
+    /// How many times the bar went one step on.
+    static qsizetype steps() { return calls().count(QStringLiteral("setvalor(1)")); }
+
+    Q_INVOKABLE void Iniciar(qint16 steps, const QString& text, const QString& title);
+    Q_INVOKABLE void setvalor(qint16 steps);
+    Q_INVOKABLE void terminar() { calls() << QStringLiteral("terminar()"); }
+};
+
 /// What an operator has keyed in; the amounts in euros, null for an empty field.
 struct Document {
     QVariant rubrica_id;
@@ -43,7 +60,7 @@ struct Document {
 };
 
 /// A place where documents are entered: a book with one member in order, both connections open on
-/// it, companions without windows, a fixed day (15 May 2026) and operator ("operador").
+/// it, a progress window that only notes, a fixed day (15 May 2026) and operator ("operador").
 class Desk : public ::testing::Test {
 protected:
     Desk();
@@ -75,16 +92,10 @@ protected:
 
     static const QString caption;  ///< of the entry screen
     support::Book book;
-    Companions companions;
     Boxes boxes;
     qint32 socio;
     coverage::TryOut run;
 };
-
-/// How many times the progress bar went one step on.
-inline qsizetype progressSteps() {
-    return Companions::calls().count(QStringLiteral("Vorlane.setvalor(1)"));
-}
 
 /// The number of the failure that `statement` raises; 0 when it passes.
 int failureOf(const std::function<void()>& statement);

@@ -105,7 +105,7 @@ TEST_P(LowestRemainder, BindsTheDocument) {
     EXPECT_EQ(kept(entry, "debito"), kind == Kind::HospitalBill ? "1000"
                                      : expected < 0             ? "0"
                                                                 : amount);
-    EXPECT_EQ(progressSteps(), 22);
+    EXPECT_EQ(FakeVorlane::steps(), 22);
 }
 
 std::string ceilingName(const ::testing::TestParamInfo<CeilingCase>& at) {
@@ -152,8 +152,8 @@ TEST_P(Limits, AMinimumAboveTheValueEndsTheRunButLeavesItValid) {
     tryOut(entry);
     EXPECT_TRUE(run.bEnsaioValido);
     EXPECT_EQ(kept(entry, "comparticipacao"), "null");
-    EXPECT_EQ(progressSteps(), 1);
-    EXPECT_EQ(Companions::calls().mid(3), QStringList({u"Vorlane.terminar()"_s, u"Vorlane.~"_s}));
+    EXPECT_EQ(FakeVorlane::steps(), 1);
+    EXPECT_EQ(FakeVorlane::calls().mid(3), QStringList({u"terminar()"_s, u"gone"_s}));
     EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
 }
 
@@ -176,7 +176,7 @@ TEST_P(Limits, TheLastOfFiveDocumentsPasses) {
 TEST_P(Limits, ADocumentPastTheMaximumEndsTheRunButLeavesItValid) {
     accumulated(code, rubric, 0, 5);
     for (const int maximum : {5, 0}) {
-        Companions::calls().clear();
+        FakeVorlane::calls().clear();
         limit("nomax_recibos_socio", "nomax_recibos_familiar", maximum, 100);
         const coverage::Entry entry = document();
         boxes.expect(u"O limite máximo do nº de documentos foi atingido."_s,
@@ -185,8 +185,8 @@ TEST_P(Limits, ADocumentPastTheMaximumEndsTheRunButLeavesItValid) {
         EXPECT_TRUE(run.bEnsaioValido);
         EXPECT_EQ(kept(entry, "comparticipacao"), "80");
         EXPECT_EQ(kept(entry, "saldo_plafond"), "null");
-        EXPECT_EQ(progressSteps(), 13);
-        EXPECT_EQ(Companions::calls().last(), u"Vorlane.~"_s);
+        EXPECT_EQ(FakeVorlane::steps(), 13);
+        EXPECT_EQ(FakeVorlane::calls().last(), u"gone"_s);
     }
 }
 
@@ -276,7 +276,7 @@ TEST_F(Accumulators, AMainRubricThatIsGoneBindsNothingAndItsThreeStepsAreNotShow
         enter({.rubrica_id = book.childRubric({.rubrica_id_main = 9999, .socio = 60})});
     tryOut(entry);
     EXPECT_EQ(kept(entry, "credito"), "60");
-    EXPECT_EQ(progressSteps(), 19);
+    EXPECT_EQ(FakeVorlane::steps(), 19);
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a try-out refuses before it calculates, the minimum of a document, and the plan's share.
 #include "boundary/environment/dtZelmars.h"
+#include "platform/com/Component.h"
 #include "platform/core/Values.h"
 #include "tests/coverage/Desk.h"
 
@@ -59,12 +60,12 @@ TEST_F(TryOutChecks, TheFirstOfSeveralFaultsIsToldAndNothingIsWritten) {
          [](coverage::Entry& at) { at.Text9 = u"100"_s; }}};
     for (const Fault& fault : faults) {
         SCOPED_TRACE(fault.text.toStdString());
-        Companions::calls().clear();
+        FakeVorlane::calls().clear();
         run.bEnsaioValido = true;
         boxes.expect(fault.text, fault.icon, fault.title);
         tryOut(entry);
         EXPECT_FALSE(run.bEnsaioValido);
-        EXPECT_EQ(Companions::calls(), QStringList({u"Vorlane"_s, u"Vorlane.~"_s}));
+        EXPECT_EQ(FakeVorlane::calls(), QStringList({u"made"_s, u"gone"_s}));
         fault.mend(entry);
     }
     EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
@@ -77,13 +78,12 @@ TEST_F(TryOutChecks, AFullRunShowsItsTwentyTwoStepsAndEveryResult) {
     const coverage::Entry entry = enter({.rubrica_id = book.childRubric({.socio = 500})});
     tryOut(entry);
     EXPECT_TRUE(run.bEnsaioValido);
-    QStringList calls = Companions::calls();
-    EXPECT_EQ(calls.removeAll(u"Vorlane.setvalor(1)"_s), 22);
-    EXPECT_EQ(calls,
-              QStringList({u"Vorlane"_s,
-                           u"Vorlane.Iniciar(22, Evolução dos calculos, aguarde alguns momentos "
-                           ". . ., Processamento)"_s,
-                           u"Vorlane.terminar()"_s, u"Vorlane.~"_s}));
+    QStringList calls = FakeVorlane::calls();
+    EXPECT_EQ(calls.removeAll(u"setvalor(1)"_s), 22);
+    EXPECT_EQ(calls, QStringList({u"made"_s,
+                                  u"Iniciar(22, Evolução dos calculos, aguarde alguns momentos "
+                                  ". . ., Processamento)"_s,
+                                  u"terminar()"_s, u"gone"_s}));
     const auto shown = [](const std::optional<QVariant>& value) {
         return value ? core::toText(*value).toStdString() : "nothing";
     };
@@ -131,9 +131,9 @@ TEST_F(TryOutChecks, WithoutAPercentageNothingCanBePosted) {
     EXPECT_FALSE(post(entry));
     EXPECT_FALSE(run.bEnsaioValido);
     EXPECT_EQ(kept(entry, "incidencia"), "100");
-    EXPECT_EQ(progressSteps(), 2);
-    EXPECT_EQ(Companions::calls().count(u"Vorlane.terminar()"_s), 1);
-    EXPECT_EQ(Companions::calls().last(), u"Vorlane.~"_s);
+    EXPECT_EQ(FakeVorlane::steps(), 2);
+    EXPECT_EQ(FakeVorlane::calls().count(u"terminar()"_s), 1);
+    EXPECT_EQ(FakeVorlane::calls().last(), u"gone"_s);
     EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
     EXPECT_EQ(stored("select zelmars from tbContadores"), "1");
 }
@@ -192,7 +192,9 @@ INSTANTIATE_TEST_SUITE_P(
                   },
                   core::Overflow, true},
         Breakdown{"OfAMissingProgressWindow",
-                  [](support::Book&, coverage::Entry&) { Companions::withdraw(u"Vorlane"_s); },
+                  [](support::Book&, coverage::Entry&) {
+                      com::registerRunning(u"Vorlane.General"_s, {});
+                  },
                   core::CannotCreateObject, false}),
     [](const auto& at) { return std::string(at.param.name); });
 

@@ -37,7 +37,7 @@ protected:
             const qint64 main = book.rubric({.agregado = maybe(1500),
                                              .socio = maybe(800),
                                              .familiar = maybe(600),
-                                             .total_familia = maybe(1200)});
+                                             .total_familia = maybe(700)});
             for (int i = 0; i < RubricsPerGroup; ++i)
                 rubrics.push_back(book.rubric({.rubrica_id_main = main,
                                                .percent = 0.05 * (1 + below(20)),

@@ -12,13 +12,6 @@ class WriteFailure : public Desk {
 protected:
     WriteFailure() { tryOut(entry); }
 
-    /// Lets the book refuse a kind of write until mend().
-    void refuse(const QString& when) {
-        book.exec(
-            u"create trigger refuses before %1 begin select raise(abort, 'disco cheio'); end"_s.arg(
-                when));
-    }
-    void mend() { book.exec(u"drop trigger refuses"_s); }
     void expectFailureBoxes(const QString& description) {
         boxes.expect(description);
         boxes.expect(u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
@@ -36,41 +29,40 @@ protected:
     const coverage::Entry entry = enter({.rubrica_id = book.childRubric({})});
 };
 
-TEST_F(WriteFailure, OfTheMovementLosesItsNumber) {
-    refuse(u"insert on tbZelmar_Movimentos"_s);
-    expectFailureBoxes(u"disco cheio"_s);
-    EXPECT_FALSE(post(entry));
-    EXPECT_EQ(state(), "2|NULL|0 in 0");
-    mend();
+/// A write that fails, and what the book holds after it and after a second try.
+struct FailingWrite {
+    const char* name;
+    const char* write;
+    bool told;
+    const char* after;
+    const char* afterASecondTry;
+};
+
+class FailingWrites : public WriteFailure, public ::testing::WithParamInterface<FailingWrite> {};
+
+TEST_P(FailingWrites, LeaveWhatWasWrittenBeforeAndAfter) {
+    book.exec(
+        u"create trigger refuses before %1 begin select raise(abort, 'disco cheio'); end"_s.arg(
+            QLatin1StringView(GetParam().write)));
+    if (GetParam().told) expectFailureBoxes(u"disco cheio"_s);
+    EXPECT_EQ(post(entry), !GetParam().told);
+    EXPECT_EQ(state(), GetParam().after);
+    if (!GetParam().told) return;
+    book.exec(u"drop trigger refuses"_s);
     EXPECT_TRUE(post(entry));
-    EXPECT_EQ(state(), "3|2|80 in 1");
+    EXPECT_EQ(state(), GetParam().afterASecondTry);
 }
 
-// The movement is written with the number that was read, and the operator is told all the same.
-TEST_F(WriteFailure, OfTheCounterIsToldAfterTheMovementWasWritten) {
-    refuse(u"update on tbContadores"_s);
-    expectFailureBoxes(u"disco cheio"_s);
-    EXPECT_FALSE(post(entry));
-    EXPECT_EQ(state(), "1|1|0 in 0");
-    mend();
-    EXPECT_TRUE(post(entry));
-    EXPECT_EQ(state(), "2|1|80 in 1");
-}
-
-TEST_F(WriteFailure, OfTheAccumulatorIsPassedOver) {
-    refuse(u"update on tbSocios_Acumulados"_s);
-    EXPECT_TRUE(post(entry));
-    EXPECT_EQ(state(), "2|1|0 in 0");
-}
-
-TEST_F(WriteFailure, OfTheTryOutsAccumulatorGoesUpBeforeAnythingIsPosted) {
-    book.exec(u"delete from tbSocios_Acumulados"_s);
-    refuse(u"insert on tbSocios_Acumulados"_s);
-    EXPECT_EQ(failureOf([&] { post(entry); }), core::DatabaseFailure);
-    mend();
-    EXPECT_TRUE(post(entry));
-    EXPECT_EQ(state(), "2|1|80 in 1");
-}
+// Without the counter the movement is written all the same, with the number that was read.
+INSTANTIATE_TEST_SUITE_P(Posting, FailingWrites,
+                         ::testing::Values(FailingWrite{"Counter", "update on tbContadores", true,
+                                                        "1|1|0 in 0", "2|1|80 in 1"},
+                                           FailingWrite{"Movement", "insert on tbZelmar_Movimentos",
+                                                        true, "2|NULL|0 in 0", "3|2|80 in 1"},
+                                           FailingWrite{"Accumulator",
+                                                        "update on tbSocios_Acumulados", false,
+                                                        "2|1|0 in 0", ""}),
+                         [](const auto& at) { return std::string(at.param.name); });
 
 TEST_F(WriteFailure, OfABookHeldByAnotherProgramLeavesItAsItWas) {
     book.exec(u"begin immediate"_s);
