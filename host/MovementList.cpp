@@ -99,7 +99,7 @@ QVariant MovementList::data(const QModelIndex& index, int role) const {
     const QString tipo = row.values[MovementRow::Type].toString();
     if (role == Qt::ForegroundRole && (tipo == "ANL"_L1 || tipo == "COR"_L1))
         return QApplication::palette().color(QPalette::PlaceholderText);
-    if (role == Qt::FontRole && tipo == "ANL"_L1) {
+    if (role == Qt::FontRole && tipo == "ANL"_L1 && index.column() == MovementRow::Type) {
         QFont struck = QApplication::font("QTableView");
         struck.setStrikeOut(true);
         return struck;

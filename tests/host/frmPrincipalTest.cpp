@@ -125,8 +125,10 @@ TEST_F(PrincipalWindow, ShowsTheNewestFirstAsPeopleReadThem) {
 TEST_F(PrincipalWindow, AnnulledRowsAreToldApart) {
     const auto window = opened();
     const auto* model = person_.find<QTableView>(u"Lista"_s)->model();
-    EXPECT_TRUE(model->index(0, 0).data(Qt::FontRole).value<QFont>().strikeOut());
-    EXPECT_FALSE(model->index(1, 0).data(Qt::FontRole).isValid());
+    EXPECT_TRUE(model->index(0, 5).data(Qt::FontRole).value<QFont>().strikeOut());
+    EXPECT_TRUE(model->index(0, 7).data(Qt::ForegroundRole).isValid());
+    EXPECT_FALSE(model->index(1, 5).data(Qt::FontRole).isValid());
+    EXPECT_FALSE(model->index(1, 7).data(Qt::ForegroundRole).isValid());
 }
 
 TEST_F(PrincipalWindow, FiltersWhileOneTypesAndOpensByEnter) {
