@@ -219,8 +219,8 @@ void MovementsView::filterChanged(const QString& text) {
     showCount();
 }
 
-/// Changes the list and puts the person back onto the same movement at the same height. Who looks
-/// at the top goes on looking at the top, where what is new appears.
+/// Changes the list and puts the person back onto the same movement at the same height. Who stands
+/// on the newest stands on the newest afterwards, and who looks at the top goes on looking there.
 template <class Change>
 void MovementsView::keepingPlace(Change&& change) {
     const QModelIndex current = list_->currentIndex();
@@ -228,7 +228,7 @@ void MovementsView::keepingPlace(Change&& change) {
     const int above = list_->verticalScrollBar()->value();
     const int rowsAbove = current.row() - above;
     change();
-    const int row = std::max(movements_->rowOf(key), 0);
+    const int row = current.row() <= 0 ? 0 : std::max(movements_->rowOf(key), 0);
     list_->selectRow(row);
     list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
 }

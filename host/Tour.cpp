@@ -104,7 +104,7 @@ public:
 
     void view() {
         player_.step(u"frmPrincipal"_s, {}, typing({u"<F5>"_s}));
-        player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Ctrl+Home>"_s, u"<Return>"_s}),
+        player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Return>"_s}),
                      listBeginsWith(u"H-2001"_s));
         player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
     }

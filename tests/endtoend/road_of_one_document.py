@@ -189,7 +189,7 @@ def road(desktop, programs, book):
 
     # The newest movement stands on top of the list, and Enter opens it read-only.
     desktop.at(MAIN)
-    desktop.keys("ctrl+Home", "Return")
+    desktop.keys("F5", "Return")
     desktop.at(ENTRY + " - Hospital")
     desktop.show("movimento")
     desktop.keys("alt+s")
