@@ -66,9 +66,12 @@ void warnOfPremium(const ado::Recordset& premium) {
                Icon::Critical);
 }
 
-/// True when the waiting period that ends on `end` is over: the last day still belongs to it.
+/// True when the waiting period that ends on `end` is over: the last day still belongs to it. A
+/// person whose row is gone has no end, not even null, and is refused.
 bool waitingIsOver(const QVariant& end) {
-    return core::isNull(end) || core::toDate(end) < core::today();
+    if (core::isNull(end)) return true;
+    const QDate last = core::toDate(end);
+    return last.isValid() && last < core::today();
 }
 
 bool refuse(const QString& text, const QString& title) {
