@@ -114,6 +114,12 @@ void openRegisto(const QVariant& Pkey, QObject* Caller) {
         environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
         ado::adCmdUnknown);
     if (rows->atEnd()) return;
+    const QString tipo = core::toText(rows->Collect(u"tipo"_s));
+    if (tipo == data::tipo::Receipt || tipo == data::tipo::Reposition)
+        throw core::Failure(core::InvalidCall,
+                            u"A vista de recebimentos e reposições ainda não está disponível "
+                            "nesta versão."_s);
+    if (tipo != data::tipo::Document && tipo != data::tipo::Hospital) return;
     closeView();
     if (Entry::isLoaded())
         throw core::Failure(core::InvalidCall,
@@ -122,17 +128,9 @@ void openRegisto(const QVariant& Pkey, QObject* Caller) {
     frmMovimentos& screen = Entry::get();
     screen.Adodc1->setRecordset(rows);
     screen.CallbackClass = Caller;
-
-    const QString tipo = core::toText(rows->Collect(u"tipo"_s));
-    if (tipo == data::tipo::Document || tipo == data::tipo::Hospital) {
-        screen.Movimento_ID = rows->Collect(u"movimento_id"_s);
-        screen.showReadOnly(tipo);
-        screen.Show();
-    } else if (tipo == data::tipo::Receipt || tipo == data::tipo::Reposition) {
-        throw core::Failure(core::InvalidCall,
-                            u"A vista de recebimentos e reposições ainda não está disponível "
-                            "nesta versão."_s);
-    }
+    screen.Movimento_ID = rows->Collect(u"movimento_id"_s);
+    screen.showReadOnly(tipo);
+    screen.Show();
 }
 
 }  // namespace entry
