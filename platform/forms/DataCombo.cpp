@@ -17,16 +17,6 @@
 
 namespace forms {
 
-namespace {
-
-/// True for the focus that goes to, or comes back from, another window, a list or a menu.
-bool isAnotherWindows(const QFocusEvent* event) {
-    return event->reason() == Qt::ActiveWindowFocusReason ||
-           event->reason() == Qt::PopupFocusReason || event->reason() == Qt::MenuBarFocusReason;
-}
-
-}  // namespace
-
 DataCombo::DataCombo(const QString& name, QWidget* parent) : QComboBox(parent) {
     setObjectName(name);
     setEditable(true);

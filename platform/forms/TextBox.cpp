@@ -15,16 +15,6 @@
 
 namespace forms {
 
-namespace {
-
-/// True for the focus that goes to, or comes back from, another window or a menu.
-bool isAnotherWindows(const QFocusEvent* event) {
-    return event->reason() == Qt::ActiveWindowFocusReason ||
-           event->reason() == Qt::PopupFocusReason || event->reason() == Qt::MenuBarFocusReason;
-}
-
-}  // namespace
-
 TextBox::TextBox(const QString& name, QWidget* parent) : QLineEdit(parent) {
     setObjectName(name);
     connect(this, &QLineEdit::textEdited, this, [this] { edited_ = true; });

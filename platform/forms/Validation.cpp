@@ -190,4 +190,9 @@ void keepFocus() {
     if (!keeper) keeper = new FocusKeeper(qApp);
 }
 
+bool isAnotherWindows(const QFocusEvent* event) {
+    return event->reason() == Qt::ActiveWindowFocusReason ||
+           event->reason() == Qt::PopupFocusReason || event->reason() == Qt::MenuBarFocusReason;
+}
+
 }  // namespace forms

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+class QFocusEvent;
+
 namespace forms {
 
 /// A control that is asked before the focus leaves it.
@@ -27,5 +29,9 @@ void passesValidation(Button* button);
 
 /// Starts the filter of the application; install() does it.
 void keepFocus();
+
+/// True for the focus that goes to, or comes back from, another window, a list or a menu: that is no
+/// leaving.
+bool isAnotherWindows(const QFocusEvent* event);
 
 }  // namespace forms
