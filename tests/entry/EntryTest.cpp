@@ -1,0 +1,136 @@
+// SPDX-License-Identifier: MIT
+#include "tests/entry/EntryTest.h"
+
+#include "boundary/General.h"
+#include "boundary/environment/dtZelmars.h"
+#include "entry/frmMovimentosF.h"
+#include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
+#include "platform/core/UserName.h"
+
+using namespace Qt::StringLiterals;
+
+namespace entry {
+
+using core::Answer;
+
+EntryTest::EntryTest() {
+    core::setToday(QDate(2026, 3, 15));
+    core::setUserName("operador");
+    core::err().clear();
+    socio = book.member({});
+    book.premiumInOrder(socio);
+    self = book.person({.socio_id = socio, .codABC = u"A"_s, .nome = u"António Matos"_s});
+    spouse = book.person({.socio_id = socio});
+    child = book.person({.socio_id = socio,
+                         .codABC = u"C1"_s,
+                         .nome = u"Inês Matos"_s,
+                         .data_nascimento = QDate(2016, 5, 20)});
+    rubric = book.childRubric({.code = u"0101"_s, .percent = 0.75, .socio = 500, .familiar = 500});
+    hospital = book.hospital();
+}
+
+EntryTest::~EntryTest() {
+    forms::DefaultInstance<frmMovimentosF>::unload();
+    forms::DefaultInstance<frmMovimentos>::unload();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    for (int position : {1, 2}) {
+        const ado::ConnectionPtr connection =
+            environment::dtZelmars::instance().Connections(position);
+        connection->CommandTimeout = 30;
+        if (connection->State() == ado::adStateOpen) connection->Close();
+    }
+    core::setToday({});
+    core::setUserName({});
+}
+
+void EntryTest::openNew(bool bHospital) {
+    General().NewMovimento(bHospital);
+    person.screen(u"frmMovimentos"_s);
+    person.waitUntil([this] { return !form().Text8->Text().isEmpty(); }, u"the defaults"_s);
+}
+
+void EntryTest::openView(const QVariant& key) {
+    General().Registo({}, key);
+    if (person.isShown(u"frmMovimentos"_s)) person.screen(u"frmMovimentos"_s);
+    person.settle();
+}
+
+frmMovimentos& EntryTest::form() const {
+    if (!forms::DefaultInstance<frmMovimentos>::isLoaded())
+        throw std::runtime_error("no entry screen");
+    return forms::DefaultInstance<frmMovimentos>::get();
+}
+
+void EntryTest::typeMember(const QString& number) {
+    person.expectBox({.text = u"Quer ver o extrato de quotizações deste Associado?"_s,
+                      .answer = Answer::No,
+                      .icon = core::Icon::Exclamation,
+                      .title = u"Quotizações"_s});
+    person.fill(u"No_Kor"_s, number);
+}
+
+void EntryTest::choosePerson(qint64 family) {
+    companions.personChosen = family;
+    person.accelerator(u'I');
+}
+
+void EntryTest::typeDocument(const QString& value, const QString& rate, const QString& received) {
+    typeMember();
+    choosePerson(self);
+    person.fill(u"Text1"_s, u"10-03-2026"_s);
+    person.fill(u"Text5"_s, u"FT 2026/17"_s);
+    person.fill(u"Text6"_s, value);
+    person.fill(u"Text9"_s, received);
+    person.fill(u"Text11"_s, rate);
+    person.fill(u"DataCombo1"_s, u"0101"_s);
+}
+
+void EntryTest::typeHospitalBill(const QString& value, const QString& incidence) {
+    typeDocument(value, u"0"_s, incidence);
+    person.fill(u"DataCombo2"_s, u"H01"_s);
+}
+
+void EntryTest::postAndLeave() {
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s,
+                      .answer = Answer::Yes,
+                      .icon = core::Icon::Question,
+                      .title = form().Caption()});
+    person.onScreen(u"frmMovimentosF"_s, [this] {
+        person.accelerator(u'S');
+        person.enter();
+    });
+    person.accelerator(u'O');
+}
+
+void EntryTest::cancelInto(QChar option) {
+    person.onScreen(u"frmMovimentosF"_s, [this, option] {
+        person.accelerator(option);
+        person.accelerator(u'O');
+    });
+    person.accelerator(u'C');
+}
+
+QVariant EntryTest::pending(const QString& column) const {
+    return form().Adodc1->Recordset()->Collect(column);
+}
+
+QString EntryTest::everything() {
+    QStringList all;
+    const QString names =
+        book.text(u"select name from sqlite_master where type = 'table' order by name"_s);
+    for (const QString& table : names.split(u'\n'))
+        all << table << book.text(u"select * from "_s + table);
+    return all.join(u'\n');
+}
+
+void EntryTest::expectFailedPosting(const QString& why) {
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+    person.expectBox({.text = why, .icon = core::Icon::None, .partly = true});
+    person.expectBox(
+        {.text = u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
+         .icon = core::Icon::Critical,
+         .title = form().Caption()});
+}
+
+}  // namespace entry
