@@ -109,16 +109,20 @@ void TourPlayer::take(const QString& picture, QWidget* screen) {
 }
 
 void TourPlayer::type(QWidget* screen, const QStringList& keys) {
+    // A key may close the window that it is typed into, and is released nowhere then.
+    const QPointer<QWindow> window = screen->windowHandle();
     for (const QString& key : keys) {
-        QWindow* window = screen->windowHandle();
-        if (!key.startsWith(u'<')) {
-            for (const QChar letter : key)
-                QTest::sendKeyEvent(QTest::Click, window, Qt::Key_unknown, letter, Qt::NoModifier);
+        if (key.startsWith(u'<')) {
+            const QString name = key.mid(1, key.size() - 2);
+            const auto named = QKeySequence::fromString(name, QKeySequence::PortableText)[0];
+            if (window) QTest::keyPress(window, named.key(), named.keyboardModifiers());
+            if (window) QTest::keyRelease(window, named.key(), named.keyboardModifiers());
             continue;
         }
-        const QKeyCombination pressed =
-            QKeySequence::fromString(key.mid(1, key.size() - 2), QKeySequence::PortableText)[0];
-        QTest::keyClick(window, pressed.key(), pressed.keyboardModifiers());
+        for (const QChar letter : key)
+            for (const auto action : {QTest::Press, QTest::Release})
+                if (window)
+                    QTest::sendKeyEvent(action, window, Qt::Key_unknown, letter, Qt::NoModifier);
     }
 }
 
