@@ -23,6 +23,8 @@ const QString NamedKeys =
     "nome, familiar from vwZelmars_Movimentos_Vigor "_s;
 // The day comes first: corrections for members who left have keys of another range.
 const QString NewestFirst = u"order by data desc, movimento_id desc"_s;
+// What was posted since, in one of the two tables behind the view.
+const QString Since = u"where ficheiro = '%1' and movimento_id > %2 "_s;
 // One row is one movement as the list shows it; the columns of MovementRow in its order.
 const QString Rows =
     u"select movimento_id, movimento_no, data, no_kor, nome, familiar, tipo, doc_no, doc_valor, "
@@ -100,17 +102,29 @@ std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
 }
 
 int MovementBook::takeNewer(MovementSearch& search) const {
-    std::vector<MovementKey> newer;
+    int taken = 0;
     const auto row = ado::Recordset::create();
-    const QString since = u"where ficheiro = 'ACTIVO' and movimento_id > %1 "_s;
-    for (row->Open(NamedKeys + since.arg(search.newest()) + NewestFirst, connection_);
-         !row->atEnd(); row->MoveNext()) {
-        newer.push_back(keyOf(*row));
-        takeNames(*row, newer.back(), search);
+    for (const bool activo : {false, true}) {
+        std::vector<MovementKey> newer;
+        const QString since =
+            Since.arg(activo ? u"ACTIVO"_s : u"INACTIVO"_s).arg(search.newest(activo));
+        row->Open(NamedKeys + since + NewestFirst, connection_);
+        for (; !row->atEnd(); row->MoveNext()) {
+            newer.push_back(keyOf(*row));
+            takeNames(*row, newer.back(), search);
+        }
+        row->Close();
+        search.prepend(newer);
+        taken += int(newer.size());
     }
+    return taken;
+}
+
+void MovementBook::takeAgain(MovementSearch& search, qint32 movimento_id) const {
+    const auto row = ado::Recordset::create();
+    row->Open(Keys + u"where movimento_id = %1"_s.arg(movimento_id), connection_);
+    if (!row->atEnd()) search.correct(keyOf(*row));
     row->Close();
-    search.prepend(newer);
-    return int(newer.size());
 }
 
 std::vector<MovementRow> MovementBook::rows(const std::vector<qint32>& keys) const {

@@ -41,8 +41,10 @@ public:
     std::shared_ptr<MovementSearch> newest(int count) const;
     /// All movements and the names of all persons; null when it was stopped.
     std::shared_ptr<MovementSearch> all(std::stop_token stop) const;
-    /// Takes in what was posted for active members since; returns how many movements that was.
+    /// Takes in what was posted since; returns how many movements that was.
     int takeNewer(MovementSearch& search) const;
+    /// Takes one movement in anew.
+    void takeAgain(MovementSearch& search, qint32 movimento_id) const;
 
     /// What the list shows of some movements, in any order; missing ones are left out.
     std::vector<MovementRow> rows(const std::vector<qint32>& keys) const;

@@ -59,6 +59,13 @@ void MovementList::takeNewer() {
         forgetRows();
 }
 
+void MovementList::takeAgain(qint32 movimento_id) {
+    if (!book_ || !search_) return;
+    book_->takeAgain(*search_, movimento_id);
+    book_->takeNewer(*search_);
+    refilter();
+}
+
 void MovementList::forgetRows() {
     read_.clear();
     if (rowCount() > 0) emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));

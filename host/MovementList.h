@@ -23,6 +23,8 @@ public:
     const QString& filter() const { return filter_; }
     /// Takes in what was posted since and reads the shown rows afresh. Fails as reading does.
     void takeNewer();
+    /// Takes in one movement that was written again, and what was posted since. Fails likewise.
+    void takeAgain(qint32 movimento_id);
     /// Reads the shown rows afresh the next time they are looked at.
     void forgetRows();
 

@@ -150,6 +150,13 @@ void MovementSearch::prepend(const std::vector<MovementKey>& movements) {
     entries_.insert(entries_.begin(), newer.begin(), newer.end());
 }
 
+void MovementSearch::correct(const MovementKey& movement) {
+    const auto known = std::find_if(entries_.begin(), entries_.end(), [&](const Entry& entry) {
+        return entry.id == movement.movimento_id;
+    });
+    if (known != entries_.end()) *known = entryOf(movement);
+}
+
 void MovementSearch::nameMember(qint32 socio_id, const QString& no_kor, const QString& nome) {
     name(memberAt(socio_id), wordsOf(no_kor) + wordsOf(nome));
 }
@@ -172,7 +179,8 @@ std::vector<quint32> MovementSearch::find(const QString& filter) const {
 }
 
 MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
-    if (movement.activo) newest_ = std::max(newest_, movement.movimento_id);
+    qint32& newest = newest_[movement.activo ? 1 : 0];
+    newest = std::max(newest, movement.movimento_id);
     const QByteArray document = ' ' + folded(movement.doc_no.simplified()).left(LongestText);
     const Entry entry{movement.movimento_id,
                       movement.movimento_no,

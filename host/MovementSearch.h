@@ -39,6 +39,8 @@ public:
     void append(const MovementKey& movement);
     /// Adds movements newer than all others, the newest first.
     void prepend(const std::vector<MovementKey>& movements);
+    /// Takes in anew a movement that was written again; one that is not here stays unknown.
+    void correct(const MovementKey& movement);
     /// Names a member or a relative, before or after his movements; the last name given counts.
     /// A relative without a code is nobody.
     void nameMember(qint32 socio_id, const QString& no_kor, const QString& nome);
@@ -46,8 +48,8 @@ public:
 
     std::size_t size() const { return entries_.size(); }
     qint32 movimento_id(std::size_t position) const { return entries_[position].id; }
-    /// The greatest key among the movements of active members, 0 without any.
-    qint32 newest() const { return newest_; }
+    /// The greatest key in the table of the active members, or of those who left; 0 without any.
+    qint32 newest(bool activo) const { return newest_[activo ? 1 : 0]; }
 
     /// Positions of the movements that fit, newest first.
     std::vector<quint32> find(const QString& filter) const;
@@ -81,8 +83,8 @@ private:
     QHash<quint64, quint32> personAt_;  // by socio_id and, below it, the position in codes_ plus 1
     std::vector<QByteArray> types_;
     std::vector<QByteArray> codes_;
-    std::string texts_;  // folded; each word behind a blank
-    qint32 newest_ = 0;
+    std::string texts_;          // folded; each word behind a blank
+    qint32 newest_[2] = {0, 0};  // of those who left, of the active
 };
 
 }  // namespace host

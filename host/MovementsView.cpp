@@ -128,19 +128,39 @@ void MovementsView::open(const BookSettings& settings) {
     }
 }
 
-void MovementsView::takeNewer() {
+/// Changes the list and puts the person back onto the same movement at the same height. Who stands
+/// on the newest stands on the newest afterwards, and who looks at the top goes on looking there.
+template <class Change>
+void MovementsView::keepingPlace(Change&& change) {
+    const QModelIndex current = list_->currentIndex();
+    const qint32 key = current.isValid() ? movements_->movimento_id(current.row()) : 0;
+    const int above = list_->verticalScrollBar()->value();
+    const int rowsAbove = current.row() - above;
+    change();
+    const int row = current.row() <= 0 ? 0 : std::max(movements_->rowOf(key), 0);
+    list_->selectRow(row);
+    list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
+}
+
+/// Changes the list as reading from the book does, which may fail.
+template <class Change>
+void MovementsView::changeList(Change&& change) {
     if (!book_) return;
     try {
-        keepingPlace([this] { movements_->takeNewer(); });
+        keepingPlace(change);
         showCount();
     } catch (const core::Failure& failure) {
         showUnreadable(failure.text());
     }
 }
 
-void MovementsView::refresh() {
-    takeNewer();
-    if (book_) loader_->start(settings_);
+void MovementsView::takeNewer() {
+    changeList([this] { movements_->takeNewer(); });
+}
+
+void MovementsView::takeAgain(qint32 movimento_id) {
+    changeList([&] { movements_->takeAgain(movimento_id); });
+    if (book_ && loader_->isReading()) loader_->start(settings_);  // it read the old state
 }
 
 void MovementsView::takeLoaded(const std::shared_ptr<MovementSearch>& search) {
@@ -217,20 +237,6 @@ void MovementsView::filterChanged(const QString& text) {
     list_->scrollToTop();
     list_->selectRow(0);
     showCount();
-}
-
-/// Changes the list and puts the person back onto the same movement at the same height. Who stands
-/// on the newest stands on the newest afterwards, and who looks at the top goes on looking there.
-template <class Change>
-void MovementsView::keepingPlace(Change&& change) {
-    const QModelIndex current = list_->currentIndex();
-    const qint32 key = current.isValid() ? movements_->movimento_id(current.row()) : 0;
-    const int above = list_->verticalScrollBar()->value();
-    const int rowsAbove = current.row() - above;
-    change();
-    const int row = current.row() <= 0 ? 0 : std::max(movements_->rowOf(key), 0);
-    list_->selectRow(row);
-    list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
 }
 
 void MovementsView::showUnreadable(const QString& text) {

@@ -24,8 +24,8 @@ public:
     void open(const BookSettings& settings);
     /// Shows what was posted since.
     void takeNewer();
-    /// Shows what other programs or an annulment changed.
-    void refresh();
+    /// Shows one movement that was written again, and what was posted since.
+    void takeAgain(qint32 movimento_id);
 
     void focusFilter();
     void focusList();
@@ -51,6 +51,8 @@ private:
     bool keyInList(const QKeyEvent& key);
     void filterChanged(const QString& text);
     void takeLoaded(const std::shared_ptr<MovementSearch>& search);
+    template <class Change>
+    void changeList(Change&& change);
     template <class Change>
     void keepingPlace(Change&& change);
     void showUnreadable(const QString& text);

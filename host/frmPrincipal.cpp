@@ -170,8 +170,8 @@ void frmPrincipal::login() {
                      core::Icon::Critical);
 }
 
-void frmPrincipal::RemoteKey(const QVariant&) {
-    movements_->refresh();
+void frmPrincipal::RemoteKey(const QVariant& movimento_id) {
+    movements_->takeAgain(movimento_id.toInt());
 }
 
 void frmPrincipal::reload() {

@@ -129,11 +129,12 @@ TEST(MovementSearch, FindsTheSameHoweverTheFilterIsWritten) {
 
 TEST(MovementSearch, TakesNewMovementsInFront) {
     host::MovementSearch search = sampleSearch();
-    EXPECT_EQ(search.newest(), 100);
+    EXPECT_EQ(search.newest(true), 100);
     const qint32 ofThoseWhoLeft = 1'000'000'001;
     search.prepend({{.movimento_id = ofThoseWhoLeft, .socio_id = 5, .activo = false},
                     {.movimento_id = 101, .movimento_no = 1206, .socio_id = 1, .codABC = u"A"_s}});
-    EXPECT_EQ(search.newest(), 101);
+    EXPECT_EQ(search.newest(true), 101);
+    EXPECT_EQ(search.newest(false), ofThoseWhoLeft);
     EXPECT_EQ(found(search, u"matos"_s).toStdString(), "101 100 99");
     EXPECT_EQ(search.movimento_id(0), ofThoseWhoLeft);
 }
