@@ -7,8 +7,12 @@ namespace {
 QDate fixedDay;
 }
 
-QDate today() { return fixedDay.isValid() ? fixedDay : QDate::currentDate(); }
+QDate today() {
+    return fixedDay.isValid() ? fixedDay : QDate::currentDate();
+}
 
-void setToday(QDate day) { fixedDay = day; }
+void setToday(QDate day) {
+    fixedDay = day;
+}
 
 }  // namespace core

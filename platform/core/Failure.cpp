@@ -16,9 +16,13 @@ void Err::set(int number, const QString& description) {
     description_ = description;
 }
 
-Err& err() { return pending; }
+Err& err() {
+    return pending;
+}
 
-HandlerScope::HandlerScope() { ++depth; }
+HandlerScope::HandlerScope() {
+    ++depth;
+}
 
 HandlerScope::~HandlerScope() {
     if (--depth == 0) pending.clear();

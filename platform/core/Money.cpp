@@ -76,6 +76,8 @@ Money operator-(Money a, Money b) {
     return difference;
 }
 
-Money Money::operator-() const { return Money() - *this; }
+Money Money::operator-() const {
+    return Money() - *this;
+}
 
 }  // namespace core

@@ -20,6 +20,8 @@ Answer MsgBox(const QString& text, Icon icon, const QString& title, Buttons butt
     return current(text, icon, title.isEmpty() ? DefaultTitle.toString() : title, buttons);
 }
 
-void setMsgBoxPresenter(MsgBoxPresenter presenter) { current = presenter; }
+void setMsgBoxPresenter(MsgBoxPresenter presenter) {
+    current = presenter;
+}
 
 }  // namespace core

@@ -22,6 +22,8 @@ bool userName(char* buffer, std::size_t length) {
     return true;
 }
 
-void setUserName(const QByteArray& name) { fixedName = name; }
+void setUserName(const QByteArray& name) {
+    fixedName = name;
+}
 
 }  // namespace core

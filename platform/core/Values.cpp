@@ -27,8 +27,7 @@ qint64 toWhole(const QVariant& value, double lowest, double highest) {
 }  // namespace
 
 bool isNullOrEmpty(const QVariant& value) {
-    return isNull(value) ||
-           (value.typeId() == QMetaType::QString && value.toString().isEmpty());
+    return isNull(value) || (value.typeId() == QMetaType::QString && value.toString().isEmpty());
 }
 
 double toDouble(const QVariant& value) {
@@ -47,7 +46,9 @@ float toSingle(double value) {
     return single;
 }
 
-float toSingle(const QVariant& value) { return toSingle(toDouble(value)); }
+float toSingle(const QVariant& value) {
+    return toSingle(toDouble(value));
+}
 
 qint32 toLong(const QVariant& value) {
     return static_cast<qint32>(toWhole(value, -2147483648.0, 2147483647.0));
@@ -57,9 +58,13 @@ qint16 toInteger(const QVariant& value) {
     return static_cast<qint16>(toWhole(value, -32768.0, 32767.0));
 }
 
-QDate toDate(const QVariant& value) { return value.toDate(); }
+QDate toDate(const QVariant& value) {
+    return value.toDate();
+}
 
-QVariant fromDate(QDate day) { return QDateTime(day, QTime(0, 0), Qt::UTC); }
+QVariant fromDate(QDate day) {
+    return QDateTime(day, QTime(0, 0), Qt::UTC);
+}
 
 QString toText(const QVariant& value) {
     if (isNull(value)) return {};

@@ -11,7 +11,9 @@ namespace core {
 // QDateTime without a zone (Qt::UTC stands for "no zone").
 
 /// True for null only.
-inline bool isNull(const QVariant& value) { return !value.isValid() || value.isNull(); }
+inline bool isNull(const QVariant& value) {
+    return !value.isValid() || value.isNull();
+}
 
 /// The one place where a rule treats null and empty text alike.
 bool isNullOrEmpty(const QVariant& value);

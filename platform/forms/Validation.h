@@ -30,8 +30,8 @@ void passesValidation(Button* button);
 /// Starts the filter of the application; install() does it.
 void keepFocus();
 
-/// True for the focus that goes to, or comes back from, another window, a list or a menu: that is no
-/// leaving.
+/// True for the focus that goes to, or comes back from, another window, a list or a menu: that is
+/// no leaving.
 bool isAnotherWindows(const QFocusEvent* event);
 
 }  // namespace forms

@@ -6,7 +6,8 @@
 
 /// Hives of named text values, kept in files: `HKEY_LOCAL_MACHINE.ini` and its companions, one INI
 /// file a hive, a key's path as the group. Where they lie:
-///   - the folder named by the environment variable ZELMARS_REGISTRY, and nowhere else, if it is set;
+///   - the folder named by the environment variable ZELMARS_REGISTRY, and nowhere else, if it is
+///   set;
 ///   - otherwise $XDG_CONFIG_HOME/zelmars/registry/ of the user, and below it, for what is missing
 ///     there, /etc/zelmars/registry/ of the machine.
 /// A missing value and an empty one stay apart.
