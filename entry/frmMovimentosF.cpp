@@ -27,6 +27,8 @@ frmMovimentosF::frmMovimentosF()
 void frmMovimentosF::layOut() {
     auto* frame = new forms::Frame(u"Frame1"_s, QString());
     auto* options = new QVBoxLayout(frame);
+    options->setContentsMargins(16, 12, 16, 12);
+    options->setSpacing(8);
     auto* question = new QLabel(u"Escolha uma das seguintes opções:"_s);
     question->setObjectName(u"Label1"_s);
     options->addWidget(question);
@@ -38,6 +40,8 @@ void frmMovimentosF::layOut() {
     buttons->addWidget(Command1);
 
     auto* all = new QVBoxLayout(this);
+    all->setContentsMargins(12, 12, 12, 12);
+    all->setSpacing(10);
     all->addWidget(frame);
     all->addLayout(buttons);
     Command1->setDefault(true);

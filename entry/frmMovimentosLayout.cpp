@@ -28,6 +28,26 @@ TextBox* displayOnly(const QString& name, QStringView shownAs = {}) {
     return made;
 }
 
+/// Width at which a field shows `text` whole, whatever the font.
+int widthFor(const QWidget* field, QStringView text) {
+    const int frame = field->fontMetrics().height();
+    return field->fontMetrics().horizontalAdvance(text.toString()) + frame;
+}
+
+/// Pairs of label and field, side by side. The labels' columns are as wide in every frame, so that
+/// the fields of all frames stand under each other.
+QGridLayout* pairsIn(QWidget* frame, int pairs) {
+    constexpr QStringView WidestLabels[] = {u"Modo de Pagamento:", u"Comparticipação:",
+                                            u"Saldo Plafond:"};
+    auto* grid = new QGridLayout(frame);
+    for (int pair = 0; pair < pairs; ++pair) {
+        grid->setColumnMinimumWidth(
+            2 * pair, frame->fontMetrics().horizontalAdvance(WidestLabels[pair].toString()));
+        grid->setColumnStretch(2 * pair + 1, pairs > 1 ? 1 : 0);
+    }
+    return grid;
+}
+
 }  // namespace
 
 void frmMovimentos::makeControls() {
@@ -77,7 +97,7 @@ void frmMovimentos::makeControls() {
 
 QWidget* frmMovimentos::beneficiaryFrame() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
-    auto* grid = new QGridLayout(frame);
+    QGridLayout* grid = pairsIn(frame, 1);
     grid->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor, u"Label1"_s), 0, 0);
     grid->addWidget(No_Kor, 0, 1);
     grid->addWidget(Text2, 0, 2);
@@ -86,8 +106,7 @@ QWidget* frmMovimentos::beneficiaryFrame() {
     grid->addWidget(Text3, 1, 1);
     grid->addWidget(Text4, 1, 2);
     grid->addWidget(Command2, 1, 3);
-    No_Kor->setMaximumWidth(130);
-    Text3->setMaximumWidth(130);
+    for (TextBox* code : {No_Kor, Text3}) code->setFixedWidth(widthFor(code, u"0000000000"));
     // 6375 twips, fifteen to the pixel.
     Text2->setMinimumWidth(425);
     Text4->setMinimumWidth(425);
@@ -97,7 +116,7 @@ QWidget* frmMovimentos::beneficiaryFrame() {
 
 QWidget* frmMovimentos::documentFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Documento:"_s);
-    auto* grid = new QGridLayout(frame);
+    QGridLayout* grid = pairsIn(frame, 3);
     Label19 = fieldLabel(u"Recebido Euros:"_s, Text9, u"Label19"_s);
     grid->addWidget(fieldLabel(u"Data:"_s, Text1), 0, 0);
     grid->addWidget(Text1, 0, 1);
@@ -112,16 +131,15 @@ QWidget* frmMovimentos::documentFrame() {
     grid->addWidget(fieldLabel(u"Imposto IVA:"_s, Text10), 1, 4);
     grid->addWidget(Text10, 1, 5);
     grid->addWidget(fieldLabel(u"Entidade:"_s, DataCombo4), 2, 0);
-    grid->addWidget(DataCombo4, 2, 1, 1, 2);
-    grid->addWidget(fieldLabel(u"Observações:"_s, Text12), 2, 3);
-    grid->addWidget(Text12, 2, 4, 1, 2);
-    for (int field : {1, 3, 5}) grid->setColumnStretch(field, 1);
+    grid->addWidget(DataCombo4, 2, 1, 1, 5);
+    grid->addWidget(fieldLabel(u"Observações:"_s, Text12), 3, 0);
+    grid->addWidget(Text12, 3, 1, 1, 5);
     return frame;
 }
 
 QWidget* frmMovimentos::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Propriedades do Lançamento:"_s);
-    auto* grid = new QGridLayout(frame);
+    QGridLayout* grid = pairsIn(frame, 1);
     Label18 = fieldLabel(u"Hospital:"_s, DataCombo2, u"Label18"_s);
     grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
     grid->addWidget(Text7, 0, 1);
@@ -131,8 +149,10 @@ QWidget* frmMovimentos::propertiesFrame() {
     grid->addWidget(Text8, 1, 1);
     grid->addWidget(Label18, 1, 2);
     grid->addWidget(DataCombo2, 1, 3);
-    Text7->setMaximumWidth(130);
-    Text8->setMaximumWidth(130);
+    for (TextBox* box : {Text7, Text8}) box->setFixedWidth(widthFor(box, u"00-00-00000"));
+    // The hospital's row keeps its place while it is hidden.
+    grid->setColumnMinimumWidth(2, Label18->sizeHint().width());
+    grid->setRowMinimumHeight(1, DataCombo2->sizeHint().height());
     grid->setColumnStretch(3, 1);
     Label18->hide();
     DataCombo2->hide();
@@ -141,10 +161,18 @@ QWidget* frmMovimentos::propertiesFrame() {
 
 QWidget* frmMovimentos::resultFrame() {
     auto* frame = new forms::Frame(u"Frame4"_s, u"Resultado do Lançamento:"_s);
-    auto* grid = new QGridLayout(frame);
-    const auto put = [grid](int row, int column, const QString& text, TextBox* field,
-                            const QString& labelName = {}) {
+    QGridLayout* grid = pairsIn(frame, 3);
+    // What will be posted stands out.
+    for (TextBox* outcome : {Credito, Debito}) {
+        QFont bold = outcome->font();
+        bold.setBold(true);
+        outcome->setFont(bold);
+    }
+    const int amountWidth = widthFor(Credito, u"(€ 999.999.999,99)");
+    const auto put = [=](int row, int column, const QString& text, TextBox* field,
+                         const QString& labelName = {}) {
         QLabel* label = fieldLabel(text, field, labelName);
+        field->setMinimumWidth(amountWidth);
         grid->addWidget(label, row, 2 * column);
         grid->addWidget(field, row, 2 * column + 1);
         return label;
@@ -158,30 +186,38 @@ QWidget* frmMovimentos::resultFrame() {
     put(2, 0, u"Crédito:"_s, Credito);
     put(2, 1, u"Débito:"_s, Debito);
     put(2, 2, u"Líquido:"_s, Liquido);
-    for (int field : {1, 3, 5}) grid->setColumnStretch(field, 1);
     return frame;
 }
 
 void frmMovimentos::layOut() {
-    auto* below = new QHBoxLayout;
-    below->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3));
-    below->addWidget(DataCombo3, 1);
-    below->addStretch(1);
-    for (forms::Button* button : {Command6, Command5, Command3, Command4}) below->addWidget(button);
+    auto* foot = new QWidget;
+    QGridLayout* below = pairsIn(foot, 1);
+    below->setContentsMargins(12, 2, 0, 0);
+    below->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 0, 0);
+    below->addWidget(DataCombo3, 0, 1);
+    // Room for the arrow beside the longest entry.
+    DataCombo3->setMinimumWidth(widthFor(DataCombo3, u"TRF - Transferência bancária") + 24);
+    below->setColumnStretch(2, 1);
+    int column = 3;
+    for (forms::Button* button : {Command6, Command5, Command3, Command4})
+        below->addWidget(button, 0, column++);
 
     auto* all = new QVBoxLayout(this);
     all->setContentsMargins(0, 0, 0, 0);
-    all->addWidget(forms::headingBand(
+    all->setSpacing(0);
+    QWidget* band = forms::headingBand(
         u"Lançamento de Documentos"_s,
         u"Lançamento no Plano de Saúde de documentos na conta corrente do associado."_s,
-        u"Label25"_s, u"Label26"_s, u"Image1"_s));
+        u"Label25"_s, u"Label26"_s, u"Image1"_s);
+    band->setObjectName(u"Frame5"_s);
+    all->addWidget(band);
     auto* body = new QVBoxLayout;
-    body->setContentsMargins(12, 8, 12, 12);
-    body->addWidget(beneficiaryFrame());
-    body->addWidget(documentFrame());
-    body->addWidget(propertiesFrame());
-    body->addWidget(resultFrame());
-    body->addLayout(below);
+    body->setContentsMargins(12, 10, 12, 12);
+    body->setSpacing(9);
+    for (QWidget* part :
+         {beneficiaryFrame(), documentFrame(), propertiesFrame(), resultFrame(), foot})
+        body->addWidget(part);
+    body->addStretch(1);
     all->addLayout(body);
 
     // Enter tries the document out, which does no harm; posting wants its own key.

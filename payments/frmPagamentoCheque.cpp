@@ -51,6 +51,8 @@ void frmPagamentoCheque::layOut() {
     buttons->addWidget(Command1);
 
     auto* all = new QVBoxLayout(this);
+    all->setContentsMargins(12, 12, 12, 12);
+    all->setSpacing(10);
     all->addWidget(frame);
     all->addLayout(buttons);
     Command1->setDefault(true);
