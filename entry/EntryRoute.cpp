@@ -36,10 +36,16 @@ void closeEntry() {
     Entry::unload();
 }
 
+/// A next entry that cannot be opened leaves no hidden screen behind.
 void openAnother(bool bHospital) {
     QString strConMember;
     QString strSQL;
-    openNewMovimento(bHospital, strConMember, strSQL);
+    try {
+        openNewMovimento(bHospital, strConMember, strSQL);
+    } catch (...) {
+        Entry::unload();
+        throw;
+    }
 }
 
 /// Without a member chosen the next entry is an ordinary one, also after a hospital bill.

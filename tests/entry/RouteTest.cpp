@@ -4,6 +4,7 @@
 
 #include "boundary/General.h"
 #include "boundary/environment/dtZelmars.h"
+#include "platform/core/Failure.h"
 #include "tests/entry/EntryTest.h"
 
 using namespace Qt::StringLiterals;
@@ -195,6 +196,26 @@ TEST_F(Route, AnotherOperationLeavesThePendingEntry) {
     EXPECT_EQ(form().Text6->Text(), u"€ 87,35"_s);
     postAndLeave();
     EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s, u"doc_valor = 87.35"_s), 1);
+}
+
+TEST_F(Route, NextEntryThatCannotBeOpenedIsSaidAndLeavesNothingInTheWay) {
+    const qint64 key = book.insert(u"tbZelmar_Movimentos"_s, {{"tipo", u"DOC"_s}});
+    openNew();
+    typeMember();
+    environment::dtZelmars::instance().MSAccess()->Close();
+    person.expectBox({.icon = Icon::Critical, .partly = true});
+    cancelInto(u'A');
+    expectNoScreen();
+    openView(key);
+    EXPECT_TRUE(form().bShowing);
+}
+
+TEST_F(Route, UnknownConnectionFailsTheCallAndOpensNothing) {
+    QString strConMember = u"Nenhuma"_s;
+    EXPECT_THROW(General().NewMovimento(false, &strConMember), core::Failure);
+    expectNoScreen();
+    openNew();
+    EXPECT_EQ(form().Text8->Text(), u"DOC"_s);
 }
 
 TEST_F(Route, SecondNewMovimentoReusesTheScreenOnAFreshRow) {
