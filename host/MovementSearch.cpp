@@ -4,45 +4,24 @@
 #include <QStringList>
 #include <algorithm>
 
+#include "platform/core/Folding.h"
 #include "platform/core/Format.h"
 
 using namespace Qt::StringLiterals;
 
 namespace host {
 
-QByteArray folded(const QString& text) {
-    const auto isPlain = [](QChar letter) { return letter.unicode() < 128; };
-    if (std::all_of(text.begin(), text.end(), isPlain)) return text.toLatin1().toLower();
-    QString plain;
-    for (const QChar letter : text.normalized(QString::NormalizationForm_KD))
-        if (letter.category() != QChar::Mark_NonSpacing) plain += letter;
-    return plain.toCaseFolded().toUtf8();
-}
-
 namespace {
 
-/// The words of a name, each behind a blank, so that " ana" finds the beginning of a word only.
-QByteArray wordsOf(const QString& name) {
-    QByteArray words;
-    bool inWord = false;
-    for (const char letter : folded(name)) {
-        const bool isLetter = static_cast<uchar>(letter) >= 128 || std::isalnum(uchar(letter));
-        if (isLetter && !inWord) words += ' ';
-        if (isLetter) words += letter;
-        inWord = isLetter;
-    }
-    return words;
-}
-
 /// Where a text stands in a short list; it is added when it is new.
-quint16 positionOf(const QByteArray& text, std::vector<QByteArray>& list) {
+quint16 positionOf(const std::string& text, std::vector<std::string>& list) {
     const auto known = std::find(list.begin(), list.end(), text);
     if (known != list.end()) return quint16(known - list.begin());
     list.push_back(text);
     return quint16(list.size() - 1);
 }
 
-constexpr qsizetype LongestText = 1000;  // what can be searched for, in bytes
+constexpr std::size_t LongestText = 1000;  // what can be searched for, in bytes
 
 /// A day as somebody types it into a filter; a part that was left out is 0.
 struct TypedDay {
@@ -87,12 +66,12 @@ class MovementSearch::Word {
 public:
     Word(const MovementSearch& search, const QString& text)
         : search_(search),
-          inDocument_(' ' + folded(text).toStdString()),
+          inDocument_(' ' + core::folded(text)),
           day_(typedDay(text)),
           number_(wholeNumber(text)) {
-        for (const QByteArray& type : search.types_)
-            fitsType_.push_back(type == folded(text) ? 1 : 0);
-        askPersons(wordsOf(text).toStdString());
+        for (const std::string& type : search.types_)
+            fitsType_.push_back(type == core::folded(text) ? 1 : 0);
+        askPersons(core::foldedWords(text));
     }
 
     bool fits(const Entry& entry) const {
@@ -158,12 +137,12 @@ void MovementSearch::correct(const MovementKey& movement) {
 }
 
 void MovementSearch::nameMember(qint32 socio_id, const QString& no_kor, const QString& nome) {
-    name(memberAt(socio_id), wordsOf(no_kor) + wordsOf(nome));
+    name(memberAt(socio_id), core::foldedWords(no_kor) + core::foldedWords(nome));
 }
 
 void MovementSearch::nameRelative(qint32 socio_id, const QString& codABC, const QString& nome) {
     if (codABC.isEmpty()) return;
-    name(relativeAt(socio_id, codABC), wordsOf(nome));
+    name(relativeAt(socio_id, codABC), core::foldedWords(nome));
 }
 
 std::vector<quint32> MovementSearch::find(const QString& filter) const {
@@ -181,15 +160,16 @@ std::vector<quint32> MovementSearch::find(const QString& filter) const {
 MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
     qint32& newest = newest_[movement.activo ? 1 : 0];
     newest = std::max(newest, movement.movimento_id);
-    const QByteArray document = ' ' + folded(movement.doc_no.simplified()).left(LongestText);
+    const std::string document =
+        ' ' + core::folded(movement.doc_no.simplified()).substr(0, LongestText);
     const Entry entry{movement.movimento_id,
                       movement.movimento_no,
                       relativeAt(movement.socio_id, movement.codABC),
                       movement.data.isValid() ? qint32(movement.data.toJulianDay()) : 0,
                       quint32(texts_.size()),
                       quint16(document.size()),
-                      positionOf(folded(movement.tipo), types_)};
-    texts_.append(document.constData(), size_t(document.size()));
+                      positionOf(core::folded(movement.tipo), types_)};
+    texts_ += document;
     return entry;
 }
 
@@ -201,7 +181,7 @@ quint32 MovementSearch::memberAt(qint32 socio_id) {
 
 quint32 MovementSearch::relativeAt(qint32 socio_id, const QString& codABC) {
     if (codABC.isEmpty()) return memberAt(socio_id);
-    const auto code = quint64(positionOf(codABC.toUtf8(), codes_)) + 1;
+    const auto code = quint64(positionOf(codABC.toStdString(), codes_)) + 1;
     const quint64 key = quint64(quint32(socio_id)) << 16 | code;
     const auto known = personAt_.constFind(key);
     return known != personAt_.constEnd() ? *known : addPerson(key, memberAt(socio_id));
@@ -214,12 +194,12 @@ quint32 MovementSearch::addPerson(quint64 key, quint32 member) {
     return person;
 }
 
-void MovementSearch::name(quint32 person, const QByteArray& words) {
+void MovementSearch::name(quint32 person, const std::string& words) {
     const std::string_view known = text(persons_[person].words, persons_[person].wordsSize);
-    if (known == std::string_view(words.constData(), size_t(words.size()))) return;
+    if (known == words) return;
     persons_[person].words = quint32(texts_.size());
     persons_[person].wordsSize = quint16(std::min(words.size(), LongestText));
-    texts_.append(words.constData(), persons_[person].wordsSize);
+    texts_.append(words, 0, persons_[person].wordsSize);
 }
 
 std::string_view MovementSearch::text(quint32 from, quint16 size) const {

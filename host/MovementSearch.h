@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QByteArray>
 #include <QDate>
 #include <QHash>
 #include <QString>
@@ -22,9 +21,6 @@ struct MovementKey {
     QString doc_no = {};
     bool activo = true;  ///< stands in the table of the active members
 };
-
-/// Letters as people compare them while typing: no accents, no case. UTF-8.
-QByteArray folded(const QString& text);
 
 /// All movements in force, newest first, in about 40 bytes each, so that a million of them answer
 /// a keystroke without asking the database.
@@ -75,14 +71,14 @@ private:
     quint32 memberAt(qint32 socio_id);
     quint32 relativeAt(qint32 socio_id, const QString& codABC);
     quint32 addPerson(quint64 key, quint32 member);
-    void name(quint32 person, const QByteArray& words);
+    void name(quint32 person, const std::string& words);
     std::string_view text(quint32 from, quint16 size) const;
 
     std::vector<Entry> entries_;
     std::vector<Person> persons_;
     QHash<quint64, quint32> personAt_;  // by socio_id and, below it, the position in codes_ plus 1
-    std::vector<QByteArray> types_;
-    std::vector<QByteArray> codes_;
+    std::vector<std::string> types_;
+    std::vector<std::string> codes_;
     std::string texts_;          // folded; each word behind a blank
     qint32 newest_[2] = {0, 0};  // of those who left, of the active
 };

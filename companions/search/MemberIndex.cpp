@@ -4,6 +4,7 @@
 #include <algorithm>
 
 #include "platform/ado/Recordset.h"
+#include "platform/core/Folding.h"
 #include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
@@ -29,20 +30,6 @@ std::vector<std::string> wordsOf(const std::string& text) {
 }
 
 }  // namespace
-
-std::string folded(const QString& text) {
-    QString plain;
-    plain.reserve(text.size() + 1);
-    bool between = true;
-    for (const QChar c : text.normalized(QString::NormalizationForm_KD)) {
-        if (c.isMark()) continue;
-        const bool part = c.isLetterOrNumber() || c.isSurrogate();
-        if (part && between) plain += u' ';
-        if (part) plain += c.toCaseFolded();
-        between = !part;
-    }
-    return plain.toStdString();
-}
 
 void MemberIndex::load(const ado::ConnectionPtr& connection) {
     const auto rows = ado::Recordset::create();
@@ -71,9 +58,9 @@ void MemberIndex::add(const Member& member) {
     }
     entry.shownEnd = static_cast<quint32>(shown_.size());
     entry.wordsBegin = static_cast<quint32>(words_.size());
-    words_ += folded(member.number);
+    words_ += core::foldedWords(member.number);
     entry.nameBegin = static_cast<quint32>(words_.size());
-    words_ += folded(member.name);
+    words_ += core::foldedWords(member.name);
     entry.wordsEnd = static_cast<quint32>(words_.size());
     entries_.push_back(entry);
 }
@@ -101,7 +88,7 @@ std::string_view MemberIndex::nameWords(const Entry& entry) const {
 }
 
 std::vector<int> MemberIndex::matching(const QString& typed) const {
-    const std::string text = folded(typed);
+    const std::string text = core::foldedWords(typed);
     const auto wanted = wordsOf(text);
     std::vector<int> found;
     for (size_t i = 0; i < entries_.size(); ++i) {

@@ -54,8 +54,4 @@ private:
     std::string words_;  // folded: " number word word …"
 };
 
-/// Lower case without accents; each word behind one blank, everything but letters and digits
-/// parts words.
-std::string folded(const QString& text);
-
 }  // namespace companions
