@@ -1,11 +1,9 @@
 // SPDX-License-Identifier: MIT
 // Rows of pessimistic sets are held against everybody else, and nothing else is.
-#include <gtest/gtest.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <QElapsedTimer>
-#include <thread>
 
 #include "SmallBook.h"
 
@@ -14,67 +12,57 @@ using namespace Qt::StringLiterals;
 namespace {
 
 const QString Counter = u"select * from tbConta"_s;
+const QString Hospitals = u"select * from tbHosp"_s;
 
-/// As every posting does it.
-int draw(const ado::ConnectionPtr& connection) {
-    const auto rows = openRows(Counter, connection, ado::adOpenDynamic, ado::adLockPessimistic);
-    const int number = rows->Collect(u"proximo"_s).toInt();
-    rows->setCollect(u"proximo"_s, number + 1);
-    rows->Update();
-    rows->Close();
-    return number;
-}
-
+/// The number with which looking at the current row fails.
 int lookedAt(const ado::RecordsetPtr& rows) {
-    return failureNumberOf([&] { rows->value(0); });
+    return failureOf([&] { rows->value(0); }).number();
 }
 
-/// Another process that holds the counter's row until it is killed.
-class Holder {
-public:
-    explicit Holder(const SmallBook& book) {
-        EXPECT_EQ(pipe(pipe_), 0);
-        process_ = fork();
-        if (process_ == 0) {
-            const auto rows = openRows(Counter, book.connect());
-            rows->value(0);
-            [[maybe_unused]] const ssize_t written = write(pipe_[1], "x", 1);
-            for (;;) pause();
-        }
-        char ready = 0;
-        EXPECT_EQ(read(pipe_[0], &ready, 1), 1);
+/// Runs the action in a process of its own, which ends with it.
+template <class Action>
+pid_t inAnotherProcess(const Action& action) {
+    const pid_t process = fork();
+    if (process == 0) {
+        action();
+        _exit(0);
     }
-    ~Holder() {
-        kill();
-        close(pipe_[0]);
-        close(pipe_[1]);
-    }
-    void kill() {
-        if (process_ > 0) {
-            ::kill(process_, SIGKILL);
-            waitpid(process_, nullptr, 0);
-        }
-        process_ = 0;
-    }
+    return process;
+}
 
-private:
-    int pipe_[2] = {};
-    pid_t process_ = 0;
-};
-
-class Locks : public testing::Test {
+class Locks : public SmallBook {
 protected:
     Locks() {
         book.exec(u"INSERT INTO tbConta VALUES(1); INSERT INTO tbHosp(code) VALUES('a'), ('b')"_s);
     }
-    SmallBook book;
+    void TearDown() override { killHolder(); }
+
+    /// Another process holds the counter's row until it is killed.
+    void startHolder() {
+        int ready[2] = {};
+        ASSERT_EQ(pipe(ready), 0);
+        holder_ = inAnotherProcess([&] {
+            const auto rows = open(Counter, connect());
+            rows->value(0);
+            if (write(ready[1], "x", 1) == 1) pause();
+        });
+        char sign = 0;
+        EXPECT_EQ(read(ready[0], &sign, 1), 1);
+    }
+    void killHolder() {
+        if (holder_ <= 0) return;
+        kill(holder_, SIGKILL);
+        waitpid(holder_, nullptr, 0);
+        holder_ = 0;
+    }
+
+private:
+    pid_t holder_ = 0;
 };
 
-}  // namespace
-
 TEST_F(Locks, HoldTheCurrentRowOnly) {
-    const auto first = openRows(u"select * from tbHosp"_s, book.connect());
-    const auto second = openRows(u"select * from tbHosp"_s, book.connect());
+    const auto first = open(Hospitals, connect());
+    const auto second = open(Hospitals, connect(1));
     EXPECT_EQ(lookedAt(first), 0);
     EXPECT_EQ(lookedAt(second), core::RowInUse);
     second->MoveNext();
@@ -89,27 +77,25 @@ TEST_F(Locks, HoldTheCurrentRowOnly) {
 }
 
 TEST_F(Locks, AreLetGoByUpdateAndTakenAgainByTheNextChange) {
-    const auto rows = openRows(u"select * from tbHosp"_s, book.connect());
+    const auto rows = open(Hospitals, connect(1));
     rows->setCollect(u"nome"_s, u"Luz"_s);
     rows->Update();
-    const auto other = openRows(u"select * from tbHosp"_s, book.connect());
+    const auto other = open(Hospitals, connect(1));
     EXPECT_EQ(lookedAt(other), 0);
     EXPECT_EQ(lookedAt(rows), 0);  // looking at what was stored holds nothing
-    EXPECT_EQ(failureNumberOf([&] { rows->setCollect(u"nome"_s, u"Sol"_s); }), core::RowInUse);
+    EXPECT_EQ(failureOf([&] { rows->setCollect(u"nome"_s, u"Sol"_s); }).number(), core::RowInUse);
     other->Close();
     rows->setCollect(u"nome"_s, u"Sol"_s);
-    EXPECT_EQ(lookedAt(openRows(u"select * from tbHosp"_s, book.connect())), core::RowInUse);
+    EXPECT_EQ(lookedAt(open(Hospitals, connect(1))), core::RowInUse);
 }
 
 TEST_F(Locks, AreNotTakenByOtherSetsAndNewRows) {
-    const auto connection = book.connect();
-    const auto held = openRows(Counter, connection);
+    const auto held = open(Counter, connection);
     EXPECT_EQ(lookedAt(held), 0);
-    EXPECT_EQ(lookedAt(openRows(Counter, connection, ado::adOpenStatic, ado::adLockOptimistic)), 0);
-    EXPECT_EQ(
-        lookedAt(openRows(Counter, connection, ado::adOpenUnspecified, ado::adLockUnspecified)), 0);
-    EXPECT_EQ(lookedAt(openRows(u"select sum(proximo) from tbConta"_s, connection)), 0);
-    const auto adding = openRows(Counter, connection);
+    EXPECT_EQ(lookedAt(open(Counter, connection, ado::adLockOptimistic)), 0);
+    EXPECT_EQ(lookedAt(open(Counter, connection, ado::adLockUnspecified)), 0);
+    EXPECT_EQ(lookedAt(open(u"select sum(proximo) from tbConta"_s, connection)), 0);
+    const auto adding = open(Counter, connection);
     adding->AddNew();
     adding->setCollect(u"proximo"_s, 5);
     adding->Update();
@@ -117,56 +103,50 @@ TEST_F(Locks, AreNotTakenByOtherSetsAndNewRows) {
 }
 
 TEST_F(Locks, ReadTheRowAfreshBeforeItIsGiven) {
-    const auto connection = book.connect();
-    const auto rows = openRows(Counter, connection);
+    const auto rows = open(Counter, connection);
     book.exec(u"UPDATE tbConta SET proximo=8"_s);
     EXPECT_EQ(rows->Collect(u"proximo"_s), QVariant(8));
 }
 
-TEST_F(Locks, NameTheHolderAndGiveUpAfterTheTimeout) {
-    const Holder holder(book);
-    const auto rows = openRows(Counter, book.connect(u"SQLOLEDB.1"_s, 1));
+TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
+    startHolder();
+    const auto rows = open(Counter, connect(1));
     QElapsedTimer waited;
     waited.start();
-    const QString text = failureOf([&] { rows->value(0); });
+    const QString text = failureOf([&] { rows->value(0); }).text();
     EXPECT_GE(waited.elapsed(), 900);
-    EXPECT_TRUE(text.contains(u"tbConta"_s) && text.contains(u'@')) << text.toStdString();
-}
-
-TEST_F(Locks, OfAProcessThatIsKilledAreFreeAtOnce) {
-    Holder holder(book);
-    const auto rows = openRows(Counter, book.connect(u"SQLOLEDB.1"_s, 0));
-    EXPECT_EQ(lookedAt(rows), core::RowInUse);
-    holder.kill();
-    EXPECT_EQ(lookedAt(rows), 0);
+    EXPECT_TRUE(text.contains(u"tbConta"_s) && text.contains(u'@')) << qPrintable(text);
+    const auto impatient = open(Counter, connect(0));
+    EXPECT_EQ(lookedAt(impatient), core::RowInUse);
+    killHolder();
+    EXPECT_EQ(lookedAt(impatient), 0);
 }
 
 TEST_F(Locks, GiveNoNumberTwice) {
-    constexpr int Workstations = 4;
-    constexpr int Draws = 50;
     std::vector<pid_t> processes;
-    for (int i = 0; i < Workstations; ++i) {
-        const pid_t process = fork();
-        if (process == 0) {
-            const auto connection = book.connect(u"SQLOLEDB.1"_s, 30);
-            for (int k = 0; k < Draws; ++k) {
-                const auto rows = openRows(u"select * from tbMov where id=0"_s, connection);
-                const int number = draw(connection);
-                rows->AddNew();
-                rows->setCollect(u"socio"_s, number);
-                rows->Update();
+    for (int workstation = 0; workstation < 4; ++workstation)
+        processes.push_back(inAnotherProcess([&] {
+            const auto mine = connect(30);
+            for (int draws = 0; draws < 50; ++draws) {
+                const auto counter =
+                    open(Counter, mine, ado::adLockPessimistic, ado::adOpenDynamic);
+                const int number = counter->Collect(u"proximo"_s).toInt();
+                counter->setCollect(u"proximo"_s, number + 1);
+                counter->Update();
+                const auto drawn = open(u"select * from tbMov where id=0"_s, mine);
+                drawn->AddNew();
+                drawn->setCollect(u"socio"_s, number);
+                drawn->Update();
             }
-            _exit(0);
-        }
-        processes.push_back(process);
-    }
+        }));
     for (const pid_t process : processes) {
         int status = -1;
         waitpid(process, &status, 0);
         EXPECT_EQ(status, 0);
     }
-    EXPECT_EQ(book.value(u"SELECT count(DISTINCT socio) || '/' || min(socio) || '/' || max(socio) "
-                         u"FROM tbMov"_s),
-              u"200/1/200"_s);
-    EXPECT_EQ(book.value(u"SELECT proximo FROM tbConta"_s), u"201"_s);
+    EXPECT_EQ(book.text(u"SELECT count(DISTINCT socio), min(socio), max(socio) FROM tbMov"_s),
+              u"200|1|200"_s);
+    EXPECT_EQ(book.text(u"SELECT proximo FROM tbConta"_s), u"201"_s);
 }
+
+}  // namespace

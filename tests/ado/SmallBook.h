@@ -1,62 +1,40 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <sqlite3.h>
-
-#include <QTemporaryDir>
+#include <gtest/gtest.h>
 
 #include "platform/ado/Recordset.h"
 #include "platform/core/Failure.h"
+#include "tests/support/Book.h"
 
-/// A book with a few small tables in a temporary folder, and a second handle on it that stands for
-/// any other program.
-class SmallBook {
-public:
+/// A book with a few small tables and a connection to it. What `book` runs by itself is what any
+/// other program does.
+class SmallBook : public testing::Test {
+protected:
     SmallBook();
-    ~SmallBook();
 
-    QString folder() const { return folder_.path(); }
-    QString file() const { return folder_.filePath(QStringLiteral("livro.db")); }
-    /// @param provider  "MSDataShape.1" for a connection that shapes
-    ado::ConnectionPtr connect(const QString& provider = QStringLiteral("SQLOLEDB.1"),
-                               int timeoutSeconds = 5) const;
+    ado::ConnectionPtr connect(int timeoutSeconds = 5) const;
+    /// The defaults are those of an editing screen.
+    static ado::RecordsetPtr open(const QString& statement, const ado::ConnectionPtr& connection,
+                                  ado::LockType lock = ado::adLockPessimistic,
+                                  ado::CursorType cursor = ado::adOpenStatic);
+    /// Rows 1 to `count` of tbMov.
+    void fill(int count);
 
-    // What another program does; a failure ends the test with the engine's text.
-    void exec(const QString& statements);
-    /// The first column of the first row as text; "NULL" for null, "-" for no row.
-    QString value(const QString& statement);
-    /// The same with the storage class before it, as in "real 87.35".
-    QString stored(const QString& expression, const QString& table);
-    sqlite3* handle() const { return other_; }
-
-private:
-    QTemporaryDir folder_;
-    sqlite3* other_ = nullptr;
+    support::Book book;
+    ado::ConnectionPtr connection = connect();
 };
 
-/// Opens a set; the defaults are those of an editing screen.
-ado::RecordsetPtr openRows(const QString& statement, const ado::ConnectionPtr& connection,
-                           ado::CursorType cursor = ado::adOpenStatic,
-                           ado::LockType lock = ado::adLockPessimistic);
+/// The values of a column from the current row on, parted by commas.
+QString valuesOf(const ado::RecordsetPtr& rows, const QString& column);
 
-/// The text of the failure that the action ends with; empty when it does not fail.
+/// What the action fails with; number 0 and no text when it does not fail.
 template <class Action>
-QString failureOf(Action&& action) {
+core::Failure failureOf(Action&& action) {
     try {
         action();
     } catch (const core::Failure& failure) {
-        return failure.text();
+        return failure;
     }
-    return {};
-}
-
-/// The number of the failure; 0 when there is none.
-template <class Action>
-int failureNumberOf(Action&& action) {
-    try {
-        action();
-    } catch (const core::Failure& failure) {
-        return failure.number();
-    }
-    return 0;
+    return {0, {}};
 }

@@ -32,25 +32,20 @@ public:
 struct Rule {
     const char* name;
     QString before;
-    QString after;
+    QString after = before;
 };
 
-class Translator : public testing::TestWithParam<Rule> {};
-
 const Rule Rules[] = {
-    {"PlainAggregatePasses", u"SELECT count(*) FROM tbA"_s, u"SELECT count(*) FROM tbA"_s},
     {"ClosingSemicolonGoes", u"SELECT count(*) FROM tbA ; "_s, u"SELECT count(*) FROM tbA"_s},
-    {"CommentStays", u"SELECT count(*) /* ; */ FROM tbA"_s, u"SELECT count(*) /* ; */ FROM tbA"_s},
-    {"UnknownFunctionPasses", u"SELECT max(datepart(yy, d)) FROM tbA"_s,
-     u"SELECT max(datepart(yy, d)) FROM tbA"_s},
+    {"CommentStays", u"SELECT count(*) /* ; */ FROM tbA"_s},
+    {"UnknownFunctionStays", u"SELECT max(datepart(yy, d)) FROM tbA"_s},
 
     {"ConvertWithTimeAndStyle",
      u"SELECT max(id) FROM tbA WHERE d >= CONVERT(DATETIME,'03/31/2001 00:00:00', 102)"_s,
      u"SELECT max(id) FROM tbA WHERE d >= '2001-03-31 00:00:00'"_s},
     {"ConvertWithoutTime", u"SELECT max(id) FROM tbA WHERE d < convert(datetime , '1/2/2001')"_s,
      u"SELECT max(id) FROM tbA WHERE d < '2001-01-02 00:00:00'"_s},
-    {"ConvertOfNoDatePasses",
-     u"SELECT max(id) FROM tbA WHERE d < CONVERT(DATETIME,'31/12/2001',102)"_s,
+    {"ConvertOfNoDateStays",
      u"SELECT max(id) FROM tbA WHERE d < CONVERT(DATETIME,'31/12/2001',102)"_s},
     {"DateBetweenSigns", u"SELECT max(id) FROM tbA WHERE d=#2/22/2000#"_s,
      u"SELECT max(id) FROM tbA WHERE d='2000-02-22 00:00:00'"_s},
@@ -58,38 +53,30 @@ const Rule Rules[] = {
      u"SELECT max(id) FROM tbA WHERE tipo='D''E'"_s},
     {"KeywordAsName", u"SELECT max(tbA.order) FROM tbA"_s, u"SELECT max(tbA.\"order\") FROM tbA"_s},
 
-    {"TextsAreJoined", u"SELECT max(code + '  -  ' + nome) FROM tbA"_s,
-     u"SELECT max(code || '  -  ' || nome) FROM tbA"_s},
     {"WholeChainIsJoined", u"SELECT max(a.b + c + f(d) + ' ' + (e)) FROM tbA"_s,
      u"SELECT max(a.b || c || f(d) || ' ' || (e)) FROM tbA"_s},
     {"NumbersAreAdded", u"SELECT max(a + b), max(c + ' ') FROM tbA"_s,
      u"SELECT max(a + b), max(c || ' ') FROM tbA"_s},
-    {"PlusInsideTextStays", u"SELECT max(nome) FROM tbA WHERE nome = 'a + b'"_s,
-     u"SELECT max(nome) FROM tbA WHERE nome = 'a + b'"_s},
+    {"PlusInsideTextStays", u"SELECT max(nome) FROM tbA WHERE nome = 'a + b'"_s},
 
     {"DifferenceOfSums",
      u"SELECT id FROM tbA GROUP BY id HAVING ((SUM(debito) - SUM(credito)) > 0.1)"_s,
      u"SELECT id FROM tbA GROUP BY id HAVING ((ROUND(SUM(debito) - SUM(credito),4)) > 0.1)"_s},
     {"SumOfDifference", u"SELECT Sum(tbA.debito-credito) AS d FROM tbA"_s,
      u"SELECT ROUND(Sum(tbA.debito-credito),4) AS d FROM tbA"_s},
-    {"SumOfFloatsKeepsItsDigits", u"SELECT Sum(credito_ac) FROM tbA"_s,
-     u"SELECT Sum(credito_ac) FROM tbA"_s},
-    {"CountedSumStays", u"SELECT Sum(id) FROM tbA"_s, u"SELECT Sum(id) FROM tbA"_s},
+    {"SumsOfFloatsAndCountsStay", u"SELECT Sum(credito_ac), Sum(id) FROM tbA"_s},
 
-    {"TextOrder", u"SELECT * FROM tbA ORDER BY nome"_s,
-     u"SELECT * FROM tbA ORDER BY nome COLLATE portuguese"_s},
     {"TextOrderWithDirections", u"SELECT * FROM vwA ORDER BY id, vwA.Nome DESC, code;"_s,
      u"SELECT * FROM vwA ORDER BY id, vwA.Nome COLLATE portuguese DESC, code COLLATE portuguese"_s},
-    {"NumberOrderStays", u"SELECT * FROM tbA ORDER BY id"_s, u"SELECT * FROM tbA ORDER BY id"_s},
     {"OrderByJoinedText", u"SELECT id, code + ' ' + nome AS completo FROM tbA ORDER BY completo"_s,
      u"SELECT id, code || ' ' || nome AS completo FROM tbA ORDER BY completo COLLATE portuguese"_s},
     {"OrderByAliasOfText", u"SELECT max(id), nome AS quem FROM tbA GROUP BY nome ORDER BY quem"_s,
      u"SELECT max(id), nome AS quem FROM tbA GROUP BY nome ORDER BY quem COLLATE portuguese"_s},
     {"OrderBehindUnion",
      u"SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM tbB ORDER BY "
-     u"tbA.nome"_s,
+     "tbA.nome"_s,
      u"SELECT * FROM (SELECT tbA.id, tbA.nome AS quem FROM tbA UNION SELECT tbB.id, tbB.nome FROM "
-     u"tbB ) ORDER BY quem COLLATE portuguese"_s},
+     "tbB ) ORDER BY quem COLLATE portuguese"_s},
     {"OrderBehindUnionWithoutAlias",
      u"SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ORDER BY tbA.id"_s,
      u"SELECT * FROM (SELECT tbA.* FROM tbA UNION SELECT tbB.* FROM tbB ) ORDER BY id"_s},
@@ -98,21 +85,16 @@ const Rule Rules[] = {
      u"Select id from TBA where id > 5 ORDER BY \"TBA\"._rowid_"_s},
     {"InsertionOrderOfJoin", u"SELECT x.id FROM tbA AS x LEFT JOIN tbB ON x.id = tbB.id"_s,
      u"SELECT x.id FROM tbA AS x LEFT JOIN tbB ON x.id = tbB.id ORDER BY \"x\"._rowid_"_s},
-    {"ViewHasNoInsertionOrder", u"SELECT * FROM vwA WHERE id = 1"_s,
-     u"SELECT * FROM vwA WHERE id = 1"_s},
-    {"GroupsHaveNoInsertionOrder", u"SELECT id FROM tbA GROUP BY id"_s,
-     u"SELECT id FROM tbA GROUP BY id"_s},
+    {"ViewHasNoInsertionOrder", u"SELECT * FROM vwA WHERE id = 1"_s},
+    {"GroupsHaveNoInsertionOrder", u"SELECT id FROM tbA GROUP BY id"_s},
 };
 
-}  // namespace
-
-TEST_P(Translator, Rule) {
+TEST(Translator, KeepsItsRules) {
     SmallSchema schema;
-    EXPECT_EQ(ado::translate(ado::Statement(GetParam().before), schema, false), GetParam().after);
+    for (const Rule& rule : Rules)
+        EXPECT_EQ(ado::translate(ado::Statement(rule.before), schema, false), rule.after)
+            << rule.name;
 }
-
-INSTANTIATE_TEST_SUITE_P(, Translator, testing::ValuesIn(Rules),
-                         [](const auto& rule) { return std::string(rule.param.name); });
 
 TEST(WritableStatement, IdentityStandsBeforeTheColumns) {
     SmallSchema schema;
@@ -131,3 +113,5 @@ TEST(WritableStatement, IsASelectStarOverOneTable) {
           u"select * from tbA where 1=1 group by id"_s})
         EXPECT_EQ(table(other), QString()) << other.toStdString();
 }
+
+}  // namespace
