@@ -369,6 +369,7 @@ TEST_F(Beneficiary, NonsenseFromTheMemberFileIsABoxAndTheScreenStays) {
     com::registerRunning(u"Tiqueta.General"_s, {});
     person.expectBox({.text = u"Tiqueta.General"_s, .icon = Icon::Critical, .partly = true});
     choosePerson(child);
+    EXPECT_EQ(form().Familia_ID, QVariant(0));
     EXPECT_EQ(form().Text3->Text(), u"B"_s);
     EXPECT_EQ(form().Socio_ID, socio);
     EXPECT_TRUE(form().isVisible());
