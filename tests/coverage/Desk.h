@@ -17,22 +17,6 @@ inline void PrintTo(const QString& text, std::ostream* out) {
     *out << text.toStdString();
 }
 
-/// The message boxes that a test expects, in their order. A box that nobody expects, or one with
-/// another text, icon, title or choice, fails the test; so does one that never comes.
-class Boxes {
-public:
-    Boxes();
-    ~Boxes();
-    Boxes(const Boxes&) = delete;
-    Boxes& operator=(const Boxes&) = delete;
-
-    /// A box with an OK button. The title given is that of a box without one of its own.
-    void expect(const QString& text, core::Icon icon = core::Icon::None,
-                const QString& title = core::DefaultTitle.toString());
-    /// A box with Yes and No.
-    void ask(const QString& text, core::Icon icon, const QString& title, core::Answer answer);
-};
-
 /// Stands for the progress window. It notes what it is asked, one line a call: "setvalor(1)";
 /// "made" and "gone" tell of the object itself.
 class FakeVorlane : public QObject {
@@ -40,12 +24,19 @@ class FakeVorlane : public QObject {
 public:
     FakeVorlane() { calls() << QStringLiteral("made"); }
     ~FakeVorlane() override { calls() << QStringLiteral("gone"); }
-    static QStringList& calls();
+    static QStringList& calls() {
+        static QStringList calls;
+        return calls;
+    }
     /// How many times the bar went one step on.
     static qsizetype steps() { return calls().count(QStringLiteral("setvalor(1)")); }
 
-    Q_INVOKABLE void Iniciar(qint16 steps, const QString& text, const QString& title);
-    Q_INVOKABLE void setvalor(qint16 steps);
+    Q_INVOKABLE void Iniciar(qint16 steps, const QString& text, const QString& title) {
+        calls() << QStringLiteral("Iniciar(%1, %2, %3)").arg(QString::number(steps), text, title);
+    }
+    Q_INVOKABLE void setvalor(qint16 steps) {
+        calls() << QStringLiteral("setvalor(%1)").arg(steps);
+    }
     Q_INVOKABLE void terminar() { calls() << QStringLiteral("terminar()"); }
 };
 
@@ -66,12 +57,18 @@ protected:
     Desk();
     ~Desk() override;
 
+    /// The next message box. One that nobody expects, or one with another text, icon, title or
+    /// choice, fails the test; so does one that never comes. Answers other than Ok are to a choice.
+    static void expectBox(const QString& text, core::Icon icon = core::Icon::None,
+                          const QString& title = core::DefaultTitle.toString(),
+                          core::Answer answer = core::Answer::Ok);
+
     /// Opens the pending row of a new movement, as the entry screen does, and keys the document in.
     coverage::Entry enter(const Document& document) const;
     /// Tries out; the outcome is in `run`.
     void tryOut(const coverage::Entry& entry) { coverage::tryOut(entry, run); }
     /// A posting with nothing missing, by bank transfer.
-    coverage::PostingEntry posting(const coverage::Entry& entry) const;
+    static coverage::PostingEntry posting(const coverage::Entry& entry);
     /// Posts, the operator saying yes.
     bool post(const coverage::PostingEntry& posting);
     bool post(const coverage::Entry& entry) { return post(posting(entry)); }
@@ -92,7 +89,6 @@ protected:
 
     static const QString caption;  ///< of the entry screen
     support::Book book;
-    Boxes boxes;
     qint32 socio;
     coverage::TryOut run;
 };
