@@ -204,15 +204,15 @@ TEST_F(Beneficiary, PremiumStatementStaysOpenUntilTheNextSearchOrTheEnd) {
               QStringList({u"Lumbra.Login(\"zelmars\", \"\")"_s,
                            u"Lumbra.appShow(\"QUO01\", 1, nothing, \"Activos\", "
                            "\"tbQuotas_Movimentos.socio_id=%1\", true, true)"_s.arg(socio)}));
-    EXPECT_EQ(companions.searchesAlive, 1);
+    EXPECT_EQ(companions.statementsOpen, 1);
 
     person.expectBox({.text = Question, .answer = Answer::Yes});
     search(socio);
-    EXPECT_EQ(companions.searchesAlive, 1);
+    EXPECT_EQ(companions.statementsOpen, 1);
 
     form().Unload();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-    EXPECT_EQ(companions.searchesAlive, 0);
+    EXPECT_EQ(companions.statementsOpen, 0);
 }
 
 TEST_F(Beneficiary, FaultyBankNumberWarnsAndOffersTheFile) {

@@ -56,6 +56,8 @@ QVariant FakeLumbra::appShow(const QString& code, const QVariant& a, const QVari
     QVariantList given{code, a, b, c, d, e, f};
     while (!given.last().isValid()) given.removeLast();
     all_.note(u"Lumbra.appShow"_s, given);
+    showsStatement_ = code == u"QUO01"_s;
+    all_.statementsOpen += showsStatement_;
     return code == u"SOC01"_s ? all_.memberFound : QVariant();
 }
 

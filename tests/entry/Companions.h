@@ -21,7 +21,7 @@ struct Companions {
     QVariant memberFound = 0;   ///< answer of the search
     QVariant personChosen = 0;  ///< answer of the member file
     QString failing;            ///< a member that fails, as "Lumbra.appShow"
-    int searchesAlive = 0;
+    int statementsOpen = 0;     ///< premium statements whose component is kept
     int progress = 0;
 
     void note(const QString& member, const QVariantList& arguments);
@@ -33,8 +33,8 @@ inline constexpr QStringView CompanionFailure = u"O componente avariou.";
 class FakeLumbra : public QObject {
     Q_OBJECT
 public:
-    explicit FakeLumbra(Companions& all) : all_(all) { ++all_.searchesAlive; }
-    ~FakeLumbra() override { --all_.searchesAlive; }
+    explicit FakeLumbra(Companions& all) : all_(all) {}
+    ~FakeLumbra() override { all_.statementsOpen -= showsStatement_; }
     Q_INVOKABLE void Login(QString* user, QString* password);
     Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& a = {},
                                  const QVariant& b = {}, const QVariant& c = {},
@@ -42,6 +42,7 @@ public:
                                  const QVariant& f = {});
 
 private:
+    bool showsStatement_ = false;
     Companions& all_;
 };
 
