@@ -35,29 +35,19 @@ protected:
     Locks() {
         book.exec(u"INSERT INTO tbConta VALUES(1); INSERT INTO tbHosp(code) VALUES('a'), ('b')"_s);
     }
-    void TearDown() override { killHolder(); }
-
-    /// Another process holds the counter's row until it is killed.
-    void startHolder() {
+    /// Another process, which holds the counter's row until it is killed.
+    pid_t startHolder() const {
         int ready[2] = {};
-        ASSERT_EQ(pipe(ready), 0);
-        holder_ = inAnotherProcess([&] {
+        EXPECT_EQ(pipe(ready), 0);
+        const pid_t process = inAnotherProcess([&] {
             const auto rows = open(Counter, connect());
             rows->value(0);
             if (write(ready[1], "x", 1) == 1) pause();
         });
         char sign = 0;
         EXPECT_EQ(read(ready[0], &sign, 1), 1);
+        return process;
     }
-    void killHolder() {
-        if (holder_ <= 0) return;
-        kill(holder_, SIGKILL);
-        waitpid(holder_, nullptr, 0);
-        holder_ = 0;
-    }
-
-private:
-    pid_t holder_ = 0;
 };
 
 TEST_F(Locks, HoldTheCurrentRowOnly) {
@@ -71,9 +61,10 @@ TEST_F(Locks, HoldTheCurrentRowOnly) {
     EXPECT_EQ(lookedAt(first), core::RowInUse);
     second->MoveFirst();
     EXPECT_EQ(lookedAt(second), 0);
+    book.exec(u"UPDATE tbHosp SET nome='Luz'"_s);
     second->Close();
     first->MoveFirst();
-    EXPECT_EQ(lookedAt(first), 0);
+    EXPECT_EQ(first->Collect(u"nome"_s), u"Luz"_s);  // read afresh before it is given
 }
 
 TEST_F(Locks, AreLetGoByUpdateAndTakenAgainByTheNextChange) {
@@ -102,14 +93,8 @@ TEST_F(Locks, AreNotTakenByOtherSetsAndNewRows) {
     EXPECT_EQ(adding->Collect(u"proximo"_s), QVariant(5));
 }
 
-TEST_F(Locks, ReadTheRowAfreshBeforeItIsGiven) {
-    const auto rows = open(Counter, connection);
-    book.exec(u"UPDATE tbConta SET proximo=8"_s);
-    EXPECT_EQ(rows->Collect(u"proximo"_s), QVariant(8));
-}
-
 TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
-    startHolder();
+    const pid_t holder = startHolder();
     const auto rows = open(Counter, connect(1));
     QElapsedTimer waited;
     waited.start();
@@ -118,7 +103,8 @@ TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
     EXPECT_TRUE(text.contains(u"tbConta"_s) && text.contains(u'@')) << qPrintable(text);
     const auto impatient = open(Counter, connect(0));
     EXPECT_EQ(lookedAt(impatient), core::RowInUse);
-    killHolder();
+    kill(holder, SIGKILL);
+    waitpid(holder, nullptr, 0);
     EXPECT_EQ(lookedAt(impatient), 0);
 }
 

@@ -2,7 +2,6 @@
 #include <QFile>
 
 #include "SmallBook.h"
-#include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
 
@@ -18,24 +17,13 @@ qint64 residentKilobytes() {
     return file.readAll().split(' ').value(1).toLongLong() * 4;
 }
 
-TEST_F(Reading, KeepsNullEmptyAndZeroApart) {
-    book.exec(u"INSERT INTO tbMov(nome, valor) VALUES(NULL, NULL), ('', 0)"_s);
-    const auto rows = open(Movements, connection);
-    EXPECT_FALSE(rows->Collect(u"nome"_s).isValid());
-    EXPECT_FALSE(rows->Collect(u"valor"_s).isValid());
-    rows->MoveNext();
-    EXPECT_EQ(rows->Collect(u"nome"_s), QVariant(u""_s));
-    EXPECT_EQ(core::toText(rows->Collect(u"valor"_s)), u"0"_s);
-    rows->MoveNext();
-    EXPECT_EQ(failureOf([&] { rows->Collect(u"nome"_s); }).number(), core::NoCurrentRow);
-}
-
 // Also after updates rows come in the order of their insertion. Statements that differ only in the
 // values of their conditions share one prepared query.
 TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
     book.exec(
-        u"INSERT INTO tbMov(socio, tipo, nome, valor, data) VALUES(5,'REP','5',1.5,'2001-04-01 "
-        "00:00:00'), (6,'DOC','x''y',-2,'2001-03-31 00:00:00'), (5,'PAG','5.0',3,NULL);"
+        u"INSERT INTO tbMov(socio, tipo, nome, valor, data, obs) VALUES(5,'REP','5',1.5,"
+        "'2001-04-01 00:00:00',NULL), (6,'DOC','x''y',-2,'2001-03-31 00:00:00',''),"
+        "(5,'PAG','5.0',3,NULL,'0');"
         "UPDATE tbMov SET tipo='AAA' WHERE id=3;"
         "INSERT INTO tbHosp(nome, code) VALUES('Zita','01'), ('Évora',NULL), (NULL,NULL),"
         "('etc',NULL), ('Eva',NULL), ('água',NULL), ('Ana',NULL), ('eva',NULL);"
@@ -53,14 +41,12 @@ TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
         {where + u"socio > 3"_s, u"id"_s, u"1,2,3"_s},
         {u"select id, tipo from tbMov where socio=5"_s, u"id"_s, u"1,3"_s},
         {where + u"socio = 6"_s, u"id"_s, u"2"_s},
-        {where + u"socio = '6'"_s, u"id"_s, u"2"_s},
         {where + u"nome = '5'"_s, u"id"_s, u"1"_s},
         {where + u"nome = 5"_s, u"id"_s, u"1"_s},
-        {where + u"nome = 'x''y'"_s, u"id"_s, u"2"_s},
-        {where + u"valor = 1.5"_s, u"id"_s, u"1"_s},
         {where + u"valor < -1"_s, u"id"_s, u"2"_s},
         {where + u"socio = 99999999999999999999"_s, u"id"_s, {}},
         {where + u"data <= CONVERT(DATETIME,'03/31/2001 00:00:00', 102)"_s, u"id"_s, u"2"_s},
+        {u"select obs from tbMov"_s, u"obs"_s, u"NULL,,0"_s},
         {u"select * from tbHosp order by nome;"_s, u"nome"_s,
          u"NULL,água,Ana,etc,eva,Eva,Évora,Zita"_s},
         {u"select * from tbHosp where nome='EVA'"_s, u"nome"_s, {}},
@@ -80,39 +66,24 @@ TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
     EXPECT_EQ(second->value(0), u"x'y"_s);
 }
 
-// The numbers lie around the sizes of what is read at a time.
-TEST_F(Reading, PassesCountsAndPassesAgain) {
-    for (const int count : {2, 31, 32, 33, 34, 500}) {
-        book.exec(u"DELETE FROM tbMov; DELETE FROM sqlite_sequence"_s);
-        fill(count);
-        const auto rows = open(Movements, connection);
-        rows->MoveLast();
-        EXPECT_EQ(rows->RecordCount(), count);
-        EXPECT_EQ(rows->Collect(u"id"_s), QVariant(count));
-        rows->MoveNext();
-        EXPECT_TRUE(rows->atEnd());
-        rows->MoveFirst();
-        int expected = 0;
-        for (; !rows->atEnd(); rows->MoveNext())
-            ASSERT_EQ(rows->Collect(u"id"_s), QVariant(++expected));
-        EXPECT_EQ(expected, count);
-    }
-}
-
-TEST_F(Reading, OfAStaticSetDoesNotSeeLaterWritesHoweverLongItIs) {
-    for (const int count : {3, 400}) {
+// Around the sizes of what is read at a time.
+TEST_F(Reading, OfAStaticSetCountsAndPassesTwiceAndSeesNoLaterWrite) {
+    for (const int count : {3, 31, 32, 33, 34, 400}) {
         book.exec(u"DELETE FROM tbMov; DELETE FROM sqlite_sequence"_s);
         fill(count);
         const auto rows = open(Movements, connection, ado::adLockOptimistic);
         book.exec(
             u"UPDATE tbMov SET nome='mudado'; INSERT INTO tbMov(nome) VALUES('novo');"
             "DELETE FROM tbMov WHERE id=2"_s);
-        rows->MoveLast();
-        EXPECT_EQ(rows->RecordCount(), count);
-        EXPECT_EQ(rows->Collect(u"nome"_s), u"n%1"_s.arg(count));
-        rows->MoveFirst();
-        rows->MoveNext();
-        EXPECT_EQ(rows->Collect(u"nome"_s), u"n2"_s);
+        for (int pass = 0; pass < 2; ++pass) {
+            rows->MoveLast();
+            EXPECT_EQ(rows->RecordCount(), count);
+            rows->MoveFirst();
+            int expected = 0;
+            for (; !rows->atEnd(); rows->MoveNext())
+                ASSERT_EQ(rows->Collect(u"nome"_s), u"n%1"_s.arg(++expected));
+            EXPECT_EQ(expected, count);
+        }
         // The open scan hides nothing from the other reads of the connection.
         EXPECT_EQ(open(u"select nome from tbMov where id=1"_s, connection)->value(0), u"mudado"_s);
     }
@@ -139,20 +110,6 @@ TEST_F(Reading, OfALongSetTakesBoundedMemory) {
     for (; !rows->atEnd(); rows->MoveNext()) ++count;
     EXPECT_EQ(count, 200000);
     EXPECT_LT(residentKilobytes() - before, 6000);
-}
-
-TEST_F(Reading, ForAListMovesNothing) {
-    fill(80);
-    const auto rows = open(Movements, connection);
-    EXPECT_EQ(rows->rowsInMemory(), 0);
-    rows->MoveNext();
-    rows->readAll();
-    EXPECT_EQ(rows->rowsInMemory(), 80);
-    EXPECT_EQ(rows->valueAt(79, 6), u"n80"_s);
-    EXPECT_EQ(rows->Collect(u"id"_s), QVariant(2));
-    rows->MoveTo(70);
-    EXPECT_EQ(rows->Collect(u"id"_s), QVariant(71));
-    EXPECT_EQ(failureOf([&] { rows->MoveTo(80); }).number(), core::NoCurrentRow);
 }
 
 }  // namespace

@@ -35,11 +35,7 @@ TEST_F(Shapes, GiveEachRowItsChildren) {
 
     rows->MoveLast();
     const auto children = rows->Chapter(u"detalhe"_s);
-    EXPECT_EQ(children->rowsInMemory(), 2);
     EXPECT_EQ(core::toText(children->valueAt(1, 4)), u"30"_s);
-    children->MoveLast();
-    children->Requery();
-    EXPECT_EQ(core::toText(children->Collect(u"valor"_s)), u"10"_s);
 }
 
 TEST_F(Shapes, ThatCannotBeSayWhy) {

@@ -10,7 +10,7 @@ SmallBook::SmallBook() {
         uR"(
         CREATE TABLE tbMov (id INTEGER PRIMARY KEY AUTOINCREMENT, socio INTEGER, tipo VARCHAR(3),
             data DATETIME, valor MONEY, taxa DOUBLE, nome VARCHAR(10), obs TEXT, pequeno SMALLINT,
-            grande BIGINT, estado TEXT DEFAULT 'novo');
+            grande BIGINT, estado TEXT DEFAULT 'novo', simples REAL);
         CREATE TABLE tbSoma (socio INTEGER, credito REAL, docs INTEGER);
         CREATE TABLE tbConta (proximo INTEGER);
         CREATE TABLE tbHosp (hosp_id INTEGER PRIMARY KEY, code VARCHAR(5), nome VARCHAR(40));

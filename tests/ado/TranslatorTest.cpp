@@ -15,17 +15,16 @@ namespace {
 class SmallSchema : public ado::Schema {
 public:
     bool isTable(QStringView name) override {
-        return name.compare(u"tbA", Qt::CaseInsensitive) == 0 ||
-               name.compare(u"tbB", Qt::CaseInsensitive) == 0;
+        return QStringList({u"tbA"_s, u"tbB"_s}).contains(name, Qt::CaseInsensitive);
     }
     std::optional<ado::ColumnType> columnType(QStringView table, QStringView column) override {
-        static const QHash<QString, ado::ColumnType> columns = {
-            {u"id"_s, ado::ColumnType::Integer32},  {u"nome"_s, ado::ColumnType::Text},
-            {u"code"_s, ado::ColumnType::Text},     {u"debito"_s, ado::ColumnType::Money},
-            {u"credito"_s, ado::ColumnType::Money}, {u"credito_ac"_s, ado::ColumnType::Single}};
-        if (!isTable(table) && table.compare(u"vwA", Qt::CaseInsensitive) != 0) return {};
-        const auto found = columns.constFind(column.toString().toLower());
-        return found == columns.constEnd() ? std::nullopt : std::optional(*found);
+        using enum ado::ColumnType;
+        static const QHash<QString, ado::ColumnType> types = {
+            {u"id"_s, Integer32}, {u"nome"_s, Text},     {u"code"_s, Text},
+            {u"debito"_s, Money}, {u"credito"_s, Money}, {u"credito_ac"_s, Single}};
+        const auto type = types.constFind(column.toString().toLower());
+        const bool known = isTable(table) || table == u"vwA";
+        return known && type != types.constEnd() ? std::optional(*type) : std::nullopt;
     }
 };
 
@@ -96,22 +95,18 @@ TEST(Translator, KeepsItsRules) {
             << rule.name;
 }
 
-TEST(WritableStatement, IdentityStandsBeforeTheColumns) {
+TEST(WritableStatement, IsASelectStarOverOneTableAndCarriesTheIdentity) {
     SmallSchema schema;
     EXPECT_EQ(ado::translate(ado::Statement(u"select * from tbA where id=1;"_s), schema, true),
               u"select _rowid_,* from tbA where id=1 ORDER BY \"tbA\"._rowid_"_s);
-}
-
-TEST(WritableStatement, IsASelectStarOverOneTable) {
     const auto table = [](const QString& text) { return ado::Statement(text).singleTable(); };
-    EXPECT_EQ(table(u"SELECT * From [tbA]"_s), u"tbA"_s);
-    EXPECT_EQ(table(u"select * from tbA where x in (1,2) order by y;"_s), u"tbA"_s);
+    EXPECT_EQ(table(u"SELECT * From [tbA] where x in (1,2) order by y;"_s), u"tbA"_s);
     for (const QString& other :
          {u"select id from tbA"_s, u"select *, 1 from tbA"_s, u"select * from tbA, tbB"_s,
           u"select * from tbA left join tbB on 1=1"_s, u"select * from (select 1)"_s,
           u"select * from tbA where 1=1 union select * from tbB"_s,
           u"select * from tbA where 1=1 group by id"_s})
-        EXPECT_EQ(table(other), QString()) << other.toStdString();
+        EXPECT_EQ(table(other), QString()) << qPrintable(other);
 }
 
 }  // namespace
