@@ -7,35 +7,27 @@ using environment::dtZelmars;
 
 namespace {
 
-class Environment : public Configured {
-protected:
-    void SetUp() override { ASSERT_TRUE(boundary::Login()); }
-};
+class Environment : public Configured {};
 
-TEST_F(Environment, HasItsTwoConnectionsAndThirteenCommandsInOrder) {
-    EXPECT_EQ(dtZelmars::instance().Connections(1), dtZelmars::instance().MSAccess());
-    EXPECT_EQ(dtZelmars::instance().Connections(2), dtZelmars::instance().SqlServer());
-    EXPECT_EQ(dtZelmars::instance().Connections(u"msaccess"_s), dtZelmars::instance().MSAccess());
-    EXPECT_EQ(dtZelmars::instance().commandNames(),
+TEST_F(Environment, HasItsConnectionsAndThirteenCommandsAndEachTextRunsOnAnEmptyBook) {
+    ASSERT_TRUE(boundary::Login());
+    dtZelmars& environment = dtZelmars::instance();
+    EXPECT_EQ(environment.Connections(1), environment.MSAccess());
+    EXPECT_EQ(environment.Connections(u"sqlserver"_s), environment.SqlServer());
+    EXPECT_EQ(environment.commandNames(),
               (QStringList{u"msRubricas"_s, u"msHospitais"_s, u"msLocalidades"_s, u"msFamiliares"_s,
                            u"msTipos"_s, u"msModosPagamento"_s, u"Print_frmTRF_TRF"_s,
                            u"Print_frmTRF_CHQ"_s, u"Print_frmListagemDividas"_s,
                            u"Print_frmListagemHospitais"_s, u"Print_Extrato1"_s, u"Print_Irs"_s,
                            u"msOutrasInstituicoes"_s}));
-}
-
-TEST_F(Environment, EveryTextRunsOnAnEmptyBook) {
-    for (const QString& name : dtZelmars::instance().commandNames()) {
-        const ado::RecordsetPtr rows = dtZelmars::instance().Recordsets(name);
-        const QString text = dtZelmars::instance().Commands(name).CommandText;
+    for (const QString& name : environment.commandNames()) {
+        const ado::RecordsetPtr rows = ado::Recordset::create();
         EXPECT_EQ(failureOf([&] {
-                      if (rows->State() != ado::adStateClosed) rows->Close();
-                      rows->Open(text, dtZelmars::instance().SqlServer());
+                      rows->Open(environment.Commands(name).CommandText, environment.SqlServer());
                       rows->Requery();
                   }),
                   QString())
             << qPrintable(name);
-        if (rows->State() != ado::adStateClosed) rows->Close();
     }
 }
 

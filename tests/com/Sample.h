@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QDateTime>
 #include <QObject>
 #include <QVariant>
 
@@ -11,35 +10,24 @@
 class Sample : public QObject {
     Q_OBJECT
 public:
-    Q_INVOKABLE void nothing() { ++calls; }
     Q_INVOKABLE QString join(const QString& a, const QString& b = QStringLiteral("x"), int c = 7) {
         return QStringLiteral("%1-%2-%3").arg(a, b).arg(c);
     }
     Q_INVOKABLE void swapTexts(QString* a, QString* b) { std::swap(*a, *b); }
     Q_INVOKABLE bool leftOut(QString* text = nullptr) { return text == nullptr; }
     Q_INVOKABLE void openRecord(int* id) { ++*id; }
-    Q_INVOKABLE void change(QVariant* value) { *value = QStringLiteral("novo"); }
     Q_INVOKABLE int sixteenBits(qint16 number) { return number; }
-    Q_INVOKABLE int length(const QString& text) { return static_cast<int>(text.size()); }
     Q_INVOKABLE double half(double number) { return number / 2; }
-    Q_INVOKABLE QDateTime midnight(const QDateTime& at) {
-        return {at.date(), QTime(0, 0), Qt::UTC};
-    }
     Q_INVOKABLE QVariant echo(const QVariant& value) { return value; }
-    Q_INVOKABLE QObject* self() { return this; }
     Q_INVOKABLE QString nameOf(QObject* object) {
         return object ? object->objectName() : QStringLiteral("nenhum");
     }
     /// As a search window is called: an argument in the middle may be left out.
     Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& a = {},
-                                 const QVariant& b = {}, const QVariant& c = {}) {
-        return QStringLiteral("%1:%2:%3:%4")
-            .arg(code, a.toString(), b.isValid() ? b.toString() : QStringLiteral("-"),
-                 c.toString());
+                                 const QVariant& b = {}) {
+        return QStringList{code, a.toString(), b.toString()}.join(u':');
     }
     Q_INVOKABLE void fail() { throw core::Failure(core::RowInUse, QStringLiteral("em uso")); }
-
-    int calls = 0;
 
 signals:
     void changed();
