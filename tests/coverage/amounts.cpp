@@ -9,7 +9,7 @@ namespace {
 class Amounts : public Desk {
 protected:
     coverage::Entry triedOut(const Document& document) {
-        coverage::Entry entry = enter(document);
+        const coverage::Entry entry = enter(document);
         tryOut(entry);
         return entry;
     }
