@@ -50,7 +50,8 @@ TEST_F(Combo, ATypedBeginningOrPartIsTakenByTabAndWhatFitsNothingIsNull) {
         // An entry that begins so comes before an earlier one that only holds it.
         {u"0"_s, u"01 Consultas"_s, 1},
         {u""_s, u""_s, 0},
-        {u"xyz'"_s, u"xyz'"_s, 0},
+        {u"xyz'"_s, u""_s, 0},
+        {u"s"_s, u""_s, 0},  // several hold it
     };
     for (const auto& trial : trials) {
         person.fill(u"Rubrica"_s, trial.typed);

@@ -12,7 +12,7 @@ namespace {
 constexpr QStringView Tables =
     uR"(
     create table recibo (recibo_id integer primary key, numero varchar(10), valor money,
-        taxa real, ordem smallint, vezes integer, fator double, dia datetime, notas varchar(200),
+        ordem smallint, fator double, dia datetime, notas varchar(200),
         rubrica_id integer, modo varchar(3));
     create table rubrica (rubrica_id integer primary key, descrit varchar(60));
     create table codigo (code varchar(3), completo varchar(40));

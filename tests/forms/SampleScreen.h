@@ -14,20 +14,24 @@ public:
     explicit SampleScreen(const QString& name = QStringLiteral("frmRecibo"));
     void take(const ado::RecordsetPtr& rows) { Adodc1.setRecordset(rows); }
 
-    forms::DataControl Adodc1;
-    forms::TextBox Livre, Numero, Valor, Taxa, Ordem, Dia, Notas, Mostra;
-    forms::DataCombo Rubrica, Modo;
-    forms::DatePicker Desde;
-    forms::CheckBox Check1;
-    forms::OptionButton Option1, Option2;
-    forms::Button Command1, Command3, Command4;
+    forms::DataControl Adodc1{QStringLiteral("Adodc1"), this};
+    forms::TextBox Livre{QStringLiteral("Livre")};
+    forms::TextBox Numero{QStringLiteral("Numero")};
+    forms::TextBox Valor{QStringLiteral("Valor")};
+    forms::TextBox Ordem{QStringLiteral("Ordem")};
+    forms::TextBox Dia{QStringLiteral("Dia")};
+    forms::TextBox Notas{QStringLiteral("Notas")};
+    forms::TextBox Mostra{QStringLiteral("Mostra")};  ///< only shows
+    forms::DataCombo Rubrica{QStringLiteral("Rubrica")};
+    forms::DataCombo Modo{QStringLiteral("Modo")};
+    forms::DatePicker Desde{QStringLiteral("Desde")};
+    forms::OptionButton Option2{QStringLiteral("Option2"), QStringLiteral("&Inactivos")};
+    forms::Button Command1{QStringLiteral("Command1"), QStringLiteral("&Procurar Sócio")};
+    forms::Button Command3{QStringLiteral("Command3"), QStringLiteral("&OK")};
+    forms::Button Command4{QStringLiteral("Command4"), QStringLiteral("&Desistir")};
     int pressed = 0;    ///< times that Command1 was pressed
     int finished = 0;   ///< times that the default button was pressed
-    int cancelled = 0;  ///< times that "&Cancelar" was pressed
-
-private:
-    void layOut();
-    void bindControls();
+    int cancelled = 0;  ///< times that Command4 was pressed
 };
 
 /// A screen of a test: on the heap, as a screen that unloads itself has to be, and unloaded with

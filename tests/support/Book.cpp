@@ -5,7 +5,6 @@
 
 #include <QDir>
 #include <QFile>
-#include <memory>
 #include <stdexcept>
 
 #include "database/Book.h"
@@ -33,52 +32,19 @@ QString pattern(Book::Content content) {
     return file;
 }
 
-using StatementPtr = std::unique_ptr<sqlite3_stmt, decltype(&sqlite3_finalize)>;
-
 [[noreturn]] void fail(sqlite3* handle, const QString& statement) {
     throw std::runtime_error(std::string(sqlite3_errmsg(handle)) + ": " + statement.toStdString());
 }
 
-StatementPtr prepare(sqlite3* handle, const QString& statement) {
-    sqlite3_stmt* prepared = nullptr;
-    if (sqlite3_prepare_v2(handle, statement.toUtf8().constData(), -1, &prepared, nullptr) !=
-        SQLITE_OK)
-        fail(handle, statement);
-    return {prepared, &sqlite3_finalize};
-}
-
-void bind(sqlite3_stmt* statement, int parameter, const QVariant& value) {
-    if (!value.isValid() || value.isNull()) {
-        sqlite3_bind_null(statement, parameter);
-        return;
-    }
-    if (value.canConvert<core::Money>()) {
-        sqlite3_bind_double(statement, parameter, value.value<core::Money>().toDouble());
-        return;
-    }
-    switch (value.typeId()) {
-        case QMetaType::Bool:
-        case QMetaType::Int:
-        case QMetaType::LongLong:
-        case QMetaType::Long:
-            sqlite3_bind_int64(statement, parameter, value.toLongLong());
-            return;
-        case QMetaType::Float:
-        case QMetaType::Double:
-            sqlite3_bind_double(statement, parameter, value.toDouble());
-            return;
-        case QMetaType::QDate:
-        case QMetaType::QDateTime: {
-            const QByteArray at = value.toDateTime().toString(u"yyyy-MM-dd HH:mm:ss"_s).toUtf8();
-            sqlite3_bind_text(statement, parameter, at.constData(), -1, SQLITE_TRANSIENT);
-            return;
-        }
-        default: {
-            const QByteArray utf8 = value.toString().toUtf8();
-            sqlite3_bind_text(statement, parameter, utf8.constData(), static_cast<int>(utf8.size()),
-                              SQLITE_TRANSIENT);
-        }
-    }
+QString literal(const QVariant& value) {
+    if (!value.isValid() || value.isNull()) return u"null"_s;
+    if (value.canConvert<core::Money>())
+        return QString::number(value.value<core::Money>().toDouble(), 'f', 4);
+    if (value.typeId() == QMetaType::Bool) return value.toBool() ? u"1"_s : u"0"_s;
+    if (value.typeId() == QMetaType::QDate || value.typeId() == QMetaType::QDateTime)
+        return value.toDateTime().toString(u"''yyyy-MM-dd HH:mm:ss''"_s);
+    if (value.typeId() != QMetaType::QString) return value.toString();
+    return u"'"_s + value.toString().replace(u"'"_s, u"''"_s) + u"'"_s;
 }
 
 QVariant column(sqlite3_stmt* statement, int at) {
@@ -93,6 +59,19 @@ QVariant column(sqlite3_stmt* statement, int at) {
             return QString::fromUtf8(
                 reinterpret_cast<const char*>(sqlite3_column_text(statement, at)));
     }
+}
+
+QList<QVariantList> rowsOf(sqlite3* handle, const QString& statement) {
+    sqlite3_stmt* query = nullptr;
+    int result = sqlite3_prepare_v2(handle, statement.toUtf8().constData(), -1, &query, nullptr);
+    QList<QVariantList> rows;
+    while (query && (result = sqlite3_step(query)) == SQLITE_ROW) {
+        rows.append(QVariantList());
+        for (int at = 0; at < sqlite3_column_count(query); ++at) rows.last() << column(query, at);
+    }
+    sqlite3_finalize(query);
+    if (result != SQLITE_DONE) fail(handle, statement);
+    return rows;
 }
 
 }  // namespace
@@ -146,27 +125,17 @@ void Book::exec(const QString& statements) {
 }
 
 QVariant Book::value(const QString& statement) {
-    const StatementPtr query = prepare(handle_, statement);
-    const int result = sqlite3_step(query.get());
-    if (result == SQLITE_ROW) return column(query.get(), 0);
-    if (result != SQLITE_DONE) fail(handle_, statement);
-    return {};
+    return rowsOf(handle_, statement).value(0).value(0);
 }
 
 QString Book::text(const QString& statement) {
-    const StatementPtr query = prepare(handle_, statement);
-    QStringList rows;
-    int result = SQLITE_DONE;
-    while ((result = sqlite3_step(query.get())) == SQLITE_ROW) {
-        QStringList row;
-        for (int at = 0; at < sqlite3_column_count(query.get()); ++at) {
-            const QVariant value = column(query.get(), at);
-            row << (value.isValid() ? value.toString() : u"NULL"_s);
-        }
-        rows << row.join(u'|');
+    QStringList lines;
+    for (const QVariantList& row : rowsOf(handle_, statement)) {
+        QStringList cells;
+        for (const QVariant& cell : row) cells << (cell.isValid() ? cell.toString() : u"NULL"_s);
+        lines << cells.join(u'|');
     }
-    if (result != SQLITE_DONE) fail(handle_, statement);
-    return rows.join(u'\n');
+    return lines.join(u'\n');
 }
 
 qint64 Book::count(const QString& table, const QString& where) {
@@ -177,17 +146,13 @@ qint64 Book::count(const QString& table, const QString& where) {
 qint64 Book::insert(const QString& table,
                     std::initializer_list<std::pair<const char*, QVariant>> columns) {
     QStringList names;
-    QStringList marks;
-    for (const auto& [name, unused] : columns) {
+    QStringList values;
+    for (const auto& [name, value] : columns) {
         names << QString::fromLatin1(name);
-        marks << u"?"_s;
+        values << literal(value);
     }
-    const QString statement =
-        u"insert into %1 (%2) values (%3)"_s.arg(table, names.join(u','), marks.join(u','));
-    const StatementPtr row = prepare(handle_, statement);
-    int parameter = 1;
-    for (const auto& [unused, value] : columns) bind(row.get(), parameter++, value);
-    if (sqlite3_step(row.get()) != SQLITE_DONE) fail(handle_, statement);
+    exec(u"insert into "_s + table + u" ("_s + names.join(u',') + u") values ("_s +
+         values.join(u',') + u")"_s);
     return sqlite3_last_insert_rowid(handle_);
 }
 
@@ -198,9 +163,7 @@ qint64 Book::member(const MemberRow& row) {
                                   {"nib", row.nib},
                                   {"zelmar", row.zelmar},
                                   {"zelmar_data_carencia", row.zelmar_data_carencia},
-                                  {"no_contribuinte", row.no_contribuinte},
                                   {"morada1", row.morada1},
-                                  {"code_postal1", row.code_postal1},
                                   {"localidade1", row.localidade1}});
 }
 
@@ -221,11 +184,7 @@ qint64 Book::rubric(const RubricRow& row) {
                                            {"socio", row.socio},
                                            {"familiar", row.familiar},
                                            {"total_familia", row.total_familia},
-                                           {"nomax_recibos_socio", row.nomax_recibos_socio},
-                                           {"nomax_recibos_familiar", row.nomax_recibos_familiar},
-                                           {"socio_min_lan", row.socio_min_lan},
                                            {"socio_max_lan", row.socio_max_lan},
-                                           {"familiar_min_lan", row.familiar_min_lan},
                                            {"familiar_max_lan", row.familiar_max_lan},
                                            {"franquia", row.franquia}});
 }

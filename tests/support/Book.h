@@ -24,9 +24,7 @@ struct MemberRow {
     QVariant nib = QStringLiteral("001300000000000000186");
     QVariant zelmar = 1;
     QVariant zelmar_data_carencia = {};
-    QVariant no_contribuinte = QStringLiteral("123456789");
     QVariant morada1 = QStringLiteral("Rua das Flores, 12");
-    QVariant code_postal1 = QStringLiteral("1050-012");
     QVariant localidade1 = QStringLiteral("Lisboa");
 };
 
@@ -50,11 +48,7 @@ struct RubricRow {
     QVariant socio = {};
     QVariant familiar = {};
     QVariant total_familia = {};
-    QVariant nomax_recibos_socio = {};
-    QVariant nomax_recibos_familiar = {};
-    QVariant socio_min_lan = {};
     QVariant socio_max_lan = {};
-    QVariant familiar_min_lan = {};
     QVariant familiar_max_lan = {};
     QVariant franquia = {};
 };

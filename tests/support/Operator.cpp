@@ -10,6 +10,7 @@
 #include <QTest>
 #include <QTimer>
 #include <QWindow>
+#include <map>
 #include <stdexcept>
 
 #include "platform/forms/Form.h"
@@ -28,31 +29,18 @@ std::string plain(const QString& text) {
 }
 
 QMessageBox::StandardButton buttonOf(core::Answer answer) {
-    switch (answer) {
-        case core::Answer::Yes:
-            return QMessageBox::Yes;
-        case core::Answer::No:
-            return QMessageBox::No;
-        case core::Answer::Ok:
-            break;
-    }
-    return QMessageBox::Ok;
+    if (answer == core::Answer::Ok) return QMessageBox::Ok;
+    return answer == core::Answer::Yes ? QMessageBox::Yes : QMessageBox::No;
 }
 
 QMessageBox::Icon iconOf(core::Icon icon) {
-    switch (icon) {
-        case core::Icon::Information:
-            return QMessageBox::Information;
-        case core::Icon::Exclamation:
-            return QMessageBox::Warning;
-        case core::Icon::Question:
-            return QMessageBox::Question;
-        case core::Icon::Critical:
-            return QMessageBox::Critical;
-        case core::Icon::None:
-            break;
-    }
-    return QMessageBox::NoIcon;
+    static const std::map<core::Icon, QMessageBox::Icon> icons{
+        {core::Icon::None, QMessageBox::NoIcon},
+        {core::Icon::Information, QMessageBox::Information},
+        {core::Icon::Exclamation, QMessageBox::Warning},
+        {core::Icon::Question, QMessageBox::Question},
+        {core::Icon::Critical, QMessageBox::Critical}};
+    return icons.at(icon);
 }
 
 QWidget* shownWindow(const QString& name) {
@@ -148,7 +136,6 @@ void Operator::answer(const QPointer<QWidget>& shown) {
     auto* box = qobject_cast<QMessageBox*>(shown);
     if (!box || !box->isVisible()) return;
     const QString text = box->text();
-    seen_.append(text);
     Box expected;
     if (expected_.isEmpty()) {
         ADD_FAILURE() << "unexpected box \"" << plain(box->windowTitle()) << "\": " << plain(text);
@@ -274,10 +261,6 @@ void Operator::settle() {
     QCoreApplication::processEvents();
     EXPECT_TRUE(QTest::qWaitFor([] { return !anyButtonDown(); }, Patience));
     QCoreApplication::processEvents();
-}
-
-void Operator::screenshot(const QString& path) {
-    EXPECT_TRUE(here()->grab().save(path)) << plain(path);
 }
 
 }  // namespace support

@@ -4,7 +4,6 @@
 #include <QObject>
 #include <QPointer>
 #include <QString>
-#include <QStringList>
 #include <QWidget>
 #include <functional>
 #include <optional>
@@ -50,20 +49,12 @@ public:
     void expectBox(const Box& box);
     /// Fails the test when an expected box has not come yet.
     void expectNoBoxesLeft();
-    /// Texts of the boxes seen, in their order.
-    const QStringList& boxesSeen() const { return seen_; }
 
     // Screens. What follows below acts on the modal window if there is one, else on the screen
     // named last, else on the active window.
 
     /// Waits until a window of that name is shown and turns to it.
     QWidget* screen(const QString& name);
-    template <class Window>
-    Window* window(const QString& name) {
-        auto* found = qobject_cast<Window*>(screen(name));
-        if (!found) missing(name, "is a window of another type");
-        return found;
-    }
     /// Runs the steps, once, when a window of that name is next shown.
     void onScreen(const QString& name, const std::function<void()>& steps);
     bool isShown(const QString& name) const;
@@ -112,9 +103,6 @@ public:
     /// Runs what is pending, animated buttons included.
     void settle();
 
-    /// Writes a picture of the window.
-    void screenshot(const QString& path);
-
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
 
@@ -133,7 +121,6 @@ private:
     QPointer<QWidget> current_;
     QList<Box> expected_;
     QList<Visit> awaited_;
-    QStringList seen_;
 };
 
 }  // namespace support
