@@ -12,8 +12,8 @@ namespace entry {
 struct Companions {
     Companions();
     ~Companions();
-    Companions(const Companions&) = delete;
-    Companions& operator=(const Companions&) = delete;
+    /// Makes the one of that name available ("Lumbra"), or again what a test took away.
+    void offer(const QString& name);
 
     /// Each call in its order: `Lumbra.appShow("SOC01", false)`; the advances of the progress
     /// window are only counted.
@@ -23,51 +23,41 @@ struct Companions {
     QString failing;            ///< a member that fails, as "Lumbra.appShow"
     int statementsOpen = 0;     ///< premium statements whose component is kept
     int progress = 0;
-
-    void note(const QString& member, const QVariantList& arguments);
 };
 
 /// The text with which a member named in Companions::failing fails.
 inline constexpr QStringView CompanionFailure = u"O componente avariou.";
 
-class FakeLumbra : public QObject {
+/// Stands in for any of the three; their members do not clash.
+class FakeCompanion : public QObject {
     Q_OBJECT
 public:
-    explicit FakeLumbra(Companions& all) : all_(all) {}
-    ~FakeLumbra() override { all_.statementsOpen -= showsStatement_; }
-    Q_INVOKABLE void Login(QString* user, QString* password);
+    FakeCompanion(const QString& name, Companions& all) : name_(name), all_(all) {}
+    ~FakeCompanion() override { all_.statementsOpen -= showsStatement_; }
+
+    Q_INVOKABLE void Login() { note("Login", {}); }
+    Q_INVOKABLE void Login(QString* user, QString* password) { note("Login", {*user, *password}); }
     Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& a = {},
                                  const QVariant& b = {}, const QVariant& c = {},
                                  const QVariant& d = {}, const QVariant& e = {},
                                  const QVariant& f = {});
+    Q_INVOKABLE void AbrirRegisto(const QVariant& id) { note("AbrirRegisto", {id}); }
+    Q_INVOKABLE QVariant EscolherFamiliar(const QVariant& id) {
+        note("EscolherFamiliar", {id});
+        return all_.personChosen;
+    }
+    Q_INVOKABLE void Iniciar(const QVariant& steps, const QString& text, const QString& title) {
+        note("Iniciar", {steps, text, title});
+    }
+    Q_INVOKABLE void setvalor(const QVariant& by) { all_.progress += by.toInt(); }
+    Q_INVOKABLE void terminar() { note("terminar", {}); }
 
 private:
+    void note(const char* member, const QVariantList& arguments);
+
+    QString name_;
+    Companions& all_;
     bool showsStatement_ = false;
-    Companions& all_;
-};
-
-class FakeTiqueta : public QObject {
-    Q_OBJECT
-public:
-    explicit FakeTiqueta(Companions& all) : all_(all) {}
-    Q_INVOKABLE void Login();
-    Q_INVOKABLE void AbrirRegisto(const QVariant& id);
-    Q_INVOKABLE QVariant EscolherFamiliar(const QVariant& id);
-
-private:
-    Companions& all_;
-};
-
-class FakeVorlane : public QObject {
-    Q_OBJECT
-public:
-    explicit FakeVorlane(Companions& all) : all_(all) {}
-    Q_INVOKABLE void Iniciar(const QVariant& steps, const QString& text, const QString& title);
-    Q_INVOKABLE void setvalor(const QVariant& by);
-    Q_INVOKABLE void terminar();
-
-private:
-    Companions& all_;
 };
 
 }  // namespace entry

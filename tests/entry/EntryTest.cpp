@@ -35,9 +35,7 @@ EntryTest::~EntryTest() {
     forms::DefaultInstance<frmMovimentos>::unload();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     for (int position : {1, 2}) {
-        const ado::ConnectionPtr connection =
-            environment::dtZelmars::instance().Connections(position);
-        connection->CommandTimeout = 30;
+        const auto connection = environment::dtZelmars::instance().Connections(position);
         if (connection->State() == ado::adStateOpen) connection->Close();
     }
     core::setToday({});
@@ -124,13 +122,10 @@ QString EntryTest::everything() {
     return all.join(u'\n');
 }
 
-void EntryTest::expectFailedPosting(const QString& why) {
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-    person.expectBox({.text = why, .icon = core::Icon::None, .partly = true});
-    person.expectBox(
-        {.text = u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
-         .icon = core::Icon::Critical,
-         .title = form().Caption()});
+void EntryTest::failOn(const QString& write) {
+    book.exec(
+        u"create trigger avaria before %1 begin select raise(abort, 'disco cheio'); end"_s.arg(
+            write));
 }
 
 }  // namespace entry

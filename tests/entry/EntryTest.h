@@ -46,8 +46,9 @@ protected:
     QVariant pending(const QString& column) const;
     /// Every row of every table.
     QString everything();
-    /// Expects the boxes of a posting that fails: why, in part, and that it failed.
-    void expectFailedPosting(const QString& why);
+    /// From here on that kind of write fails ("insert on tbCheques"), until mended.
+    void failOn(const QString& write);
+    void mend() { book.exec(QStringLiteral("drop trigger avaria")); }
 
     support::Book book;
     qint64 socio = 0;   ///< staff number 100015, in order in every respect

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Try-out and posting at the screen, to the stored rows.
+#include "platform/com/Component.h"
 #include "tests/entry/EntryTest.h"
 
 using namespace Qt::StringLiterals;
@@ -25,9 +26,8 @@ protected:
 
     QString accumulator() {
         return book.text(
-            u"select socio_id, codABC, rubrica_id, rubrica_id_main, printf('%.4f',credito_ac), "
-            "printf('%.4f',debito_ac), no_docs from tbSocios_Acumulados where rubrica_id = %1"_s
-                .arg(rubric));
+            u"select codABC, printf('%.4f',credito_ac), printf('%.4f',debito_ac), no_docs "
+            "from tbSocios_Acumulados where rubrica_id = %1"_s.arg(rubric));
     }
 
     void expectResults(const QStringList& shown) {
@@ -38,17 +38,6 @@ protected:
         QStringList found;
         for (const forms::TextBox* box : boxes) found << box->Text();
         EXPECT_EQ(found, shown);
-    }
-
-    /// "&OK" and yes; `refusal` is the last box, in the screen's name.
-    void expectRefused(const QString& refusal) {
-        person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-        person.expectBox({.text = refusal, .icon = Icon::Information, .title = form().Caption()});
-        person.accelerator(u'O');
-        person.expectNoBoxesLeft();
-        EXPECT_TRUE(form().isVisible());
-        EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
-        EXPECT_EQ(book.value(u"select zelmars from tbContadores"_s).toInt(), 1);
     }
 };
 
@@ -67,11 +56,11 @@ TEST_F(Posting, DocumentIsStoredToTheFourthDecimal) {
     // 87,35 at 75 % is 65,5125; the account stood at 40 - 25,5.
     expectResults({u"€ 87,35"_s, u"€ 65,51"_s, u"€ 500,00"_s, u"€ 14,50"_s, u"€ 65,51"_s,
                    u"€ 500,00"_s, u"€ 65,51"_s, u"€ 65,51"_s, u"€ 65,51"_s});
-    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
-    const QString main = book.text(
-        u"select rubrica_id_main from tbZelmar_Plafonds where rubrica_id = %1"_s.arg(rubric));
-    const QString grain = u"%1|A|%2|%3|"_s.arg(socio).arg(rubric).arg(main);
-    EXPECT_EQ(accumulator(), grain + u"0.0000|0.0000|0"_s);
+    EXPECT_EQ(accumulator(), u"A|0.0000|0.0000|0"_s);
+    const QString before = everything();
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::No});
+    person.accelerator(u'O');
+    EXPECT_EQ(everything(), before);
 
     postAndLeave();
     EXPECT_EQ(
@@ -84,10 +73,9 @@ TEST_F(Posting, DocumentIsStoredToTheFourthDecimal) {
                      "#saldo_plafond #saldo_acumulado #iliquido #liquido #credito #debito"_s),
               u"87.3500|16.3300|23.0000|10.0000|87.3500|65.5125|500.0000|14.5000|65.5125|65.5125|"
               "65.5125|65.5125"_s);
-    EXPECT_EQ(accumulator(), grain + u"65.5125|65.5125|1"_s);
+    EXPECT_EQ(accumulator(), u"A|65.5125|65.5125|1"_s);
     EXPECT_EQ(book.value(u"select zelmars from tbContadores"_s).toInt(), 2);
     EXPECT_FALSE(person.isShown(u"frmMovimentos"_s));
-    EXPECT_FALSE(person.isShown(u"frmMovimentosF"_s));
 }
 
 TEST_F(Posting, HospitalBillByChequeTakesTheOvertypedNumber) {
@@ -111,147 +99,100 @@ TEST_F(Posting, HospitalBillByChequeTakesTheOvertypedNumber) {
               u"1|A|%1|HOS|CHQ|500|NULL|1000.0000|750.0000|500.0000|NULL|750.0000|500.0000|"
               "500.0000|1200.0000"_s.arg(hospital));
     EXPECT_EQ(book.text(u"select cheque_no from tbCheques"_s), u"501"_s);
-    EXPECT_TRUE(accumulator().endsWith(u"|500.0000|1200.0000|1"_s)) << accumulator().toStdString();
+    EXPECT_EQ(accumulator(), u"A|500.0000|1200.0000|1"_s);
 }
 
-TEST_F(Posting, NoAtTheQuestionDoesNothing) {
+// The failing write of the number is among what the screen says; the posting goes on once mended.
+TEST_F(Posting, ChequeScreenStaysUntilItsNumberIsStored) {
+    book.exec(u"delete from tbCheques"_s);
     openNew();
-    typeDocument(u"87,35"_s, u"23"_s, u"0"_s);
-    const QString before = everything();
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s,
-                      .answer = Answer::No,
-                      .icon = Icon::Question,
-                      .title = u"Lançamento (Plano de Saúde)"_s});
-    person.accelerator(u'O');
-    EXPECT_EQ(everything(), before);
-    expectResults(QStringList(9));
-}
-
-TEST_F(Posting, TryOutChecksComeOneAfterTheOther) {
-    openNew(true);
-    const auto expectCheck = [this](const QString& text, bool plain = false) {
-        person.expectBox({.text = text,
-                          .icon = plain ? Icon::None : Icon::Information,
-                          .title = plain ? u"Zelmars"_s : form().Caption()});
-        person.accelerator(u'E');
+    typeDocument(u"100"_s, u"0"_s, u"0"_s);
+    person.fill(u"DataCombo3"_s, u"CHQ"_s);
+    person.onScreen(u"frmPagamentoCheque"_s, [this] {
+        EXPECT_EQ(person.here()->windowTitle(), u"Pagamento por Cheque"_s);
+        const auto* number = person.find<forms::TextBox>(u"Text1"_s);
+        EXPECT_EQ(number->Text(), u"0"_s) << "of an empty table";
+        person.click(u"Command3"_s);
+        EXPECT_EQ(number->Text(), u"1"_s);
+        person.click(u"Command2"_s);
+        person.click(u"Command2"_s);
+        EXPECT_EQ(number->Text(), u"-1"_s);
+        person.expectBox({.text = u"abc"_s, .icon = Icon::Critical, .partly = true});
+        person.put(u"Text1"_s, u"abc"_s);
+        person.accelerator(u'O');
         person.expectNoBoxesLeft();
-    };
-    expectCheck(u"Tem de Indicar uma rubrica!"_s);
-    person.fill(u"DataCombo1"_s, u"0101"_s);
-    expectCheck(u"Não foi atribuido nenhum código de familiar!"_s);
-    typeMember();
-    choosePerson(self);
-    expectCheck(u"Tem de indicar o valor de incidência!"_s);
-    person.fill(u"Text9"_s, u"50"_s);
-    expectCheck(u"Tem de indicar um valor para o documento!"_s);
-    person.fill(u"Text6"_s, u"-1"_s);
-    expectCheck(u"O valor do documento é inferior a 0."_s, true);
-    EXPECT_EQ(companions.calls.filter(u"Vorlane"_s), QStringList());
-    EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
-}
-
-TEST_F(Posting, ReceivedIsComparedWithTheIncidenceFromTheSecondRunOn) {
-    openNew();
-    typeDocument(u"80"_s, u"0"_s, QString());
-    person.expectBox(
-        {.text = u"Tem de indicar um valor para o campo Recebido!"_s, .icon = Icon::Information});
-    person.accelerator(u'E');
-    person.fill(u"Text9"_s, u"-1"_s);
-    person.expectBox({.text = u"O valor recebido é inferior a 0."_s, .icon = Icon::None});
-    person.accelerator(u'E');
-    person.fill(u"Text9"_s, u"100"_s);
-    person.accelerator(u'E');
-    // 80 - 100: gross, net and credit go below nothing, the debit does not.
-    expectResults({u"€ 80,00"_s, u"€ 60,00"_s, u"€ 500,00"_s, u"€ 0,00"_s, u"(€ 20,00)"_s,
-                   u"€ 500,00"_s, u"(€ 20,00)"_s, u"€ 0,00"_s, u"(€ 20,00)"_s});
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-    person.expectBox({.text = u"O valor recebido é maior que o valor do documento."_s,
-                      .icon = Icon::None,
-                      .title = u"Zelmars"_s});
-    person.accelerator(u'O');
-    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
+        failOn(u"update on tbCheques"_s);
+        person.expectBox({.text = u"disco cheio"_s, .icon = Icon::Critical, .partly = true});
+        person.put(u"Text1"_s, u"7"_s);
+        person.accelerator(u'O');
+        EXPECT_EQ(book.text(u"select cheque_no from tbCheques"_s), u"0"_s);
+        mend();
+        person.enter();
+    });
+    postAndLeave();
+    EXPECT_EQ(stored(u"cheque"_s), u"7"_s);
+    EXPECT_EQ(book.text(u"select cheque_no from tbCheques"_s), u"8"_s);
 }
 
 TEST_F(Posting, EntryChecksComeInTheirOrder) {
     openNew(true);
+    person.expectBox({.text = u"Tem de Indicar uma rubrica!"_s, .icon = Icon::Information});
+    person.accelerator(u'E');
     typeDocument(u"100"_s, u"0"_s, u"100"_s);
-    person.fill(u"DataCombo3"_s, QString());
-    person.fill(u"Text1"_s, QString());
-    person.fill(u"Text5"_s, QString());
+    for (const QString& name : {u"DataCombo3"_s, u"Text1"_s, u"Text5"_s})
+        person.fill(name, QString());
     form().Text7->Clear();
-    expectRefused(u"Tem de indicar um modo de pagamento."_s);
-    person.fill(u"DataCombo3"_s, u"TRF"_s);
-    expectRefused(u"Tem de introduzir a data do registo."_s);
-    form().Text7->setText(u"15-03-2026"_s);
-    expectRefused(u"Tem de introduzir a data do documento."_s);
-    EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 1) << "the try-out ran first";
-    person.fill(u"Text1"_s, u"10-03-2026"_s);
-    expectRefused(u"Tem de introduzir o número do documento."_s);
-    person.fill(u"Text5"_s, u"1"_s);
-    expectRefused(u"Tem de indicar um hospital."_s);
-    person.fill(u"DataCombo2"_s, u"H01"_s);
+    struct {
+        QString refusal;
+        const char* field;
+        QString mended;
+    } const checks[] = {
+        {u"Tem de indicar um modo de pagamento."_s, "DataCombo3", u"TRF"_s},
+        {u"Tem de introduzir a data do registo."_s, "Text7", u"15-03-2026"_s},
+        {u"Tem de introduzir a data do documento."_s, "Text1", u"10-03-2026"_s},
+        {u"Tem de introduzir o número do documento."_s, "Text5", u"1"_s},
+        {u"Tem de indicar um hospital."_s, "DataCombo2", u"H01"_s},
+    };
+    for (const auto& [refusal, field, mended] : checks) {
+        person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+        person.expectBox({.text = refusal, .icon = Icon::Information, .title = form().Caption()});
+        person.accelerator(u'O');
+        person.expectNoBoxesLeft();
+        EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
+        EXPECT_EQ(book.value(u"select zelmars from tbContadores"_s).toInt(), 1);
+        if (qstrcmp(field, "Text7") == 0)
+            form().Text7->setText(mended);
+        else
+            person.fill(QString::fromLatin1(field), mended);
+    }
     postAndLeave();
     EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 1);
 }
 
-TEST_F(Posting, BankNumberStopsAndAMemberWhoLeftOnlyWarns) {
+TEST_F(Posting, FailuresAreSaidKeepWhatWasTypedAndCanBeTriedAgain) {
     openNew();
     typeDocument(u"100"_s, u"0"_s, u"0"_s);
-    const std::pair<const char*, QString> faulty[] = {
-        {"null", u"Este Associado não tem NIB!"_s},
-        {"'00130000000000000018'", u"Este Associado tem especificado um NIB INVÁLIDO!"_s},
-        {"'0013000000000000001866'", u"Este Associado tem especificado um NIB INVÁLIDO!"_s},
-    };
-    for (const auto& [nib, text] : faulty) {
-        book.exec(u"update tbSocios set nib="_s + QString::fromLatin1(nib));
-        person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-        person.expectBox({.text = text, .icon = Icon::Critical, .title = u"Zelmars"_s});
-        person.accelerator(u'O');
-        person.expectNoBoxesLeft();
-        EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
-    }
-    book.exec(u"delete from tbSocios"_s);
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-    person.expectBox({.text = u"Este Associado não se encontra na tabela de Activos."_s,
-                      .icon = Icon::Critical,
-                      .title = u"Zelmars"_s});
-    person.onScreen(u"frmMovimentosF"_s, [this] { person.escape(); });
-    person.accelerator(u'O');
-    EXPECT_EQ(stored(u"movimento_no socio_id"_s), u"1|%1"_s.arg(socio));
-}
-
-TEST_F(Posting, MinimumAndNumberOfDocumentsAreSaidAndThePostingGoesOn) {
-    book.exec(
-        u"update tbZelmar_Plafonds set socio_min_lan = 100.5, nomax_recibos_socio = 0 "
-        "where rubrica_id = %1"_s.arg(rubric));
-    openNew();
-    typeDocument(u"100"_s, u"0"_s, u"0"_s);
-    person.expectBox({.text = u"Este lançamento tem um limite minimo de € 100,50"_s,
-                      .icon = Icon::None,
-                      .title = u"Zelmars"_s});
+    com::registerRunning(u"Vorlane.General"_s, {});
+    person.expectBox({.text = u"Vorlane.General"_s, .icon = Icon::Critical, .partly = true});
     person.accelerator(u'E');
-    person.fill(u"Text6"_s, u"100,5"_s);
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
-    person.expectBox({.text = u"O limite máximo do nº de documentos foi atingido."_s,
-                      .icon = Icon::Information,
-                      .title = form().Caption()});
-    person.onScreen(u"frmMovimentosF"_s, [this] { person.escape(); });
-    person.accelerator(u'O');
-    EXPECT_EQ(stored(u"#comparticipacao #credito #debito"_s), u"75.3750|NULL|NULL"_s);
-    EXPECT_EQ(book.text(u"select credito_ac, debito_ac, no_docs from tbSocios_Acumulados"_s),
-              u"NULL|NULL|1"_s);
-}
+    person.expectNoBoxesLeft();
+    companions.offer(u"Vorlane"_s);
 
-TEST_F(Posting, SecondDocumentFindsTheFirstInItsCeiling) {
-    openNew();
-    typeDocument(u"600"_s, u"0"_s, u"0"_s);  // 450 of 500
+    failOn(u"insert on tbZelmar_Movimentos"_s);
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+    person.expectBox({.text = u"disco cheio"_s, .icon = Icon::None, .partly = true});
+    person.expectBox(
+        {.text = u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
+         .icon = Icon::Critical,
+         .title = form().Caption()});
+    person.accelerator(u'O');
+    EXPECT_EQ(form().Text6->Text(), u"€ 100,00"_s);
+    EXPECT_EQ(form().Text5->Text(), u"FT 2026/17"_s);
+    EXPECT_EQ(accumulator(), u"A|0.0000|0.0000|0"_s);
+    mend();
     postAndLeave();
-    openNew();
-    typeDocument(u"87,35"_s, u"0"_s, u"0"_s);
-    postAndLeave();
-    EXPECT_EQ(stored(u"movimento_no #comparticipacao #saldo_plafond #saldo_acumulado #credito"_s),
-              u"1|450.0000|500.0000|0.0000|450.0000\n2|65.5125|50.0000|0.0000|50.0000"_s);
-    EXPECT_TRUE(accumulator().endsWith(u"|500.0000|500.0000|2"_s));
+    EXPECT_EQ(stored(u"movimento_no #credito"_s), u"2|75.0000"_s) << "number 1 is lost";
+    EXPECT_EQ(accumulator(), u"A|75.0000|75.0000|1"_s);
 }
 
 }  // namespace
