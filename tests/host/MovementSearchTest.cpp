@@ -62,88 +62,39 @@ TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
         const char* keys;
     } cases[] = {
         {u"", "100 99 98 97 96 95"},
-        {u"   ", "100 99 98 97 96 95"},
         // Number, staff number and number of the document, from their beginning.
         {u"1205", "100"},
-        {u"120", "100 99 98 97 96"},
         {u"1204", "99 98 96"},
         {u"205", ""},
-        {u"01205", ""},
         {u"100015", "100 99"},
-        {u"7700", "99"},
         {u"ft", "100"},
-        {u"2026/118", "100"},
         {u"FT 2026/118", "100"},
         {u"A-9%", "98"},
-        {u"%", ""},
         // Words of the member's or relative's name, from their beginning.
         {u"matos", "100 99"},
         {u"ines", "99"},
-        {u"gonçal", "98"},
+        {u"  MAT\tine\u0302s", "99"},
         {u"atos", ""},
-        {u"araujo", "98 96"},
         {u"d'ara", "98 96"},
         // Types only in full.
-        {u"hos", "99"},
         {u"ho", ""},
         {u"Anl", "96"},
         {u"sa", "97 95"},  // the type, and the name Sá
         // Days.
         {u"21-11-2026", "99 98"},
         {u"21/11/26", "99 98"},
-        {u"21.11.2026", "99 98"},
-        {u"21112026", "99 98"},
         {u"21-11", "99 98 96"},
         {u"11-2026", "100 99 98"},
         {u"2/2026", "97"},
         {u"31-2-2026", ""},
-        {u"40-11", ""},
-        {u"11-", ""},
         // Words hold together.
         {u"21-11 doc", "98"},
         {u"matos silva doc", "100"},
         {u"matos araujo", ""},
         // What nobody means to type does no harm.
-        {u"\U0001F600", ""},
         {u"'; drop table x", ""},
     };
     for (const auto& each : cases)
         EXPECT_EQ(found(search, QString::fromUtf16(each.filter)).toStdString(), each.keys)
             << QString::fromUtf16(each.filter).toStdString();
-}
-
-TEST(MovementSearch, FindsTheSameHoweverTheFilterIsWritten) {
-    const host::MovementSearch search = sampleSearch();
-    const QStringList ways[] = {
-        {u"inês matos"_s, u"MATOS INES"_s, u"  mat\tinês "_s, u"ine\u0302s matos"_s},
-        {u"joão"_s, u"JOAO"_s, u"joa\u0303o"_s},
-        {u"22-11-2026 doc"_s, u"DOC 22/11/26"_s, u"doc 22.11.2026"_s, u"22112026 Doc"_s},
-    };
-    for (const QStringList& writings : ways) {
-        EXPECT_NE(found(search, writings.first()).toStdString(), "");
-        for (const QString& writing : writings)
-            EXPECT_EQ(found(search, writing), found(search, writings.first()))
-                << writing.toStdString();
-    }
-}
-
-TEST(MovementSearch, TakesNewMovementsInFront) {
-    host::MovementSearch search = sampleSearch();
-    EXPECT_EQ(search.newest(true), 100);
-    const qint32 ofThoseWhoLeft = 1'000'000'001;
-    search.prepend({{.movimento_id = ofThoseWhoLeft, .socio_id = 5, .activo = false},
-                    {.movimento_id = 101, .movimento_no = 1206, .socio_id = 1, .codABC = u"A"_s}});
-    EXPECT_EQ(search.newest(true), 101);
-    EXPECT_EQ(search.newest(false), ofThoseWhoLeft);
-    EXPECT_EQ(found(search, u"matos"_s).toStdString(), "101 100 99");
-    EXPECT_EQ(search.movimento_id(0), ofThoseWhoLeft);
-}
-
-TEST(MovementSearch, TextsPastWhatIsKeptDoNoHarm) {
-    host::MovementSearch search;
-    const QString endless(100'000, u'x');
-    search.append({.movimento_id = 1, .socio_id = 1, .doc_no = endless});
-    search.nameMember(1, endless, endless);
-    EXPECT_EQ(found(search, u"xxx"_s).toStdString(), "1");
-    EXPECT_EQ(found(search, endless).toStdString(), "");
 }

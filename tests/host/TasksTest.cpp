@@ -19,26 +19,16 @@ protected:
         program.setProcessEnvironment(environment);
         program.start(QCoreApplication::applicationDirPath() + u"/zelmars"_s, words);
         EXPECT_TRUE(program.waitForFinished(60'000));
-        output_ = QString::fromUtf8(program.readAllStandardOutput());
         errors_ = QString::fromUtf8(program.readAllStandardError());
         return program.exitCode();
     }
     QString book() const { return folder_.filePath(u"livro"_s); }
 
     QTemporaryDir folder_;
-    QString output_;
     QString errors_;
 };
 
 }  // namespace
-
-TEST_F(Program, RefusesWhatItDoesNotKnow) {
-    EXPECT_EQ(run({u"Despesas"_s}), 2);
-    EXPECT_TRUE(errors_.contains(u"NewMovimento"_s));
-    EXPECT_TRUE(output_.isEmpty());
-    EXPECT_EQ(run({u"--version"_s}), 0);
-    EXPECT_TRUE(output_.startsWith(u"zelmars "_s));
-}
 
 TEST_F(Program, MakesABookOnceAndNeverOverIt) {
     EXPECT_EQ(run({u"init"_s, book()}), 0) << errors_.toStdString();
