@@ -16,7 +16,8 @@ struct PostingEntry {
     QString Text1;            ///< date of the document
     QString Text5;            ///< number of the document
     QString DataCombo2;       ///< hospital as shown
-    /// Asks for the cheque's number and writes it to the row; returns when it was given.
+    /// Asks for the cheque's number and writes it to the row; returns when its screen has gone.
+    /// What it fails with ends the posting before anything is written.
     std::function<void(const ado::RecordsetPtr&)> askCheque;
 };
 

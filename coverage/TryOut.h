@@ -3,6 +3,7 @@
 
 #include <QString>
 #include <QVariant>
+#include <functional>
 #include <optional>
 
 #include "platform/ado/Recordset.h"
@@ -44,6 +45,15 @@ struct TryOut {
     /// document minimum and by the number of documents; that is meant.
     bool bEnsaioValido = false;
     Results shown;
+    /// Called whenever a value was added, so that it stands on the screen before the next box; may
+    /// be empty.
+    std::function<void(const Results&)> onShown = {};
+
+    /// Puts a value on one of the result controls.
+    void show(std::optional<QVariant> Results::*control, const QVariant& value) {
+        shown.*control = value;
+        if (onShown) onShown(shown);
+    }
 };
 
 /// Works out what the plan pays for the pending document. Writes the result columns of the pending

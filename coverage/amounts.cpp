@@ -72,27 +72,29 @@ float creditAfterFranchise(const Entry& entry, float franquia) {
 
 }  // namespace
 
-void setAmounts(const Entry& entry, const Working& working, Progress& progress, Results& shown) {
-    if (!entry.bHospital) shown.SaldoCC = write(entry, u"saldo_acumulado"_s, balance(entry));
+void setAmounts(const Entry& entry, const Working& working, Progress& progress, TryOut& run) {
+    if (!entry.bHospital)
+        run.show(&Results::SaldoCC, write(entry, u"saldo_acumulado"_s, balance(entry)));
     progress.advance();
 
-    shown.Iliquido = write(entry, u"iliquido"_s, gross(entry));
+    run.show(&Results::Iliquido, write(entry, u"iliquido"_s, gross(entry)));
     progress.advance();
 
-    shown.Liquido =
-        write(entry, u"liquido"_s,
-              data::MinSingle(single(entry, u"iliquido"_s), single(entry, u"saldo_plafond"_s)));
+    const float net =
+        data::MinSingle(single(entry, u"iliquido"_s), single(entry, u"saldo_plafond"_s));
+    run.show(&Results::Liquido, write(entry, u"liquido"_s, net));
     progress.advance();
 
-    shown.Credito = write(entry, u"credito"_s, creditAfterFranchise(entry, working.franquia));
+    run.show(&Results::Credito,
+             write(entry, u"credito"_s, creditAfterFranchise(entry, working.franquia)));
     progress.advance();
 
     if (entry.bHospital) {
-        entry.record->setCollect(u"debito"_s, single(entry, u"doc_valor"_s));
-        shown.Debito = entry.record->Collect(u"doc_valor"_s);
+        write(entry, u"debito"_s, single(entry, u"doc_valor"_s));
+        run.show(&Results::Debito, entry.record->Collect(u"doc_valor"_s));
     } else {
-        shown.Debito =
-            write(entry, u"debito"_s, data::MaxSingle(0.0F, single(entry, u"credito"_s)));
+        run.show(&Results::Debito,
+                 write(entry, u"debito"_s, data::MaxSingle(0.0F, single(entry, u"credito"_s))));
     }
     progress.advance();
     progress.finish();

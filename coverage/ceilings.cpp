@@ -131,7 +131,7 @@ void narrowByGroup(const Entry& entry, const ado::Recordset& rubric, const Accum
 
 }  // namespace
 
-bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, Results& shown) {
+bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, TryOut& run) {
     const ado::Recordset& rubric = *working.rubric;
     const Accumulated found = lookUpAccumulated(entry, rubric, progress);
 
@@ -161,7 +161,7 @@ bool applyCeilings(const Entry& entry, const Working& working, Progress& progres
     if (exists(maximum)) saldo = data::MinSingle(saldo, core::toSingle(maximum));
 
     entry.record->setCollect(u"saldo_plafond"_s, saldo);
-    shown.SaldoPlafond = entry.record->Collect(u"saldo_plafond"_s);
+    run.show(&Results::SaldoPlafond, entry.record->Collect(u"saldo_plafond"_s));
     working.rubric->Close();
     return true;
 }

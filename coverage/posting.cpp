@@ -54,14 +54,16 @@ bool bankNumberCheck(qint32 socio_id) {
 }
 
 /// Draws the number and saves the row; a failing statement is passed over and the next one runs.
-/// False when one failed.
+/// False when one failed. A movement without a number is not saved: it would be paid without
+/// standing in the accumulators.
 bool save(const PostingEntry& posting) {
     ado::Recordset& record = *posting.entry.record;
     qint32 number = 0;
-    passingOver([&] { data::drawMovementNumber(number); });
-    passingOver([&] { record.setCollect(u"movimento_no"_s, number); });
-    passingOver([&] { record.setCollect(u"created_by"_s, data::ObterUtilizador()); });
-    passingOver([&] { record.Update(); });
+    if (passingOver([&] { data::drawMovementNumber(number); })) {
+        passingOver([&] { record.setCollect(u"movimento_no"_s, number); });
+        passingOver([&] { record.setCollect(u"created_by"_s, data::ObterUtilizador()); });
+        passingOver([&] { record.Update(); });
+    }
     if (core::err().number() == 0) return true;
     MsgBox(core::err().description());
     MsgBox(u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,

@@ -20,9 +20,9 @@ bool isMember(const Entry& entry);
 
 /// Writes what is left of all ceilings into `saldo_plafond`. False when the number of documents is
 /// used up: the box was shown and the try-out ends.
-bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, Results& shown);
+bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, TryOut& run);
 
 /// Writes balance, gross, net, credit and debit.
-void setAmounts(const Entry& entry, const Working& working, Progress& progress, Results& shown);
+void setAmounts(const Entry& entry, const Working& working, Progress& progress, TryOut& run);
 
 }  // namespace coverage

@@ -70,18 +70,18 @@ bool reachesMinimum(const Entry& entry, const ado::Recordset& rubric, Progress& 
                   core::formatted(minimum, core::format::Money));
 }
 
-void setIncidence(const Entry& entry, Results& shown) {
+void setIncidence(const Entry& entry, TryOut& run) {
     if (!entry.bHospital)
         entry.record->setCollect(u"incidencia"_s, entry.record->Collect(u"doc_valor"_s));
-    shown.Incidencia = entry.record->Collect(u"incidencia"_s);
+    run.show(&Results::Incidencia, entry.record->Collect(u"incidencia"_s));
 }
 
 /// The share before franchise and ceilings: incidence times the percentage, a fraction.
-void setShare(const Entry& entry, const QVariant& percent, Results& shown) {
+void setShare(const Entry& entry, const QVariant& percent, TryOut& run) {
     const double share = core::toDouble(entry.record->Collect(u"incidencia"_s)) *
                          static_cast<double>(core::toSingle(percent));
     entry.record->setCollect(u"comparticipacao"_s, share);
-    shown.Comparticipacao = entry.record->Collect(u"comparticipacao"_s);
+    run.show(&Results::Comparticipacao, entry.record->Collect(u"comparticipacao"_s));
 }
 
 }  // namespace
@@ -104,12 +104,12 @@ void tryOut(const Entry& entry, TryOut& run) {
     const ado::Recordset& rubric = *working.rubric;
 
     working.limit = singleOrZero(rubric.Collect(isMember(entry) ? u"socio"_s : u"familiar"_s));
-    run.shown.LimiteAplicavel = working.limit;
+    run.show(&Results::LimiteAplicavel, working.limit);
     progress.advance();
     if (!reachesMinimum(entry, rubric, progress)) return;
 
     working.franquia = singleOrZero(rubric.Collect(u"franquia"_s));
-    setIncidence(entry, run.shown);
+    setIncidence(entry, run);
     progress.advance();
 
     const QVariant percent = rubric.Collect(u"Percent"_s);
@@ -120,11 +120,10 @@ void tryOut(const Entry& entry, TryOut& run) {
             "percentagem."_s);
         return;
     }
-    setShare(entry, percent, run.shown);
+    setShare(entry, percent, run);
     progress.advance();
 
-    if (applyCeilings(entry, working, progress, run.shown))
-        setAmounts(entry, working, progress, run.shown);
+    if (applyCeilings(entry, working, progress, run)) setAmounts(entry, working, progress, run);
 }
 
 }  // namespace coverage

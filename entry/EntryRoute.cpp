@@ -27,7 +27,7 @@ struct Member {
 };
 
 Member memberOf(const frmMovimentos& entry) {
-    return {entry.Socio_ID, entry.No_Kor->Text(), entry.Text2->Text()};
+    return {entry.Socio_ID, entry.memberNumber(), entry.Text2->Text()};
 }
 
 void closeEntry() {
@@ -36,16 +36,10 @@ void closeEntry() {
     Entry::unload();
 }
 
-/// A next entry that cannot be opened leaves no hidden screen behind.
 void openAnother(bool bHospital) {
     QString strConMember;
     QString strSQL;
-    try {
-        openNewMovimento(bHospital, strConMember, strSQL);
-    } catch (...) {
-        Entry::unload();
-        throw;
-    }
+    openNewMovimento(bHospital, strConMember, strSQL);
 }
 
 /// Without a member chosen the next entry is an ordinary one, also after a hospital bill.
@@ -92,16 +86,19 @@ void askHowToGoOn() {
     Exit::get().ShowModal();
 }
 
-}  // namespace
-
-void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
+/// The row set of a new entry; empty texts get their defaults.
+ado::RecordsetPtr openNewRow(QString& strConMember, QString& strSQL) {
     if (strSQL.isEmpty()) strSQL = u"select * from tbzelmar_movimentos where movimento_id = 0"_s;
     if (strConMember.isEmpty()) strConMember = u"MSAccess"_s;
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(strSQL, environment::dtZelmars::instance().Connections(strConMember),
                ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
+    return rows;
+}
 
-    closeView();
+void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {
+    // The form of a hospital entry does not turn back into an ordinary one.
+    if (Entry::isLoaded() && Entry::get().bHospital && !bHospital) Entry::unload();
     frmMovimentos& screen = Entry::get();
     screen.bHospital = bHospital;
     if (bHospital) screen.showAsHospital();
@@ -113,7 +110,23 @@ void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
     screen.Show();
 }
 
+}  // namespace
+
+void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
+    try {
+        const ado::RecordsetPtr rows = openNewRow(strConMember, strSQL);
+        closeView();
+        showEntry(bHospital, rows);
+    } catch (...) {
+        // A hidden screen would stand in the way of the next one.
+        if (Entry::isLoaded() && !Entry::get().isVisible()) Entry::unload();
+        throw;
+    }
+}
+
 void openRegisto(const QVariant& Pkey, QObject* Caller) {
+    // A key that is no number fails here; as a number it is not used.
+    core::toLong(Pkey);
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(
         u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey),

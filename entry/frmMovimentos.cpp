@@ -97,6 +97,7 @@ void frmMovimentos::showAsHospital() {
 
 void frmMovimentos::setMember(qint32 id, const QString& number, const QString& name) {
     Socio_ID = id;
+    memberNumber_ = number;
     No_Kor->setText(number);
     Text2->setText(name);
     for (forms::TextBox* box : {Text2, Text3, Text4}) box->setBackColor(BackColor::Window);
@@ -186,6 +187,7 @@ void frmMovimentos::takeMemberFound(ado::Recordset& member) {
     testBankNumber(member.Collect(u"nib"_s),
                    [id] { return QVariant::fromValue(core::toInteger(id)); });
     Socio_ID = id;
+    memberNumber_ = No_Kor->Text();
     Text2->setBackColor(BackColor::Window);
     Text2->setText(core::toText(member.Collect(u"nome"_s)));
     Text3->setBackColor(BackColor::Window);
@@ -214,7 +216,8 @@ void frmMovimentos::searchMember() {
         com::Object statement = testPremium(id);
         testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
         Socio_ID = id;
-        No_Kor->setText(core::toText(member->Collect(u"no_kor"_s)));
+        memberNumber_ = core::toText(member->Collect(u"no_kor"_s));
+        No_Kor->setText(memberNumber_);
         Text2->setText(core::toText(member->Collect(u"nome"_s)));
         Text2->setBackColor(BackColor::Window);
         Command2->setEnabled(true);
@@ -237,6 +240,7 @@ void frmMovimentos::clearMember() {
     }
     Command2->setEnabled(false);
     Socio_ID = 0;
+    memberNumber_.clear();
     Familia_ID = {};
 }
 
@@ -258,8 +262,7 @@ void frmMovimentos::Text1_Validate(bool& cancel) {
 }
 
 void frmMovimentos::Text5_GotFocus() {
-    if (Adodc1->hasField(Text5->DataField()))
-        Text5->setMaxLength(Adodc1->Recordset()->Fields(Text5->DataField()).DefinedSize());
+    Text5->limitToColumn();
     Text5->SelectAll();
 }
 
@@ -270,6 +273,7 @@ void frmMovimentos::emptyBecomesNull(forms::TextBox* box) {
 }
 
 void frmMovimentos::Text6_Validate() {
+    if (bShowing) return;
     if (Text6->Text().isEmpty()) {
         emptyBecomesNull(Text6);
         return;
@@ -281,6 +285,8 @@ void frmMovimentos::Text6_Validate() {
 }
 
 void frmMovimentos::Text11_Validate(bool& cancel) {
+    // In a view nothing is worked out, and an empty rate must not hold anybody.
+    if (bShowing) return;
     const std::optional<double> rate = core::parseNumber(Text11->Text());
     if (!rate) {
         MsgBox(u"O valor que digitou não é um número válido."_s, Icon::Information);
@@ -332,7 +338,9 @@ coverage::Entry frmMovimentos::entry() const {
 }
 
 void frmMovimentos::Command5_Click() {
-    tryOutWith([this](coverage::TryOut& run) { coverage::tryOut(entry(), run); });
+    coverage::TryOut run;
+    run.onShown = [this](const coverage::Results& results) { showResults(results); };
+    coverage::tryOut(entry(), run);
 }
 
 void frmMovimentos::Command3_Click() {
@@ -348,9 +356,9 @@ void frmMovimentos::Command3_Click() {
                                          Text5->Text(),
                                          DataCombo2->Text(),
                                          &payments::frmPagamentoCheque::ask};
-    bool posted = false;
-    tryOutWith([&](coverage::TryOut& run) { posted = coverage::post(posting, run); });
-    if (posted) leaveEntry();
+    coverage::TryOut run;
+    run.onShown = [this](const coverage::Results& results) { showResults(results); };
+    if (coverage::post(posting, run)) leaveEntry();
 }
 
 void frmMovimentos::Command4_Click() {
@@ -360,18 +368,6 @@ void frmMovimentos::Command4_Click() {
 void frmMovimentos::leaveEntry() {
     Hide();
     if (onLeft) onLeft();
-}
-
-/// What a run has reached is shown also when it fails on the way.
-void frmMovimentos::tryOutWith(const std::function<void(coverage::TryOut&)>& run) {
-    coverage::TryOut tryOut;
-    try {
-        run(tryOut);
-    } catch (...) {
-        showResults(tryOut.shown);
-        throw;
-    }
-    showResults(tryOut.shown);
 }
 
 void frmMovimentos::showResults(const coverage::Results& results) {

@@ -36,6 +36,9 @@ public:
     void showAsHospital();
     /// A member already known from the entry before.
     void setMember(qint32 id, const QString& number, const QString& name);
+    /// The number of the chosen member. What stands in No_Kor may be another one, typed since and
+    /// never accepted.
+    const QString& memberNumber() const { return memberNumber_; }
     /// The read-only view of the row that Adodc1 holds, whose type is `tipo`.
     void showReadOnly(const QString& tipo);
     /// Sets the new row's defaults a moment after the screen is up.
@@ -109,11 +112,11 @@ private:
     void workOutVat();
     void leaveEntry();
     coverage::Entry entry() const;
-    void tryOutWith(const std::function<void(coverage::TryOut&)>& run);
     void showResults(const coverage::Results& results);
 
     forms::Timer* Timer1;
     com::Object search_;  ///< the last search component; keeps its premium statement open
+    QString memberNumber_;
     QString remembered_;  ///< the text of DataCombo1 or DataCombo2 when it received the focus
 };
 

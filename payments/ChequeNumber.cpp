@@ -12,6 +12,9 @@ namespace payments {
 
 namespace {
 
+/// More digits than any cheque has; one step further still fits.
+constexpr qint64 LargestNumber = 999'999'999'999'999;
+
 ado::RecordsetPtr openCheques() {
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(u"Select * from tbCheques"_s, environment::dtZelmars::instance().MSAccess(),
@@ -37,7 +40,7 @@ qint64 chequeNumber(const QString& typed) {
     const std::optional<QString> plain = core::parseDecimal(typed);
     bool ok = false;
     const qint64 number = plain ? plain->toLongLong(&ok) : 0;
-    if (!ok)
+    if (!ok || number > LargestNumber || number < -LargestNumber)
         throw core::Failure(core::TypeMismatch,
                             u"«%1» não é um número de cheque válido."_s.arg(typed.left(60)));
     return number;

@@ -10,7 +10,7 @@ using namespace Qt::StringLiterals;
 
 namespace payments {
 
-frmPagamentoCheque::frmPagamentoCheque(const ado::RecordsetPtr& movement)
+frmPagamentoCheque::frmPagamentoCheque(const ado::RecordsetPtr& movement, const QString& number)
     : Form(u"frmPagamentoCheque"_s, u"Pagamento por Cheque"_s),
       movement_(movement),
       Text1(new forms::TextBox(u"Text1"_s)),
@@ -18,14 +18,16 @@ frmPagamentoCheque::frmPagamentoCheque(const ado::RecordsetPtr& movement)
       Command2(new forms::Button(u"Command2"_s, QString())),
       Command3(new forms::Button(u"Command3"_s, QString())) {
     layOut();
-    onLoad = [this] { Form_Load(); };
+    Text1->setText(number);
+    Text1->SelectAll();
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { step(-1); };
     Command3->onClick = [this] { step(1); };
 }
 
 void frmPagamentoCheque::ask(const ado::RecordsetPtr& movement) {
-    const QPointer<frmPagamentoCheque> screen = new frmPagamentoCheque(movement);
+    const QPointer<frmPagamentoCheque> screen =
+        new frmPagamentoCheque(movement, nextChequeNumber());
     screen->ShowModal();
     if (screen) screen->Unload();
 }
@@ -57,11 +59,6 @@ void frmPagamentoCheque::layOut() {
     all->addLayout(buttons);
     Command1->setDefault(true);
     setMinimumWidth(320);
-}
-
-void frmPagamentoCheque::Form_Load() {
-    Text1->setText(nextChequeNumber());
-    Text1->SelectAll();
 }
 
 void frmPagamentoCheque::step(int by) {

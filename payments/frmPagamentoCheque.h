@@ -13,14 +13,15 @@ class frmPagamentoCheque : public forms::Form {
     Q_OBJECT
 public:
     /// @param movement  its current row takes the number; saving the row is its owner's work
-    explicit frmPagamentoCheque(const ado::RecordsetPtr& movement);
+    /// @param number    offered
+    frmPagamentoCheque(const ado::RecordsetPtr& movement, const QString& number);
 
-    /// Shows the screen and waits until it is gone.
+    /// Shows the screen with the next number and waits until it is gone. Fails when there is no
+    /// next number to be read; the screen then does not come.
     static void ask(const ado::RecordsetPtr& movement);
 
 private:
     void layOut();
-    void Form_Load();
     void step(int by);
     void Command1_Click();
 

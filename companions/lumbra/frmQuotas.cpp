@@ -36,7 +36,7 @@ QString premiumStatement(int socioId) {
 // Whose payments these are. A member who never paid has no row to tell it, but the condition does.
 int memberOf(const ado::RecordsetPtr& payments, const QString& filter) {
     if (!payments->atEnd()) return core::toLong(payments->Collect(u"socio_id"_s));
-    static const QRegularExpression condition(u"socio_id\\s*=\\s*(\\d{1,9})"_s,
+    static const QRegularExpression condition(u"socio_id\\s*=\\s*(\\d{1,10})"_s,
                                               QRegularExpression::CaseInsensitiveOption);
     return condition.match(filter).captured(1).toInt();
 }

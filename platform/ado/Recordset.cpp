@@ -64,7 +64,13 @@ void Recordset::Requery() {
     d->requireOpen();
     if (d->book.isEmpty()) return MoveFirst();  // a chapter's rows came with its parent
     d->close();
-    d->openRows();
+    try {
+        d->openRows();
+    } catch (...) {
+        d->close();
+        emit closed();
+        throw;
+    }
     emit opened();
     emit currentRowChanged();
 }

@@ -31,7 +31,7 @@ bool Recordset::Implementation::setValue(int column, const QVariant& value) {
 
 void Recordset::Implementation::addNew() {
     requireOpen();
-    if (readOnly()) requireTable();
+    requireTable();
     leaveRow();
     before = at;
     at = At::New;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Calls of a component's members by name.
 #include <QMetaMethod>
+#include <QScopeGuard>
 #include <vector>
 
 #include "platform/com/Component.h"
@@ -38,6 +39,14 @@ QMetaType referred(const QMetaMethod& method, int position) {
     return QMetaType::fromName(name.chopped(1));
 }
 
+/// Numbers but 0 are true; of texts only the two names of the values are booleans.
+bool toBoolean(const QVariant& value) {
+    for (const bool known : {false, true})
+        if (value.toString().compare(known ? u"True"_s : u"False"_s, Qt::CaseInsensitive) == 0)
+            return known;
+    return core::toDouble(value) != 0;
+}
+
 /// Changes a value into the given type. Whole numbers must fit. Fails with a core::Failure that
 /// says why, or gives false.
 bool convert(QVariant& value, QMetaType type) {
@@ -48,6 +57,9 @@ bool convert(QVariant& value, QMetaType type) {
             return true;
         case QMetaType::Int:
             value = core::toLong(value);
+            return true;
+        case QMetaType::Bool:
+            value = toBoolean(value);
             return true;
         case QMetaType::Float:
             value = core::toSingle(value);
@@ -135,9 +147,12 @@ QVariant invoke(QObject* target, const QMetaMethod& method, QVariantList& given)
     for (Argument& argument : arguments) table.push_back(argument.entry());
     // Straight into the class's own table, past the checks of QMetaMethod::invoke: a failure raised
     // in the member then crosses no frame of the library.
+    // What the member has changed comes back also when it fails then.
+    const auto writtenBack = qScopeGuard([&] {
+        for (std::size_t at = 0; at < arguments.size(); ++at)
+            arguments[at].writeBack(given[static_cast<qsizetype>(at)]);
+    });
     target->qt_metacall(QMetaObject::InvokeMetaMethod, method.methodIndex(), table.data());
-    for (std::size_t at = 0; at < arguments.size(); ++at)
-        arguments[at].writeBack(given[static_cast<qsizetype>(at)]);
     return result;
 }
 

@@ -112,28 +112,29 @@ void DataCombo::rowReplaced() {
     choose(rowValue());
 }
 
-/// The entry that reads as typed; else the first that begins so; else the first that holds it. -1
-/// for none. Case does not count.
+/// The entry that reads as typed; else the first that begins so; else the only one that holds it: a
+/// stray letter must not choose what happens to contain it. -1 for none. Case does not count.
 int DataCombo::entryFor(const QString& typed) const {
     if (typed.isEmpty()) return -1;
     for (const Qt::MatchFlags how :
          {Qt::MatchFlags(Qt::MatchExactly | Qt::MatchCaseSensitive),
-          Qt::MatchFlags(Qt::MatchFixedString), Qt::MatchFlags(Qt::MatchStartsWith),
-          Qt::MatchFlags(Qt::MatchContains)}) {
+          Qt::MatchFlags(Qt::MatchFixedString), Qt::MatchFlags(Qt::MatchStartsWith)}) {
         const int entry = findText(typed, how);
         if (entry >= 0) return entry;
     }
-    return -1;
+    const QModelIndexList holding =
+        model()->match(model()->index(0, 0), Qt::DisplayRole, typed, 2, Qt::MatchContains);
+    return holding.size() == 1 ? holding.front().row() : -1;
 }
 
 void DataCombo::settleTypedText() {
     if (!edited_) return;
     edited_ = false;
     const int entry = entryFor(currentText());
-    const QString typed = currentText();
     const QSignalBlocker quiet(this);
     setCurrentIndex(entry);
-    setEditText(entry < 0 ? typed : itemText(entry));
+    // What is no entry must not look like a choice.
+    setEditText(entry < 0 ? QString() : itemText(entry));
     chosen_ = BoundText();
 }
 
@@ -154,6 +155,8 @@ bool DataCombo::writeChoice() {
 }
 
 bool DataCombo::leave() {
+    // The list of completions would keep the next click to itself.
+    if (completer() && completer()->popup()->isVisible()) completer()->popup()->hide();
     if (!edited_) return true;
     settleTypedText();
     if (writeChoice()) return true;

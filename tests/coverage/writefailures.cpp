@@ -34,11 +34,10 @@ protected:
     const coverage::Entry entry = enter({.rubrica_id = book.childRubric({})});
 };
 
-// The movement is written all the same, with the number that was read.
-TEST_F(WriteFailure, OfTheCounterLeavesAMovementThatIsNotInTheTotals) {
+TEST_F(WriteFailure, OfTheCounterSavesNothing) {
     refuse(u"update on tbContadores"_s);
     failToPost(u"disco cheio"_s);
-    expectState("1|1|0 in 0");
+    expectState("1|NULL|0 in 0");
     book.exec(u"drop trigger refuses"_s);
     EXPECT_TRUE(post(entry));
     expectState("2|1|80 in 1");
