@@ -92,9 +92,9 @@ QVariant Object::call(const QString& member, QVariantList&& arguments) const {
     return call(member, arguments);
 }
 
-void registerRunning(const QString& progId, std::function<QObject*()> make) {
+void registerRunning(const QString& progId, const std::function<QObject*()>& make) {
     if (make)
-        runningClasses().insert(progId.toLower(), std::move(make));
+        runningClasses().insert(progId.toLower(), make);
     else
         runningClasses().remove(progId.toLower());
 }

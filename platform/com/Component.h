@@ -53,6 +53,6 @@ Object createObject(const QString& progId);
 
 /// Registers (or, with an empty maker, withdraws) a class of this process under a programmatic
 /// name, before whatever the registry says.
-void registerRunning(const QString& progId, std::function<QObject*()> make);
+void registerRunning(const QString& progId, const std::function<QObject*()>& make);
 
 }  // namespace com
