@@ -5,7 +5,6 @@
 
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
-#include "entry/Beneficiary.h"
 #include "entry/DocumentVat.h"
 #include "payments/frmPagamentoCheque.h"
 #include "platform/core/Clock.h"
@@ -153,105 +152,6 @@ void frmMovimentos::Timer1_Timer() {
     Text7->setValue(core::fromDate(core::today()));
     Text8->setText((bHospital ? data::tipo::Hospital : data::tipo::Document).toString());
     DataCombo3->setBoundText((bHospital ? data::modo::Cheque : data::modo::Transfer).toString());
-}
-
-// --- Who the document is for
-
-void frmMovimentos::No_Kor_Validate(bool& cancel) {
-    if (bShowing) return;
-    if (No_Kor->Text().isEmpty()) {
-        clearMember();
-        return;
-    }
-    Text10->setText(u"0"_s);
-    Text11->setText(u"0"_s);
-    const ado::RecordsetPtr member = openMemberByNumber(No_Kor->Text());
-    if (member->atEnd()) {
-        MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Associados"_s);
-        cancel = true;
-        return;
-    }
-    if (!checkEnrolled(*member)) {
-        clearMember();
-        return;
-    }
-    takeMemberFound(*member);
-    core::passingOver([this] { No_Kor->SelectAll(); });
-}
-
-/// Typing recolours the person's fields and keeps what they hold.
-void frmMovimentos::takeMemberFound(ado::Recordset& member) {
-    const qint32 id = core::toLong(member.Collect(u"socio_id"_s));
-    if (com::Object statement = testPremium(id)) search_ = statement;
-    // The member file takes the number typed as a 16-bit integer.
-    testBankNumber(member.Collect(u"nib"_s),
-                   [id] { return QVariant::fromValue(core::toInteger(id)); });
-    Socio_ID = id;
-    memberNumber_ = No_Kor->Text();
-    Text2->setBackColor(BackColor::Window);
-    Text2->setText(core::toText(member.Collect(u"nome"_s)));
-    Text3->setBackColor(BackColor::Window);
-    Text4->setBackColor(BackColor::Window);
-    Command2->setEnabled(true);
-    member.Close();
-}
-
-void frmMovimentos::Command1_Click() {
-    core::err().clear();
-    try {
-        searchMember();
-    } catch (const std::exception& failure) {
-        MsgBox(QString::fromUtf8(failure.what()));
-    }
-}
-
-void frmMovimentos::searchMember() {
-    search_ = openSearch();
-    const qint32 id = core::toLong(search_.call(u"appShow"_s, {u"SOC01"_s, false}));
-    if (id == 0) return;
-    const ado::RecordsetPtr member = openMemberById(id);
-    if (member->atEnd()) {
-        MsgBox(u"Este Associado não se encontra na tabela de activos."_s, Icon::Critical);
-    } else if (checkEnrolled(*member)) {
-        com::Object statement = testPremium(id);
-        testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
-        Socio_ID = id;
-        memberNumber_ = core::toText(member->Collect(u"no_kor"_s));
-        No_Kor->setText(memberNumber_);
-        Text2->setText(core::toText(member->Collect(u"nome"_s)));
-        Text2->setBackColor(BackColor::Window);
-        Command2->setEnabled(true);
-        for (forms::TextBox* box : {Text3, Text4}) {
-            box->setBackColor(BackColor::Menu);
-            box->Clear();
-        }
-        Familia_ID = {};
-        search_ = statement;
-        return;
-    }
-    No_Kor->Clear();
-    clearMember();
-}
-
-void frmMovimentos::clearMember() {
-    for (forms::TextBox* box : {Text2, Text3, Text4}) {
-        box->setBackColor(BackColor::Menu);
-        box->Clear();
-    }
-    Command2->setEnabled(false);
-    Socio_ID = 0;
-    memberNumber_.clear();
-    Familia_ID = {};
-}
-
-void frmMovimentos::Command2_Click() {
-    Familia_ID = 0;
-    Familia_ID = choosePerson(Socio_ID);
-    if (core::compareNumbers(Familia_ID, 0) == 0) return;
-    const std::optional<Person> person = admitPerson(Familia_ID, Socio_ID);
-    if (!person) return;
-    Text3->setText(core::toText(person->codABC));
-    if (!core::isNull(person->nome)) Text4->setText(core::toText(person->nome));
 }
 
 // --- The document's fields
