@@ -42,6 +42,8 @@ protected:
         EXPECT_EQ(form().Text4->backColor(), *code ? BackColor::Window : BackColor::Menu);
     }
 
+    void expectFormer() { expectMember(socio, "António Manuel Silva Matos", "C1"); }
+
     void search(qint64 found) {
         companions.memberFound = found;
         person.accelerator(u'P');
@@ -51,13 +53,13 @@ protected:
 
 TEST_F(Beneficiary, NumberChoosesIsHeldOrClearsTheMember) {
     book.member({.no_kor = u"100020"_s, .zelmar = 0});
-    expectMember(socio, "António Manuel Silva Matos", "C1");
+    expectFormer();
     person.expectBox({.text = u"Número de Empresa não encontrado!"_s,
                       .icon = Icon::Critical,
                       .title = u"Associados"_s});
     person.fill(u"No_Kor"_s, u"999999"_s);
     EXPECT_TRUE(form().No_Kor->hasFocus());
-    expectMember(socio, "António Manuel Silva Matos", "C1");
+    expectFormer();
     person.expectBox(NotEnrolled);
     person.fill(u"No_Kor"_s, u"100020"_s);
     EXPECT_EQ(form().No_Kor->Text(), u"100020"_s);
@@ -72,7 +74,7 @@ TEST_F(Beneficiary, SearchThatFindsNobodyOfThePlanClearsTheMember) {
     search(0);  // given up
     EXPECT_EQ(companions.calls, QStringList({u"Lumbra.Login(\"zelmars\", \"\")"_s,
                                              u"Lumbra.appShow(\"SOC01\", false)"_s}));
-    expectMember(socio, "António Manuel Silva Matos", "C1");
+    expectFormer();
     person.expectBox(NotEnrolled);
     search(book.member({.no_kor = u"100020"_s, .zelmar = 0}));
     EXPECT_EQ(form().No_Kor->Text(), QString());
@@ -111,27 +113,24 @@ TEST_F(Beneficiary, ArrearsWarnAndTheQuestionAlwaysFollows) {
         u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) desde "_s;
     const QString due =
         u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s;
-    struct {
-        QDate today;
-        int month, year, paid;  ///< of 120 due
-        QString warning;
-    } const rows[] = {
-        {{2026, 3, 15}, 3, 2026, 120, {}},
-        {{2026, 3, 15}, 2, 2026, 120, {}},  // one month's delay is tolerated
-        {{2026, 3, 15}, 1, 2026, 120, arrears + u"1/2026."_s},
-        {{2026, 3, 15}, 3, 2025, 120, arrears + u"3/2025."_s},
-        {{2026, 3, 15}, 3, 2027, 120, arrears + u"3/2027."_s},
-        {{2026, 3, 15}, 2, 2026, 119, due},
-        {{2026, 3, 15}, 1, 2026, 119, arrears + u"1/2026."_s},
-        {{2027, 1, 10}, 12, 2026, 120, arrears + u"12/2026."_s},
+    // Today, the month and year paid up to, what is paid of 120, and the warning.
+    const std::tuple<QDate, int, int, int, QString> rows[] = {
+        {QDate(2026, 3, 15), 3, 2026, 120, {}},
+        {QDate(2026, 3, 15), 2, 2026, 120, {}},  // one month's delay is tolerated
+        {QDate(2026, 3, 15), 1, 2026, 120, arrears + u"1/2026."_s},
+        {QDate(2026, 3, 15), 3, 2025, 120, arrears + u"3/2025."_s},
+        {QDate(2026, 3, 15), 3, 2027, 120, arrears + u"3/2027."_s},
+        {QDate(2026, 3, 15), 2, 2026, 119, due},
+        {QDate(2026, 3, 15), 1, 2026, 119, arrears + u"1/2026."_s},
+        {QDate(2027, 1, 10), 12, 2026, 120, arrears + u"12/2026."_s},
     };
     const QString paidUpTo =
         u"update tbQuotas_Socios set total_quotas=120, ult_mes=%1, ult_ano=%2, total_pago=%3"_s;
-    for (const auto& row : rows) {
-        core::setToday(row.today);
-        book.exec(paidUpTo.arg(row.month).arg(row.year).arg(row.paid));
-        if (!row.warning.isEmpty())
-            person.expectBox({.text = row.warning, .icon = Icon::Critical, .title = u"Zelmars"_s});
+    for (const auto& [today, month, year, paid, warning] : rows) {
+        core::setToday(today);
+        book.exec(paidUpTo.arg(month).arg(year).arg(paid));
+        if (!warning.isEmpty())
+            person.expectBox({.text = warning, .icon = Icon::Critical, .title = u"Zelmars"_s});
         typeMember();
         person.expectNoBoxesLeft();
         EXPECT_EQ(form().Socio_ID, socio);
@@ -145,23 +144,16 @@ TEST_F(Beneficiary, ArrearsWarnAndTheQuestionAlwaysFollows) {
 }
 
 TEST_F(Beneficiary, FaultyBankNumberWarnsAndOffersTheFile) {
-    const auto expectWarning = [&](const QString& warning, Answer answer) {
-        person.expectBox({.text = Question, .answer = Answer::No});
-        person.expectBox({.text = warning, .icon = Icon::Critical, .title = u"Zelmars"_s});
-        person.expectBox(
-            {.text = u"Quer abrir a ficha deste Associado para proceder a alterações?"_s,
-             .answer = answer,
-             .icon = Icon::Question,
-             .title = u"Associados"_s});
-    };
-    book.exec(u"update tbSocios set nib = null"_s);
-    expectWarning(u"Este Associado não tem NIB!"_s, Answer::No);
-    person.fill(u"No_Kor"_s, u"100015"_s);
-    EXPECT_EQ(companions.calls, QStringList());
-
     book.exec(u"update tbSocios set nib = '00130000000000000018'"_s);
     for (const bool typed : {true, false}) {
-        expectWarning(u"Este Associado tem especificado um NIB INVÁLIDO!"_s, Answer::Yes);
+        person.expectBox({.text = Question, .answer = Answer::No});
+        person.expectBox({.text = u"Este Associado tem especificado um NIB INVÁLIDO!"_s,
+                          .icon = Icon::Critical,
+                          .title = u"Zelmars"_s});
+        person.expectBox(
+            {.text = u"Quer abrir a ficha deste Associado para proceder a alterações?"_s,
+             .answer = Answer::Yes,
+             .icon = Icon::Question});
         typed ? person.fill(u"No_Kor"_s, u"100015"_s) : search(socio);
         EXPECT_EQ(companions.calls.last(),
                   u"Tiqueta.AbrirRegisto(%1%2)"_s.arg(socio).arg(typed ? u" of 16 bits"_s : u""_s));
@@ -174,9 +166,9 @@ TEST_F(Beneficiary, PersonWhoIsRefusedOrNotChosenLeavesTheFormerOne) {
                       .icon = Icon::Information});
     choosePerson(book.person({.socio_id = socio, .codABC = u"C2"_s}));
     person.expectNoBoxesLeft();
-    expectMember(socio, "António Manuel Silva Matos", "C1");
+    expectFormer();
     choosePerson(0);
-    expectMember(socio, "António Manuel Silva Matos", "C1");
+    expectFormer();
 }
 
 TEST_F(Beneficiary, CompanionsThatFailAnswerNonsenseOrAreMissingAreSaid) {
@@ -190,7 +182,7 @@ TEST_F(Beneficiary, CompanionsThatFailAnswerNonsenseOrAreMissingAreSaid) {
             person.expectBox({.text = text, .icon = icon, .partly = true});
             person.accelerator(key);
             person.expectNoBoxesLeft();
-            expectMember(socio, "António Manuel Silva Matos", "C1");
+            expectFormer();
         };
         for (const QVariant& nonsense : {QVariant(), QVariant(u"abc"_s)}) {
             companions.memberFound = companions.personChosen = nonsense;

@@ -22,9 +22,7 @@ protected:
 };
 
 TEST_F(DocumentFields, VatIsWhatTheValueContainsToTheCentHalvesToEven) {
-    struct {
-        QString value, rate, vat;
-    } const rows[] = {
+    const std::tuple<QString, QString, QString> rows[] = {
         {u"123,00"_s, u"5"_s, u"5,86"_s},
         {u"87,35"_s, u"23"_s, u"16,33"_s},
         {u"0,25"_s, u"100"_s, u"0,12"_s},  // 12,5 cents
@@ -34,13 +32,13 @@ TEST_F(DocumentFields, VatIsWhatTheValueContainsToTheCentHalvesToEven) {
         {u"-50"_s, u"100"_s, u"-25,00"_s},
     };
     openNew();
-    for (const auto& row : rows) {
-        SCOPED_TRACE(row.value.toStdString());
+    for (const auto& [value, rate, vat] : rows) {
+        SCOPED_TRACE(value.toStdString());
         person.fill(u"Text11"_s, u"0"_s);
-        person.fill(u"Text6"_s, row.value);
+        person.fill(u"Text6"_s, value);
         EXPECT_EQ(form().Text10->Text(), u"0,00"_s) << "a rate of 0 leaves the tax";
-        person.fill(u"Text11"_s, row.rate);
-        EXPECT_EQ(form().Text10->Text(), row.vat);
+        person.fill(u"Text11"_s, rate);
+        EXPECT_EQ(form().Text10->Text(), vat);
     }
     EXPECT_DOUBLE_EQ(amount(u"doc_iva"_s), -25);
     person.fill(u"Text6"_s, u"200"_s);
@@ -52,9 +50,7 @@ TEST_F(DocumentFields, VatIsWhatTheValueContainsToTheCentHalvesToEven) {
 
 TEST_F(DocumentFields, RefusalsHoldTheFocusAndLeaveTheRow) {
     const QString outside = u"O valor de IVA tem de ser entre 0 e 100."_s;
-    struct {
-        QString field, typed, text;
-    } const rows[] = {
+    const std::tuple<QString, QString, QString> rows[] = {
         {u"Text11"_s, u"abc"_s, NotANumber},
         {u"Text11"_s, QString(), NotANumber},
         {u"Text11"_s, u"-0,01"_s, outside},
@@ -65,18 +61,18 @@ TEST_F(DocumentFields, RefusalsHoldTheFocusAndLeaveTheRow) {
         {u"Text1"_s, u"ontem"_s, QString()},
     };
     openNew();
-    for (const auto& row : rows) {
-        SCOPED_TRACE(row.typed.toStdString());
+    for (const auto& [field, typed, text] : rows) {
+        SCOPED_TRACE(typed.toStdString());
         for (const bool byTab : {true, false}) {
-            if (!row.text.isEmpty()) person.expectBox({.text = row.text});
-            person.put(row.field, row.typed);
+            if (!text.isEmpty()) person.expectBox({.text = text});
+            person.put(field, typed);
             byTab ? person.tab() : person.accelerator(u'P');
             person.expectNoBoxesLeft();
-            EXPECT_TRUE(person.find(row.field)->hasFocus());
+            EXPECT_TRUE(person.find(field)->hasFocus());
         }
-        person.put(row.field, row.field == u"Text1"_s ? QString() : u"5"_s);
+        person.put(field, field == u"Text1"_s ? QString() : u"5"_s);
         person.tab();
-        EXPECT_FALSE(person.find(row.field)->hasFocus());
+        EXPECT_FALSE(person.find(field)->hasFocus());
     }
     EXPECT_EQ(companions.calls, QStringList()) << "the search never began";
     EXPECT_FALSE(pending(u"doc_data"_s).isValid());
@@ -108,7 +104,7 @@ TEST_F(DocumentFields, ListsAndTheIncidenceOfAHospitalBillReachTheRow) {
 // What nobody should type. A lookup may fail with its text; the row, the screen and the book stay.
 TEST_F(DocumentFields, BadInputIsSaidAndLosesNothing) {
     openNew(true);
-    typeHospitalBill(u"87,35"_s, u"10"_s);
+    typeDocument(u"87,35"_s, u"10"_s);
     const QString before = everything();
     const Operator::Box failed{.icon = Icon::Critical, .partly = true};
     const Operator::Box unknown{.text = u"Número de Empresa não encontrado!"_s};

@@ -21,7 +21,7 @@ EntryTest::EntryTest() {
     socio = book.member({});
     book.premiumInOrder(socio);
     self = book.person({.socio_id = socio, .codABC = u"A"_s, .nome = u"António Matos"_s});
-    spouse = book.person({.socio_id = socio});
+    book.person({.socio_id = socio});
     child = book.person({.socio_id = socio,
                          .codABC = u"C1"_s,
                          .nome = u"Inês Matos"_s,
@@ -73,7 +73,7 @@ void EntryTest::choosePerson(qint64 family) {
     person.accelerator(u'I');
 }
 
-void EntryTest::typeDocument(const QString& value, const QString& rate, const QString& received) {
+void EntryTest::typeDocument(const QString& value, const QString& received, const QString& rate) {
     typeMember();
     choosePerson(self);
     person.fill(u"Text1"_s, u"10-03-2026"_s);
@@ -82,11 +82,7 @@ void EntryTest::typeDocument(const QString& value, const QString& rate, const QS
     person.fill(u"Text9"_s, received);
     person.fill(u"Text11"_s, rate);
     person.fill(u"DataCombo1"_s, u"0101"_s);
-}
-
-void EntryTest::typeHospitalBill(const QString& value, const QString& incidence) {
-    typeDocument(value, u"0"_s, incidence);
-    person.fill(u"DataCombo2"_s, u"H01"_s);
+    if (form().bHospital) person.fill(u"DataCombo2"_s, u"H01"_s);
 }
 
 void EntryTest::postAndLeave() {

@@ -32,10 +32,9 @@ protected:
     /// Types the number of the member in order; the premium statement is not wanted.
     void typeMember(const QString& number = QStringLiteral("100015"));
     void choosePerson(qint64 family);
-    /// A document that can be posted, all but its amounts: member, himself, date, number, rubric.
-    void typeDocument(const QString& value, const QString& rate, const QString& received);
-    /// A hospital bill that can be posted.
-    void typeHospitalBill(const QString& value, const QString& incidence);
+    /// A document or a hospital bill that can be posted; what is received, or the incidence.
+    void typeDocument(const QString& value, const QString& received = QStringLiteral("0"),
+                      const QString& rate = QStringLiteral("0"));
 
     /// "&OK" and yes, up to what the posting says. On frmMovimentosF the person then leaves.
     void postAndLeave();
@@ -52,8 +51,7 @@ protected:
 
     support::Book book;
     qint64 socio = 0;   ///< staff number 100015, in order in every respect
-    qint64 self = 0;    ///< his own family row, code "A"
-    qint64 spouse = 0;  ///< code "B"
+    qint64 self = 0;    ///< his own family row, code "A"; there is a "B" too
     qint64 child = 0;   ///< code "C1", nine years old
     qint64 rubric = 0;  ///< "0101", 75 %, ceilings of 500 for member and relative
     qint64 hospital = 0;
