@@ -15,10 +15,7 @@ host::CommandLine parsed(const QString& words) {
 }  // namespace
 
 TEST(CommandLine, NamesOneTask) {
-    const struct {
-        QString words;
-        Task task;
-    } cases[] = {
+    const std::pair<QString, Task> cases[] = {
         {u""_s, Task::Window},
         {u"--help"_s, Task::Help},
         {u"tour out"_s, Task::Tour},
@@ -38,8 +35,8 @@ TEST(CommandLine, NamesOneTask) {
         {u"Registo 99999999999"_s, Task::Wrong},
         {u"Ldividas x"_s, Task::Wrong},
     };
-    for (const auto& each : cases)
-        EXPECT_EQ(parsed(each.words).task, each.task) << each.words.toStdString();
+    for (const auto& [words, task] : cases)
+        EXPECT_EQ(parsed(words).task, task) << words.toStdString();
 }
 
 TEST(CommandLine, GivesOperationsTheirArguments) {

@@ -11,34 +11,27 @@ namespace {
 
 /// The newest first; named by their numbers in what is expected below.
 host::MovementSearch sampleSearch() {
-    const struct {
-        qint32 number;
-        qint32 socio;
-        const char* code;
-        QDate day;
-        const char* tipo;
-        const char* document;
-    } movements[] = {
-        {1205, 1, "A", {2026, 11, 22}, "DOC", "FT 2026/118"},
-        {1204, 1, "C1", {2026, 11, 21}, "HOS", "77001"},
-        {1203, 2, "B", {2026, 11, 21}, "DOC", "a-9%"},
-        {120, 3, "", {2026, 2, 1}, "PAG", ""},
-        {12, 2, "A", {2025, 11, 21}, "ANL", "1204"},
-        {0, 9, "A", {}, "SA", ""},
-    };
     host::MovementSearch search;
     search.nameMember(1, u"100015"_s, u"António Manuel Silva Matos"_s);
     search.nameMember(2, u"12040"_s, u"Conceição d'Araújo"_s);
     search.nameMember(3, u"100073"_s, u"ANA SÁ"_s);
     qint32 key = 100;
-    for (const auto& movement : movements)
+    const auto add = [&](qint32 number, qint32 socio, const QString& code, QDate day,
+                         const QString& tipo, const QString& document) {
         search.append({.movimento_id = key--,
-                       .movimento_no = movement.number,
-                       .socio_id = movement.socio,
-                       .codABC = QString::fromLatin1(movement.code),
-                       .data = movement.day,
-                       .tipo = QString::fromLatin1(movement.tipo),
-                       .doc_no = QString::fromLatin1(movement.document)});
+                       .movimento_no = number,
+                       .socio_id = socio,
+                       .codABC = code,
+                       .data = day,
+                       .tipo = tipo,
+                       .doc_no = document});
+    };
+    add(1205, 1, u"A"_s, {2026, 11, 22}, u"DOC"_s, u"FT 2026/118"_s);
+    add(1204, 1, u"C1"_s, {2026, 11, 21}, u"HOS"_s, u"77001"_s);
+    add(1203, 2, u"B"_s, {2026, 11, 21}, u"DOC"_s, u"a-9%"_s);
+    add(120, 3, {}, {2026, 2, 1}, u"PAG"_s, {});
+    add(12, 2, u"A"_s, {2025, 11, 21}, u"ANL"_s, u"1204"_s);
+    add(0, 9, u"A"_s, {}, u"SA"_s, {});
     search.nameRelative(1, u"A"_s, u"António Manuel Silva Matos"_s);
     search.nameRelative(1, u"C1"_s, u"Inês Matos"_s);
     search.nameRelative(2, u"B"_s, u"João Gonçalves"_s);
@@ -57,10 +50,7 @@ QString found(const host::MovementSearch& search, const QString& filter) {
 
 TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
     const host::MovementSearch search = sampleSearch();
-    const struct {
-        const char16_t* filter;
-        const char* keys;
-    } cases[] = {
+    const std::pair<const char16_t*, const char*> cases[] = {
         {u"", "100 99 98 97 96 95"},
         // Number, staff number and number of the document, from their beginning.
         {u"1205", "100"},
@@ -94,7 +84,8 @@ TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
         // What nobody means to type does no harm.
         {u"'; drop table x", ""},
     };
-    for (const auto& each : cases)
-        EXPECT_EQ(found(search, QString::fromUtf16(each.filter)).toStdString(), each.keys)
-            << QString::fromUtf16(each.filter).toStdString();
+    for (const auto& [text, keys] : cases) {
+        const QString filter = QString::fromUtf16(text);
+        EXPECT_EQ(found(search, filter).toStdString(), keys) << filter.toStdString();
+    }
 }
