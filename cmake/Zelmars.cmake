@@ -17,6 +17,7 @@ set(CMAKE_INSTALL_RPATH "$ORIGIN")
 
 find_package(Qt6 6.4 REQUIRED COMPONENTS Core Gui Widgets Test)
 find_package(SQLite3 REQUIRED)
+find_package(PostgreSQL REQUIRED)
 
 find_program(ZELMARS_CCACHE ccache)
 if(ZELMARS_CCACHE)

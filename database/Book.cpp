@@ -5,6 +5,7 @@
 #include <QFile>
 #include <QScopeGuard>
 
+#include "database/SchemaText.h"
 #include "database/Sqlite.h"
 #include "database/SqliteBookWriter.h"
 #include "database/sample/SampleBook.h"
@@ -14,23 +15,9 @@
 
 using namespace Qt::StringLiterals;
 
-// A static library's resource is linked in only when it is asked for, and that from outside any
-// namespace.
-static void loadSchema() {
-    Q_INIT_RESOURCE(schema);
-}
-
 namespace database {
 
 namespace {
-
-QByteArray schemaText(const QString& name) {
-    loadSchema();
-    QFile file(u":/zelmars/schema/"_s + name);
-    if (!file.open(QIODevice::ReadOnly))
-        throw core::Failure(core::InvalidCall, u"Falta no programa o ficheiro %1."_s.arg(name));
-    return file.readAll();
-}
 
 void removeBook(const QString& file) {
     for (const QString& suffix : {u""_s, u"-wal"_s, u"-shm"_s, u"-journal"_s})

@@ -2,6 +2,7 @@
 #include "platform/ado/Connection.h"
 
 #include "platform/ado/ConnectionSettings.h"
+#include "platform/ado/PostgresSession.h"
 #include "platform/ado/SqliteSession.h"
 #include "platform/core/Failure.h"
 
@@ -10,6 +11,18 @@ namespace ado {
 using namespace Qt::StringLiterals;
 
 namespace {
+
+std::shared_ptr<Session> openServer(const ConnectionSettings& settings, const QString& place,
+                                    const QString& catalog, int timeoutSeconds) {
+    PostgresAddress address;
+    address.place(place);
+    address.catalog = catalog;
+    address.user = settings.value(u"User ID"_s);
+    address.password = settings.value(u"Password"_s);
+    if (const int seconds = settings.value(u"Connect Timeout"_s).toInt(); seconds > 0)
+        address.connectSeconds = seconds;
+    return std::make_shared<PostgresSession>(address, timeoutSeconds);
+}
 
 /// The engine that `Data Source` names, on the book that `Initial Catalog` names.
 std::shared_ptr<Session> openSession(const ConnectionSettings& settings, int timeoutSeconds) {
@@ -22,13 +35,12 @@ std::shared_ptr<Session> openSession(const ConnectionSettings& settings, int tim
     };
     const QString engine = source.section(u':', 0, 0).trimmed().toLower();
     const QString place = source.section(u':', 1);
-    if (engine == "sqlite"_L1 && !place.isEmpty()) {
-        if (catalog.isEmpty()) throw refuse(u"falta o nome do livro (Initial Catalog)."_s);
-        return std::make_shared<SqliteSession>(place, catalog, timeoutSeconds);
-    }
-    if (engine == "postgresql"_L1)
-        throw refuse(u"o servidor PostgreSQL ainda não está disponível nesta versão."_s);
-    throw refuse(u"as formas conhecidas são «sqlite:PASTA» e «postgresql:SERVIDOR[:PORTA]»."_s);
+    const bool isServer = engine == "postgresql"_L1;
+    if (place.isEmpty() || (!isServer && engine != "sqlite"_L1))
+        throw refuse(u"as formas conhecidas são «sqlite:PASTA» e «postgresql:SERVIDOR[:PORTA]»."_s);
+    if (catalog.isEmpty()) throw refuse(u"falta o nome do livro (Initial Catalog)."_s);
+    if (isServer) return openServer(settings, place, catalog, timeoutSeconds);
+    return std::make_shared<SqliteSession>(place, catalog, timeoutSeconds);
 }
 
 }  // namespace

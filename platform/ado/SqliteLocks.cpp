@@ -7,14 +7,13 @@
 
 #include <QElapsedTimer>
 #include <QFile>
-#include <QSysInfo>
 #include <QThread>
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
 
+#include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
-#include "platform/core/UserName.h"
 
 namespace ado {
 
@@ -47,26 +46,10 @@ off_t slotOf(quint64 offset) {
     return static_cast<off_t>(offset % Slots * sizeof(Record));
 }
 
-const QByteArray& self() {
-    static const QByteArray owner = [] {
-        char name[OwnerLength / 2] = {};
-        if (!core::userName(name, sizeof name - 1)) std::strcpy(name, "?");
-        return QByteArray(name) + '@' + QSysInfo::machineHostName().toUtf8();
-    }();
-    return owner;
-}
-
-/// Rows that this thread holds: file and place.
-struct Held {
-    QString path;
-    quint64 offset;
-    bool operator==(const Held&) const = default;
-};
-thread_local std::vector<Held> heldHere;
-
 class OfdLock final : public RowLock {
 public:
-    OfdLock(const QString& path, quint64 offset) : held_{path, offset} {
+    OfdLock(const QString& path, quint64 offset)
+        : path_(path), offset_(offset), here_(path, QString::number(offset)) {
         const QByteArray name = QFile::encodeName(path);
         // Not inherited by a program that this one starts: it would keep the row.
         file_ = ::open(name.constData(), O_RDWR | O_CLOEXEC);
@@ -77,21 +60,18 @@ public:
                                     path, qt_error_string(errno)));
     }
     ~OfdLock() override {
-        if (taken_) heldHere.erase(std::find(heldHere.begin(), heldHere.end(), held_));
         if (file_ >= 0) ::close(file_);
     }
     OfdLock(const OfdLock&) = delete;
     OfdLock& operator=(const OfdLock&) = delete;
 
-    bool heldByThisThread() const {
-        return std::find(heldHere.begin(), heldHere.end(), held_) != heldHere.end();
-    }
+    bool heldByThisThread() const { return here_.isTaken(); }
 
     bool take() {
         struct flock range {};
         range.l_type = F_WRLCK;
         range.l_whence = SEEK_SET;
-        range.l_start = static_cast<off_t>(held_.offset);
+        range.l_start = static_cast<off_t>(offset_);
         range.l_len = 1;
         if (::fcntl(file_, F_OFD_SETLK, &range) != 0) {
             if (errno == EAGAIN || errno == EACCES || errno == EINTR) return false;
@@ -99,15 +79,15 @@ public:
                 core::DatabaseFailure,
                 u"Não foi possível bloquear a linha: %1"_s.arg(qt_error_string(errno)));
         }
-        taken_ = true;
-        heldHere.push_back(held_);
+        here_.take();
         Record record;
-        record.offset = held_.offset;
-        std::memcpy(record.owner, self().constData(),
-                    qMin<std::size_t>(OwnerLength - 1, static_cast<std::size_t>(self().size())));
+        record.offset = offset_;
+        std::memcpy(
+            record.owner, workstation().constData(),
+            qMin<std::size_t>(OwnerLength - 1, static_cast<std::size_t>(workstation().size())));
         // Only for the text of a refusal: without it the lock holds all the same.
         [[maybe_unused]] const ssize_t written =
-            ::pwrite(file_, &record, sizeof record, slotOf(held_.offset));
+            ::pwrite(file_, &record, sizeof record, slotOf(offset_));
         return true;
     }
 
@@ -115,10 +95,10 @@ public:
     QString holder() const {
         Record record;
         const bool known =
-            ::pread(file_, &record, sizeof record, slotOf(held_.offset)) == sizeof record &&
-            record.offset == held_.offset;
+            ::pread(file_, &record, sizeof record, slotOf(offset_)) == sizeof record &&
+            record.offset == offset_;
         record.owner[OwnerLength - 1] = '\0';
-        return known ? QString::fromUtf8(record.owner) : u"outro posto"_s;
+        return known ? QString::fromUtf8(record.owner) : OtherWorkstation;
     }
 
 private:
@@ -132,28 +112,22 @@ private:
         return file;
     }
 
-    Held held_;
+    QString path_;
+    quint64 offset_;
+    HeldHere here_;
     int file_ = -1;
-    bool taken_ = false;
 };
-
-[[noreturn]] void refuse(const QString& table, RowIdentity row, const QString& holder) {
-    throw core::Failure(
-        core::RowInUse,
-        u"A linha %1 de %2 está a ser usada por %3. Tente mais tarde."_s.arg(row).arg(table,
-                                                                                      holder));
-}
 
 }  // namespace
 
 std::unique_ptr<RowLock> SqliteLocks::lock(const QString& table, RowIdentity row,
                                            int timeoutSeconds) const {
     auto lock = std::make_unique<OfdLock>(path_, offsetOf(table, row));
-    if (lock->heldByThisThread()) refuse(table, row, u"outra janela deste programa"_s);
+    if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
     QElapsedTimer waited;
     waited.start();
     for (unsigned long pause = 1; !lock->take(); pause = qMin(pause * 2, 50UL)) {
-        if (waited.hasExpired(qint64{timeoutSeconds} * 1000)) refuse(table, row, lock->holder());
+        if (waited.hasExpired(qint64{timeoutSeconds} * 1000)) refuseRow(table, row, lock->holder());
         QThread::msleep(pause);
     }
     return lock;

@@ -43,17 +43,20 @@ struct ColumnName {
 
 class Translation {
 public:
-    Translation(const Statement& statement, Schema& schema) : s(statement), schema_(schema) {
+    Translation(const Statement& statement, Schema& schema, Dialect dialect)
+        : s(statement), schema_(schema), isServer_(dialect == Dialect::Postgres) {
         survey();
     }
 
     QString run(bool withIdentity) {
         literals();
         if (has_.plus) joins();
-        if (has_.sum) sums();
+        if (has_.sum) isServer_ ? floatSums() : amountSums();
+        if (isServer_) numbersBesideTexts();
         if (order_ >= 0) orderTerms();
         insertionOrder();
-        if (withIdentity) edits_.insert(s.token(1).at, QLatin1StringView(Identity) + u","_s);
+        if (withIdentity)
+            edits_.insert(s.token(1).at, schema_.identity(sources_.front().table) + u',');
         if (s.end() < s.text().size()) edits_.replace(s.end(), s.text().size() - s.end(), {});
         return edits_.applied(s.text());
     }
@@ -68,16 +71,23 @@ private:
     void survey();
     void noteSource(int i);
     void noteClause(int i);
+    bool aggregates(int i) const;
 
     void literals();
+    QString quoted(const QString& name) const;
     void convert(int i);
     void joins();
     int operandBefore(int plus) const;
     int operandBehind(int plus) const;
-    void sums();
+    void amountSums();
     bool sumsMoney(int open, int behind);
+    void floatSums();
+    bool sumsSingles(int open, int behind);
+    void numbersBesideTexts();
     void orderTerms();
     void orderTerm(int first, int behind);
+    void orderNulls(int first, int behind);
+    bool isIdentity(const ColumnName& column);
     void insertionOrder();
 
     ColumnName columnAt(int i) const;
@@ -91,9 +101,11 @@ private:
     const Statement& s;
     Schema& schema_;
     Edits edits_;
+    bool isServer_;  ///< for PostgreSQL
     std::vector<Source> sources_;
-    int from_ = -1;   ///< FROM of the first SELECT
-    int order_ = -1;  ///< ORDER of the whole statement
+    std::size_t outer_ = 0;  ///< the first SELECT's first source
+    int from_ = -1;          ///< FROM of the first SELECT
+    int order_ = -1;         ///< ORDER of the whole statement
     int limit_ = -1;
     bool grouped_ = false;  ///< GROUP BY, DISTINCT or an aggregate: rows are no rows of a table
     bool compound_ = false;
@@ -105,20 +117,25 @@ private:
 // One walk that finds what there is to do, so that a plain statement costs nothing more.
 void Translation::survey() {
     int depth = 0;
+    int inner = 0;  // depth of the outermost SELECT in brackets; 0 outside of one
     for (int i = 0; i < s.count(); ++i) {
         const Token& token = s.token(i);
         if (token.kind == TokenKind::Symbol) {
             const QChar c = s.text()[token.at];
             if (c == u'(') ++depth;
-            if (c == u')') --depth;
+            if (c == u')' && --depth < inner) inner = 0;
             if (c == u'+') has_.plus = true;
-        } else if (token.kind == TokenKind::Date || token.kind == TokenKind::DoubleText) {
-            has_.literal = true;
         } else if (token.kind == TokenKind::Word) {
+            if (s.is(i, "select"_L1) && inner == 0) inner = depth;
+            if (inner == 0 && from_ < 0 && aggregates(i)) grouped_ = true;
+            if (depth == 0 && from_ < 0 && s.is(i, "from"_L1)) outer_ = sources_.size();
             if (s.is(i, "from"_L1) || s.is(i, "join"_L1)) noteSource(i);
             if (s.is(i, "sum"_L1)) has_.sum = true;
             if (s.is(i, "convert"_L1) || s.is(i - 1, "."_L1)) has_.literal = true;
             if (depth == 0) noteClause(i);
+        } else if (token.kind == TokenKind::Date || token.kind == TokenKind::DoubleText ||
+                   token.kind == TokenKind::Name) {
+            has_.literal = true;
         }
     }
 }
@@ -128,10 +145,12 @@ void Translation::noteClause(int i) {
     if (s.is(i, "order"_L1) && s.is(i + 1, "by"_L1)) order_ = i;
     if (s.is(i, "limit"_L1)) limit_ = i;
     if (s.is(i, "union"_L1) || s.is(i, "except"_L1) || s.is(i, "intersect"_L1)) compound_ = true;
-    const bool aggregate =
-        s.is(i + 1, "("_L1) && (s.is(i, "sum"_L1) || s.is(i, "count"_L1) || s.is(i, "min"_L1) ||
-                                s.is(i, "max"_L1) || s.is(i, "avg"_L1) || s.is(i, "total"_L1));
-    if (aggregate || s.is(i, "group"_L1) || s.is(i, "distinct"_L1)) grouped_ = true;
+    if (s.is(i, "group"_L1) || s.is(i, "distinct"_L1)) grouped_ = true;
+}
+
+bool Translation::aggregates(int i) const {
+    return s.is(i + 1, "("_L1) && (s.is(i, "sum"_L1) || s.is(i, "count"_L1) || s.is(i, "min"_L1) ||
+                                   s.is(i, "max"_L1) || s.is(i, "avg"_L1) || s.is(i, "total"_L1));
 }
 
 void Translation::noteSource(int i) {
@@ -157,13 +176,19 @@ void Translation::literals() {
         } else if (token.kind == TokenKind::DoubleText) {
             edits_.replace(token.at, token.length,
                            u"'%1'"_s.arg(s.name(i).replace(u"'"_s, u"''"_s)));
+        } else if (token.kind == TokenKind::Name && isServer_) {
+            edits_.replace(token.at, token.length, quoted(s.name(i)));
         } else if (token.kind == TokenKind::Word && s.is(i, "convert"_L1)) {
             convert(i);
         } else if (token.kind == TokenKind::Word && s.is(i - 1, "."_L1)) {
-            if (isAny(i, Keywords))
-                edits_.replace(token.at, token.length, u"\"%1\""_s.arg(s.word(i)));
+            if (isAny(i, Keywords)) edits_.replace(token.at, token.length, quoted(s.name(i)));
         }
     }
+}
+
+/// A name in quotes; the server's unquoted names are lower case.
+QString Translation::quoted(const QString& name) const {
+    return u"\"%1\""_s.arg(isServer_ ? name.toLower() : name);
 }
 
 // CONVERT(DATETIME, 'text'[, style]): whatever the style says, the text is month/day/year.
@@ -229,9 +254,9 @@ void Translation::joins() {
     for (const int plus : joining) edits_.replace(s.token(plus).at, 1, u"||"_s);
 }
 
-// Amounts are stored in binary; a sum of them, and a sum of such sums, is brought back to the four
-// decimals that the amounts have, so that 0.4 - 0.3 is not above 0.1.
-void Translation::sums() {
+// SQLite stores amounts in binary; a sum of them, and a sum of such sums, is brought back to the
+// four decimals that the amounts have, so that 0.4 - 0.3 is not above 0.1.
+void Translation::amountSums() {
     for (int i = 0; i < s.count(); ++i) {
         if (!s.is(i, "sum"_L1) || !s.is(i + 1, "("_L1)) continue;
         int behind = s.behindBracket(i + 1);
@@ -264,6 +289,39 @@ bool Translation::sumsMoney(int open, int behind) {
     return money;
 }
 
+// The server would sum 32-bit floats into one of their kind, and digits would go with every row.
+void Translation::floatSums() {
+    for (int i = 0; i < s.count(); ++i) {
+        if (!s.is(i, "sum"_L1) || !s.is(i + 1, "("_L1)) continue;
+        const int behind = s.behindBracket(i + 1);
+        if (!sumsSingles(i + 1, behind)) continue;
+        edits_.insert(s.token(i + 1).at + 1, u"CAST("_s);
+        edits_.insert(s.token(behind - 1).at, u" AS double precision)"_s);
+    }
+}
+
+bool Translation::sumsSingles(int open, int behind) {
+    for (int i = open + 1; i < behind - 1; ++i) {
+        if (!s.isWord(i)) continue;
+        if (typeOf(columnAt(i)) == ColumnType::Single) return true;
+        i = columnEnd(i) - 1;
+    }
+    return false;
+}
+
+// The server compares a text with texts only; people also write staff numbers bare.
+void Translation::numbersBesideTexts() {
+    for (int i = 2; i < s.count(); ++i) {
+        if (s.kind(i) != TokenKind::Number) continue;
+        int before = i - 1;
+        while (s.is(before, "="_L1) || s.is(before, "<"_L1) || s.is(before, ">"_L1)) --before;
+        if (before == i - 1 || before < 0 || !s.isWord(before)) continue;
+        const int column = s.is(before - 1, "."_L1) ? before - 2 : before;
+        if (typeOf(columnAt(column)) == ColumnType::Text)
+            edits_.replace(s.token(i).at, s.token(i).length, u"'%1'"_s.arg(s.word(i)));
+    }
+}
+
 ColumnName Translation::columnAt(int i) const {
     if (s.is(i + 1, "."_L1)) return {s.name(i), s.name(i + 2)};
     return {{}, s.name(i)};
@@ -287,7 +345,7 @@ void Translation::orderTerms() {
     // The engine takes an order of its own kind behind a UNION of groups only from around it.
     if (compound_) {
         edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
-        edits_.insert(s.token(order_).at, u") "_s);
+        edits_.insert(s.token(order_).at, isServer_ ? u") AS uniao "_s : u") "_s);
     }
     const int end = limit_ > order_ ? limit_ : s.count();
     int depth = 0;
@@ -303,6 +361,7 @@ void Translation::orderTerms() {
 }
 
 void Translation::orderTerm(int first, int behind) {
+    if (isServer_ && first < behind) orderNulls(first, behind);
     if (s.is(behind - 1, "asc"_L1) || s.is(behind - 1, "desc"_L1)) --behind;
     if (first >= behind || !s.isWord(first) || columnEnd(first) != behind) return;
     const ColumnName column = columnAt(first);
@@ -311,7 +370,22 @@ void Translation::orderTerm(int first, int behind) {
     // Behind a UNION only the columns of the result have names.
     if (compound_ && !column.qualifier.isEmpty())
         edits_.replace(s.token(first).at, end - s.token(first).at, aliasOf(column));
-    if (isText(first, behind)) edits_.insert(end, u" COLLATE "_s + QLatin1StringView(Collation));
+    if (!isServer_ && isText(first, behind))
+        edits_.insert(end, u" COLLATE "_s + QLatin1StringView(Collation));
+}
+
+// Nulls come before all values. A table's identity has none and is found in its order as it is.
+void Translation::orderNulls(int first, int behind) {
+    const bool descends = s.is(behind - 1, "desc"_L1);
+    const int end = descends || s.is(behind - 1, "asc"_L1) ? behind - 1 : behind;
+    if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return;
+    const Token& last = s.token(behind - 1);
+    edits_.insert(last.at + last.length, descends ? u" NULLS LAST"_s : u" NULLS FIRST"_s);
+}
+
+bool Translation::isIdentity(const ColumnName& column) {
+    if (sources_.size() != 1) return false;
+    return schema_.identity(sources_.front().table).compare(column.name, Qt::CaseInsensitive) == 0;
 }
 
 /// True for a column that the book declares as text, and for a joined text of the SELECT list.
@@ -368,17 +442,20 @@ QString Translation::aliasOf(const ColumnName& column) const {
 // Without an order of its own a read of a table gives the rows in the order of their insertion,
 // whatever index finds them.
 void Translation::insertionOrder() {
-    if (order_ >= 0 || compound_ || grouped_ || from_ < 0 || sources_.empty()) return;
-    const Source& first = sources_.front();
-    if (s.is(from_ + 1, "("_L1) || !schema_.isTable(first.table)) return;
-    const QString order = u" ORDER BY \"%1\"."_s.arg(first.alias) + QLatin1StringView(Identity);
+    if (order_ >= 0 || compound_ || grouped_ || from_ < 0 || outer_ >= sources_.size()) return;
+    const Source& first = sources_[outer_];
+    // SQLite passes through the first of joins in brackets as it does without them.
+    if (!isServer_ && s.is(from_ + 1, "("_L1)) return;
+    const QString identity = schema_.identity(first.table);
+    if (identity.isEmpty()) return;
+    const QString order = u" ORDER BY %1.%2"_s.arg(quoted(first.alias), identity);
     edits_.insert(limit_ < 0 ? s.end() : s.token(limit_).at - 1, order);
 }
 
 }  // namespace
 
-QString translate(const Statement& statement, Schema& schema, bool withIdentity) {
-    return Translation(statement, schema).run(withIdentity);
+QString translate(const Statement& statement, Schema& schema, bool withIdentity, Dialect dialect) {
+    return Translation(statement, schema, dialect).run(withIdentity);
 }
 
 }  // namespace ado

@@ -8,6 +8,14 @@
 
 namespace ado {
 
+/// SQLite's collation by which texts sort as a Portuguese reader expects; on PostgreSQL the columns
+/// themselves have theirs.
+inline constexpr auto Collation = "portuguese";
+/// SQLite's row identity.
+inline constexpr auto Identity = "_rowid_";
+/// The row identity that tables without a key of one number have on PostgreSQL.
+inline constexpr auto HiddenIdentity = "_linha";
+
 /// What the translator asks about the book.
 class Schema {
 public:
@@ -16,15 +24,17 @@ public:
     virtual bool isTable(QStringView name) = 0;
     /// The declared type of a column of a table or view; nothing when there is no such column.
     virtual std::optional<ColumnType> columnType(QStringView table, QStringView column) = 0;
+    /// The column that is a table's row identity; empty for anything but a table.
+    virtual QString identity(QStringView table) {
+        return isTable(table) ? QString::fromLatin1(Identity) : QString();
+    }
 };
 
-/// Name of the collation by which texts sort as a Portuguese reader expects.
-inline constexpr auto Collation = "portuguese";
-/// Name of SQLite's row identity.
-inline constexpr auto Identity = "_rowid_";
+enum class Dialect { Sqlite, Postgres };
 
-/// The statement in SQLite's dialect. With `withIdentity` (only for a `SELECT *` over one table)
+/// The statement in an engine's dialect. With `withIdentity` (only for a `SELECT *` over one table)
 /// the row identity stands before the columns. What no rule knows is passed on as it stands.
-QString translate(const Statement& statement, Schema& schema, bool withIdentity);
+QString translate(const Statement& statement, Schema& schema, bool withIdentity,
+                  Dialect dialect = Dialect::Sqlite);
 
 }  // namespace ado

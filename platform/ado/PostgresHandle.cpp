@@ -1,0 +1,273 @@
+// SPDX-License-Identifier: MIT
+#include "platform/ado/PostgresHandle.h"
+
+#include <poll.h>
+
+#include "platform/ado/RowHolders.h"
+#include "platform/core/Failure.h"
+
+namespace ado {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+/// Seconds beyond the server's own time-out after which a server counts as gone.
+constexpr int Grace = 3;
+constexpr int OldestServer = 140000;
+/// Statements that stay prepared; more than these and all are prepared anew.
+constexpr int PreparedStatements = 128;
+
+constexpr auto NoAnswer = "57014";
+constexpr auto CannotConnect = "08001";
+/// The server ends the connection by itself: it is shut down, or its administrator wants it so.
+constexpr auto Ending = "57P0"_L1;
+
+/// The server's text as it stands, on one line.
+QString oneLine(const char* text) {
+    return QString::fromUtf8(text).simplified();
+}
+
+bool isFailure(const PGresult* result) {
+    const ExecStatusType status = PQresultStatus(result);
+    return status == PGRES_FATAL_ERROR || status == PGRES_BAD_RESPONSE;
+}
+
+std::vector<const char*> pointers(const PostgresValues& values) {
+    std::vector<const char*> texts;
+    for (const auto& value : values) texts.push_back(value ? value->constData() : nullptr);
+    return texts;
+}
+
+/// Waits until the socket is ready; false when the time is over.
+bool await(PGconn* connection, short events, const QDeadlineTimer& deadline) {
+    pollfd socket{PQsocket(connection), events, 0};
+    const qint64 left = deadline.remainingTime();
+    return poll(&socket, 1, static_cast<int>(left)) != 0;
+}
+
+}  // namespace
+
+void PostgresAddress::place(const QString& text) {
+    const qsizetype colon = text.lastIndexOf(u':');
+    if (colon > text.lastIndexOf(u']')) {
+        host = text.left(colon);
+        port = text.mid(colon + 1).trimmed();
+        bool isNumber = false;
+        const int number = port.toInt(&isNumber);
+        if (!isNumber || number < 1 || number > 65535)
+            throw core::Failure(
+                core::InvalidCall,
+                u"Não foi possível abrir o livro «%1»: a porta «%2» não existe."_s.arg(shown(),
+                                                                                       port));
+    } else {
+        host = text;
+    }
+    host = host.trimmed();
+    if (host.startsWith(u'[') && host.endsWith(u']')) host = host.mid(1, host.size() - 2);
+}
+
+QString PostgresAddress::shown() const {
+    return u"postgresql:"_s + host + (port.isEmpty() ? QString() : u':' + port) + u'/' + catalog;
+}
+
+PostgresHandle::PostgresHandle(const PostgresAddress& address, Role role)
+    : place_(address.shown()) {
+    try {
+        connect(address);
+        settle(role);
+    } catch (...) {
+        PQfinish(connection_);
+        throw;
+    }
+}
+
+PostgresHandle::~PostgresHandle() {
+    PQfinish(connection_);
+}
+
+void PostgresHandle::connect(const PostgresAddress& address) {
+    const QByteArray values[] = {address.host.toUtf8(), address.port.toUtf8(),
+                                 address.user.toUtf8(), address.password.toUtf8(),
+                                 address.catalog.toUtf8()};
+    const char* const names[] = {
+        "host", "port", "user", "password", "dbname", "client_encoding", "application_name",
+        nullptr};
+    const char* const texts[] = {
+        values[0], values[1], values[2], values[3], values[4], "UTF8", workstation().constData(),
+        nullptr};
+    const auto fail = [&](const QString& why) {
+        return core::Failure(
+            core::DatabaseFailure,
+            u"Não foi possível abrir o livro «%1» como «%2»: %3"_s.arg(place_, address.user, why),
+            QString::fromLatin1(CannotConnect));
+    };
+    connection_ = PQconnectStartParams(names, texts, 0);
+    const QDeadlineTimer deadline(address.connectSeconds * 1000);
+    for (PostgresPollingStatusType next = PGRES_POLLING_WRITING; next != PGRES_POLLING_OK;
+         next = PQconnectPoll(connection_)) {
+        if (next == PGRES_POLLING_FAILED || PQstatus(connection_) == CONNECTION_BAD)
+            throw fail(oneLine(PQerrorMessage(connection_)));
+        if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline))
+            throw fail(u"o servidor não respondeu em %1 segundos."_s.arg(address.connectSeconds));
+    }
+    if (PQserverVersion(connection_) < OldestServer)
+        throw fail(u"o servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
+            PQserverVersion(connection_) / 10000));
+}
+
+void PostgresHandle::settle(Role role) {
+    PQsetnonblocking(connection_, 1);
+    PQenterPipelineMode(connection_);
+    PQsetNoticeProcessor(
+        connection_, [](void*, const char*) {}, nullptr);
+    send("SET datestyle = ISO, MDY");
+    send("SET standard_conforming_strings = on");
+    // Compiling pays for statements of seconds; those of the daily work take milliseconds.
+    send("SET jit = off");
+    // A set may stay open over lunch.
+    send("SET idle_in_transaction_session_timeout = 0");
+    // Whoever is killed while the server works for him lets go of his rows all the same.
+    send("SET client_connection_check_interval = 500");
+    if (role == Role::Reader) send("SET default_transaction_read_only = on");
+}
+
+void PostgresHandle::setTimeout(int seconds) {
+    if (seconds == timeout_) return;
+    timeout_ = seconds;
+    // 0 would be no limit at all.
+    send("SET lock_timeout = " + QByteArray::number(qMax(1, seconds * 1000)));
+    send("SET statement_timeout = " + QByteArray::number(seconds * 1000 + 1000));
+}
+
+bool PostgresHandle::isLost() {
+    const QDeadlineTimer now(0);
+    while (!lost_ && await(connection_, POLLIN, now))
+        if (!PQconsumeInput(connection_)) lost_ = true;
+    lost_ = lost_ || PQstatus(connection_) == CONNECTION_BAD;
+    return lost_;
+}
+
+PostgresResult PostgresHandle::run(const QByteArray& text, const PostgresValues& values) {
+    drain();
+    const int count = dispatch(text, values);
+    synchronise();
+    PostgresResult result = answers(count);
+    drain();
+    if (!isFailure(result.get())) return result;
+    const bool isNew = count > 1;
+    if (isNew) prepared_.remove(text);
+    refuse(result.get());
+}
+
+void PostgresHandle::send(const QByteArray& text, const PostgresValues& values) {
+    dispatch(text, values);
+    synchronise();
+}
+
+PostgresResult PostgresHandle::runOpen(const std::vector<QByteArray>& texts) {
+    drain();
+    for (const QByteArray& text : texts) dispatch(text, {});
+    PQsendFlushRequest(connection_);
+    PostgresResult result = answers(static_cast<int>(texts.size()));
+    if (!isFailure(result.get())) return result;
+    synchronise();
+    send("ROLLBACK");
+    refuse(result.get());
+}
+
+int PostgresHandle::dispatch(const QByteArray& text, const PostgresValues& values) {
+    if (values.empty()) {
+        PQsendQueryParams(connection_, text, 0, nullptr, nullptr, nullptr, nullptr, 0);
+        return 1;
+    }
+    int count = 1;
+    if (prepared_.size() >= PreparedStatements) {
+        prepared_.clear();
+        PQsendQueryParams(connection_, "DEALLOCATE ALL", 0, nullptr, nullptr, nullptr, nullptr, 0);
+        ++count;
+    }
+    QByteArray& name = prepared_[text];
+    if (name.isEmpty()) {
+        name = 's' + QByteArray::number(++lastPrepared_);
+        PQsendPrepare(connection_, name, text, 0, nullptr);
+        ++count;
+    }
+    PQsendQueryPrepared(connection_, name, static_cast<int>(values.size()), pointers(values).data(),
+                        nullptr, nullptr, 0);
+    return count;
+}
+
+void PostgresHandle::synchronise() {
+    PQpipelineSync(connection_);
+    PQflush(connection_);
+    ++unread_;
+}
+
+/// Reads what earlier statements still answer.
+void PostgresHandle::drain() {
+    if (lost_) lose(u"a ligação foi fechada."_s);
+    startClock();
+    while (unread_ > 0) {
+        const PostgresResult result(take());
+        if (PQresultStatus(result.get()) == PGRES_PIPELINE_SYNC) --unread_;
+    }
+}
+
+void PostgresHandle::startClock() {
+    deadline_.setRemainingTime((qMax(timeout_, 0) + Grace) * 1000);
+}
+
+/// The answer of the last of so many statements, or of the first one that failed.
+PostgresResult PostgresHandle::answers(int count) {
+    startClock();
+    PostgresResult result;
+    for (; count > 0; --count) {
+        PostgresResult next(take());
+        PostgresResult(take()).reset();  // the end of the statement's answers
+        if (!isFailure(result.get()) || !result) result = std::move(next);
+    }
+    return result;
+}
+
+PGresult* PostgresHandle::take() {
+    while (PQisBusy(connection_)) wait();
+    PGresult* result = PQgetResult(connection_);
+    if (PQstatus(connection_) != CONNECTION_BAD) return result;
+    const PostgresResult last(result);
+    lose(oneLine(result ? PQresultErrorMessage(result) : PQerrorMessage(connection_)));
+}
+
+void PostgresHandle::wait() {
+    const int sending = PQflush(connection_);
+    if (sending < 0) lose(oneLine(PQerrorMessage(connection_)));
+    if (!await(connection_, static_cast<short>(sending > 0 ? POLLIN | POLLOUT : POLLIN),
+               deadline_)) {
+        // Nobody knows what a silent server still does: the connection is given up.
+        lost_ = true;
+        throw core::Failure(
+            core::DatabaseFailure,
+            u"O servidor de «%1» não respondeu em %2 segundos; a ligação foi fechada."_s.arg(place_)
+                .arg(qMax(timeout_, 0) + Grace),
+            QString::fromLatin1(NoAnswer));
+    }
+    if (!PQconsumeInput(connection_)) lose(oneLine(PQerrorMessage(connection_)));
+}
+
+void PostgresHandle::refuse(const PGresult* result) {
+    const auto code = QString::fromLatin1(PQresultErrorField(result, PG_DIAG_SQLSTATE));
+    QString text = oneLine(PQresultErrorField(result, PG_DIAG_MESSAGE_PRIMARY));
+    if (const char* detail = PQresultErrorField(result, PG_DIAG_MESSAGE_DETAIL))
+        text += u'\n' + oneLine(detail);
+    if (text.isEmpty()) text = oneLine(PQresultErrorMessage(result));
+    if (code.startsWith(Ending)) lose(text, code);
+    throw core::Failure(core::DatabaseFailure, text, code);
+}
+
+void PostgresHandle::lose(const QString& text, const QString& code) {
+    lost_ = true;
+    throw core::Failure(core::DatabaseFailure,
+                        u"A ligação a «%1» perdeu-se: %2"_s.arg(place_, text), code);
+}
+
+}  // namespace ado

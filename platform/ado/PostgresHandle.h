@@ -1,0 +1,89 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <libpq-fe.h>
+
+#include <QByteArray>
+#include <QDeadlineTimer>
+#include <QHash>
+#include <QString>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace ado {
+
+/// Where a book is and who opens it.
+struct PostgresAddress {
+    QString host;  ///< a name, an address, or a folder with the server's local socket
+    QString port;  ///< empty for the server's usual one
+    QString user;
+    QString password;
+    QString catalog;
+    int connectSeconds = 15;  ///< after which a server counts as gone
+
+    /// Reads "HOST[:PORT]"; an IPv6 address stands in brackets. Fails when the port is none.
+    void place(const QString& text);
+    /// Server and book, as texts of failures name them; never the password.
+    QString shown() const;
+};
+
+struct PostgresClear {
+    void operator()(PGresult* result) const { PQclear(result); }
+};
+using PostgresResult = std::unique_ptr<PGresult, PostgresClear>;
+/// Parameters as text; nothing for null.
+using PostgresValues = std::vector<std::optional<QByteArray>>;
+
+/// One connection to a server. No call waits longer than its time-out, also when the server stops
+/// answering. Failures carry the server's text and its SQLSTATE.
+///
+/// The client library's pipeline is always on: statements are sent one behind the other and make
+/// one transaction up to the next synchronisation.
+class PostgresHandle {
+public:
+    enum class Role { Reader, Writer };
+
+    PostgresHandle(const PostgresAddress& address, Role role);
+    ~PostgresHandle();
+    PostgresHandle(const PostgresHandle&) = delete;
+    PostgresHandle& operator=(const PostgresHandle&) = delete;
+
+    /// Seconds that a statement may run or wait for a lock.
+    void setTimeout(int seconds);
+    /// True when the connection is of no use any more.
+    bool isLost();
+
+    /// Runs one statement and commits it. One with values stays prepared.
+    PostgresResult run(const QByteArray& text, const PostgresValues& values = {});
+    /// The same without waiting for the answer, which nobody sees.
+    void send(const QByteArray& text, const PostgresValues& values = {});
+    /// Runs statements in one round trip, without a commit; gives the answer of the last one. After
+    /// a failure nothing of the transaction is left.
+    PostgresResult runOpen(const std::vector<QByteArray>& texts);
+
+private:
+    void connect(const PostgresAddress& address);
+    void settle(Role role);
+    /// Gives the number of answers that will come.
+    int dispatch(const QByteArray& text, const PostgresValues& values);
+    void synchronise();
+    void drain();
+    PGresult* take();
+    void wait();
+    void startClock();
+    PostgresResult answers(int count);
+    [[noreturn]] void refuse(const PGresult* result);
+    [[noreturn]] void lose(const QString& text, const QString& code = QStringLiteral("08006"));
+
+    PGconn* connection_ = nullptr;
+    QString place_;
+    bool lost_ = false;
+    int timeout_ = -1;
+    int unread_ = 0;  ///< synchronisations whose answers nobody has read
+    QDeadlineTimer deadline_;
+    QHash<QByteArray, QByteArray> prepared_;  ///< names by text
+    int lastPrepared_ = 0;
+};
+
+}  // namespace ado

@@ -1,0 +1,108 @@
+// SPDX-License-Identifier: MIT
+// Rows held against every other row set and workstation: the server's advisory locks, kept by the
+// connection that writes and let go by the server when it ends. Nobody who only reads waits.
+#include "platform/ado/PostgresSession.h"
+#include "platform/ado/RowHolders.h"
+#include "platform/core/Failure.h"
+
+namespace ado {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+// The server makes the 64-bit number of a lock from its key.
+constexpr auto Take = "SELECT pg_advisory_lock(hashtextextended($1, 0))";
+constexpr auto LetGo = "SELECT pg_advisory_unlock(hashtextextended($1, 0))";
+constexpr auto Holder =
+    "SELECT a.application_name FROM pg_locks l JOIN pg_stat_activity a USING (pid)"
+    " WHERE l.locktype = 'advisory' AND l.granted AND l.objsubid = 1"
+    "   AND l.database = (SELECT oid FROM pg_database WHERE datname = current_database())"
+    "   AND ((l.classid::bigint << 32) | l.objid::bigint) = hashtextextended($1, 0)";
+
+/// SQLSTATE of a lock that was waited for too long.
+constexpr auto LockNotAvailable = "55P03"_L1;
+
+QByteArray keyOf(const QString& table, RowIdentity row) {
+    return table.toLower().toUtf8() + ':' + QByteArray::number(row);
+}
+
+class AdvisoryLock final : public RowLock {
+public:
+    AdvisoryLock(std::shared_ptr<PostgresSession> session, const QByteArray& key)
+        : session_(std::move(session)),
+          key_(key),
+          here_(session_->book(), QString::fromUtf8(key)) {}
+    ~AdvisoryLock() override {
+        if (taken_) session_->unlock(key_);
+    }
+    AdvisoryLock(const AdvisoryLock&) = delete;
+    AdvisoryLock& operator=(const AdvisoryLock&) = delete;
+
+    bool heldByThisThread() const { return here_.isTaken(); }
+    void taken() {
+        taken_ = true;
+        here_.take();
+    }
+
+private:
+    std::shared_ptr<PostgresSession> session_;
+    QByteArray key_;
+    HeldHere here_;
+    bool taken_ = false;
+};
+
+}  // namespace
+
+std::unique_ptr<RowLock> PostgresSession::lock(const QString& table, RowIdentity row,
+                                               int timeoutSeconds) {
+    const QByteArray key = keyOf(table, row);
+    auto lock = std::make_unique<AdvisoryLock>(shared_from_this(), key);
+    if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
+    setTimeout(timeoutSeconds);
+    takeLock(table, row, key);
+    lock->taken();
+    return lock;
+}
+
+void PostgresSession::takeLock(const QString& table, RowIdentity row, const QByteArray& key) {
+    try {
+        writer().run(Take, {key});
+    } catch (const core::Failure& failure) {
+        if (failure.code() != LockNotAvailable) throw;
+        refuseRow(table, row, holderOf(key));
+    }
+    locked_.insert(key);
+}
+
+QString PostgresSession::holderOf(const QByteArray& key) {
+    const PostgresResult found = writer().run(Holder, {key});
+    const bool isKnown = PQntuples(found.get()) > 0 && PQgetlength(found.get(), 0, 0) > 0;
+    return isKnown ? QString::fromUtf8(PQgetvalue(found.get(), 0, 0)) : OtherWorkstation;
+}
+
+void PostgresSession::unlock(const QByteArray& key) noexcept {
+    locked_.remove(key);
+    try {
+        if (writer_ && !writer_->isLost()) writer_->send(LetGo, {key});
+    } catch (const std::exception&) {
+        // Without the connection the server has let go already.
+    }
+}
+
+/// The rows held went with the connection that was lost: they are taken again before anything else
+/// happens on the new one. Where somebody else was quicker, nothing is written.
+void PostgresSession::lockAgain() {
+    try {
+        writer_->setTimeout(timeout_);
+        for (const QByteArray& key : locked_) writer_->run(Take, {key});
+    } catch (const core::Failure& failure) {
+        writer_.reset();
+        if (failure.code() != LockNotAvailable) throw;
+        throw core::Failure(core::RowInUse,
+                            u"A ligação a «%1» perdeu-se e uma linha que estava a ser alterada foi "
+                            u"entretanto tomada por outro posto."_s.arg(book_));
+    }
+}
+
+}  // namespace ado

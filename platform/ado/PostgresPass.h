@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/PostgresSession.h"
+
+namespace ado {
+
+/// A statement whose rows come in batches from a cursor on a reader of its own. What fits the first
+/// batch needs the reader no longer.
+class PostgresPass final : public Pass {
+public:
+    /// `withIdentity`: the row identity stands before the statement's columns.
+    PostgresPass(std::shared_ptr<PostgresSession> session, const QByteArray& statement,
+                 bool withIdentity);
+    ~PostgresPass() override { release(); }
+
+    int columnCount() const override { return static_cast<int>(columns_.size()); }
+    const Column& column(int column) const override {
+        return columns_[static_cast<std::size_t>(column)];
+    }
+    int indexOf(QStringView name) const override;
+    bool step() override;
+    Cell cell(int column) const override;
+    RowIdentity identity() const override;
+    void restart() override;
+    void release() override;
+
+private:
+    void fetchFirst(const std::vector<QByteArray>& before);
+    void describeColumns();
+
+    std::shared_ptr<PostgresSession> session_;
+    std::shared_ptr<PostgresHandle> reader_;  ///< none any more when all rows are here
+    QByteArray declare_;
+    bool withIdentity_;
+    PostgresResult batch_;
+    int row_ = -1;       ///< within the batch
+    bool first_ = true;  ///< the batch is the first one
+    std::vector<Column> columns_;
+    std::vector<int> places_;  ///< of the columns within the batch
+};
+
+}  // namespace ado

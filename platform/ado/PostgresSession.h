@@ -1,0 +1,72 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QHash>
+#include <QSet>
+
+#include "platform/ado/PostgresHandle.h"
+#include "platform/ado/Session.h"
+#include "platform/ado/StatementTranslator.h"
+
+namespace ado {
+
+/// A book on a PostgreSQL server. Passes read on connections of their own, taken from a small pool;
+/// writes, fresh reads of single rows and the locks share another one, so that a write never goes
+/// out when the connection that held its lock is gone. A connection that was lost is made anew by
+/// the next operation.
+///
+/// A row's identity is its table's key where that is one integer column, else the column
+/// HiddenIdentity, which the server generates and no set shows.
+class PostgresSession final : public Session,
+                              public Schema,
+                              public std::enable_shared_from_this<PostgresSession> {
+public:
+    /// Connects to an existing book.
+    PostgresSession(const PostgresAddress& address, int timeoutSeconds);
+
+    std::shared_ptr<Pass> open(const Statement& statement, const QString& table) override;
+    bool isTable(QStringView name) override;
+    bool read(const QString& table, RowIdentity row, RowStore& into) override;
+    RowIdentity insert(const QString& table, const QStringList& columns,
+                       const std::vector<QVariant>& values) override;
+    bool update(const QString& table, RowIdentity row, const QStringList& columns,
+                const std::vector<QVariant>& values) override;
+    bool remove(const QString& table, RowIdentity row) override;
+    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row,
+                                  int timeoutSeconds) override;
+    void setTimeout(int seconds) override { timeout_ = seconds; }
+    const QString& book() const override { return book_; }
+
+    std::optional<ColumnType> columnType(QStringView table, QStringView column) override;
+    QString identity(QStringView table) override;
+
+    // For the passes: a reader that nobody else uses, and its way back.
+    std::shared_ptr<PostgresHandle> takeReader();
+    void giveBack(std::shared_ptr<PostgresHandle> reader);
+    /// For the locks: lets go of a row; never fails.
+    void unlock(const QByteArray& key) noexcept;
+
+private:
+    /// What the server's catalogue says about a table or view.
+    struct Table {
+        QHash<QString, ColumnType> types;  ///< by column
+        QStringList columns;               ///< the visible ones
+        QString identity;                  ///< empty for a view
+    };
+    /// Null when there is none of that name.
+    const Table* find(QStringView name);
+    PostgresHandle& writer();
+    void takeLock(const QString& table, RowIdentity row, const QByteArray& key);
+    QString holderOf(const QByteArray& key);
+    void lockAgain();
+
+    PostgresAddress address_;
+    QString book_;
+    int timeout_;
+    QHash<QString, Table> tables_;
+    std::vector<std::shared_ptr<PostgresHandle>> readers_;  ///< idle ones
+    std::unique_ptr<PostgresHandle> writer_;                ///< made by its first use
+    QSet<QByteArray> locked_;                               ///< keys of the rows held
+};
+
+}  // namespace ado
