@@ -4,8 +4,6 @@
 #include <stdexcept>
 
 #include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
-#include "platform/core/UserName.h"
 
 using namespace Qt::StringLiterals;
 
@@ -30,22 +28,6 @@ TEST(PendingError, KeepsWhatIsPassedOverUntilTheOutermostHandlerReturns) {
     }
     EXPECT_EQ(core::err().number(), 0);
     EXPECT_EQ(core::err().description(), QString());
-}
-
-TEST(MessageBoxes, WithoutScreensGetTheCautiousAnswer) {
-    testing::internal::CaptureStderr();
-    EXPECT_EQ(core::MsgBox(u"Continuar?"_s, core::Icon::Question, {}, core::Buttons::YesNo),
-              core::Answer::No);
-    EXPECT_EQ(core::MsgBox(u"Feito."_s, core::Icon::None, u"Fecho"_s), core::Answer::Ok);
-    EXPECT_EQ(testing::internal::GetCapturedStderr(), "Zelmars: Continuar?\nFecho: Feito.\n");
-}
-
-TEST(UserName, IsCutToTheBuffer) {
-    core::setUserName("mariana");
-    char buffer[] = "#######";
-    ASSERT_TRUE(core::userName(buffer, 3));
-    EXPECT_STREQ(buffer, "mar####");
-    core::setUserName({});
 }
 
 }  // namespace
