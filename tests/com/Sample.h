@@ -13,12 +13,8 @@ public:
     Q_INVOKABLE QString join(const QString& a, const QString& b = QStringLiteral("x"), int c = 7) {
         return QStringLiteral("%1-%2-%3").arg(a, b).arg(c);
     }
-    Q_INVOKABLE void swapTexts(QString* a, QString* b) { std::swap(*a, *b); }
-    Q_INVOKABLE bool leftOut(QString* text = nullptr) { return text == nullptr; }
     Q_INVOKABLE void openRecord(int* id) { ++*id; }
     Q_INVOKABLE int sixteenBits(qint16 number) { return number; }
-    Q_INVOKABLE double half(double number) { return number / 2; }
-    Q_INVOKABLE QVariant echo(const QVariant& value) { return value; }
     Q_INVOKABLE QString nameOf(QObject* object) {
         return object ? object->objectName() : QStringLiteral("nenhum");
     }
