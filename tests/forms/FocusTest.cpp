@@ -2,7 +2,6 @@
 // A field that refuses to lose the focus, on every way by which a person can try to leave it.
 #include <gtest/gtest.h>
 
-#include <QLabel>
 #include <QTest>
 #include <functional>
 
@@ -72,17 +71,6 @@ TEST_F(Focus, IsHeldOnEveryWayOutAndLeftOnceTheFieldAgrees) {
     }
 }
 
-TEST_F(Focus, SwallowsBacktabDoubleClickAndAClickOnAButtonWithoutFocus) {
-    screen.Livre.onValidate = [](bool& cancel) { cancel = true; };
-    person.backtab();
-    EXPECT_TRUE(screen.Livre.hasFocus());
-    person.doubleClick(u"Command1"_s);
-    screen.Command1.setFocusPolicy(Qt::NoFocus);
-    person.click(u"Command1"_s);
-    EXPECT_EQ(screen.pressed, 0);
-    EXPECT_TRUE(screen.Livre.hasFocus());
-}
-
 // A typist does not wait: the option and the default button, one right after the other.
 TEST_F(Focus, AnAcceleratorPressesAtOnceAndTakesTheFocusAlong) {
     refusing = false;
@@ -96,27 +84,6 @@ TEST_F(Focus, AnAcceleratorPressesAtOnceAndTakesTheFocusAlong) {
     QTest::keyClick(window, Qt::Key_Return);
     person.settle();
     EXPECT_EQ(order, (QStringList{u"option"_s, u"ok"_s}));
-    QTest::keyClick(window, Qt::Key_P, Qt::AltModifier);  // from a button, that nobody asks
-    EXPECT_EQ(screen.pressed, 1);
-    EXPECT_TRUE(screen.Command1.hasFocus());
-}
-
-TEST_F(Focus, IsNotLeftForAnotherWindowALabelOrTheGround) {
-    const Held<SampleScreen> outside(u"frmOutro"_s);
-    outside->Show();
-    person.screen(u"frmOutro"_s);
-    person.click(u"Numero"_s);
-    EXPECT_TRUE(outside->Numero.hasFocus());
-    person.screen(u"frmRecibo"_s);
-    const QLabel* label = screen.findChild<QLabel*>();
-    for (const QPoint at : {label->mapTo(&screen, label->rect().center()), QPoint(2, 2)})
-        QTest::mouseClick(screen.windowHandle(), Qt::LeftButton, {}, at);
-    person.accelerator(u'L');  // the field's own
-    EXPECT_EQ(asked, 0);
-    EXPECT_TRUE(screen.Livre.hasFocus());
-    expectRefusal();
-    person.click(u"Numero"_s);
-    EXPECT_EQ(asked, 1);
 }
 
 TEST_F(Focus, GivingUpIsNeverHeldAndTheFieldPassedByIsAskedLater) {
@@ -153,24 +120,6 @@ TEST_F(Focus, AFailingHandlerShowsItsTextAndKeepsTheFocus) {
     EXPECT_TRUE(screen.Livre.hasFocus());
     screen.Livre.onValidate = {};
     person.tab();
-    EXPECT_TRUE(screen.Numero.hasFocus());
-}
-
-TEST_F(Focus, AValidationCanShowAScreenWhoseFieldsHoldAsWell) {
-    const Held<SampleScreen> inner(u"frmFicha"_s);
-    int innerAsked = 0;
-    inner->Livre.onValidate = [&innerAsked](bool& cancel) { cancel = ++innerAsked == 1; };
-    inner->Command1.onClick = [&inner] { inner->Hide(); };
-    screen.Livre.onValidate = [&inner](bool&) { inner->ShowModal(); };
-    person.onScreen(u"frmFicha"_s, [&] {
-        person.put(u"Livre"_s, u"1"_s);
-        person.accelerator(u'P');
-        EXPECT_TRUE(inner->isVisible());
-        person.accelerator(u'P');
-    });
-    person.tab();
-    EXPECT_EQ(innerAsked, 2);
-    EXPECT_FALSE(inner->isVisible());
     EXPECT_TRUE(screen.Numero.hasFocus());
 }
 

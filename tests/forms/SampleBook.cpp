@@ -13,12 +13,10 @@ constexpr QStringView Tables =
     uR"(
     create table recibo (recibo_id integer primary key, numero varchar(10), valor money,
         ordem smallint, fator double, dia datetime, notas varchar(200),
-        rubrica_id integer, modo varchar(3));
+        rubrica_id integer);
     create table rubrica (rubrica_id integer primary key, descrit varchar(60));
-    create table codigo (code varchar(3), completo varchar(40));
     insert into rubrica values (1, '01 Consultas'), (2, '02 Análises clínicas'),
         (3, '03 Óculos e lentes'), (7, '07 Próteses dentárias'), (8, '08 Internamento');
-    insert into codigo values ('TRF', 'TRF Transferência bancária'), ('CHQ', 'CHQ Cheque');
 )";
 
 }  // namespace

@@ -5,12 +5,11 @@
 
 #include "platform/ado/Recordset.h"
 
-/// A book of three small tables: `recibo` (one row of each type of column), `rubrica` (a list) and
-/// `codigo` (a list of texts). Its statements run outside the row-set layer.
+/// A book of two small tables: `recibo` (one row of each type of column) and `rubrica` (a list).
+/// Its statements run outside the row-set layer.
 class SampleBook {
 public:
     SampleBook();
-    const ado::ConnectionPtr& connection() const { return connection_; }
     ado::RecordsetPtr open(const QString& statement, ado::LockType lock = ado::adLockOptimistic);
     /// A new, pending row of `recibo`.
     ado::RecordsetPtr newRow();

@@ -24,7 +24,6 @@ SampleScreen::SampleScreen(const QString& name) : Form(name, u"Lançamento de Re
         {u"Ordem:"_s, &Ordem, &Ordem, u"ordem"_s},
         {u"Data:"_s, &Dia, &Dia, u"dia"_s},
         {u"Rúbrica:"_s, &Rubrica, &Rubrica, u"rubrica_id"_s},
-        {u"Modo:"_s, &Modo, &Modo, u"modo"_s},
         {u"Observações:"_s, &Notas, &Notas, u"notas"_s},
         {u"Imposto IVA:"_s, &Mostra, &Mostra, u"fator"_s},
         {u"De:"_s, &Desde, nullptr, {}},

@@ -23,7 +23,6 @@ public:
     forms::TextBox Notas{QStringLiteral("Notas")};
     forms::TextBox Mostra{QStringLiteral("Mostra")};  ///< only shows
     forms::DataCombo Rubrica{QStringLiteral("Rubrica")};
-    forms::DataCombo Modo{QStringLiteral("Modo")};
     forms::DatePicker Desde{QStringLiteral("Desde")};
     forms::OptionButton Option2{QStringLiteral("Option2"), QStringLiteral("&Inactivos")};
     forms::Button Command1{QStringLiteral("Command1"), QStringLiteral("&Procurar Sócio")};
