@@ -11,29 +11,6 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-struct Box {
-    QString text;
-    core::Icon icon;
-    QString title;
-    core::Answer answer;
-};
-QList<Box> queue;
-
-core::Answer present(const QString& text, core::Icon icon, const QString& title,
-                     core::Buttons buttons) {
-    const bool choice = buttons == core::Buttons::YesNo;
-    if (queue.isEmpty()) {
-        ADD_FAILURE() << "nobody expected the box: " << text.toStdString();
-        return choice ? core::Answer::No : core::Answer::Ok;
-    }
-    const Box expected = queue.takeFirst();
-    EXPECT_EQ(text, expected.text);
-    EXPECT_EQ(title, expected.title) << text.toStdString();
-    EXPECT_EQ(icon, expected.icon) << text.toStdString();
-    EXPECT_EQ(choice, expected.answer != core::Answer::Ok) << text.toStdString();
-    return expected.answer;
-}
-
 void reopen(const ado::ConnectionPtr& connection, const QString& text) {
     if (connection->State() == ado::adStateOpen) connection->Close();
     connection->ConnectionString = text;
@@ -47,9 +24,6 @@ void reopen(const ado::ConnectionPtr& connection, const QString& text) {
 const QString Desk::caption = u"Lançamento (Plano de Saúde)"_s;
 
 Desk::Desk() : socio(static_cast<qint32>(book.member({}))) {
-    queue.clear();
-    core::setMsgBoxPresenter(present);
-    FakeVorlane::calls().clear();
     com::registerRunning(u"Vorlane.General"_s, [] { return new FakeVorlane; });
     core::setToday(QDate(2026, 5, 15));
     core::setUserName("operador");
@@ -59,19 +33,12 @@ Desk::Desk() : socio(static_cast<qint32>(book.member({}))) {
 }
 
 Desk::~Desk() {
-    for (const Box& box : queue) ADD_FAILURE() << "a box never came: " << box.text.toStdString();
     auto& environment = environment::dtZelmars::instance();
     environment.MSAccess()->Close();
     environment.SqlServer()->Close();
     com::registerRunning(u"Vorlane.General"_s, {});
     core::setUserName({});
     core::setToday({});
-    core::err().clear();
-}
-
-void Desk::expectBox(const QString& text, core::Icon icon, const QString& title,
-                     core::Answer answer) {
-    queue << Box{text, icon, title, answer};
 }
 
 coverage::Entry Desk::enter(const Document& document) const {
@@ -112,10 +79,15 @@ coverage::PostingEntry Desk::posting(const coverage::Entry& entry) {
             .askCheque = [](const ado::RecordsetPtr&) { ADD_FAILURE() << "no cheque wanted"; }};
 }
 
-bool Desk::post(const coverage::PostingEntry& posting) {
-    queue.prepend(
-        {u"Deseja finalizar o registo?"_s, core::Icon::Question, caption, core::Answer::Yes});
-    return coverage::post(posting, run);
+bool Desk::post(const coverage::PostingEntry& posting, const QList<support::Operator::Box>& boxes) {
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s,
+                      .answer = core::Answer::Yes,
+                      .icon = core::Icon::Question,
+                      .title = caption});
+    for (const support::Operator::Box& box : boxes) person.expectBox(box);
+    const bool posted = coverage::post(posting, run);
+    person.expectNoBoxesLeft();
+    return posted;
 }
 
 void Desk::accumulated(const QString& codABC, qint64 rubrica_id, double credit, int documents) {
@@ -149,14 +121,4 @@ void Desk::setRubric(qint64 rubrica_id, const char* column, const QVariant& valu
 std::string Desk::kept(const coverage::Entry& entry, const char* column) {
     const QVariant value = entry.record->Collect(QString::fromLatin1(column));
     return core::isNull(value) ? "null" : core::toText(value).toStdString();
-}
-
-int failureOf(const std::function<void()>& statement) {
-    try {
-        statement();
-    } catch (const core::Failure& failure) {
-        EXPECT_FALSE(failure.text().isEmpty());
-        return failure.number();
-    }
-    return 0;
 }

@@ -4,40 +4,22 @@
 #include <gtest/gtest.h>
 
 #include <QObject>
-#include <QStringList>
-#include <functional>
 #include <string>
 
 #include "coverage/Posting.h"
-#include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
 #include "tests/support/Book.h"
+#include "tests/support/Operator.h"
 
-inline void PrintTo(const QString& text, std::ostream* out) {
-    *out << text.toStdString();
-}
-
-/// Stands for the progress window. It notes what it is asked, one line a call: "setvalor(1)";
-/// "made" and "gone" tell of the object itself.
+/// Stands for the progress window.
 class FakeVorlane : public QObject {
     Q_OBJECT
 public:
-    FakeVorlane() { calls() << QStringLiteral("made"); }
-    ~FakeVorlane() override { calls() << QStringLiteral("gone"); }
-    static QStringList& calls() {
-        static QStringList calls;
-        return calls;
-    }
-    /// How many times the bar went one step on.
-    static qsizetype steps() { return calls().count(QStringLiteral("setvalor(1)")); }
+    FakeVorlane() { steps = 0; }
+    static inline int steps = 0;  ///< that the bar of the newest one went on
 
-    Q_INVOKABLE void Iniciar(qint16 steps, const QString& text, const QString& title) {
-        calls() << QStringLiteral("Iniciar(%1, %2, %3)").arg(QString::number(steps), text, title);
-    }
-    Q_INVOKABLE void setvalor(qint16 steps) {
-        calls() << QStringLiteral("setvalor(%1)").arg(steps);
-    }
-    Q_INVOKABLE void terminar() { calls() << QStringLiteral("terminar()"); }
+    Q_INVOKABLE void Iniciar(qint16, const QString&, const QString&) {}
+    Q_INVOKABLE void setvalor(qint16 by) { steps += by; }
+    Q_INVOKABLE void terminar() {}
 };
 
 /// What an operator has keyed in; the amounts in euros, null for an empty field.
@@ -57,11 +39,11 @@ protected:
     Desk();
     ~Desk() override;
 
-    /// The next message box. One that nobody expects, or one with another text, icon, title or
-    /// choice, fails the test; so does one that never comes. Answers other than Ok are to a choice.
-    static void expectBox(const QString& text, core::Icon icon = core::Icon::None,
-                          const QString& title = core::DefaultTitle.toString(),
-                          core::Answer answer = core::Answer::Ok);
+    /// The next message box.
+    void expectBox(const QString& text, core::Icon icon = core::Icon::None,
+                   const QString& title = core::DefaultTitle.toString()) {
+        person.expectBox({.text = text, .icon = icon, .title = title});
+    }
 
     /// Opens the pending row of a new movement, as the entry screen does, and keys the document in.
     coverage::Entry enter(const Document& document) const;
@@ -69,8 +51,9 @@ protected:
     void tryOut(const coverage::Entry& entry) { coverage::tryOut(entry, run); }
     /// A posting with nothing missing, by bank transfer.
     static coverage::PostingEntry posting(const coverage::Entry& entry);
-    /// Posts, the operator saying yes.
-    bool post(const coverage::PostingEntry& posting);
+    /// Posts, the operator saying yes; then the boxes come.
+    bool post(const coverage::PostingEntry& posting,
+              const QList<support::Operator::Box>& boxes = {});
     bool post(const coverage::Entry& entry) { return post(posting(entry)); }
 
     /// Adds an accumulator row of the member.
@@ -89,9 +72,7 @@ protected:
 
     static const QString caption;  ///< of the entry screen
     support::Book book;
+    support::Operator person;
     qint32 socio;
     coverage::TryOut run;
 };
-
-/// The number of the failure that `statement` raises; 0 when it passes.
-int failureOf(const std::function<void()>& statement);

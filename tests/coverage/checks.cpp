@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
-// What a try-out refuses before it calculates, what it shows, and what breaks it off.
-#include "platform/core/Values.h"
+// Whom and what a try-out and a posting refuse.
+#include <functional>
+
+#include "entry/Beneficiary.h"
+#include "platform/core/Clock.h"
 #include "tests/coverage/Desk.h"
 
 using namespace Qt::StringLiterals;
@@ -8,11 +11,12 @@ using core::Icon;
 
 namespace {
 
-class TryOutChecks : public Desk {};
+class Checks : public Desk {};
 
-TEST_F(TryOutChecks, TheFirstOfSeveralFaultsIsToldAndNothingIsWritten) {
-    coverage::Entry entry = enter(
-        {.rubrica_id = book.childRubric({}), .doc_valor = -1, .hospital = true, .incidencia = 4});
+TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
+    coverage::PostingEntry bill = posting(enter(
+        {.rubrica_id = book.childRubric({}), .doc_valor = -1, .hospital = true, .incidencia = 4}));
+    coverage::Entry& entry = bill.entry;
     const auto put = [&](const QString& column, const QVariant& value) {
         entry.record->setCollect(column, value);
     };
@@ -20,14 +24,14 @@ TEST_F(TryOutChecks, TheFirstOfSeveralFaultsIsToldAndNothingIsWritten) {
     entry.bErroEntrada = true;
     for (QString* text : {&entry.DataCombo1, &entry.Text3, &entry.Text6, &entry.Text9})
         text->clear();
+    book.exec(u"update tbSocios set nib = null"_s);
     const QString none = core::DefaultTitle.toString();
-    struct Fault {
+    const struct {
         QString text;
         Icon icon;
         QString title;
         std::function<void()> mend;
-    };
-    const Fault faults[] = {
+    } faults[] = {
         {u"O valor recebido é maior que o valor do documento."_s, Icon::None, none,
          [&] { put(u"recebido"_s, -0.01), put(u"incidencia"_s, {}); }},
         {u"O valor recebido é inferior a 0."_s, Icon::None, none, [&] { put(u"recebido"_s, {}); }},
@@ -45,87 +49,77 @@ TEST_F(TryOutChecks, TheFirstOfSeveralFaultsIsToldAndNothingIsWritten) {
         {u"Tem de indicar um valor para o documento!"_s, Icon::Information, caption,
          [&] { entry.Text6 = u"0"_s; }},
         {u"Tem de indicar um valor para o campo Recebido!"_s, Icon::Information, caption,
-         [&] { entry.Text9 = u"100"_s; }}};
+         [&] { entry.Text9 = u"100"_s; }},
+        {u"Este Associado não tem NIB!"_s, Icon::Critical, none,
+         [&] { book.exec(u"update tbSocios set nib = 'não é um número 1234'"_s); }},
+        {u"Este Associado tem especificado um NIB INVÁLIDO!"_s, Icon::Critical, none,
+         [&] { book.exec(u"update tbSocios set nib = 'não é um número 12345'"_s); }},
+    };
     for (const auto& fault : faults) {
-        SCOPED_TRACE(fault.text.toStdString());
-        run.bEnsaioValido = true;
-        expectBox(fault.text, fault.icon, fault.title);
-        tryOut(entry);
-        EXPECT_FALSE(run.bEnsaioValido);
+        EXPECT_FALSE(post(bill, {{.text = fault.text, .icon = fault.icon, .title = fault.title}}));
         fault.mend();
     }
-    EXPECT_EQ(FakeVorlane::steps(), 0);
-    EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
-    EXPECT_FALSE(run.shown.LimiteAplicavel);
-    tryOut(entry);
-    EXPECT_TRUE(run.bEnsaioValido);
-}
-
-TEST_F(TryOutChecks, AFullRunShowsItsTwentyTwoStepsAndEveryResult) {
-    tryOut(enter({.rubrica_id = book.childRubric({.socio = 500})}));
-    EXPECT_TRUE(run.bEnsaioValido);
-    QStringList calls = FakeVorlane::calls();
-    EXPECT_EQ(calls.removeAll(u"setvalor(1)"_s), 22);
-    EXPECT_EQ(calls, QStringList({u"made"_s,
-                                  u"Iniciar(22, Evolução dos calculos, aguarde alguns momentos "
-                                  ". . ., Processamento)"_s,
-                                  u"terminar()"_s, u"gone"_s}));
-    const coverage::Results& shown = run.shown;
-    QStringList texts;
-    for (const auto& result :
-         {shown.LimiteAplicavel, shown.Incidencia, shown.Comparticipacao, shown.SaldoPlafond,
-          shown.SaldoCC, shown.Iliquido, shown.Liquido, shown.Credito, shown.Debito})
-        texts << (result ? core::toText(*result) : u"nothing"_s);
-    EXPECT_EQ(texts.join(u' '), u"500 100 80 500 0 80 80 80 80"_s);
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
+    EXPECT_EQ(stored("select zelmars from tbContadores"), "1");
+    EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s, u"credito_ac <> 0 or no_docs <> 0"_s), 0);
+    // A member who has left is told, but gets what is his.
+    book.exec(u"delete from tbSocios"_s);
+    EXPECT_TRUE(post(bill, {{.text = u"Este Associado não se encontra na tabela de Activos."_s,
+                             .icon = Icon::Critical,
+                             .title = none}}));
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 1);
 }
 
 // The incidence of a document is filled by the run itself, so the first run cannot compare with it.
-TEST_F(TryOutChecks, MoreReceivedThanTheDocumentIsWorthIsRefusedFromTheSecondRunOn) {
-    const qint64 rubric = book.childRubric({});
-    const coverage::Entry asMuch = enter({.rubrica_id = rubric, .recebido = 100});
-    const coverage::Entry more = enter({.rubrica_id = rubric, .recebido = 120});
-    for (const bool second : {false, true}) {
-        tryOut(asMuch);
-        EXPECT_TRUE(run.bEnsaioValido);
-        EXPECT_EQ(kept(asMuch, "credito"), "0");
-        if (second) expectBox(u"O valor recebido é maior que o valor do documento."_s);
-        tryOut(more);
-        EXPECT_EQ(run.bEnsaioValido, !second);
-        EXPECT_EQ(kept(more, "credito"), "-20");
-    }
-}
-
-TEST_F(TryOutChecks, WithoutAPercentageNothingCanBePostedButOneOfZeroPaysNothing) {
-    const qint64 rubric = book.childRubric({.percent = 0});
-    const coverage::Entry entry = enter({.rubrica_id = rubric});
-    tryOut(entry);
+TEST_F(Checks, MoreReceivedThanTheDocumentIsWorthIsRefusedFromTheSecondRunOn) {
+    const coverage::Entry more = enter({.rubrica_id = book.childRubric({}), .recebido = 120});
+    tryOut(more);
     EXPECT_TRUE(run.bEnsaioValido);
-    EXPECT_EQ(kept(entry, "credito"), "0");
-    setRubric(rubric, "percent", {});
-    FakeVorlane::calls().clear();
-    expectBox(
-        u"Erro: não foi possível calcular a comparticipação, porque não existe valor para a "
-        "percentagem."_s);
-    EXPECT_FALSE(post(entry));
+    EXPECT_EQ(kept(more, "credito"), "-20");
+    EXPECT_EQ(kept(more, "debito"), "0");
+    expectBox(u"O valor recebido é maior que o valor do documento."_s);
+    tryOut(more);
     EXPECT_FALSE(run.bEnsaioValido);
-    EXPECT_EQ(FakeVorlane::steps(), 2);
-    EXPECT_EQ(FakeVorlane::calls().last(), u"gone"_s);
-    EXPECT_EQ(stored("select zelmars from tbContadores"), "1");
 }
 
-TEST_F(TryOutChecks, AFailureGoesUpToTheCallerAndLeavesTheBookAsItWas) {
-    const std::pair<const char*, QString> causes[] = {
-        {"update tbZelmar_Plafonds set rubrica_id_main = null", u"A"_s},
-        {"update tbZelmar_Plafonds set percent = 0.8", u"B'"_s},
-        {"delete from tbZelmar_Plafonds", u"A"_s},
+// Today is 15 May 2026.
+TEST_F(Checks, PersonsAreAdmittedByAgeAndWaitingPeriod) {
+    const QDate today = core::today();
+    const QDate yesterday = today.addDays(-1);
+    const QString tooOld = u"Este familiar tem mais de 25 anos! Tente indicar outro."_s;
+    const QString relativeWaits =
+        u"Este familiar está dentro do periodo de carência! Não pode ser processado o documento."_s;
+    const QString memberWaits =
+        u"O Associado está dentro do periodo de carência! Não pode ser processado o documento."_s;
+    const QVariant none;
+    const struct {
+        const char* code;
+        QVariant birth, waiting, memberWaiting;
+        QString refusal;
+    } rows[] = {
+        {"C1", today.addDays(-9131), none, none, {}},
+        {"C1", today.addDays(-9132), none, none, tooOld},
+        // The child's letter counts first, wherever it stands.
+        {"cA", today.addDays(-9132), none, none, tooOld},
+        {"C1", none, none, none, tooOld},
+        {"C1", today.addDays(-9131), today, none, relativeWaits},
+        {"B", none, today, none, relativeWaits},
+        {"B", none, yesterday, today, {}},
+        {"A", none, none, today, memberWaits},
+        {"A", none, today, yesterday, {}},
     };
-    for (const auto& [change, code] : causes) {
-        SCOPED_TRACE(change);
-        const coverage::Entry entry = enter({.rubrica_id = book.childRubric({}), .codABC = code});
-        book.exec(QString::fromLatin1(change));
-        EXPECT_NE(failureOf([&] { tryOut(entry); }), 0);
-        EXPECT_EQ(kept(entry, "credito"), "null");
-        EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
+    for (const auto& row : rows) {
+        SCOPED_TRACE(std::string(row.code) + " " + row.refusal.toStdString());
+        const qint64 id = book.person({.socio_id = socio,
+                                       .codABC = QString::fromLatin1(row.code),
+                                       .data_nascimento = row.birth,
+                                       .data_carencia = row.waiting});
+        const qint64 member = book.member({.zelmar_data_carencia = row.memberWaiting});
+        if (!row.refusal.isEmpty())
+            expectBox(row.refusal, Icon::Information,
+                      row.refusal == tooOld ? u"Familiares"_s : u"Periodo de Carência"_s);
+        EXPECT_EQ(entry::admitPerson(id, static_cast<qint32>(member)).has_value(),
+                  row.refusal.isEmpty());
     }
 }
 
