@@ -31,15 +31,4 @@ TEST_F(Environment, HasItsConnectionsAndThirteenCommandsAndEachTextRunsOnAnEmpty
     }
 }
 
-TEST_F(Environment, ListsShowTheirCodeBesideTheirName) {
-    book.childRubric({.code = u"11"_s, .descrit = u"Estomatologia"_s});
-    book.hospital(u"H7"_s, u"Hospital do Tejo"_s);
-    ASSERT_TRUE(boundary::Login());
-    const auto rows = [](const QString& name) { return dtZelmars::instance().Recordsets(name); };
-    EXPECT_EQ(rows(u"msRubricas"_s)->Collect(u"completo"_s), u"11  -  Estomatologia"_s);
-    EXPECT_EQ(rows(u"msRubricas"_s)->RecordCount(), 1);
-    EXPECT_EQ(rows(u"msHospitais"_s)->Collect(u"completo"_s), u"H7 - Hospital do Tejo"_s);
-    EXPECT_EQ(rows(u"msLocalidades"_s)->State(), ado::adStateClosed);
-}
-
 }  // namespace

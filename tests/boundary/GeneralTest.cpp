@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "boundary/General.h"
 
-#include <QApplication>
-
 #include "entry/frmMovimentos.h"
 #include "platform/com/Component.h"
 #include "tests/boundary/Configured.h"
@@ -10,7 +8,6 @@
 
 using namespace Qt::StringLiterals;
 using environment::dtZelmars;
-using environment::loginState;
 
 namespace {
 
@@ -58,28 +55,6 @@ TEST_F(PublicClass, TenOperationsAreRefusedWithoutSettings) {
     EXPECT_EQ(com::call(&general, u"Login"_s), false);
 }
 
-TEST_F(PublicClass, EveryOperationClosesTheShapingConnectionFirst) {
-    ASSERT_TRUE(general.Login());
-    remove(u"dtUser"_s);
-    person.expectBox({.text = RefusalText});
-    general.CallIRS();
-    EXPECT_EQ(dtZelmars::instance().SqlServer()->State(), ado::adStateClosed);
-    EXPECT_EQ(dtZelmars::instance().MSAccess()->State(), ado::adStateOpen);
-}
-
-TEST_F(PublicClass, WhatIsStillToComeSaysSo) {
-    for (const auto& [operation, arguments] : Refusing) {
-        if (operation == u"NewMovimento"_s) continue;
-        EXPECT_EQ(failureOf([&] { com::call(&general, operation, QVariantList(arguments)); }),
-                  u"A operação %1 ainda não está disponível nesta versão."_s.arg(operation));
-        EXPECT_TRUE(loginState().bLoggedIn);
-    }
-    for (const QString& operation : {u"Ldividas"_s, u"Lcartasdividas"_s, u"Lhospitais"_s}) {
-        person.expectBox({.text = operation, .partly = true});
-        EXPECT_EQ(com::call(&general, operation), false);
-    }
-}
-
 TEST_F(PublicClass, ABookThatDoesNotOpenIsToldByThoseThatMayTell) {
     set(u"dtDataSource"_s, u"sqlite:/nada/nenhures"_s);
     const QString text = failureOf([&] { general.CallIRS(); });
@@ -116,12 +91,6 @@ TEST_F(PublicClass, NewMovimentoGivesItsDefaultsBackAndAnotherLoginLeavesItItsRo
     EXPECT_TRUE(row->isNewRow());
     row->Update();
     EXPECT_EQ(book.value(u"select doc_no from tbZelmar_Movimentos"_s), u"FT 17"_s);
-}
-
-TEST_F(PublicClass, AnUnknownConnectionIsToldByItsName) {
-    QString connection = u"Nenhuma"_s;
-    EXPECT_TRUE(failureOf([&] { general.NewMovimento(false, &connection); }).contains(connection));
-    EXPECT_FALSE(isEntryShown());
 }
 
 TEST_F(PublicClass, RegistoIsSilentAboutWhatItDoesNotShow) {

@@ -1,9 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "boundary/Login.h"
 
-#include <QDir>
-#include <QFile>
-
 #include "tests/boundary/Configured.h"
 
 using namespace Qt::StringLiterals;
@@ -77,48 +74,6 @@ TEST_F(Login, AnEmptyValueIsAValue) {
     const QString text = failureOf([] { boundary::Login(); });
     EXPECT_TRUE(text.contains(u"sqlite:"_s)) << qPrintable(text);
     EXPECT_FALSE(loginState().bLoggedIn);
-}
-
-TEST_F(Login, WhatIsNoBookFailsAndMakesNothing) {
-    const QTemporaryDir folder;
-    QFile garbage(folder.filePath(u"garbage.db"_s));
-    ASSERT_TRUE(garbage.open(QFile::WriteOnly));
-    garbage.write(QByteArray(5000, 'x'));
-    garbage.close();
-    const struct {
-        QString folder;
-        QString catalogue;
-    } rows[] = {{folder.filePath(u"nada"_s), u"zelmars"_s},
-                {folder.path(), u"zelmars"_s},
-                {folder.path(), u""_s},
-                {folder.path(), u"garbage"_s}};
-    for (const auto& row : rows) {
-        set(u"dtDataSource"_s, u"sqlite:"_s + row.folder);
-        set(u"dtInitialCatalog"_s, row.catalogue);
-        EXPECT_NE(failureOf([] { boundary::Login(); }), QString()) << qPrintable(row.catalogue);
-        EXPECT_FALSE(loginState().bLoggedIn);
-    }
-    EXPECT_EQ(QDir(folder.path()).entryList(QDir::AllEntries | QDir::NoDotAndDotDot),
-              QStringList(u"garbage.db"_s));
-    EXPECT_EQ(garbage.size(), 5000);
-}
-
-TEST_F(Login, ABookWithoutTablesFailsAfterTheLoginCounted) {
-    book.exec(u"alter table tbHospitais rename to guardada"_s);
-    const QString text = failureOf([] { boundary::Login(); });
-    EXPECT_TRUE(text.contains(u"tbHospitais"_s)) << qPrintable(text);
-    EXPECT_TRUE(loginState().bLoggedIn);
-    EXPECT_EQ(dtZelmars::instance().Recordsets(u"msRubricas"_s)->State(), ado::adStateOpen);
-}
-
-TEST_F(Login, APendingFailureCountsAsAFailedLogin) {
-    const core::HandlerScope handler;
-    core::err().set(core::RowInUse, u"em uso"_s);
-    EXPECT_FALSE(boundary::Login());
-    EXPECT_FALSE(loginState().bLoggedIn);
-    EXPECT_TRUE(areBothOpen());
-    core::err().clear();
-    EXPECT_TRUE(boundary::Login());
 }
 
 }  // namespace
