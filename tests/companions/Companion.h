@@ -9,7 +9,6 @@
 #include <QTableView>
 
 #include "platform/com/Component.h"
-#include "platform/core/Failure.h"
 #include "tests/support/Book.h"
 #include "tests/support/Operator.h"
 
@@ -25,17 +24,6 @@ protected:
         if (!registerServer) throw std::runtime_error(server.errorString().toStdString());
         EXPECT_EQ(registerServer(), com::Ok);
         return com::createObject(name + QStringLiteral(".General"));
-    }
-
-    /// The failure of a call; number 0 when it passed.
-    static core::Failure failureOf(const com::Object& object, const QString& member,
-                                   QVariantList arguments = {}) {
-        try {
-            object.call(member, arguments);
-        } catch (const core::Failure& failure) {
-            return failure;
-        }
-        return {0, QString()};
     }
 
     /// What a list shows, cells parted by '|', rows by '\n'.

@@ -1,5 +1,4 @@
 // SPDX-License-Identifier: MIT
-#include "platform/registry/Registry.h"
 #include "tests/companions/Companion.h"
 
 using namespace Qt::StringLiterals;
@@ -43,8 +42,15 @@ TEST_F(LumbraTest, SearchFindsWhileTypingAndKeysMoveAndTake) {
         person.enter();
     });
     EXPECT_EQ(found, ines);
+    const qint64 whole = book.member({.no_kor = u"10002"_s, .nome = u"Zulmira Paz"_s});
+    const int typedInFull = search([&] {
+        person.type(u"10002"_s);
+        person.enter();
+    });
+    EXPECT_EQ(typedInFull, whole);
     const int moved = search([&] {
-        person.type(u"1000"_s);
+        person.type(u"10002"_s);
+        person.press(Qt::Key_Down);
         person.press(Qt::Key_Down);
         EXPECT_EQ(focus(), u"txtProcurar"_s);
         person.enter();
@@ -93,17 +99,4 @@ TEST_F(LumbraTest, PremiumStatementStaysWhileTheObjectIsKept) {
     EXPECT_EQ(label(u"lblTotais"_s), u"Pagamentos: 0    Total: € 0,00"_s);
     lumbra = {};
     EXPECT_FALSE(person.isShown(u"frmQuotas"_s));
-}
-
-TEST_F(LumbraTest, WrongUseIsAFailureWithAText) {
-    for (const QString& condition : {u"nada=1"_s, u"descrit='d'Almeida'"_s})
-        EXPECT_FALSE(failureOf(lumbra, u"appShow"_s, premiumsOf(condition)).text().isEmpty());
-    EXPECT_FALSE(person.isShown(u"frmQuotas"_s));
-    EXPECT_TRUE(failureOf(lumbra, u"appShow"_s, {u"XYZ"_s}).text().contains(u"«XYZ»"_s));
-    EXPECT_EQ(failureOf(companion(u"Lumbra"_s), u"appShow"_s, {u"SOC01"_s, false}).number(),
-              core::InvalidCall)
-        << "before Login";
-    registry::removeKey(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s);
-    EXPECT_TRUE(
-        failureOf(lumbra, u"Login"_s, {u"zelmars"_s, u""_s}).text().contains(u"dtSecurityInfo"_s));
 }

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include <QLineEdit>
 
-#include "platform/ado/Connection.h"
-#include "platform/registry/Registry.h"
 #include "tests/companions/Companion.h"
 
 using namespace Qt::StringLiterals;
@@ -12,18 +10,13 @@ namespace {
 class TiquetaTest : public CompanionTest {
 protected:
     TiquetaTest() : tiqueta(companion(u"Tiqueta"_s)) {
+        tiqueta.call(u"Login"_s);
         socio = book.member({.no_kor = u"100015"_s,
                              .nome = u"António Matos"_s,
                              .nib = u"0013"_s,
                              .zelmar_data_carencia = QDate(2026, 3, 31)});
     }
 
-    QVariant connection() {
-        auto opened = std::make_shared<ado::Connection>(u"MSAccess"_s);
-        opened->ConnectionString = book.connectionString();
-        opened->Open();
-        return QVariant::fromValue(opened);
-    }
     void edit(const std::function<void()>& steps) {
         person.onScreen(u"frmFichaSocio"_s, steps);
         tiqueta.call(u"AbrirRegisto"_s, {QVariant::fromValue(static_cast<qint16>(socio))});
@@ -42,12 +35,7 @@ protected:
     qint64 socio = 0;
 };
 
-class TiquetaFile : public TiquetaTest {
-protected:
-    TiquetaFile() { tiqueta.call(u"Login"_s); }
-};
-
-class TiquetaFamily : public TiquetaFile {
+class TiquetaFamily : public TiquetaTest {
 protected:
     TiquetaFamily() {
         himself = book.person({.socio_id = socio,
@@ -67,26 +55,7 @@ protected:
 
 }  // namespace
 
-TEST_F(TiquetaTest, LoginTakesNothingOrAConnectionInEitherOrderAndRefusesAnythingElse) {
-    const QVariantList wrong[] = {{u"MSAccess"_s},
-                                  {u"SqlServer"_s, connection()},
-                                  {u"MSAccess"_s, 7},
-                                  {u"MSAccess"_s, QVariant::fromValue(ado::ConnectionPtr())}};
-    for (const auto& arguments : wrong)
-        EXPECT_EQ(failureOf(tiqueta, u"Login"_s, arguments).number(), core::TypeMismatch);
-    EXPECT_EQ(failureOf(tiqueta, u"FindSocios"_s).number(), core::InvalidCall);
-    const QVariantList right[] = {{}, {u"MSAccess"_s, connection()}, {connection(), u"MSAccess"_s}};
-    for (const auto& arguments : right) {
-        tiqueta = companion(u"Tiqueta"_s);
-        EXPECT_EQ(failureOf(tiqueta, u"Login"_s, arguments).number(), 0);
-        person.onScreen(u"frmProcurar"_s, [&] { person.enter(); });
-        EXPECT_EQ(tiqueta.call(u"FindSocios"_s).toLongLong(), socio);
-        registry::removeKey(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s);
-    }
-    EXPECT_EQ(failureOf(tiqueta, u"Login"_s).number(), core::NoSuchItem);
-}
-
-TEST_F(TiquetaFile, OkWritesWhatWasChangedAndNothingElse) {
+TEST_F(TiquetaTest, OkWritesWhatWasChangedAndNothingElse) {
     edit([&] {
         EXPECT_TRUE(person.find<QLineEdit>(u"txtNumero"_s)->isReadOnly());
         person.fill(u"txtNib"_s, u"PT50 0013 0000 00000000001 86"_s);
@@ -108,7 +77,7 @@ TEST_F(TiquetaFile, OkWritesWhatWasChangedAndNothingElse) {
     EXPECT_EQ(stored(u"nome"_s), u"Mudado por outro posto"_s);
 }
 
-TEST_F(TiquetaFile, CancelAbandons) {
+TEST_F(TiquetaTest, CancelAbandons) {
     const auto change = [&] {
         person.fill(u"txtNome"_s, u"Outro"_s);
         person.put(u"txtMorada"_s, u"Outra"_s);
@@ -121,24 +90,7 @@ TEST_F(TiquetaFile, CancelAbandons) {
               u"António Matos/Rua das Flores, 12/1"_s);
 }
 
-TEST_F(TiquetaFile, TellsOfTheBankNumberWhileTyping) {
-    const std::pair<QString, QString> rows[] = {
-        {u"0013"_s, u"em falta: 17"_s},
-        {u"001300000000000000186"_s, u"✓ NIB válido"_s},
-        {u"001300000000000000187"_s, u"não conferem"_s},
-        {u"0013000000000000001860"_s, u"a mais: 1"_s},
-        {u"0013A"_s, u"só pode ter algarismos"_s},
-    };
-    edit([&] {
-        for (const auto& [typed, hint] : rows) {
-            person.put(u"txtNib"_s, typed);
-            EXPECT_TRUE(label(u"lblControloNib"_s).contains(hint)) << typed.toStdString();
-        }
-        person.escape();
-    });
-}
-
-TEST_F(TiquetaFile, AWriteTheBookRefusesLeavesTheScreenAsItIs) {
+TEST_F(TiquetaTest, AWriteTheBookRefusesLeavesTheScreenAsItIs) {
     book.exec(
         u"create trigger refuses before update on tbSocios "
         "begin select raise(abort, 'o livro recusa'); end"_s);
@@ -170,12 +122,4 @@ TEST_F(TiquetaFamily, OffersTheMemberAndHisRelativesAndKeysJumpAndTake) {
         });
         EXPECT_EQ(chosen, taken) << typed.toStdString();
     }
-}
-
-TEST_F(TiquetaFamily, GivingUpIsZeroAndSoIsNobodyThere) {
-    EXPECT_EQ(choose([&] { person.escape(); }), 0);
-    EXPECT_EQ(choose([&] { person.accelerator(u'D'); }), 0);
-    socio = 4711;
-    EXPECT_EQ(choose([&] { person.enter(), person.escape(); }), 0);
-    EXPECT_TRUE(failureOf(tiqueta, u"AbrirRegisto"_s, {4711}).text().contains(u"4711"_s));
 }

@@ -38,22 +38,6 @@ TEST_F(VorlaneTest, CountsTheStepsUpToTheTotalAndGoesWithItsObject) {
     EXPECT_FALSE(isShown());
 }
 
-TEST_F(VorlaneTest, MembersOutOfOrderDoNothing) {
-    advance(1);
-    vorlane.call(u"terminar"_s);
-    EXPECT_FALSE(isShown());
-    start(2);
-    advance(2);
-    start(5);
-    advance(-3);
-    EXPECT_EQ(value(), 0) << "a second start begins anew";
-    start(0);
-    advance(1);
-    EXPECT_TRUE(isShown());
-    vorlane.call(u"terminar"_s);
-    EXPECT_FALSE(isShown());
-}
-
 TEST_F(VorlaneTest, LeavesTheFocusWhereItIs) {
     QLineEdit field;
     field.show();
