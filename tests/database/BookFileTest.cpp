@@ -77,18 +77,6 @@ TEST_F(BookFile, ARefusedSettingLeavesNeitherBookNorFolder) {
     EXPECT_TRUE(failure.contains(path("file/book"))) << qPrintable(failure);
 }
 
-TEST_F(BookFile, InitNamesTheBookInTheFiveValues) {
-    database::initBook(path("book"), false);
-    const std::optional<registry::Key> key =
-        registry::Key::open(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s);
-    ASSERT_TRUE(key);
-    EXPECT_EQ(key->value(u"dtSecurityInfo"_s), u"True"_s);
-    EXPECT_TRUE(key->value(u"dtUser"_s));
-    EXPECT_TRUE(key->value(u"dtPassword"_s));
-    EXPECT_EQ(key->value(u"dtInitialCatalog"_s), u"zelmars"_s);
-    EXPECT_EQ(key->value(u"dtDataSource"_s), u"sqlite:"_s + path("book"));
-}
-
 TEST_F(BookFile, ABookInUseOrWithMembersIsNotFilled) {
     support::Book book;
     book.count(u"tbSocios"_s);  // whoever has read it holds it open

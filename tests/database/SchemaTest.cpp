@@ -22,18 +22,6 @@ TEST(Schema, TwinsHaveTheSameColumnsInTheSameOrderAndTheHistoryHasThemAll) {
               QString());
 }
 
-TEST(Schema, AccumulatorsTakeEqualRowsAndNullsAndOnlyTheTwinDefaultsItsSums) {
-    support::Book book;
-    for (const char* table : {"tbSocios_Acumulados", "tbSocios_Acumulados_Inactivos"})
-        for (int row = 0; row < 2; ++row)
-            book.exec(u"insert into %1 (socio_id) values (1)"_s.arg(QString::fromLatin1(table)));
-    EXPECT_EQ(book.text(u"select debito_ac, credito_ac, no_docs from tbSocios_Acumulados"_s),
-              u"NULL|NULL|NULL\nNULL|NULL|NULL"_s);
-    EXPECT_EQ(
-        book.text(u"select debito_ac, credito_ac, no_docs from tbSocios_Acumulados_Inactivos"_s),
-        u"0|0|NULL\n0|0|NULL"_s);
-}
-
 TEST(Schema, ANewBookHasItsCodesAndStartsToCountAtOne) {
     support::Book book;
     EXPECT_EQ(book.text(u"select group_concat(code) from "
@@ -107,15 +95,6 @@ TEST(Schema, DailyStatementsDoNotReadWholeTables) {
         EXPECT_TRUE(plan.contains(u"SEARCH"_s)) << qPrintable(statement + u'\n' + plan);
         EXPECT_FALSE(plan.contains(u"SCAN"_s)) << qPrintable(statement + u'\n' + plan);
     }
-}
-
-TEST(Schema, TheNewestMovementsAreReadWithoutSortingAll) {
-    support::Book book;
-    const QString plan = book.text(
-        u"explain query plan select * from vwZelmars_Movimentos_Vigor "
-        "order by movimento_id desc limit 100"_s);
-    EXPECT_TRUE(plan.contains(u"MERGE"_s)) << qPrintable(plan);
-    EXPECT_FALSE(plan.contains(u"TEMP B-TREE"_s)) << qPrintable(plan);
 }
 
 }  // namespace
