@@ -15,6 +15,9 @@ namespace {
 constexpr int FirstRows = 64;
 constexpr int LaterRows = 1000;
 
+// Most statements give few rows: those are asked for at once, without a cursor.
+constexpr auto OnlyFirst = " LIMIT 64";
+
 constexpr auto Begin = "BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY";
 constexpr auto FetchFirst = "FETCH 64 FROM linhas";
 constexpr auto FetchLater = "FETCH 1000 FROM linhas";
@@ -22,18 +25,25 @@ constexpr auto FetchLater = "FETCH 1000 FROM linhas";
 }  // namespace
 
 PostgresPass::PostgresPass(std::shared_ptr<PostgresSession> session, const QByteArray& statement,
-                           bool withIdentity)
+                           bool withIdentity, bool limits)
     : session_(std::move(session)),
       reader_(session_->takeReader()),
       declare_("DECLARE linhas NO SCROLL CURSOR FOR " + statement),
       withIdentity_(withIdentity) {
     try {
-        fetchFirst({Begin});
+        if (limits || !isShort(statement)) fetchFirst({Begin});
     } catch (...) {
         session_->giveBack(std::move(reader_));
         throw;
     }
     describeColumns();
+}
+
+bool PostgresPass::isShort(const QByteArray& statement) {
+    batch_ = reader_->run(statement + OnlyFirst);
+    if (PQntuples(batch_.get()) == FirstRows) return false;
+    session_->giveBack(std::move(reader_));
+    return true;
 }
 
 void PostgresPass::fetchFirst(const std::vector<QByteArray>& before) {

@@ -5,13 +5,14 @@
 
 namespace ado {
 
-/// A statement whose rows come in batches from a cursor on a reader of its own. What fits the first
-/// batch needs the reader no longer.
+/// A statement whose rows are here at once when they are few, else come in batches from a cursor on
+/// a reader of its own.
 class PostgresPass final : public Pass {
 public:
-    /// `withIdentity`: the row identity stands before the statement's columns.
+    /// `withIdentity`: the row identity stands before the statement's columns. `limits`: the
+    /// statement says itself how many rows it wants.
     PostgresPass(std::shared_ptr<PostgresSession> session, const QByteArray& statement,
-                 bool withIdentity);
+                 bool withIdentity, bool limits);
     ~PostgresPass() override { release(); }
 
     int columnCount() const override { return static_cast<int>(columns_.size()); }
@@ -26,6 +27,8 @@ public:
     void release() override;
 
 private:
+    /// True when all rows are in the batch now.
+    bool isShort(const QByteArray& statement);
     void fetchFirst(const std::vector<QByteArray>& before);
     void describeColumns();
 

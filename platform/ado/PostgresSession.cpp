@@ -41,6 +41,15 @@ QByteArray parameter(std::size_t number) {
     return '$' + QByteArray::number(static_cast<qulonglong>(number));
 }
 
+/// True when a statement may say by itself how many rows it wants.
+bool limits(const Statement& statement) {
+    for (int i = 0; i < statement.count(); ++i)
+        if (statement.is(i, "limit"_L1) || statement.is(i, "fetch"_L1) ||
+            statement.is(i, "offset"_L1) || statement.is(i, "for"_L1))
+            return true;
+    return false;
+}
+
 }  // namespace
 
 PostgresSession::PostgresSession(const PostgresAddress& address, int timeoutSeconds)
@@ -76,7 +85,8 @@ PostgresHandle& PostgresSession::writer() {
 std::shared_ptr<Pass> PostgresSession::open(const Statement& statement, const QString& table) {
     const bool withIdentity = !table.isEmpty();
     const QString text = translate(statement, *this, withIdentity, Dialect::Postgres);
-    return std::make_shared<PostgresPass>(shared_from_this(), text.toUtf8(), withIdentity);
+    return std::make_shared<PostgresPass>(shared_from_this(), text.toUtf8(), withIdentity,
+                                          limits(statement));
 }
 
 // --- The catalogue

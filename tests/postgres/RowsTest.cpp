@@ -101,14 +101,6 @@ TEST_F(Rows, SortAsAPortugueseReaderExpectsWithNullsFirst) {
     EXPECT_EQ(open(u"select * from tbMov where nome='EVA'"_s, connection)->RecordCount(), 0);
 }
 
-TEST_F(Rows, KeepDifferencesOfAmountsExact) {
-    exec(u"INSERT INTO tbMov(socio, valor) VALUES(1, 0.4), (1, -0.3), (2, 0.4001), (2, -0.3)"_s);
-    const auto rows = open(
-        u"SELECT socio, SUM(valor) AS s FROM tbMov GROUP BY socio HAVING (((SUM(valor)) > 0.1))"_s,
-        connection);
-    EXPECT_EQ(valuesOf(rows, u"socio"_s), u"2"_s);
-}
-
 TEST_F(Rows, OfAStaticSetDoNotChangeHoweverManyTheyAre) {
     for (const int count : {3, 63, 64, 65, 2500}) {
         exec(u"TRUNCATE tbMov RESTART IDENTITY"_s);
@@ -130,19 +122,6 @@ TEST_F(Rows, OfAStaticSetDoNotChangeHoweverManyTheyAre) {
     }
 }
 
-TEST_F(Rows, OfADynamicSetAreReadAfreshAndTheGoneOnesPassed) {
-    fill(100);
-    const auto rows =
-        open(u"select * from tbMov"_s, connection, ado::adLockOptimistic, ado::adOpenDynamic);
-    exec(u"UPDATE tbMov SET nome='mudado' WHERE id IN (2, 90); DELETE FROM tbMov WHERE id=3"_s);
-    rows->MoveNext();
-    EXPECT_EQ(rows->Collect(u"nome"_s), u"mudado"_s);
-    rows->MoveNext();
-    EXPECT_EQ(rows->Collect(u"id"_s), QVariant(4));
-    while (rows->Collect(u"id"_s).toInt() < 90) rows->MoveNext();
-    EXPECT_EQ(rows->Collect(u"nome"_s), u"mudado"_s);
-}
-
 TEST_F(Rows, OfALongSetArePassedInBoundedMemory) {
     fill(200000);  // some 8 MB of rows
     const qint64 before = residentKilobytes();
@@ -151,20 +130,4 @@ TEST_F(Rows, OfALongSetArePassedInBoundedMemory) {
     for (; !rows->atEnd(); rows->MoveNext()) ++count;
     EXPECT_EQ(count, 200000);
     EXPECT_LT(residentKilobytes() - before, 6000);
-}
-
-TEST_F(Rows, OfAShapeComeWithTheirChildren) {
-    exec(
-        u"INSERT INTO tbMov(socio, valor, data) VALUES(1, 10, '2001-01-01'), (2, 20, "
-        u"'2001-01-01'), (1, 30, '2001-01-01'), (1, 40, '1999-01-01'), (NULL, 50, "
-        u"'2001-01-01')"_s);
-    const auto rows = open(
-        u"SHAPE {SELECT socio FROM tbMov GROUP BY socio ORDER BY socio DESC} AS lista APPEND "
-        u"({SELECT tbMov.* FROM tbMov WHERE data >= CONVERT(DATETIME,'01/01/2000 00:00:00',102) "
-        u"ORDER BY id} AS detalhe RELATE 'socio' TO 'socio') AS detalhe"_s,
-        connect(5, u"MSDataShape.1"_s));
-    QStringList lines;
-    for (; !rows->atEnd(); rows->MoveNext())
-        lines += valuesOf(rows->Chapter(u"detalhe"_s), u"valor"_s);
-    EXPECT_EQ(lines, QStringList({u"20"_s, u"10,30"_s, QString()}));
 }

@@ -40,12 +40,6 @@ class ServerTranslator : public testing::TestWithParam<Rule> {};
 const Rule Rules[] = {
     {"NameInBrackets", u"SELECT max([Id]) FROM `TbA`"_s, u"SELECT max(\"id\") FROM \"tba\""_s},
     {"KeywordAsName", u"SELECT max(tbA.Order) FROM tbA"_s, u"SELECT max(tbA.\"order\") FROM tbA"_s},
-    {"DoubleQuotedText", u"SELECT max(id) FROM tbA WHERE tipo=\"D'E\""_s,
-     u"SELECT max(id) FROM tbA WHERE tipo='D''E'"_s},
-    {"DateBetweenSigns", u"SELECT max(id) FROM tbA WHERE d=#2/22/2000#"_s,
-     u"SELECT max(id) FROM tbA WHERE d='2000-02-22 00:00:00'"_s},
-    {"TextsAreJoined", u"SELECT max(a + ' - ' + b) FROM tbA"_s,
-     u"SELECT max(a || ' - ' || b) FROM tbA"_s},
     {"SumOfAmountsStays", u"SELECT Sum(debito) FROM tbA"_s, u"SELECT Sum(debito) FROM tbA"_s},
     {"SumOfFloats", u"SELECT Sum(tbB.credito_ac) AS s FROM tbB"_s,
      u"SELECT Sum(CAST(tbB.credito_ac AS double precision)) AS s FROM tbB"_s},
