@@ -10,16 +10,6 @@ namespace {
 
 class Connections : public SmallBook {};
 
-TEST_F(Connections, AndSetsFailReadablyInTheWrongState) {
-    const auto rows = open(u"select 1 as um"_s, connection);
-    EXPECT_EQ(failureOf([&] { rows->Open(u"select 1"_s, connection); }).number(), core::ObjectOpen);
-    rows->Close();
-    EXPECT_EQ(failureOf([&] { rows->MoveNext(); }).number(), core::ObjectClosed);
-    EXPECT_EQ(failureOf([&] { rows->Collect(u"um"_s); }).number(), core::ObjectClosed);
-    connection->Close();
-    EXPECT_EQ(failureOf([&] { open(u"select 1"_s, connection); }).number(), core::ObjectClosed);
-}
-
 TEST_F(Connections, SayWhatWasTriedAndMakeNothing) {
     const QTemporaryDir folder;
     const QString path = folder.path();
@@ -50,16 +40,6 @@ TEST_F(Connections, SayWhatWasTriedAndMakeNothing) {
     }
     EXPECT_EQ(QDir(path).entryList(QDir::AllEntries | QDir::NoDotAndDotDot),
               QStringList(u"texto.db"_s));
-}
-
-TEST_F(Connections, SeeTablesThatAreAlteredLater) {
-    const QString text = u"select * from tbConta where proximo = 1"_s;
-    EXPECT_EQ(open(text, connection)->columnCount(), 1);
-    book.exec(
-        u"ALTER TABLE tbConta ADD COLUMN nota VARCHAR(7); INSERT INTO tbConta VALUES(1, 'a')"_s);
-    const auto rows = open(text, connection);
-    EXPECT_EQ(rows->Collect(u"nota"_s), u"a"_s);
-    EXPECT_EQ(rows->Fields(u"nota"_s).DefinedSize(), 7);
 }
 
 }  // namespace

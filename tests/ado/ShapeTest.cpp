@@ -38,10 +38,4 @@ TEST_F(Shapes, GiveEachRowItsChildren) {
     EXPECT_EQ(core::toText(children->valueAt(1, 4)), u"30"_s);
 }
 
-TEST_F(Shapes, ThatCannotBeSayWhy) {
-    const QString wrong = QString(Listing).replace(u"TO 'socio'"_s, u"TO 'nada'"_s);
-    EXPECT_TRUE(failureOf([&] { open(wrong, shaping); }).text().contains(u"«nada»"_s));
-    EXPECT_TRUE(failureOf([&] { open(Listing, connection); }).text().contains(u"SELECT"_s));
-}
-
 }  // namespace

@@ -9,12 +9,11 @@ SmallBook::SmallBook() {
     book.exec(
         uR"(
         CREATE TABLE tbMov (id INTEGER PRIMARY KEY AUTOINCREMENT, socio INTEGER, tipo VARCHAR(3),
-            data DATETIME, valor MONEY, taxa DOUBLE, nome VARCHAR(10), obs TEXT, pequeno SMALLINT,
-            grande BIGINT, estado TEXT DEFAULT 'novo', simples REAL);
+            data DATETIME, valor MONEY, taxa DOUBLE, nome VARCHAR(10), obs TEXT,
+            estado TEXT DEFAULT 'novo', simples REAL);
         CREATE TABLE tbSoma (socio INTEGER, credito REAL, docs INTEGER);
         CREATE TABLE tbConta (proximo INTEGER);
-        CREATE TABLE tbHosp (hosp_id INTEGER PRIMARY KEY, code VARCHAR(5), nome VARCHAR(40));
-        CREATE VIEW vwMov AS SELECT tbMov.*, 'ACTIVO' AS ficheiro FROM tbMov;)"_s);
+        CREATE TABLE tbHosp (hosp_id INTEGER PRIMARY KEY, code VARCHAR(5), nome VARCHAR(40));)"_s);
 }
 
 ado::ConnectionPtr SmallBook::connect(int timeoutSeconds) const {

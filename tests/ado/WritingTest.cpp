@@ -1,8 +1,4 @@
 // SPDX-License-Identifier: MIT
-#include <sys/resource.h>
-
-#include <csignal>
-
 #include "SmallBook.h"
 #include "platform/core/Values.h"
 
@@ -36,19 +32,6 @@ TEST_F(Writing, ANewRowTakesTheTablesDefaultsAndGivesItsKeyBack) {
     EXPECT_EQ(rows->valueAt(0, 6), u"Ana"_s);
 }
 
-TEST_F(Writing, ADroppedNewRowLeavesNothing) {
-    fill(1);
-    const auto rows = open(Movements, connection);
-    rows->AddNew();
-    rows->setCollect(u"nome"_s, u"x"_s);
-    rows->CancelUpdate();
-    EXPECT_EQ(rows->Collect(u"nome"_s), u"n1"_s);
-    rows->AddNew();
-    rows->MoveFirst();
-    EXPECT_FALSE(rows->isNewRow());
-    EXPECT_EQ(names(), u"n1"_s);
-}
-
 TEST_F(Writing, APendingRowSurvivesClosingAndReopeningTheConnection) {
     const auto rows = open(u"select * from tbMov where id = 0"_s, connection);
     rows->AddNew();
@@ -61,20 +44,6 @@ TEST_F(Writing, APendingRowSurvivesClosingAndReopeningTheConnection) {
     rows->Update();
     EXPECT_EQ(rows->Collect(u"id"_s), QVariant(1));
     EXPECT_EQ(book.text(u"SELECT nome, valor FROM tbMov"_s), u"pendente|2"_s);
-}
-
-TEST_F(Writing, ARowNeverGoesToAnotherBook) {
-    book.exec(u"INSERT INTO tbMov(nome) VALUES('um')"_s);
-    support::Book other;
-    other.exec(u"CREATE TABLE tbMov(id INTEGER PRIMARY KEY, nome TEXT)"_s);
-    other.exec(u"INSERT INTO tbMov(nome) VALUES('alheio')"_s);
-    const auto rows = optimistic();
-    rows->setCollect(u"nome"_s, u"dois"_s);
-    connection->Close();
-    connection->ConnectionString = other.connectionString();
-    connection->Open();
-    EXPECT_EQ(failureOf([&] { rows->Update(); }).number(), core::NotUpdatable);
-    EXPECT_EQ(other.text(u"SELECT nome FROM tbMov"_s), u"alheio"_s);
 }
 
 TEST_F(Writing, AnOptimisticUpdateTakesTheChangedColumnsOnly) {
@@ -112,33 +81,6 @@ TEST_F(Writing, ARowThatVanishedFailsAndKeepsWhatWasTyped) {
     EXPECT_EQ(rows->Collect(u"nome"_s), u"dois"_s);
 }
 
-TEST_F(Writing, IsRefusedWhereRowsHaveNoTable) {
-    fill(1);
-    const auto view = open(u"SELECT * FROM vwMov"_s, connection, ado::adLockOptimistic);
-    view->setCollect(u"nome"_s, u"por cima"_s);  // typed over, and it goes nowhere
-    EXPECT_EQ(view->Collect(u"nome"_s), u"por cima"_s);
-    EXPECT_EQ(failureOf([&] { view->Update(); }).number(), core::NotUpdatable);
-    const auto reading = open(Movements, connection, ado::adLockUnspecified);
-    EXPECT_EQ(failureOf([&] { reading->AddNew(); }).number(), core::NotUpdatable);
-    EXPECT_EQ(failureOf([&] { reading->Delete(); }).number(), core::NotUpdatable);
-    EXPECT_EQ(names(), u"n1"_s);
-}
-
-TEST_F(Writing, DeletesAreSeenByListsAndEmptyATableRowByRow) {
-    fill(100);
-    const auto rows = optimistic();
-    rows->MoveNext();
-    rows->Delete();
-    EXPECT_EQ(failureOf([&] { rows->Collect(u"nome"_s); }).number(), core::NoCurrentRow);
-    add(rows, u"novo"_s);
-    rows->readAll();
-    EXPECT_EQ(rows->valueAt(1, 6), u"n3"_s);
-    rows->MoveTo(98);
-    EXPECT_EQ(valuesOf(rows, u"nome"_s), u"n100,novo"_s);
-    for (rows->MoveFirst(); !rows->atEnd(); rows->MoveNext()) rows->Delete();
-    EXPECT_EQ(book.count(u"tbMov"_s), 0);
-}
-
 TEST_F(Writing, WhilePassingALongSetTouchesEveryRowOnce) {
     fill(300);
     book.exec(u"UPDATE tbMov SET socio = id, valor = NULL"_s);
@@ -163,22 +105,6 @@ TEST_F(Writing, OnALockedBookBringsTheEnginesText) {
     book.exec(u"COMMIT"_s);
     rows->Update();
     EXPECT_EQ(names(), u"x"_s);
-}
-
-TEST_F(Writing, OnAFullDiskBringsTheEnginesTextAndChangesNothing) {
-    const auto rows = open(Movements, connection);
-    add(rows, u"antes"_s);
-    std::signal(SIGXFSZ, SIG_IGN);
-    rlimit before{};
-    getrlimit(RLIMIT_FSIZE, &before);
-    const rlimit none{0, before.rlim_max};
-    setrlimit(RLIMIT_FSIZE, &none);
-    const QString text = failureOf([&] { add(rows, u"depois"_s); }).text();
-    setrlimit(RLIMIT_FSIZE, &before);
-    EXPECT_EQ(text, u"disk I/O error"_s);
-    EXPECT_EQ(names(), u"antes"_s);
-    rows->Update();
-    EXPECT_EQ(names(), u"antes,depois"_s);
 }
 
 }  // namespace
