@@ -22,8 +22,7 @@ TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
     };
     put(u"recebido"_s, 5);
     entry.bErroEntrada = true;
-    for (QString* text : {&entry.DataCombo1, &entry.Text3, &entry.Text6, &entry.Text9})
-        text->clear();
+    for (QString* text : {&entry.Text3, &entry.Text6, &entry.Text9}) text->clear();
     book.exec(u"update tbSocios set nib = null"_s);
     const QString none = core::DefaultTitle.toString();
     const struct {
@@ -40,8 +39,6 @@ TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
         {u"Surgiu um erro grave durante a introdução dos dados no formulário, é aconcelhável que "
          "recomece outro registo."_s,
          Icon::Critical, caption, [&] { entry.bErroEntrada = false; }},
-        {u"Tem de Indicar uma rubrica!"_s, Icon::Information, caption,
-         [&] { entry.DataCombo1 = u"01"_s; }},
         {u"Não foi atribuido nenhum código de familiar!"_s, Icon::Information, caption,
          [&] { entry.Text3 = u"A"_s; }},
         {u"Tem de indicar o valor de incidência!"_s, Icon::Information, caption,

@@ -24,20 +24,22 @@ protected:
         });
         for (int i = 0; i < Members; ++i) members.push_back(static_cast<qint32>(book.member({})));
         for (int group = 0; group < Groups; ++group) {
-            const qint64 main = book.rubric({.agregado = maybe(1500),
-                                             .socio = maybe(800),
-                                             .familiar = maybe(600),
-                                             .total_familia = maybe(700)});
+            const qint64 main =
+                book.insert(u"tbZelmar_Plafonds"_s, {{"agregado", maybe(1500)},
+                                                     {"socio", maybe(800)},
+                                                     {"familiar", maybe(600)},
+                                                     {"total_familia", maybe(700)}});
             for (int i = 0; i < RubricsPerGroup; ++i)
-                rubrics.push_back(book.rubric({.rubrica_id_main = main,
-                                               .percent = 0.05 * (1 + below(20)),
-                                               .agregado = maybe(2000),
-                                               .socio = amount(2000),
-                                               .familiar = amount(2000),
-                                               .total_familia = maybe(1200),
-                                               .socio_max_lan = maybe(200),
-                                               .familiar_max_lan = maybe(200),
-                                               .franquia = maybe(60)}));
+                rubrics.push_back(
+                    book.insert(u"tbZelmar_Plafonds"_s, {{"rubrica_id_main", main},
+                                                         {"percent", 0.05 * (1 + below(20))},
+                                                         {"agregado", maybe(2000)},
+                                                         {"socio", amount(2000)},
+                                                         {"familiar", amount(2000)},
+                                                         {"total_familia", maybe(1200)},
+                                                         {"socio_max_lan", maybe(200)},
+                                                         {"familiar_max_lan", maybe(200)},
+                                                         {"franquia", maybe(60)}}));
         }
     }
 

@@ -9,7 +9,6 @@
 
 #include "database/Book.h"
 #include "platform/core/Clock.h"
-#include "platform/core/Money.h"
 
 using namespace Qt::StringLiterals;
 
@@ -32,78 +31,30 @@ QString pattern(Book::Content content) {
     return file;
 }
 
-[[noreturn]] void fail(sqlite3* handle, const QString& statement) {
-    throw std::runtime_error(std::string(sqlite3_errmsg(handle)) + ": " + statement.toStdString());
-}
-
 QString literal(const QVariant& value) {
     if (!value.isValid() || value.isNull()) return u"null"_s;
-    if (value.canConvert<core::Money>())
-        return QString::number(value.value<core::Money>().toDouble(), 'f', 4);
-    if (value.typeId() == QMetaType::Bool) return value.toBool() ? u"1"_s : u"0"_s;
     if (value.typeId() == QMetaType::QDate || value.typeId() == QMetaType::QDateTime)
         return value.toDateTime().toString(u"''yyyy-MM-dd HH:mm:ss''"_s);
     if (value.typeId() != QMetaType::QString) return value.toString();
     return u"'"_s + value.toString().replace(u"'"_s, u"''"_s) + u"'"_s;
 }
 
-QVariant column(sqlite3_stmt* statement, int at) {
-    switch (sqlite3_column_type(statement, at)) {
-        case SQLITE_NULL:
-            return {};
-        case SQLITE_INTEGER:
-            return QVariant::fromValue<qint64>(sqlite3_column_int64(statement, at));
-        case SQLITE_FLOAT:
-            return sqlite3_column_double(statement, at);
-        default:
-            return QString::fromUtf8(
-                reinterpret_cast<const char*>(sqlite3_column_text(statement, at)));
-    }
-}
-
-QList<QVariantList> rowsOf(sqlite3* handle, const QString& statement) {
-    sqlite3_stmt* query = nullptr;
-    int result = sqlite3_prepare_v2(handle, statement.toUtf8().constData(), -1, &query, nullptr);
-    QList<QVariantList> rows;
-    while (query && (result = sqlite3_step(query)) == SQLITE_ROW) {
-        rows.append(QVariantList());
-        for (int at = 0; at < sqlite3_column_count(query); ++at) rows.last() << column(query, at);
-    }
-    sqlite3_finalize(query);
-    if (result != SQLITE_DONE) fail(handle, statement);
-    return rows;
-}
-
 }  // namespace
 
-Book::Book(Content content) {
+Book::Book(Content content) : registryBefore_(qgetenv(RegistryVariable)) {
     QDir(root_.path()).mkpath(u"book"_s);
     QDir(root_.path()).mkpath(u"registry"_s);
-    if (!QFile::copy(pattern(content), file())) throw std::runtime_error("no copy of the book");
-    hadRegistry_ = qEnvironmentVariableIsSet(RegistryVariable);
-    registryBefore_ = qgetenv(RegistryVariable);
+    const QString file = database::bookFile(folder(), catalogue());
+    if (!QFile::copy(pattern(content), file)) throw std::runtime_error("no copy of the book");
     qputenv(RegistryVariable, registryFolder().toUtf8());
     database::writeSettings(folder(), catalogue());
-    if (sqlite3_open(file().toUtf8().constData(), &handle_) != SQLITE_OK) fail(handle_, u"open"_s);
+    sqlite3_open(file.toUtf8().constData(), &handle_);
     sqlite3_busy_timeout(handle_, 5000);
 }
 
 Book::~Book() {
     sqlite3_close(handle_);
-    if (hadRegistry_)
-        qputenv(RegistryVariable, registryBefore_);
-    else
-        qunsetenv(RegistryVariable);
-}
-
-QString Book::folder() const {
-    return root_.filePath(u"book"_s);
-}
-QString Book::file() const {
-    return database::bookFile(folder(), catalogue());
-}
-QString Book::registryFolder() const {
-    return root_.filePath(u"registry"_s);
+    qputenv(RegistryVariable, registryBefore_);
 }
 
 QString Book::connectionString() const {
@@ -113,26 +64,34 @@ QString Book::connectionString() const {
 }
 
 QString Book::shapingConnectionString() const {
-    return u"Provider=MSDataShape.1;Persist Security Info=True;Connect Timeout=15;"
-           "Data Source=sqlite:%2;User ID=zelmars;Password=;Initial Catalog=%1;"
-           "Data Provider=SQLOLEDB.1"_s.arg(catalogue(), folder());
+    return connectionString().replace(u"Provider=SQLOLEDB.1"_s,
+                                      u"Provider=MSDataShape.1;Data Provider=SQLOLEDB.1"_s);
 }
 
-void Book::exec(const QString& statements) {
-    if (sqlite3_exec(handle_, statements.toUtf8().constData(), nullptr, nullptr, nullptr) !=
-        SQLITE_OK)
-        fail(handle_, statements);
+QList<QStringList> Book::rows(const QString& statements) {
+    const auto take = [](void* rows, int count, char** cells, char**) {
+        QStringList row;
+        for (int at = 0; at < count; ++at) row << QString::fromUtf8(cells[at]);
+        static_cast<QList<QStringList>*>(rows)->append(row);
+        return 0;
+    };
+    QList<QStringList> rows;
+    if (sqlite3_exec(handle_, statements.toUtf8().constData(), take, &rows, nullptr) != SQLITE_OK)
+        throw std::runtime_error(std::string(sqlite3_errmsg(handle_)) + ": " +
+                                 statements.toStdString());
+    return rows;
 }
 
 QVariant Book::value(const QString& statement) {
-    return rowsOf(handle_, statement).value(0).value(0);
+    const QString cell = rows(statement).value(0).value(0);
+    return cell.isNull() ? QVariant() : cell;
 }
 
 QString Book::text(const QString& statement) {
     QStringList lines;
-    for (const QVariantList& row : rowsOf(handle_, statement)) {
-        QStringList cells;
-        for (const QVariant& cell : row) cells << (cell.isValid() ? cell.toString() : u"NULL"_s);
+    for (QStringList cells : rows(statement)) {
+        for (QString& cell : cells)
+            if (cell.isNull()) cell = u"NULL"_s;
         lines << cells.join(u'|');
     }
     return lines.join(u'\n');
@@ -163,7 +122,6 @@ qint64 Book::member(const MemberRow& row) {
                                   {"nib", row.nib},
                                   {"zelmar", row.zelmar},
                                   {"zelmar_data_carencia", row.zelmar_data_carencia},
-                                  {"morada1", row.morada1},
                                   {"localidade1", row.localidade1}});
 }
 
@@ -178,20 +136,17 @@ qint64 Book::person(const PersonRow& row) {
 qint64 Book::rubric(const RubricRow& row) {
     return insert(u"tbZelmar_Plafonds"_s, {{"rubrica_id_main", row.rubrica_id_main},
                                            {"code", row.code},
-                                           {"descrit", row.descrit},
+                                           {"descrit", u"Consultas"_s},
                                            {"percent", row.percent},
                                            {"agregado", row.agregado},
                                            {"socio", row.socio},
                                            {"familiar", row.familiar},
                                            {"total_familia", row.total_familia},
-                                           {"socio_max_lan", row.socio_max_lan},
-                                           {"familiar_max_lan", row.familiar_max_lan},
                                            {"franquia", row.franquia}});
 }
 
 qint64 Book::childRubric(RubricRow row) {
-    if (!row.rubrica_id_main.isValid())
-        row.rubrica_id_main = rubric({.code = u"0"_s, .descrit = u"Grupo"_s});
+    if (!row.rubrica_id_main.isValid()) row.rubrica_id_main = rubric({.code = u"0"_s});
     if (!row.percent.isValid()) row.percent = 0.8;
     if (!row.socio.isValid()) row.socio = 1000000;
     if (!row.familiar.isValid()) row.familiar = 1000000;

@@ -24,7 +24,6 @@ struct MemberRow {
     QVariant nib = QStringLiteral("001300000000000000186");
     QVariant zelmar = 1;
     QVariant zelmar_data_carencia = {};
-    QVariant morada1 = QStringLiteral("Rua das Flores, 12");
     QVariant localidade1 = QStringLiteral("Lisboa");
 };
 
@@ -42,14 +41,11 @@ struct PersonRow {
 struct RubricRow {
     QVariant rubrica_id_main = {};
     QVariant code = QStringLiteral("01");
-    QVariant descrit = QStringLiteral("Consultas");
     QVariant percent = {};  // 0..1, a fraction
     QVariant agregado = {};
     QVariant socio = {};
     QVariant familiar = {};
     QVariant total_familia = {};
-    QVariant socio_max_lan = {};
-    QVariant familiar_max_lan = {};
     QVariant franquia = {};
 };
 
@@ -76,18 +72,15 @@ public:
     Book(const Book&) = delete;
     Book& operator=(const Book&) = delete;
 
-    QString folder() const;
+    QString folder() const { return root_.filePath(QStringLiteral("book")); }
     QString catalogue() const { return QStringLiteral("zelmars"); }
-    QString file() const;
-    QString registryFolder() const;
-    /// As a login would set it, of the plain provider and of the shaping one.
+    QString registryFolder() const { return root_.filePath(QStringLiteral("registry")); }
+    /// Of the plain provider, as a login would set it, and of the shaping one.
     QString connectionString() const;
     QString shapingConnectionString() const;
 
-    /// Runs statements that give no rows.
-    void exec(const QString& statements);
-    /// The first column of the first row as it is stored: qint64, double or QString; invalid for
-    /// null and for no row.
+    void exec(const QString& statements) { rows(statements); }
+    /// The first column of the first row as text; invalid for null and for no row.
     QVariant value(const QString& statement);
     /// All rows: columns parted by '|', rows by '\n', null as "NULL".
     QString text(const QString& statement);
@@ -110,9 +103,10 @@ public:
     void premiumInOrder(qint64 socio_id);
 
 private:
+    QList<QStringList> rows(const QString& statements);  ///< a null text for null
+
     QTemporaryDir root_;
     QByteArray registryBefore_;
-    bool hadRegistry_ = false;
     sqlite3* handle_ = nullptr;
 };
 

@@ -10,7 +10,6 @@
 #include <QTest>
 #include <QTimer>
 #include <QWindow>
-#include <map>
 #include <stdexcept>
 
 #include "platform/forms/Form.h"
@@ -24,41 +23,28 @@ namespace {
 
 constexpr int Patience = 10'000;  // milliseconds; reached only when something is wrong
 
-std::string plain(const QString& text) {
-    return text.toStdString();
-}
-
 QMessageBox::StandardButton buttonOf(core::Answer answer) {
     if (answer == core::Answer::Ok) return QMessageBox::Ok;
     return answer == core::Answer::Yes ? QMessageBox::Yes : QMessageBox::No;
 }
 
-QMessageBox::Icon iconOf(core::Icon icon) {
-    static const std::map<core::Icon, QMessageBox::Icon> icons{
-        {core::Icon::None, QMessageBox::NoIcon},
-        {core::Icon::Information, QMessageBox::Information},
-        {core::Icon::Exclamation, QMessageBox::Warning},
-        {core::Icon::Question, QMessageBox::Question},
-        {core::Icon::Critical, QMessageBox::Critical}};
-    return icons.at(icon);
-}
-
-QWidget* shownWindow(const QString& name) {
-    for (QWidget* window : QApplication::topLevelWidgets())
-        if (window->isVisible() && window->objectName() == name) return window;
-    return nullptr;
-}
+/// In the order of core::Icon.
+constexpr QMessageBox::Icon Icons[] = {QMessageBox::NoIcon, QMessageBox::Information,
+                                       QMessageBox::Warning, QMessageBox::Question,
+                                       QMessageBox::Critical};
 
 void compare(const QMessageBox& box, const Operator::Box& expected) {
     const QString text = box.text();
     if (!expected.partly || !text.contains(expected.text)) {
-        EXPECT_EQ(plain(text), plain(expected.text));
+        EXPECT_EQ(text.toStdString(), expected.text.toStdString());
     }
     if (expected.icon) {
-        EXPECT_EQ(box.icon(), iconOf(*expected.icon)) << "icon of: " << plain(text);
+        EXPECT_EQ(box.icon(), Icons[static_cast<int>(*expected.icon)])
+            << "icon of: " << text.toStdString();
     }
     if (!expected.title.isEmpty()) {
-        EXPECT_EQ(plain(box.windowTitle()), plain(expected.title)) << "title of: " << plain(text);
+        EXPECT_EQ(box.windowTitle().toStdString(), expected.title.toStdString())
+            << "title of: " << text.toStdString();
     }
 }
 
@@ -80,20 +66,16 @@ Operator::Operator() {
 Operator::~Operator() {
     expectNoBoxesLeft();
     for (const Visit& visit : awaited_)
-        ADD_FAILURE() << "the screen " << plain(visit.name) << " did not come";
-}
-
-void Operator::expectBox(const Box& box) {
-    expected_.append(box);
+        ADD_FAILURE() << "the screen " << visit.name.toStdString() << " did not come";
 }
 
 void Operator::expectNoBoxesLeft() {
-    for (const Box& box : expected_) ADD_FAILURE() << "no box said: " << plain(box.text);
+    for (const Box& box : expected_) ADD_FAILURE() << "no box said: " << box.text.toStdString();
     expected_.clear();
 }
 
 void Operator::missing(const QString& name, const char* how) const {
-    throw std::runtime_error(plain(name) + " " + how);
+    throw std::runtime_error(name.toStdString() + " " + how);
 }
 
 bool Operator::eventFilter(QObject* watched, QEvent* event) {
@@ -110,23 +92,18 @@ bool Operator::eventFilter(QObject* watched, QEvent* event) {
         QTimer::singleShot(0, this, [this, shown, next] { visit(shown, next.steps); });
         return false;
     }
-    if (qobject_cast<forms::Form*>(shown) && shown->windowModality() == Qt::ApplicationModal) {
-        ADD_FAILURE() << "nobody waits on the modal screen " << plain(shown->objectName());
-        QTimer::singleShot(0, shown,
-                           [shown] { static_cast<forms::Form*>(shown.data())->Unload(); });
-    }
     return false;
 }
 
 void Operator::visit(const QPointer<QWidget>& shown, const std::function<void()>& steps) {
     if (!shown) return;
+    const QString name = shown->objectName();
     const QPointer<QWidget> before = current_;
     try {
         turnTo(shown);
         steps();
     } catch (const std::exception& failure) {
-        ADD_FAILURE() << "on " << plain(shown ? shown->objectName() : QString()) << ": "
-                      << failure.what();
+        ADD_FAILURE() << "on " << name.toStdString() << ": " << failure.what();
         if (auto* form = qobject_cast<forms::Form*>(shown)) form->Unload();
     }
     if (before && before->isVisible()) current_ = before;
@@ -138,7 +115,8 @@ void Operator::answer(const QPointer<QWidget>& shown) {
     const QString text = box->text();
     Box expected;
     if (expected_.isEmpty()) {
-        ADD_FAILURE() << "unexpected box \"" << plain(box->windowTitle()) << "\": " << plain(text);
+        ADD_FAILURE() << "unexpected box \"" << box->windowTitle().toStdString()
+                      << "\": " << text.toStdString();
         expected.answer = box->button(QMessageBox::Ok) ? core::Answer::Ok : core::Answer::No;
     } else {
         expected = expected_.takeFirst();
@@ -147,13 +125,18 @@ void Operator::answer(const QPointer<QWidget>& shown) {
     QAbstractButton* button = box->button(buttonOf(expected.answer));
     if (button) clickOn(button);
     if (!shown || !shown->isVisible()) return;
-    ADD_FAILURE() << "the box cannot be answered as expected: " << plain(text);
+    ADD_FAILURE() << "the box cannot be answered as expected: " << text.toStdString();
     box->done(QMessageBox::No);
 }
 
+QWidget* Operator::shownWindow(const QString& name) {
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (window->isVisible() && window->objectName() == name) return window;
+    return nullptr;
+}
+
 QWidget* Operator::screen(const QString& name) {
-    if (!QTest::qWaitFor([&name] { return shownWindow(name) != nullptr; }, Patience))
-        missing(name, "is not shown");
+    if (!QTest::qWaitFor([&] { return isShown(name); }, Patience)) missing(name, "is not shown");
     turnTo(shownWindow(name));
     return current_;
 }
@@ -161,33 +144,17 @@ QWidget* Operator::screen(const QString& name) {
 /// On a real display a window takes keys only once the window manager has made it the active one.
 void Operator::turnTo(QWidget* window) {
     current_ = window;
-    const QWidget* modal = QApplication::activeModalWidget();
-    if (modal && modal != window) return;
     window->activateWindow();
     const auto isActive = [this] { return !current_ || current_->isActiveWindow(); };
     EXPECT_TRUE(QTest::qWaitFor(isActive, Patience))
-        << "not active: " << plain(window->objectName());
-}
-
-void Operator::onScreen(const QString& name, const std::function<void()>& steps) {
-    awaited_.append({name, steps});
-}
-
-bool Operator::isShown(const QString& name) const {
-    return shownWindow(name) != nullptr;
+        << "not active: " << window->objectName().toStdString();
 }
 
 QWidget* Operator::here() const {
     QWidget* modal = QApplication::activeModalWidget();
     if (modal && !qobject_cast<QMessageBox*>(modal)) return modal;
     if (current_ && current_->isVisible()) return current_;
-    if (QApplication::activeWindow()) return QApplication::activeWindow();
     throw std::runtime_error("no window is shown");
-}
-
-QWindow* Operator::keyWindow() const {
-    if (QWidget* popup = QApplication::activePopupWidget()) return popup->windowHandle();
-    return here()->windowHandle();
 }
 
 void Operator::clickOn(QWidget* control) {
@@ -201,13 +168,6 @@ void Operator::click(const QString& name) {
     settle();
 }
 
-void Operator::doubleClick(const QString& name) {
-    auto* control = find(name);
-    QTest::mouseDClick(control->window()->windowHandle(), Qt::LeftButton, Qt::NoModifier,
-                       control->mapTo(control->window(), control->rect().center()));
-    settle();
-}
-
 void Operator::put(const QString& name, const QString& text) {
     auto* field = find(name);
     if (!field->hasFocus()) clickOn(field);
@@ -216,11 +176,6 @@ void Operator::put(const QString& name, const QString& text) {
     press(Qt::Key_A, Qt::ControlModifier);
     press(Qt::Key_Delete);
     type(text);
-}
-
-void Operator::fill(const QString& name, const QString& text) {
-    put(name, text);
-    tab();
 }
 
 void Operator::type(const QString& text) {
@@ -243,7 +198,7 @@ void Operator::paste(const QString& text) {
 }
 
 void Operator::press(Qt::Key key, Qt::KeyboardModifiers modifiers) {
-    QTest::keyClick(keyWindow(), key, modifiers);
+    QTest::keyClick(here()->windowHandle(), key, modifiers);
     settle();
 }
 
@@ -253,7 +208,7 @@ void Operator::accelerator(QChar letter) {
 
 bool Operator::waitUntil(const std::function<bool()>& condition, const QString& what) {
     const bool came = QTest::qWaitFor(condition, Patience);
-    EXPECT_TRUE(came) << "in vain: " << plain(what);
+    EXPECT_TRUE(came) << "in vain: " << what.toStdString();
     return came;
 }
 

@@ -46,18 +46,20 @@ public:
         bool partly = false;                  ///< `text` is a part of the box's text
     };
     /// The next box that appears has to be this one; it gets the answer by a click on its button.
-    void expectBox(const Box& box);
+    void expectBox(const Box& box) { expected_.append(box); }
     /// Fails the test when an expected box has not come yet.
     void expectNoBoxesLeft();
 
     // Screens. What follows below acts on the modal window if there is one, else on the screen
-    // named last, else on the active window.
+    // named last.
 
     /// Waits until a window of that name is shown and turns to it.
     QWidget* screen(const QString& name);
     /// Runs the steps, once, when a window of that name is next shown.
-    void onScreen(const QString& name, const std::function<void()>& steps);
-    bool isShown(const QString& name) const;
+    void onScreen(const QString& name, const std::function<void()>& steps) {
+        awaited_.append({name, steps});
+    }
+    bool isShown(const QString& name) const { return shownWindow(name) != nullptr; }
     /// The window that takes the keys.
     QWidget* here() const;
 
@@ -79,11 +81,10 @@ public:
     }
 
     void click(const QString& name);
-    void doubleClick(const QString& name);
     /// Puts the text in the place of what the field holds and stays there.
     void put(const QString& name, const QString& text);
     /// The same, and leaves the field by Tab.
-    void fill(const QString& name, const QString& text);
+    void fill(const QString& name, const QString& text) { put(name, text), tab(); }
 
     // Keys, to the control that has the focus.
 
@@ -94,7 +95,6 @@ public:
     /// Alt and a letter; returns when the button is up again.
     void accelerator(QChar letter);
     void tab() { press(Qt::Key_Tab); }
-    void backtab() { press(Qt::Key_Backtab, Qt::ShiftModifier); }
     void enter() { press(Qt::Key_Return); }
     void escape() { press(Qt::Key_Escape); }
 
@@ -112,7 +112,7 @@ private:
         std::function<void()> steps;
     };
     [[noreturn]] void missing(const QString& name, const char* how) const;
-    QWindow* keyWindow() const;
+    static QWidget* shownWindow(const QString& name);
     void turnTo(QWidget* window);
     void clickOn(QWidget* control);
     void answer(const QPointer<QWidget>& shown);

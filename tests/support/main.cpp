@@ -5,7 +5,6 @@
 
 #include <QApplication>
 #include <QTemporaryDir>
-#include <cstdio>
 
 namespace {
 
@@ -20,18 +19,11 @@ void settleSurroundings(const QTemporaryDir& folder) {
     qputenv("ZELMARS_REGISTRY", path + "/registry");
 }
 
-/// Leaves out what a platform without a display says at each window.
-void report(QtMsgType, const QMessageLogContext&, const QString& message) {
-    if (!message.startsWith(QStringLiteral("This plugin does not support")))
-        std::fprintf(stderr, "%s\n", qUtf8Printable(message));
-}
-
 }  // namespace
 
 int main(int argc, char** argv) {
     const QTemporaryDir folder;
     settleSurroundings(folder);
-    qInstallMessageHandler(report);
     testing::InitGoogleTest(&argc, argv);
     QApplication application(argc, argv);
     QApplication::setQuitOnLastWindowClosed(false);
