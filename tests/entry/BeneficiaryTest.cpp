@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Who the document is for: the member by number or search, and the person of his family.
 #include "platform/com/Component.h"
-#include "platform/core/Clock.h"
 #include "tests/entry/EntryTest.h"
 
 using namespace Qt::StringLiterals;
@@ -15,7 +14,6 @@ using core::Icon;
 using forms::BackColor;
 using support::Operator;
 
-const QString Question = u"Quer ver o extrato de quotizações deste Associado?"_s;
 const Operator::Box NotEnrolled{.text = u"Este Associado não está inscrito no plano de Saúde."_s,
                                 .icon = Icon::Critical,
                                 .title = u"Zelmars"_s};
@@ -51,9 +49,8 @@ protected:
     }
 };
 
-TEST_F(Beneficiary, NumberChoosesIsHeldOrClearsTheMember) {
-    book.member({.no_kor = u"100020"_s, .zelmar = 0});
-    expectFormer();
+TEST_F(Beneficiary, NumberIsHeldWhenUnknownAndWhoIsNotEnrolledClearsTheMember) {
+    const qint64 other = book.member({.no_kor = u"100020"_s, .zelmar = 0});
     person.expectBox({.text = u"Número de Empresa não encontrado!"_s,
                       .icon = Icon::Critical,
                       .title = u"Associados"_s});
@@ -64,25 +61,11 @@ TEST_F(Beneficiary, NumberChoosesIsHeldOrClearsTheMember) {
     person.fill(u"No_Kor"_s, u"100020"_s);
     EXPECT_EQ(form().No_Kor->Text(), u"100020"_s);
     expectMember(0, "", "");
-    typeMember();
-    person.fill(u"No_Kor"_s, QString());
-    EXPECT_FALSE(form().No_Kor->hasFocus());
-    expectMember(0, "", "");
-}
 
-TEST_F(Beneficiary, SearchThatFindsNobodyOfThePlanClearsTheMember) {
-    search(0);  // given up
-    EXPECT_EQ(companions.calls, QStringList({u"Lumbra.Login(\"zelmars\", \"\")"_s,
-                                             u"Lumbra.appShow(\"SOC01\", false)"_s}));
-    expectFormer();
-    person.expectBox(NotEnrolled);
-    search(book.member({.no_kor = u"100020"_s, .zelmar = 0}));
-    EXPECT_EQ(form().No_Kor->Text(), QString());
-    expectMember(0, "", "");
     typeMember();
-    person.expectBox({.text = u"Este Associado não se encontra na tabela de activos."_s,
-                      .icon = Icon::Critical});
-    search(31000);
+    person.expectBox(NotEnrolled);
+    search(other);
+    EXPECT_EQ(form().No_Kor->Text(), QString()) << "a search wipes the number too";
     expectMember(0, "", "");
 }
 
@@ -97,7 +80,8 @@ TEST_F(Beneficiary, TypingResetsTheVatAndKeepsThePersonSearchingTheOtherWayRound
     EXPECT_EQ(form().Text10->Text(), u"0,00"_s);
 
     person.fill(u"Text11"_s, u"5"_s);
-    person.expectBox({.text = Question, .answer = Answer::Yes});
+    person.expectBox(
+        {.text = u"Quer ver o extrato de quotizações deste Associado?"_s, .answer = Answer::Yes});
     search(socio);
     expectMember(socio, "António Manuel Silva Matos", "");
     EXPECT_EQ(form().No_Kor->Text(), u"100015"_s);
@@ -113,50 +97,22 @@ TEST_F(Beneficiary, ArrearsWarnAndTheQuestionAlwaysFollows) {
         u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) desde "_s;
     const QString due =
         u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s;
-    // Today, the month and year paid up to, what is paid of 120, and the warning.
-    const std::tuple<QDate, int, int, int, QString> rows[] = {
-        {QDate(2026, 3, 15), 3, 2026, 120, {}},
-        {QDate(2026, 3, 15), 2, 2026, 120, {}},  // one month's delay is tolerated
-        {QDate(2026, 3, 15), 1, 2026, 120, arrears + u"1/2026."_s},
-        {QDate(2026, 3, 15), 3, 2025, 120, arrears + u"3/2025."_s},
-        {QDate(2026, 3, 15), 3, 2027, 120, arrears + u"3/2027."_s},
-        {QDate(2026, 3, 15), 2, 2026, 119, due},
-        {QDate(2026, 3, 15), 1, 2026, 119, arrears + u"1/2026."_s},
-        {QDate(2027, 1, 10), 12, 2026, 120, arrears + u"12/2026."_s},
+    // The month and year paid up to, what is paid of 120, and the warning.
+    const std::tuple<int, int, int, QString> rows[] = {
+        {2, 2026, 120, {}},  // one month's delay is tolerated
+        {1, 2026, 120, arrears + u"1/2026."_s},
+        {3, 2027, 120, arrears + u"3/2027."_s},
+        {2, 2026, 119, due},
     };
     const QString paidUpTo =
         u"update tbQuotas_Socios set total_quotas=120, ult_mes=%1, ult_ano=%2, total_pago=%3"_s;
-    for (const auto& [today, month, year, paid, warning] : rows) {
-        core::setToday(today);
+    for (const auto& [month, year, paid, warning] : rows) {
         book.exec(paidUpTo.arg(month).arg(year).arg(paid));
         if (!warning.isEmpty())
             person.expectBox({.text = warning, .icon = Icon::Critical, .title = u"Zelmars"_s});
         typeMember();
         person.expectNoBoxesLeft();
         EXPECT_EQ(form().Socio_ID, socio);
-    }
-    book.exec(u"delete from tbQuotas_Socios"_s);
-    person.expectBox({.text = u"Este Associado ainda não liquidou nenhum prémio de zelmar "
-                              "(quotizações do Plano de Saúde)."_s,
-                      .icon = Icon::Critical});
-    typeMember();
-    EXPECT_EQ(form().Socio_ID, socio);
-}
-
-TEST_F(Beneficiary, FaultyBankNumberWarnsAndOffersTheFile) {
-    book.exec(u"update tbSocios set nib = '00130000000000000018'"_s);
-    for (const bool typed : {true, false}) {
-        person.expectBox({.text = Question, .answer = Answer::No});
-        person.expectBox({.text = u"Este Associado tem especificado um NIB INVÁLIDO!"_s,
-                          .icon = Icon::Critical,
-                          .title = u"Zelmars"_s});
-        person.expectBox(
-            {.text = u"Quer abrir a ficha deste Associado para proceder a alterações?"_s,
-             .answer = Answer::Yes,
-             .icon = Icon::Question});
-        typed ? person.fill(u"No_Kor"_s, u"100015"_s) : search(socio);
-        EXPECT_EQ(companions.calls.last(),
-                  u"Tiqueta.AbrirRegisto(%1%2)"_s.arg(socio).arg(typed ? u" of 16 bits"_s : u""_s));
     }
 }
 
@@ -171,27 +127,20 @@ TEST_F(Beneficiary, PersonWhoIsRefusedOrNotChosenLeavesTheFormerOne) {
     expectFormer();
 }
 
-TEST_F(Beneficiary, CompanionsThatFailAnswerNonsenseOrAreMissingAreSaid) {
-    const std::tuple<QString, QString, QChar, Icon> rows[] = {
-        {u"Lumbra.General"_s, u"Lumbra.appShow"_s, u'P', Icon::None},
-        {u"Tiqueta.General"_s, u"Tiqueta.EscolherFamiliar"_s, u'I', Icon::Critical},
+TEST_F(Beneficiary, CompanionsThatAnswerNonsenseOrAreMissingAreSaid) {
+    const std::tuple<QString, QChar, Icon> rows[] = {
+        {u"Lumbra.General"_s, u'P', Icon::None},
+        {u"Tiqueta.General"_s, u'I', Icon::Critical},
     };
-    for (const auto& [name, member, key, icon] : rows) {
-        SCOPED_TRACE(name.toStdString());
-        const auto expectSaid = [&, key = key, icon = icon](const QString& text) {
+    companions.memberFound = companions.personChosen = u"abc"_s;
+    for (const auto& [name, key, icon] : rows) {
+        for (const QString& text : {QString(), name}) {
             person.expectBox({.text = text, .icon = icon, .partly = true});
             person.accelerator(key);
             person.expectNoBoxesLeft();
             expectFormer();
-        };
-        for (const QVariant& nonsense : {QVariant(), QVariant(u"abc"_s)}) {
-            companions.memberFound = companions.personChosen = nonsense;
-            expectSaid(QString());
+            com::registerRunning(name, {});
         }
-        companions.failing = member;
-        expectSaid(CompanionFailure.toString());
-        com::registerRunning(name, {});
-        expectSaid(name);
     }
 }
 

@@ -12,21 +12,13 @@ namespace entry {
 struct Companions {
     Companions();
     ~Companions();
-    /// Makes the one of that name available ("Lumbra"), or again what a test took away.
-    void offer(const QString& name);
 
-    /// Each call in its order: `Lumbra.appShow("SOC01", false)`; the advances of the progress
-    /// window are only counted.
+    /// Each call in its order: `Lumbra.appShow("SOC01", false)`; not the progress window's.
     QStringList calls;
     QVariant memberFound = 0;   ///< answer of the search
     QVariant personChosen = 0;  ///< answer of the member file
-    QString failing;            ///< a member that fails, as "Lumbra.appShow"
     int statementsOpen = 0;     ///< premium statements whose component is kept
-    int progress = 0;
 };
-
-/// The text with which a member named in Companions::failing fails.
-inline constexpr QStringView CompanionFailure = u"O componente avariou.";
 
 /// Stands in for any of the three; their members do not clash.
 class FakeCompanion : public QObject {
@@ -41,16 +33,13 @@ public:
                                  const QVariant& b = {}, const QVariant& c = {},
                                  const QVariant& d = {}, const QVariant& e = {},
                                  const QVariant& f = {});
-    Q_INVOKABLE void AbrirRegisto(const QVariant& id) { note("AbrirRegisto", {id}); }
     Q_INVOKABLE QVariant EscolherFamiliar(const QVariant& id) {
         note("EscolherFamiliar", {id});
         return all_.personChosen;
     }
-    Q_INVOKABLE void Iniciar(const QVariant& steps, const QString& text, const QString& title) {
-        note("Iniciar", {steps, text, title});
-    }
-    Q_INVOKABLE void setvalor(const QVariant& by) { all_.progress += by.toInt(); }
-    Q_INVOKABLE void terminar() { note("terminar", {}); }
+    Q_INVOKABLE void Iniciar(const QVariant&, const QString&, const QString&) {}
+    Q_INVOKABLE void setvalor(const QVariant&) {}
+    Q_INVOKABLE void terminar() {}
 
 private:
     void note(const char* member, const QVariantList& arguments);

@@ -97,14 +97,6 @@ void EntryTest::postAndLeave() {
     person.accelerator(u'O');
 }
 
-void EntryTest::cancelInto(QChar option) {
-    person.onScreen(u"frmMovimentosF"_s, [this, option] {
-        person.accelerator(option);
-        person.accelerator(u'O');
-    });
-    person.accelerator(u'C');
-}
-
 QVariant EntryTest::pending(const QString& column) const {
     return form().Adodc1->Recordset()->Collect(column);
 }
@@ -116,12 +108,6 @@ QString EntryTest::everything() {
     for (const QString& table : names.split(u'\n'))
         all << table << book.text(u"select * from "_s + table);
     return all.join(u'\n');
-}
-
-void EntryTest::failOn(const QString& write) {
-    book.exec(
-        u"create trigger avaria before %1 begin select raise(abort, 'disco cheio'); end"_s.arg(
-            write));
 }
 
 }  // namespace entry

@@ -38,16 +38,11 @@ protected:
 
     /// "&OK" and yes, up to what the posting says. On frmMovimentosF the person then leaves.
     void postAndLeave();
-    /// "&Cancelar" and, on frmMovimentosF, the option with that accelerator.
-    void cancelInto(QChar option);
 
     /// A value of the pending row.
     QVariant pending(const QString& column) const;
     /// Every row of every table.
     QString everything();
-    /// From here on that kind of write fails ("insert on tbCheques"), until mended.
-    void failOn(const QString& write);
-    void mend() { book.exec(QStringLiteral("drop trigger avaria")); }
 
     support::Book book;
     qint64 socio = 0;   ///< staff number 100015, in order in every respect

@@ -37,65 +37,50 @@ protected:
     }
 };
 
-TEST_F(Route, TheWayOutOffersFourOptionsAndClosingItLeaves) {
-    openNew();
-    person.expectBox({.text = u"Os extratos ainda não estão disponíveis nesta versão."_s,
-                      .icon = Icon::Information});
-    person.put(u"Text1"_s, u"31-02-2026"_s);  // a field that refuses does not hold "&Cancelar"
-    person.onScreen(u"frmMovimentosF"_s, [this] {
-        EXPECT_EQ(person.here()->windowTitle(), u"Sair de Lançamentos"_s);
-        const std::pair<const char*, const char*> options[] = {
-            {"Option2", "Continuar a registar com o mesmo &Associado"},
-            {"Option4", "&Continuar a registar com um novo Associado"},
-            {"Option3", "Imprimir &Extratos de Lançamentos"},
-            {"Option1", "&Sair"},
-        };
-        int above = 0;
-        for (const auto& [name, text] : options) {
-            auto* option = person.find<QRadioButton>(QString::fromLatin1(name));
-            EXPECT_EQ(option->text(), QString::fromUtf8(text));
-            EXPECT_EQ(option->isChecked(), qstrcmp(name, "Option2") == 0);
-            EXPECT_GT(option->y(), above);
-            above = option->y();
-        }
-        EXPECT_FALSE(form().isVisible());
-        person.accelerator(u'E');
-        person.accelerator(u'O');
-        EXPECT_TRUE(person.isShown(u"frmMovimentosF"_s)) << "statements leave the choice open";
-        person.accelerator(u'S');
-        person.accelerator(u'O');
-    });
-    person.accelerator(u'C');
-    expectNoScreen();
-
-    openNew();
-    person.onScreen(u"frmMovimentosF"_s, [this] { person.here()->close(); });
-    person.escape();  // as "&Cancelar"
-    expectNoScreen();
-}
-
-TEST_F(Route, NextEntryIsForTheSameMemberOrAnotherInTheSameForm) {
+TEST_F(Route, TheWayOutOffersFourOptions) {
+    const std::tuple<QString, QString, QChar> options[] = {
+        {u"Option2"_s, u"Continuar a registar com o mesmo &Associado"_s, u'A'},
+        {u"Option4"_s, u"&Continuar a registar com um novo Associado"_s, u'C'},
+        {u"Option3"_s, u"Imprimir &Extratos de Lançamentos"_s, u'E'},
+        {u"Option1"_s, u"&Sair"_s, u'S'},
+    };
     const QString before = everything();
-    for (const bool bHospital : {true, false}) {
-        SCOPED_TRACE(bHospital ? "hospital" : "document");
-        openNew(bHospital);
+    for (const auto& [name, text, key] : options) {
+        SCOPED_TRACE(text.toStdString());
+        openNew(true);
         typeMember();
         choosePerson(child);
         person.fill(u"Text6"_s, u"100"_s);
-        cancelInto(u'A');
-        expectNewEntry(bHospital, socio);
-        choosePerson(child);  // what came with the member is enough to go on with
-        EXPECT_EQ(pending(u"codABC"_s).toString(), u"C1"_s);
-        cancelInto(u'C');
-        expectNewEntry(bHospital, 0);
-        EXPECT_TRUE(form().No_Kor->hasFocus());
-        form().Unload();
+        person.put(u"Text1"_s, u"31-02-2026"_s);  // what refuses does not hold "&Cancelar"
+        person.onScreen(u"frmMovimentosF"_s, [&, name = name, text = text, key = key] {
+            EXPECT_FALSE(form().isVisible());
+            EXPECT_TRUE(person.find<QRadioButton>(u"Option2"_s)->isChecked());
+            EXPECT_EQ(person.find<QRadioButton>(name)->text(), text);
+            person.accelerator(key);
+            if (key == u'E')
+                person.expectBox(
+                    {.text = u"Os extratos ainda não estão disponíveis nesta versão."_s});
+            person.accelerator(u'O');
+            if (key == u'E') person.here()->close();  // statements leave the choice open
+        });
+        person.accelerator(u'C');
+        key == u'A'   ? expectNewEntry(true, socio)
+        : key == u'C' ? expectNewEntry(true, 0)
+                      : expectNoScreen();
+        if (forms::DefaultInstance<frmMovimentos>::isLoaded()) form().Unload();
         person.settle();
     }
-    openNew(true);
-    cancelInto(u'A');
-    expectNewEntry(false, 0);  // the same member without one
     EXPECT_EQ(everything(), before);
+}
+
+TEST_F(Route, NumberTypedButNeverAcceptedDoesNotTravelOn) {
+    book.premiumInOrder(book.member({.no_kor = u"100077"_s, .nome = u"Rui Sá"_s}));
+    openNew();
+    typeMember();
+    person.put(u"No_Kor"_s, u"100077"_s);
+    person.onScreen(u"frmMovimentosF"_s, [this] { person.enter(); });
+    person.escape();
+    expectNewEntry(false, socio);
 }
 
 TEST_F(Route, AnotherLoginOrOperationLeavesThePendingRowAndItPosts) {
@@ -128,27 +113,11 @@ TEST_F(Route, EntryThatCannotBeOpenedIsSaidAndLeavesNothingInTheWay) {
     typeMember();
     environment::dtZelmars::instance().MSAccess()->Close();
     person.expectBox({.icon = Icon::Critical, .partly = true});
-    cancelInto(u'A');
+    person.onScreen(u"frmMovimentosF"_s, [this] { person.enter(); });
+    person.accelerator(u'C');
     expectNoScreen();
     openView(key);
     EXPECT_TRUE(form().bShowing);
-}
-
-TEST_F(Route, SecondNewMovimentoReusesTheScreenOnAFreshRowAndTheMemberGoesOnAfterPosting) {
-    openNew();
-    typeDocument(u"87,35"_s, u"0"_s, u"23"_s);
-    const frmMovimentos* first = &form();
-    openNew();
-    EXPECT_EQ(&form(), first);
-    EXPECT_EQ(form().Text6->Text(), QString());
-    typeDocument(u"40"_s);
-    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = core::Answer::Yes});
-    person.onScreen(u"frmMovimentosF"_s, [this] { person.enter(); });
-    person.accelerator(u'O');
-    expectNewEntry(false, socio);
-    EXPECT_EQ(
-        book.text(u"select movimento_no, doc_valor, modo_pagamento from tbZelmar_Movimentos"_s),
-        u"1|40|TRF"_s);
 }
 
 }  // namespace
