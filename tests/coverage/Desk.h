@@ -14,11 +14,8 @@
 class FakeVorlane : public QObject {
     Q_OBJECT
 public:
-    FakeVorlane() { steps = 0; }
-    static inline int steps = 0;  ///< that the bar of the newest one went on
-
     Q_INVOKABLE void Iniciar(qint16, const QString&, const QString&) {}
-    Q_INVOKABLE void setvalor(qint16 by) { steps += by; }
+    Q_INVOKABLE void setvalor(qint16) {}
     Q_INVOKABLE void terminar() {}
 };
 
@@ -33,7 +30,7 @@ struct Document {
 };
 
 /// A place where documents are entered: a book with one member in order, both connections open on
-/// it, a progress window that only notes, a fixed day (15 May 2026) and operator ("operador").
+/// it, a progress window that shows nothing, a fixed day (15 May 2026) and operator ("operador").
 class Desk : public ::testing::Test {
 protected:
     Desk();

@@ -21,36 +21,40 @@ TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
         entry.record->setCollect(column, value);
     };
     put(u"recebido"_s, 5);
-    entry.bErroEntrada = true;
-    for (QString* text : {&entry.Text3, &entry.Text6, &entry.Text9}) text->clear();
+    for (QString* text :
+         {&entry.DataCombo1, &entry.Text3, &entry.Text6, &entry.Text9, &bill.DataCombo3,
+          &bill.Text7, &bill.Text1, &bill.Text5, &bill.DataCombo2})
+        text->clear();
     book.exec(u"update tbSocios set nib = null"_s);
     const QString none = core::DefaultTitle.toString();
-    const struct {
+    struct Fault {
         QString text;
-        Icon icon;
-        QString title;
         std::function<void()> mend;
-    } faults[] = {
-        {u"O valor recebido é maior que o valor do documento."_s, Icon::None, none,
-         [&] { put(u"recebido"_s, -0.01), put(u"incidencia"_s, {}); }},
-        {u"O valor recebido é inferior a 0."_s, Icon::None, none, [&] { put(u"recebido"_s, {}); }},
-        {u"O valor do documento é inferior a 0."_s, Icon::None, none,
-         [&] { put(u"doc_valor"_s, 0); }},
-        {u"Surgiu um erro grave durante a introdução dos dados no formulário, é aconcelhável que "
-         "recomece outro registo."_s,
-         Icon::Critical, caption, [&] { entry.bErroEntrada = false; }},
-        {u"Não foi atribuido nenhum código de familiar!"_s, Icon::Information, caption,
-         [&] { entry.Text3 = u"A"_s; }},
-        {u"Tem de indicar o valor de incidência!"_s, Icon::Information, caption,
-         [&] { put(u"incidencia"_s, 100); }},
-        {u"Tem de indicar um valor para o documento!"_s, Icon::Information, caption,
-         [&] { entry.Text6 = u"0"_s; }},
-        {u"Tem de indicar um valor para o campo Recebido!"_s, Icon::Information, caption,
-         [&] { entry.Text9 = u"100"_s; }},
-        {u"Este Associado não tem NIB!"_s, Icon::Critical, none,
-         [&] { book.exec(u"update tbSocios set nib = 'não é um número 1234'"_s); }},
-        {u"Este Associado tem especificado um NIB INVÁLIDO!"_s, Icon::Critical, none,
-         [&] { book.exec(u"update tbSocios set nib = 'não é um número 12345'"_s); }},
+        Icon icon = Icon::Information;
+        QString title = caption;
+    };
+    const Fault faults[] = {
+        {u"O valor recebido é maior que o valor do documento."_s,
+         [&] { put(u"recebido"_s, -0.01), put(u"incidencia"_s, {}); }, Icon::None, none},
+        {u"O valor recebido é inferior a 0."_s, [&] { put(u"recebido"_s, {}); }, Icon::None, none},
+        {u"O valor do documento é inferior a 0."_s, [&] { put(u"doc_valor"_s, 0); }, Icon::None,
+         none},
+        {u"Tem de Indicar uma rubrica!"_s, [&] { entry.DataCombo1 = u"01"_s; }},
+        {u"Não foi atribuido nenhum código de familiar!"_s, [&] { entry.Text3 = u"A"_s; }},
+        {u"Tem de indicar o valor de incidência!"_s, [&] { put(u"incidencia"_s, 100); }},
+        {u"Tem de indicar um valor para o documento!"_s, [&] { entry.Text6 = u"0"_s; }},
+        {u"Tem de indicar um valor para o campo Recebido!"_s, [&] { entry.Text9 = u"100"_s; }},
+        {u"Tem de indicar um modo de pagamento."_s, [&] { bill.DataCombo3 = u"TRF"_s; }},
+        {u"Tem de introduzir a data do registo."_s, [&] { bill.Text7 = u"15-05-2026"_s; }},
+        {u"Tem de introduzir a data do documento."_s, [&] { bill.Text1 = u"12-05-2026"_s; }},
+        {u"Tem de introduzir o número do documento."_s, [&] { bill.Text5 = u"1"_s; }},
+        {u"Tem de indicar um hospital."_s, [&] { bill.DataCombo2 = u"H01"_s; }},
+        {u"Este Associado não tem NIB!"_s,
+         [&] { book.exec(u"update tbSocios set nib = 'não é um número 1234'"_s); }, Icon::Critical,
+         none},
+        {u"Este Associado tem especificado um NIB INVÁLIDO!"_s,
+         [&] { book.exec(u"update tbSocios set nib = 'não é um número 12345'"_s); }, Icon::Critical,
+         none},
     };
     for (const auto& fault : faults) {
         EXPECT_FALSE(post(bill, {{.text = fault.text, .icon = fault.icon, .title = fault.title}}));
