@@ -31,25 +31,26 @@ void createBook(const QString& folder, const QString& catalogue);
 /// closed years. All dates derive from `asOf`, an invalid one being today: the same sizes and day
 /// give the same content. Fails, leaving the book as it was, if it has members already.
 ///
+// clang-format off
 /// Members at fixed numbers, for tests and documents:
 ///
-/// | no_kor | Member                     | What is particular |
-/// |--------|----------------------------|---------------------------------------------------------|
-/// | 100015 | António Manuel Silva Matos | all in order; spouse B, child C1 of 12 years | | 100023
-/// | Maria João Pires Teles     | no bank number                                          | |
-/// 100031 | José Carlos Lobo Nunes     | bank number of 20 characters                            |
-/// | 100049 | Ana Paula Reis Fonseca     | premium in arrears since five months ago | | 100057 |
-/// Rui Miguel Castro Vaz      | in his waiting period until 30 days from `asOf`; so are | | | | his
-/// spouse B and child C1                               | | 100065 | Helena Sofia Dias Couto    |
-/// not enrolled in the plan                                | | 100073 | Joaquim Alves Guerra |
-/// child C1 of 9132 days (refused), C2 of 9131 (accepted)  | | 100081 | Teresa Isabel Brito Faria
-/// | never paid a premium                                    | | 100099 | Fernando Jorge Melo Serra
-/// | paid up to this month, but less than is due             | | 100107 | Luísa Margarida Paz Leal
-/// | owes the plan 412,35 from the year before               |
+/// | no_kor | Member                     | What is particular                                            |
+/// |--------|----------------------------|---------------------------------------------------------------|
+/// | 100015 | António Manuel Silva Matos | all in order; spouse B, child C1 of 12 years                  |
+/// | 100023 | Maria João Pires Teles     | no bank number                                                |
+/// | 100031 | José Carlos Lobo Nunes     | bank number of 20 characters                                  |
+/// | 100049 | Ana Paula Reis Fonseca     | premium in arrears since five months ago                      |
+/// | 100057 | Rui Miguel Castro Vaz      | in his waiting period until 30 days from `asOf`, with B and C1 |
+/// | 100065 | Helena Sofia Dias Couto    | not enrolled in the plan                                      |
+/// | 100073 | Joaquim Alves Guerra       | child C1 of 9132 days (refused), C2 of 9131 (accepted)        |
+/// | 100081 | Teresa Isabel Brito Faria  | never paid a premium                                          |
+/// | 100099 | Fernando Jorge Melo Serra  | paid up to this month, but less than is due                   |
+/// | 100107 | Luísa Margarida Paz Leal   | owes the plan 412,35 from the year before                     |
 ///
 /// None of them but the last has a movement.
 void fillSample(const QString& folder, const QString& catalogue, const BookSizes& sizes = {},
                 QDate asOf = {});
+// clang-format on
 
 /// Writes the five values that every login reads, so that they name this book.
 void writeSettings(const QString& folder, const QString& catalogue);

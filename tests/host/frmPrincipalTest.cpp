@@ -62,24 +62,17 @@ private:
     }
 };
 
-class PrincipalWindow : public testing::Test {
+/// The book is filled before the window is made, which reads it at once.
+class FilledBook : public testing::Test {
 protected:
-    void SetUp() override {
-        forms::install();
-        com::registerRunning(u"Zelmars.General"_s, [] { return new Recorder; });
-        Recorder::calls.clear();
-        Recorder::failure.clear();
+    FilledBook() {
         member_ = book_.member({.no_kor = u"100015"_s, .nome = u"António Silva"_s});
         const qint64 other = book_.member({.no_kor = u"100023"_s, .nome = u"Inês Araújo"_s});
         book_.person({.socio_id = member_, .codABC = u"C1"_s, .nome = u"Rui Silva"_s});
         post(1, member_, "DOC", 87.35);
         post(2, other, "HOS", 12000);
         last_ = post(3, member_, "ANL", 5);
-        window_.show();
-        person_.screen(u"frmPrincipal"_s);
-        person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
     }
-    void TearDown() override { com::registerRunning(u"Zelmars.General"_s, {}); }
 
     qint64 post(int number, qint64 socio, const char* tipo, double value) {
         return book_.insert("tbZelmar_Movimentos", {{"movimento_no", number},
@@ -90,6 +83,24 @@ protected:
                                                     {"doc_no", u"FT %1"_s.arg(number)},
                                                     {"doc_valor", value}});
     }
+    support::Book book_;
+    qint64 member_ = 0;
+    qint64 last_ = 0;
+};
+
+class PrincipalWindow : public FilledBook {
+protected:
+    void SetUp() override {
+        forms::install();
+        com::registerRunning(u"Zelmars.General"_s, [] { return new Recorder; });
+        Recorder::calls.clear();
+        Recorder::failure.clear();
+        window_.show();
+        person_.screen(u"frmPrincipal"_s);
+        person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
+    }
+    void TearDown() override { com::registerRunning(u"Zelmars.General"_s, {}); }
+
     QString count() { return person_.find<QLabel>(u"Contagem"_s)->text(); }
     QString cell(int row, int column) {
         const auto* model = person_.find<QTableView>(u"Lista"_s)->model();
@@ -97,11 +108,8 @@ protected:
     }
     int rows() { return person_.find<QTableView>(u"Lista"_s)->model()->rowCount(); }
 
-    support::Book book_;
     support::Operator person_;
     host::frmPrincipal window_;
-    qint64 member_ = 0;
-    qint64 last_ = 0;
 };
 
 }  // namespace
@@ -119,9 +127,11 @@ TEST_F(PrincipalWindow, ShowsTheNewestFirstAsPeopleReadThem) {
 
 TEST_F(PrincipalWindow, FiltersWhileOneTypesAndOpensByEnter) {
     person_.type(u"ines"_s);
+    EXPECT_EQ(person_.find<QLineEdit>(u"Filtro"_s)->text(), u"ines"_s);
     EXPECT_EQ(rows(), 1);
     EXPECT_EQ(count(), u"1 de 3 movimentos"_s);
     person_.enter();
+    ASSERT_FALSE(Recorder::calls.isEmpty());
     EXPECT_EQ(Recorder::calls.last(), u"Registo %1"_s.arg(last_ - 1));
     EXPECT_EQ(Recorder::caller, &window_);
     person_.escape();
