@@ -42,7 +42,7 @@ bool Report::wanted(const QString& name) const {
 void Report::pair(const QString& name, double limit, int calls, const std::function<void()>& ours,
                   const std::function<void()>& bare) {
     if (!wanted(name)) return;
-    std::vector<double> ourTimes, bareTimes, ratios;
+    std::vector<double> ourTimes, bareTimes;
     timed(calls, ours);  // warm up
     timed(calls, bare);
     for (int round = 0; round < Rounds; ++round) {
@@ -53,9 +53,8 @@ void Report::pair(const QString& name, double limit, int calls, const std::funct
         if (!oursFirst) ourTime = timed(calls, ours);
         ourTimes.push_back(ourTime);
         bareTimes.push_back(bareTime);
-        ratios.push_back(ourTime / bareTime);
     }
-    add({name, u"ms"_s, middle(ourTimes), middle(bareTimes), middle(ratios), limit});
+    ratio(name, limit, ourTimes, bareTimes);
 }
 
 double Report::median(int calls, const std::function<void()>& work) const {
@@ -69,8 +68,12 @@ double Report::medianOf(int runs, const std::function<double()>& measure) const 
     return middle(values);
 }
 
-void Report::ratio(const QString& name, double limit, double ours, double bare) {
-    if (wanted(name)) add({name, u"ms"_s, ours, bare, ours / bare, limit});
+void Report::ratio(const QString& name, double limit, const std::vector<double>& ours,
+                   const std::vector<double>& bare) {
+    std::vector<double> ratios;
+    for (std::size_t round = 0; round < ours.size(); ++round)
+        ratios.push_back(ours[round] / bare[round]);
+    if (wanted(name)) add({name, u"ms"_s, middle(ours), middle(bare), middle(ratios), limit});
 }
 
 void Report::value(const QString& name, const QString& unit, double limit, double value) {

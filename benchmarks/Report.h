@@ -36,8 +36,10 @@ public:
     double median(int calls, const std::function<void()>& work) const;
     /// The median of what a measurement gives, after one run to warm up.
     double medianOf(int runs, const std::function<double()>& measure) const;
-    /// Holds the ratio of two times, measured one after the other, against the limit.
-    void ratio(const QString& name, double limit, double ours, double bare);
+    /// Times that were measured in turn, round by round: holds the median of the rounds' ratios
+    /// against the limit.
+    void ratio(const QString& name, double limit, const std::vector<double>& ours,
+               const std::vector<double>& bare);
 
     /// A value that was measured elsewhere.
     void value(const QString& name, const QString& unit, double limit, double value);

@@ -3,6 +3,8 @@
 #include <QApplication>
 #include <QElapsedTimer>
 #include <QEvent>
+#include <algorithm>
+#include <vector>
 
 #include "benchmarks/Benches.h"
 #include "benchmarks/Books.h"
@@ -57,17 +59,21 @@ double openEntry(General& general) {
 double medianOpening(Report& report, const Book& book) {
     use(book);
     General general;
-    return report.medianOf(15, [&] { return openEntry(general); });
+    return report.medianOf(7, [&] { return openEntry(general); });
 }
 
 }  // namespace
 
 void measureScreens(Report& report) {
     if (!report.wanted(u"NewMovimento"_s)) return;
-    const double onLarge = medianOpening(report, largeBook());
-    const double onSample = medianOpening(report, sampleBook());
+    std::vector<double> onLarge, onSample;
+    for (int round = 0; round < 5; ++round) {
+        onLarge.push_back(medianOpening(report, largeBook()));
+        onSample.push_back(medianOpening(report, sampleBook()));
+    }
     report.ratio(u"NewMovimento, large book against sample"_s, 1.3, onLarge, onSample);
-    report.value(u"NewMovimento, large book, painted"_s, u"ms"_s, 150, onLarge);
+    report.value(u"NewMovimento, large book, painted (slowest)"_s, u"ms"_s, 150,
+                 *std::max_element(onLarge.begin(), onLarge.end()));
 }
 
 }  // namespace benchmarks
