@@ -4,6 +4,8 @@
 #include <QBoxLayout>
 #include <QLabel>
 
+#include "platform/forms/SmallScreen.h"
+
 using namespace Qt::StringLiterals;
 
 namespace entry {
@@ -35,17 +37,7 @@ void frmMovimentosF::layOut() {
     for (forms::OptionButton* option : {Option2, Option4, Option3, Option1})
         options->addWidget(option);
 
-    auto* buttons = new QHBoxLayout;
-    buttons->addStretch(1);
-    buttons->addWidget(Command1);
-
-    auto* all = new QVBoxLayout(this);
-    all->setContentsMargins(12, 12, 12, 12);
-    all->setSpacing(10);
-    all->addWidget(frame);
-    all->addLayout(buttons);
-    Command1->setDefault(true);
-    setMinimumWidth(380);
+    forms::layOutSmallScreen(this, frame, Command1, 380);
 }
 
 void frmMovimentosF::Command1_Click() {

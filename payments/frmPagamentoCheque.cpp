@@ -5,6 +5,7 @@
 #include <QPointer>
 
 #include "payments/ChequeNumber.h"
+#include "platform/forms/SmallScreen.h"
 
 using namespace Qt::StringLiterals;
 
@@ -48,17 +49,7 @@ void frmPagamentoCheque::layOut() {
     number->addWidget(Command2);
     number->addWidget(Command3);
 
-    auto* buttons = new QHBoxLayout;
-    buttons->addStretch(1);
-    buttons->addWidget(Command1);
-
-    auto* all = new QVBoxLayout(this);
-    all->setContentsMargins(12, 12, 12, 12);
-    all->setSpacing(10);
-    all->addWidget(frame);
-    all->addLayout(buttons);
-    Command1->setDefault(true);
-    setMinimumWidth(320);
+    forms::layOutSmallScreen(this, frame, Command1, 320);
 }
 
 void frmPagamentoCheque::step(int by) {

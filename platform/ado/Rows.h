@@ -34,7 +34,6 @@ public:
     void takeAll();
     void toRow(qint64 row) { row_ = row; }
     Cell cellAt(qint64 row, int column) const { return store_->cell(row, column); }
-    RowIdentity identityAt(qint64 row) const { return store_->identity(row); }
 
 private:
     void take(qint64 most);
