@@ -41,7 +41,7 @@ core::Failure failureOfOpening(const QString& text) {
 
 TEST_F(Connections, SayWhatWasTriedAndNeverThePassword) {
     exec(u"CREATE ROLE fechado LOGIN PASSWORD 'outro'"_s);
-    const QString host = Server::instance().folder();
+    const QString host = support::Server::instance().folder();
     const auto at = [&](const QString& source) {
         return QString(connectionString(catalog, u"dono"_s))
             .replace(u"postgresql:"_s + host, source);
@@ -71,7 +71,7 @@ TEST_F(Connections, SayWhatWasTriedAndNeverThePassword) {
 }
 
 TEST_F(Connections, GiveUpOnAServerThatNeverAnswers) {
-    const QString host = Server::instance().folder();
+    const QString host = support::Server::instance().folder();
     sockaddr_un address{AF_UNIX, {}};
     const QByteArray path = host.toUtf8() + "/.s.PGSQL.5998";
     std::copy(path.begin(), path.end(), address.sun_path);

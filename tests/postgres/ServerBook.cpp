@@ -21,8 +21,8 @@ constexpr auto Tables = R"(
     CREATE VIEW vwMov AS SELECT tbMov.*, 'ACTIVO' AS ficheiro FROM tbMov;)";
 
 PGconn* connectOther(const QString& catalog) {
-    return PQsetdbLogin(Server::instance().folder().toUtf8(), nullptr, nullptr, nullptr,
-                        catalog.toUtf8(), Server::User, nullptr);
+    return PQsetdbLogin(support::Server::instance().folder().toUtf8(), nullptr, nullptr, nullptr,
+                        catalog.toUtf8(), support::Server::User, nullptr);
 }
 
 }  // namespace
@@ -46,12 +46,13 @@ QString ServerBook::connectionString(const QString& catalog, const QString& user
                                      const QString& provider) {
     return u"Provider=%1;Persist Security Info=True;User ID=%2;Password=segredo;"
            u"Initial Catalog=%3;Data Source=postgresql:%4;Connect Timeout=15"_s.arg(
-               provider, user, catalog, Server::instance().folder());
+               provider, user, catalog, support::Server::instance().folder());
 }
 
 ado::ConnectionPtr ServerBook::connect(int timeoutSeconds, const QString& provider) const {
     auto made = std::make_shared<ado::Connection>();
-    made->ConnectionString = connectionString(catalog, QString::fromLatin1(Server::User), provider);
+    made->ConnectionString =
+        connectionString(catalog, QString::fromLatin1(support::Server::User), provider);
     made->CommandTimeout = timeoutSeconds;
     made->Open();
     return made;

@@ -3,9 +3,9 @@
 
 #include <gtest/gtest.h>
 
-#include "Server.h"
 #include "platform/ado/Recordset.h"
 #include "platform/core/Failure.h"
+#include "tests/support/Server.h"
 
 struct pg_conn;
 

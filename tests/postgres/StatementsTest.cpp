@@ -16,7 +16,11 @@ protected:
         database::createBook(target());
     }
     database::ServerCatalogue target() const {
-        return {Server::instance().folder(), {}, QString::fromLatin1(Server::User), {}, catalog};
+        return {support::Server::instance().folder(),
+                {},
+                QString::fromLatin1(support::Server::User),
+                {},
+                catalog};
     }
 };
 

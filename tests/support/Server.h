@@ -5,6 +5,8 @@
 #include <QString>
 #include <QTemporaryDir>
 
+namespace support {
+
 /// A PostgreSQL server of this test run alone: a cluster in a temporary folder, reached through a
 /// socket there, gone with the program however that ends. Where no server is installed the run
 /// fails with a text that says so.
@@ -26,3 +28,5 @@ private:
     QTemporaryDir folder_;
     QProcess server_;
 };
+
+}  // namespace support

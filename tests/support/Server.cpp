@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "Server.h"
+#include "tests/support/Server.h"
 
 #include <pwd.h>
 #include <sys/prctl.h>
@@ -12,6 +12,8 @@
 #include <cstdlib>
 
 using namespace Qt::StringLiterals;
+
+namespace support {
 
 namespace {
 
@@ -93,3 +95,5 @@ void Server::start(QProcess& process, const QString& path, const QStringList& ar
     process.start(path, arguments);
     if (!process.waitForStarted()) giveUp(process.errorString());
 }
+
+}  // namespace support
