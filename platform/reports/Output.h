@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QString>
+
+#include "platform/ado/Recordset.h"
+#include "platform/reports/Pages.h"
+
+class QPainter;
+class QPrinter;
+
+/// The ways out of laid-out pages. Failures are core::Failure with a Portuguese text.
+namespace reports {
+
+/// Paints a page, `unitsPerMillimetre` being the painter's; the page's corner is the origin.
+void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMillimetre);
+
+/// Writes complete pages as PDF, fonts embedded. Fails, leaving no half file, when the file cannot
+/// be written.
+void writePdf(const Pages& pages, const QString& file);
+
+/// Prints pages `from`..`to` (counted from 0) on a printer that is set up.
+void print(const Pages& pages, QPrinter& printer, int from, int to);
+
+/// Sends complete pages to the default printer; without one, writes a PDF into the person's
+/// documents folder and says so in a box that names the file.
+void printUnasked(const Pages& pages);
+
+/// The rows as a text that spreadsheets open: semicolons, decimal comma, UTF-8 with a mark. One
+/// line with the columns that the report shows, one for each detail row; of a report with groups
+/// the group's columns stand first. The rows are passed from the first on.
+void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file);
+
+}  // namespace reports

@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/ado/Recordset.h"
+#include "platform/forms/Form.h"
+#include "platform/reports/Report.h"
+
+namespace reports {
+
+/// The preview of a report: pages as they will be printed, one at a time or one below the other;
+/// zoom, find, print, PDF, CSV; all of it by keyboard. The first page shows as soon as it is laid
+/// out; the others follow while the window is in use. Closing it stops the layout.
+///
+/// A failure of the rows or of the layout is shown in a box; the pages laid out until then stay.
+class Preview : public forms::Form {
+    Q_OBJECT
+public:
+    Preview(const Report& report, const ado::RecordsetPtr& rows);
+    ~Preview() override;
+
+private:
+    struct Implementation;
+    std::unique_ptr<Implementation> d;
+};
+
+}  // namespace reports
