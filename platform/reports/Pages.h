@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QByteArray>
 #include <QRectF>
 #include <QString>
 #include <vector>
@@ -13,20 +14,21 @@ namespace reports {
 /// page's upper left corner.
 struct TextRun {
     QPointF baseline;  ///< where the first letter stands
-    double width;      ///< of the text as measured
-    QString text;      ///< with the number of pages still as %P: see Pages::text
+    double width = 0;  ///< of the text as measured
+    QString text;
     Style style;
+    bool open = false;  ///< the number of pages is still missing: see Pages::resolved
 };
 
 struct Line {
     QLineF line;
-    double width;
+    double width = 0;
 };
 
 struct Box {
     QRectF rect;
-    bool shaded;
-    bool framed;
+    bool shaded = false;
+    bool framed = false;
 };
 
 /// What stands on a page, in painting order: boxes, lines, texts.
@@ -36,25 +38,26 @@ struct Page {
     std::vector<TextRun> texts;
 };
 
-/// The pages laid out so far.
+/// The pages laid out so far, packed, so that thousands of them take little memory.
 class Pages {
 public:
     QString caption;  ///< of the report
 
     int count() const { return static_cast<int>(pages_.size()); }
-    const Page& at(int page) const { return pages_[static_cast<size_t>(page)]; }
+    /// Unpacks a page (a fraction of a millisecond); keep it while working with its texts.
+    Page at(int page) const;
     /// True when no page is to come; the number of pages is known from then on.
     bool isComplete() const { return complete_; }
 
-    /// A run with the number of pages filled in ("…" while it is not known) and, where that makes
-    /// the text wider, moved as its alignment wants.
+    /// A run with the number of pages filled in ("…" while it is not known), moved as its alignment
+    /// wants. Other runs as they are.
     TextRun resolved(const TextRun& run) const;
 
-    void add(Page page) { pages_.push_back(std::move(page)); }
+    void add(const Page& page);
     void complete() { complete_ = true; }
 
 private:
-    std::vector<Page> pages_;
+    std::vector<QByteArray> pages_;
     bool complete_ = false;
 };
 

@@ -20,10 +20,12 @@ struct Style {
     bool bold = false;
     bool italic = false;
     Align align = Align::Left;
+
+    bool operator==(const Style&) const = default;
 };
 
 /// A fixed text. In it %D is the day of printing in long form, %p the page's number, %P the number
-/// of pages.
+/// of pages, %% a percent sign.
 struct Label {
     QString name;  ///< for captions that are set at run time; empty where none is
     QRectF box;
