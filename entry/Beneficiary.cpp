@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "entry/Beneficiary.h"
 
-#include "boundary/environment/LoginState.h"
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
+#include "data/MemberSearch.h"
 #include "data/modDlookup.h"
 #include "platform/core/Clock.h"
 #include "platform/core/MsgBox.h"
@@ -122,13 +122,6 @@ ado::RecordsetPtr openMemberById(qint32 socio_id) {
     return openRead(u"select * from tbsocios where socio_id ="_s + QString::number(socio_id));
 }
 
-com::Object openSearch() {
-    const environment::LoginState& login = environment::loginState();
-    const com::Object search = com::createObject(u"Lumbra.General"_s);
-    search.call(u"Login"_s, {login.dtUser, login.dtPassword});
-    return search;
-}
-
 bool checkEnrolled(const ado::Recordset& member) {
     if (core::compareNumbers(member.Collect(u"zelmar"_s), 0) != 0) return true;
     MsgBox(u"Este Associado não está inscrito no plano de Saúde."_s, Icon::Critical);
@@ -149,7 +142,7 @@ com::Object testPremium(qint32 socio_id) {
     if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
                u"Quotizações"_s, Buttons::YesNo) != Answer::Yes)
         return {};
-    const com::Object statement = openSearch();
+    const com::Object statement = data::openSearch();
     statement.call(u"appShow"_s, {u"QUO01"_s, 1, QVariant(), u"Activos"_s,
                                   u"tbQuotas_Movimentos.socio_id="_s + id, true, true});
     return statement;

@@ -15,9 +15,6 @@ namespace entry {
 ado::RecordsetPtr openMemberByNumber(const QString& no_kor);
 ado::RecordsetPtr openMemberById(qint32 socio_id);
 
-/// The search component, logged in.
-com::Object openSearch();
-
 /// True when the member's row says that he is enrolled in the plan; otherwise says so to the
 /// operator.
 bool checkEnrolled(const ado::Recordset& member);

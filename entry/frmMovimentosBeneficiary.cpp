@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Who the document is for: the member by number or by search, and the person of his family.
+#include "data/MemberSearch.h"
 #include "entry/Beneficiary.h"
 #include "entry/frmMovimentos.h"
 #include "platform/core/Failure.h"
@@ -63,8 +64,8 @@ void frmMovimentos::Command1_Click() {
 }
 
 void frmMovimentos::searchMember() {
-    search_ = openSearch();
-    const qint32 id = core::toLong(search_.call(u"appShow"_s, {u"SOC01"_s, false}));
+    search_ = data::openSearch();
+    const qint32 id = data::chooseMember(search_);
     if (id == 0) return;
     const ado::RecordsetPtr member = openMemberById(id);
     if (member->atEnd()) {
