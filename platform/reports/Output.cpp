@@ -1,0 +1,85 @@
+// SPDX-License-Identifier: MIT
+#include "platform/reports/Output.h"
+
+#include <QPageSize>
+#include <QPainter>
+#include <QPdfWriter>
+#include <QSaveFile>
+
+#include "platform/core/Failure.h"
+#include "platform/reports/Typesetting.h"
+
+using namespace Qt::StringLiterals;
+
+namespace reports {
+
+namespace {
+
+constexpr double FrameWidth = 0.2;  // millimetres
+
+QPen penOf(double millimetres) {
+    return {Qt::black, millimetres * UnitsPerMillimetre, Qt::SolidLine, Qt::FlatCap, Qt::MiterJoin};
+}
+
+QRectF inUnits(const QRectF& rect) {
+    return {rect.topLeft() * UnitsPerMillimetre, rect.size() * UnitsPerMillimetre};
+}
+
+/// The painter's unit is 1/1200 inch.
+void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces) {
+    for (const Box& box : page.boxes) {
+        painter.setPen(box.framed ? penOf(FrameWidth) : QPen(Qt::NoPen));
+        painter.setBrush(box.shaded ? QColor(0xe4, 0xe4, 0xe4) : QColor(Qt::transparent));
+        painter.drawRect(inUnits(box.rect));
+    }
+    for (const Line& line : page.lines) {
+        painter.setPen(penOf(line.width));
+        painter.drawLine(line.line.p1() * UnitsPerMillimetre, line.line.p2() * UnitsPerMillimetre);
+    }
+    painter.setPen(Qt::black);
+    const Face* face = nullptr;
+    for (const TextRun& each : page.texts) {
+        const TextRun run = pages.resolved(each);
+        if (!face || face->style != run.style) {
+            face = &faces.of(run.style);
+            painter.setFont(face->font);
+        }
+        painter.drawText(run.baseline * UnitsPerMillimetre, run.text);
+    }
+}
+
+}  // namespace
+
+void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMillimetre) {
+    Faces faces;
+    painter.save();
+    painter.scale(unitsPerMillimetre / UnitsPerMillimetre, unitsPerMillimetre / UnitsPerMillimetre);
+    paint(painter, pages, pages.at(page), faces);
+    painter.restore();
+}
+
+void writePdf(const Pages& pages, const QString& file) {
+    QSaveFile out(file);
+    bool done = out.open(QIODevice::WriteOnly);
+    if (done) {
+        QPdfWriter writer(&out);
+        writer.setResolution(1200);
+        writer.setPageSize(QPageSize(QPageSize::A4));
+        writer.setPageMargins({});
+        writer.setTitle(pages.caption);
+        writer.setCreator(u"Zelmars"_s);
+        QPainter painter;
+        Faces faces;
+        done = painter.begin(&writer);
+        for (int page = 0; done && page < pages.count(); ++page) {
+            if (page > 0) writer.newPage();
+            paint(painter, pages, pages.at(page), faces);
+        }
+        painter.end();
+    }
+    if (!done || !out.commit())
+        throw core::Failure(core::InvalidCall,
+                            u"Não foi possível escrever «%1»: %2"_s.arg(file, out.errorString()));
+}
+
+}  // namespace reports

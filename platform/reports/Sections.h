@@ -1,0 +1,58 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "platform/ado/Recordset.h"
+#include "platform/reports/Report.h"
+#include "platform/reports/Tallies.h"
+#include "platform/reports/Typesetting.h"
+
+/// Sections made ready to be printed many times: what stays the same is set once, columns are
+/// looked up once.
+namespace reports {
+
+/// The columns that sections use of one row set, and their values in its current row.
+class RowValues {
+public:
+    /// The place of a column's value; the column is looked up later.
+    size_t place(const QString& column);
+    /// Fails with NoSuchItem and the name of a column that the rows do not have.
+    void lookUp(ado::Recordset& rows);
+    void read(const ado::Recordset& rows, qint64 row);
+
+    const std::vector<QVariant>& values() const { return values_; }
+
+private:
+    QStringList names_;
+    std::vector<int> columns_;
+    std::vector<QVariant> values_;
+};
+
+/// Which figures a section shows.
+enum class Over { Report, Group };
+
+class PreparedSection {
+public:
+    /// @param row      what the fields are read from
+    /// @param details  what the totals are taken over
+    PreparedSection(const Section& section, Over over, Faces& faces, RowValues& row,
+                    RowValues& details, Tallies& tallies);
+
+    double height() const { return height_; }
+    /// Prints the section at that height of the page, which is the `number`th, counted from 1.
+    void print(Page& page, double top, int number) const;
+
+private:
+    double height_;
+    Over over_;
+    Faces& faces_;
+    const RowValues& row_;
+    const Tallies& tallies_;
+    Page fixed_;  ///< from the section's upper edge
+    std::vector<Label> numbered_;
+    std::vector<std::pair<Field, size_t>> fields_;
+    std::vector<std::pair<Total, size_t>> totals_;
+};
+
+}  // namespace reports
