@@ -12,8 +12,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// Seconds beyond the server's own time-out after which a server counts as gone.
-constexpr int Grace = 3;
+/// A server that is silent for the whole time-out counts as gone, but not before these seconds.
+constexpr int LeastPatience = 4;
 constexpr int OldestServer = 140000;
 /// Statements that stay prepared; more than these and all are prepared anew.
 constexpr int PreparedStatements = 128;
@@ -135,9 +135,10 @@ void PostgresHandle::settle(Role role) {
 void PostgresHandle::setTimeout(int seconds) {
     if (seconds == timeout_) return;
     timeout_ = seconds;
-    // 0 would be no limit at all.
-    send("SET lock_timeout = " + QByteArray::number(qMax(1, seconds * 1000)));
-    send("SET statement_timeout = " + QByteArray::number(seconds * 1000 + 1000));
+    // The server's own limits, in milliseconds, end a little before anybody takes it for gone. 0
+    // would be no limit at all.
+    send("SET lock_timeout = " + QByteArray::number(qMax(1, seconds * 950)));
+    send("SET statement_timeout = " + QByteArray::number(qMax(1, seconds * 975)));
 }
 
 bool PostgresHandle::isLost() {
@@ -148,79 +149,122 @@ bool PostgresHandle::isLost() {
     return lost_;
 }
 
-PostgresResult PostgresHandle::run(const QByteArray& text, const PostgresValues& values) {
-    drain();
-    const int count = dispatch(text, values);
+PostgresResult PostgresHandle::run(const std::vector<PostgresCall>& calls) {
+    requireConnection();
+    int count = 0;
+    for (const PostgresCall& call : calls) count += dispatch(call);
+    try {
+        return committed(count);
+    } catch (const core::Failure&) {
+        // Which of them the server knows by now nobody can tell; a table may have been altered.
+        for (const PostgresCall& call : calls) forget(call.text);
+        throw;
+    }
+}
+
+PostgresResult PostgresHandle::runOnce(const QByteArray& text) {
+    requireConnection();
+    return committed(dispatch(text));
+}
+
+PostgresResult PostgresHandle::committed(int count) {
     synchronise();
+    drain(1);
     PostgresResult result = answers(count);
-    drain();
-    if (!isFailure(result.get())) return result;
-    const bool isNew = count > 1;
-    if (isNew) prepared_.remove(text);
-    refuse(result.get());
+    drain(0);
+    if (isFailure(result.get())) refuse(result.get());
+    return result;
 }
 
-void PostgresHandle::send(const QByteArray& text, const PostgresValues& values) {
-    dispatch(text, values);
+void PostgresHandle::send(const PostgresCall& call) {
+    dispatch(call);
     synchronise();
 }
 
-PostgresResult PostgresHandle::runOpen(const std::vector<QByteArray>& texts) {
-    drain();
-    for (const QByteArray& text : texts) dispatch(text, {});
+void PostgresHandle::send(const QByteArray& text) {
+    dispatch(text);
+    synchronise();
+}
+
+void PostgresHandle::ask(const std::vector<QByteArray>& texts) {
+    if (asked_ > 0) answer();
+    requireConnection();
+    for (const QByteArray& text : texts) asked_ += dispatch(text);
     PQsendFlushRequest(connection_);
-    PostgresResult result = answers(static_cast<int>(texts.size()));
+    PQflush(connection_);
+}
+
+PostgresResult PostgresHandle::answer() {
+    drain(0);
+    PostgresResult result = answers(asked_);
+    asked_ = 0;
     if (!isFailure(result.get())) return result;
     synchronise();
     send("ROLLBACK");
     refuse(result.get());
 }
 
-int PostgresHandle::dispatch(const QByteArray& text, const PostgresValues& values) {
-    if (values.empty()) {
-        PQsendQueryParams(connection_, text, 0, nullptr, nullptr, nullptr, nullptr, 0);
-        return 1;
-    }
+void PostgresHandle::finish() {
+    // A statement that nobody waited for may fail and would take the next one with it.
+    if (asked_ > 0) synchronise();
+    send("COMMIT");
+}
+
+int PostgresHandle::dispatch(const QByteArray& text) {
+    PQsendQueryParams(connection_, text, 0, nullptr, nullptr, nullptr, nullptr, 0);
+    return 1;
+}
+
+int PostgresHandle::dispatch(const PostgresCall& call) {
     int count = 1;
     if (prepared_.size() >= PreparedStatements) {
         prepared_.clear();
-        PQsendQueryParams(connection_, "DEALLOCATE ALL", 0, nullptr, nullptr, nullptr, nullptr, 0);
-        ++count;
+        count += dispatch("DEALLOCATE ALL");
     }
-    QByteArray& name = prepared_[text];
+    QByteArray& name = prepared_[call.text];
     if (name.isEmpty()) {
         name = 's' + QByteArray::number(++lastPrepared_);
-        PQsendPrepare(connection_, name, text, 0, nullptr);
+        PQsendPrepare(connection_, name, call.text, 0, nullptr);
         ++count;
     }
-    PQsendQueryPrepared(connection_, name, static_cast<int>(values.size()), pointers(values).data(),
-                        nullptr, nullptr, 0);
+    PQsendQueryPrepared(connection_, name, static_cast<int>(call.values.size()),
+                        pointers(call.values).data(), nullptr, nullptr, 0);
     return count;
+}
+
+void PostgresHandle::forget(const QByteArray& text) {
+    const QByteArray name = prepared_.take(text);
+    if (!name.isEmpty()) send("DEALLOCATE " + name);
 }
 
 void PostgresHandle::synchronise() {
     PQpipelineSync(connection_);
     PQflush(connection_);
     ++unread_;
+    asked_ = 0;
 }
 
-/// Reads what earlier statements still answer.
-void PostgresHandle::drain() {
+void PostgresHandle::requireConnection() {
     if (lost_) lose(u"a ligação foi fechada."_s);
-    startClock();
-    while (unread_ > 0) {
+}
+
+/// Reads what earlier statements still answer, up to the last so many synchronisations.
+void PostgresHandle::drain(int but) {
+    requireConnection();
+    deadline_.setRemainingTime(patience() * 1000);
+    while (unread_ > but) {
         const PostgresResult result(take());
         if (PQresultStatus(result.get()) == PGRES_PIPELINE_SYNC) --unread_;
     }
 }
 
-void PostgresHandle::startClock() {
-    deadline_.setRemainingTime((qMax(timeout_, 0) + Grace) * 1000);
+/// Seconds after which a silent server counts as gone.
+int PostgresHandle::patience() const {
+    return qMax(timeout_, LeastPatience);
 }
 
 /// The answer of the last of so many statements, or of the first one that failed.
 PostgresResult PostgresHandle::answers(int count) {
-    startClock();
     PostgresResult result;
     for (; count > 0; --count) {
         PostgresResult next(take());
@@ -248,7 +292,7 @@ void PostgresHandle::wait() {
         throw core::Failure(
             core::DatabaseFailure,
             u"O servidor de «%1» não respondeu em %2 segundos; a ligação foi fechada."_s.arg(place_)
-                .arg(qMax(timeout_, 0) + Grace),
+                .arg(patience()),
             QString::fromLatin1(NoAnswer));
     }
     if (!PQconsumeInput(connection_)) lose(oneLine(PQerrorMessage(connection_)));

@@ -35,6 +35,12 @@ using PostgresResult = std::unique_ptr<PGresult, PostgresClear>;
 /// Parameters as text; nothing for null.
 using PostgresValues = std::vector<std::optional<QByteArray>>;
 
+/// A statement with the values of its parameters.
+struct PostgresCall {
+    QByteArray text;
+    PostgresValues values;
+};
+
 /// One connection to a server. No call waits longer than its time-out, also when the server stops
 /// answering. Failures carry the server's text and its SQLSTATE.
 ///
@@ -54,25 +60,40 @@ public:
     /// True when the connection is of no use any more.
     bool isLost();
 
-    /// Runs one statement and commits it. One with values stays prepared.
-    PostgresResult run(const QByteArray& text, const PostgresValues& values = {});
-    /// The same without waiting for the answer, which nobody sees.
-    void send(const QByteArray& text, const PostgresValues& values = {});
-    /// Runs statements in one round trip, without a commit; gives the answer of the last one. After
-    /// a failure nothing of the transaction is left.
-    PostgresResult runOpen(const std::vector<QByteArray>& texts);
+    /// Runs statements in one round trip and commits them; gives the answer of the last one. They
+    /// stay prepared.
+    PostgresResult run(const std::vector<PostgresCall>& calls);
+    PostgresResult run(const QByteArray& text, const PostgresValues& values = {}) {
+        return run(std::vector<PostgresCall>{{text, values}});
+    }
+    /// Runs one statement that will hardly come again, and commits it.
+    PostgresResult runOnce(const QByteArray& text);
+    /// Sends a statement and commits it, without waiting for the answer, which nobody sees.
+    void send(const PostgresCall& call);
+    void send(const QByteArray& text);
+
+    /// Sends statements of an open transaction; answer() waits for the last one's answer. One that
+    /// nobody waited for is dropped. After a failure nothing of the transaction is left.
+    void ask(const std::vector<QByteArray>& texts);
+    PostgresResult answer();
+    /// Ends the open transaction, without waiting.
+    void finish();
 
 private:
     void connect(const PostgresAddress& address);
     void settle(Role role);
-    /// Gives the number of answers that will come.
-    int dispatch(const QByteArray& text, const PostgresValues& values);
+    /// Both give the number of answers that will come.
+    int dispatch(const QByteArray& text);
+    int dispatch(const PostgresCall& call);
+    void forget(const QByteArray& text);
     void synchronise();
-    void drain();
+    void drain(int but);
     PGresult* take();
     void wait();
-    void startClock();
+    int patience() const;
+    void requireConnection();
     PostgresResult answers(int count);
+    PostgresResult committed(int count);
     [[noreturn]] void refuse(const PGresult* result);
     [[noreturn]] void lose(const QString& text, const QString& code = QStringLiteral("08006"));
 
@@ -81,6 +102,7 @@ private:
     bool lost_ = false;
     int timeout_ = -1;
     int unread_ = 0;  ///< synchronisations whose answers nobody has read
+    int asked_ = 0;   ///< statements that answer() waits for
     QDeadlineTimer deadline_;
     QHash<QByteArray, QByteArray> prepared_;  ///< names by text
     int lastPrepared_ = 0;

@@ -55,24 +55,26 @@ private:
 }  // namespace
 
 std::unique_ptr<RowLock> PostgresSession::lock(const QString& table, RowIdentity row,
-                                               int timeoutSeconds) {
+                                               int timeoutSeconds, RowStore& into) {
     const QByteArray key = keyOf(table, row);
     auto lock = std::make_unique<AdvisoryLock>(shared_from_this(), key);
     if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
     setTimeout(timeoutSeconds);
-    takeLock(table, row, key);
+    const PostgresCall fresh = selectRow(table, row);
+    PostgresHandle& handle = writer();
+    // From here on the row is let go whatever happens.
     lock->taken();
-    return lock;
-}
-
-void PostgresSession::takeLock(const QString& table, RowIdentity row, const QByteArray& key) {
+    locked_.insert(key);
     try {
-        writer().run(Take, {key});
+        // The second statement sees what was stored until the first one had the row.
+        const PostgresResult found = handle.run({{Take, {key}}, fresh});
+        append(found.get(), row, into);
     } catch (const core::Failure& failure) {
         if (failure.code() != LockNotAvailable) throw;
+        lock.reset();
         refuseRow(table, row, holderOf(key));
     }
-    locked_.insert(key);
+    return lock;
 }
 
 QString PostgresSession::holderOf(const QByteArray& key) {
@@ -84,7 +86,7 @@ QString PostgresSession::holderOf(const QByteArray& key) {
 void PostgresSession::unlock(const QByteArray& key) noexcept {
     locked_.remove(key);
     try {
-        if (writer_ && !writer_->isLost()) writer_->send(LetGo, {key});
+        if (writer_ && !writer_->isLost()) writer_->send({LetGo, {key}});
     } catch (const std::exception&) {
         // Without the connection the server has let go already.
     }

@@ -11,27 +11,35 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// Rows of the first batch; a set with fewer is here with one round trip.
-constexpr int FirstRows = 64;
-constexpr int LaterRows = 1000;
-
 // Most statements give few rows: those are asked for at once, without a cursor.
 constexpr auto OnlyFirst = " LIMIT 64";
 
 constexpr auto Begin = "BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY";
 constexpr auto FetchFirst = "FETCH 64 FROM linhas";
 constexpr auto FetchLater = "FETCH 1000 FROM linhas";
+// Rows that were asked for ahead wait on the server until somebody wants them, maybe over lunch.
+constexpr auto NoTimeout = "SET LOCAL statement_timeout = 0";
+
+/// True when a statement may say by itself how many rows it wants.
+bool limits(const Statement& statement) {
+    for (int i = 0; i < statement.count(); ++i)
+        if (statement.is(i, "limit"_L1) || statement.is(i, "fetch"_L1) ||
+            statement.is(i, "offset"_L1) || statement.is(i, "for"_L1))
+            return true;
+    return false;
+}
 
 }  // namespace
 
-PostgresPass::PostgresPass(std::shared_ptr<PostgresSession> session, const QByteArray& statement,
-                           bool withIdentity, bool limits)
-    : session_(std::move(session)),
-      reader_(session_->takeReader()),
-      declare_("DECLARE linhas NO SCROLL CURSOR FOR " + statement),
-      withIdentity_(withIdentity) {
+PostgresPass::PostgresPass(std::shared_ptr<PostgresSession> session, const Statement& statement,
+                           bool withIdentity)
+    : session_(std::move(session)), reader_(session_->takeReader()), withIdentity_(withIdentity) {
     try {
-        if (limits || !isShort(statement)) fetchFirst({Begin});
+        if (limits(statement) || !isShort(statement)) {
+            declare_ = "DECLARE linhas NO SCROLL CURSOR FOR " +
+                       session_->translated(statement, withIdentity);
+            fetchFirst(Begin);
+        }
     } catch (...) {
         session_->giveBack(std::move(reader_));
         throw;
@@ -39,21 +47,19 @@ PostgresPass::PostgresPass(std::shared_ptr<PostgresSession> session, const QByte
     describeColumns();
 }
 
-bool PostgresPass::isShort(const QByteArray& statement) {
-    batch_ = reader_->run(statement + OnlyFirst);
-    if (PQntuples(batch_.get()) == FirstRows) return false;
+bool PostgresPass::isShort(const Statement& statement) {
+    batch_ = session_->firstRows(*reader_, statement, withIdentity_, OnlyFirst);
+    if (count() == FirstRows) return false;
     session_->giveBack(std::move(reader_));
     return true;
 }
 
-void PostgresPass::fetchFirst(const std::vector<QByteArray>& before) {
-    std::vector<QByteArray> texts = before;
-    texts.push_back(declare_);
-    texts.push_back(FetchFirst);
-    batch_ = reader_->runOpen(texts);
+void PostgresPass::fetchFirst(const QByteArray& before) {
+    reader_->ask({before, declare_, FetchFirst});
+    batch_ = reader_->answer();
     row_ = -1;
     first_ = true;
-    if (PQntuples(batch_.get()) < FirstRows) release();
+    if (count() < FirstRows) release();
 }
 
 void PostgresPass::describeColumns() {
@@ -72,20 +78,22 @@ int PostgresPass::indexOf(QStringView name) const {
 }
 
 bool PostgresPass::step() {
-    if (row_ + 1 < PQntuples(batch_.get())) {
+    if (row_ + 1 < count()) {
         ++row_;
         return true;
     }
-    const bool last = !reader_ || (!first_ && PQntuples(batch_.get()) < LaterRows);
-    if (last) return false;
-    batch_ = reader_->runOpen({FetchLater});
+    if (isWhole()) return false;
+    if (first_) reader_->ask({NoTimeout, FetchLater});
+    batch_ = reader_->answer();
     first_ = false;
     row_ = 0;
-    return PQntuples(batch_.get()) > 0;
+    if (!isWhole()) reader_->ask({FetchLater});
+    return count() > 0;
 }
 
 Cell PostgresPass::cell(int column) const {
-    return cellOf(batch_.get(), row_, places_[static_cast<std::size_t>(column)]);
+    const auto at = static_cast<std::size_t>(column);
+    return cellOf(batch_.get(), row_, places_[at], columns_[at].type);
 }
 
 RowIdentity PostgresPass::identity() const {
@@ -96,12 +104,12 @@ void PostgresPass::restart() {
     if (first_)
         row_ = -1;
     else
-        fetchFirst({"CLOSE linhas"});
+        fetchFirst("CLOSE linhas");
 }
 
 void PostgresPass::release() {
     if (!reader_) return;
-    reader_->send("COMMIT");
+    reader_->finish();
     session_->giveBack(std::move(reader_));
 }
 

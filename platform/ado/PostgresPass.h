@@ -9,10 +9,9 @@ namespace ado {
 /// a reader of its own.
 class PostgresPass final : public Pass {
 public:
-    /// `withIdentity`: the row identity stands before the statement's columns. `limits`: the
-    /// statement says itself how many rows it wants.
-    PostgresPass(std::shared_ptr<PostgresSession> session, const QByteArray& statement,
-                 bool withIdentity, bool limits);
+    /// `withIdentity`: the row identity stands before the statement's columns.
+    PostgresPass(std::shared_ptr<PostgresSession> session, const Statement& statement,
+                 bool withIdentity);
     ~PostgresPass() override { release(); }
 
     int columnCount() const override { return static_cast<int>(columns_.size()); }
@@ -27,9 +26,16 @@ public:
     void release() override;
 
 private:
+    /// Rows of the first batch; a set with fewer is here with one round trip.
+    static constexpr int FirstRows = 64;
+    static constexpr int LaterRows = 1000;
+
     /// True when all rows are in the batch now.
-    bool isShort(const QByteArray& statement);
-    void fetchFirst(const std::vector<QByteArray>& before);
+    bool isShort(const Statement& statement);
+    void fetchFirst(const QByteArray& before);
+    /// True when no row comes behind the batch.
+    bool isWhole() const { return !reader_ || (!first_ && count() < LaterRows); }
+    int count() const { return PQntuples(batch_.get()); }
     void describeColumns();
 
     std::shared_ptr<PostgresSession> session_;

@@ -4,6 +4,7 @@
 #include "platform/ado/PostgresPass.h"
 #include "platform/ado/PostgresTypes.h"
 #include "platform/ado/RowStore.h"
+#include "platform/core/Failure.h"
 
 namespace ado {
 
@@ -41,13 +42,15 @@ QByteArray parameter(std::size_t number) {
     return '$' + QByteArray::number(static_cast<qulonglong>(number));
 }
 
-/// True when a statement may say by itself how many rows it wants.
-bool limits(const Statement& statement) {
-    for (int i = 0; i < statement.count(); ++i)
-        if (statement.is(i, "limit"_L1) || statement.is(i, "fetch"_L1) ||
-            statement.is(i, "offset"_L1) || statement.is(i, "for"_L1))
-            return true;
-    return false;
+// Classes of SQLSTATE.
+constexpr auto WrongStatement = "42"_L1;
+constexpr auto WrongValue = "22"_L1;
+constexpr auto NotSupported = "0A"_L1;  // among others, columns of another type than before
+
+/// True when the server may take a statement whole that it refused with parameters in it.
+bool isAboutTypes(const QString& code) {
+    return code.startsWith(WrongStatement) || code.startsWith(WrongValue) ||
+           code.startsWith(NotSupported);
 }
 
 }  // namespace
@@ -83,10 +86,19 @@ PostgresHandle& PostgresSession::writer() {
 }
 
 std::shared_ptr<Pass> PostgresSession::open(const Statement& statement, const QString& table) {
-    const bool withIdentity = !table.isEmpty();
-    const QString text = translate(statement, *this, withIdentity, Dialect::Postgres);
-    return std::make_shared<PostgresPass>(shared_from_this(), text.toUtf8(), withIdentity,
-                                          limits(statement));
+    return std::make_shared<PostgresPass>(shared_from_this(), statement, !table.isEmpty());
+}
+
+PostgresResult PostgresSession::firstRows(PostgresHandle& reader, const Statement& statement,
+                                          bool withIdentity, const QByteArray& limit) {
+    const auto call = texts_.lifted(statement, withIdentity);
+    try {
+        if (call) return reader.run(call->text + limit, call->values);
+    } catch (const core::Failure& failure) {
+        if (!isAboutTypes(failure.code())) throw;
+        if (failure.code().startsWith(WrongStatement)) texts_.keepWhole(statement, withIdentity);
+    }
+    return reader.runOnce(translated(statement, withIdentity) + limit);
 }
 
 // --- The catalogue
@@ -107,8 +119,9 @@ const PostgresSession::Table* PostgresSession::find(QStringView name) {
         if (identifies) table.identity = column;
         if (column == QLatin1StringView(HiddenIdentity)) continue;
         table.types.insert(column, typeOf(type, modifier));
-        table.columns += column;
+        table.select += (table.select.isEmpty() ? "SELECT " : ",") + quoted(column);
     }
+    table.select += " FROM " + quoted(name) + " WHERE " + quoted(table.identity) + "=$1";
     return &*tables_.insert(key, table);
 }
 
@@ -130,20 +143,21 @@ std::optional<ColumnType> PostgresSession::columnType(QStringView name, QStringV
 
 // --- Rows
 
-bool PostgresSession::read(const QString& name, RowIdentity row, RowStore& into) {
-    const Table* table = find(name);
-    if (!table) return false;
-    QByteArray columns;
-    for (const QString& column : table->columns)
-        columns += (columns.isEmpty() ? "" : ",") + quoted(column);
-    const PostgresResult found = writer().run(
-        "SELECT " + columns + " FROM " + quoted(name) + " WHERE " + quoted(table->identity) + "=$1",
-        {QByteArray::number(row)});
-    if (PQntuples(found.get()) == 0) return false;
+PostgresCall PostgresSession::selectRow(const QString& table, RowIdentity row) {
+    const Table* known = find(table);
+    return {known ? known->select : QByteArray(), {QByteArray::number(row)}};
+}
+
+bool PostgresSession::append(const PGresult* found, RowIdentity row, RowStore& into) {
+    if (PQntuples(found) == 0) return false;
     into.beginRow(row);
-    for (int column = 0; column < PQnfields(found.get()); ++column)
-        into.add(cellOf(found.get(), 0, column));
+    for (int column = 0; column < PQnfields(found); ++column) into.add(cellOf(found, 0, column));
     return true;
+}
+
+bool PostgresSession::read(const QString& table, RowIdentity row, RowStore& into) {
+    const PostgresResult found = writer().run({selectRow(table, row)});
+    return append(found.get(), row, into);
 }
 
 RowIdentity PostgresSession::insert(const QString& table, const QStringList& columns,

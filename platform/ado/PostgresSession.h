@@ -4,9 +4,8 @@
 #include <QHash>
 #include <QSet>
 
-#include "platform/ado/PostgresHandle.h"
+#include "platform/ado/PostgresTexts.h"
 #include "platform/ado/Session.h"
-#include "platform/ado/StatementTranslator.h"
 
 namespace ado {
 
@@ -32,8 +31,8 @@ public:
     bool update(const QString& table, RowIdentity row, const QStringList& columns,
                 const std::vector<QVariant>& values) override;
     bool remove(const QString& table, RowIdentity row) override;
-    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row,
-                                  int timeoutSeconds) override;
+    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
+                                  RowStore& into) override;
     void setTimeout(int seconds) override { timeout_ = seconds; }
     const QString& book() const override { return book_; }
 
@@ -43,6 +42,13 @@ public:
     // For the passes: a reader that nobody else uses, and its way back.
     std::shared_ptr<PostgresHandle> takeReader();
     void giveBack(std::shared_ptr<PostgresHandle> reader);
+    /// The statement in the server's dialect.
+    QByteArray translated(const Statement& statement, bool withIdentity) {
+        return texts_.whole(statement, withIdentity);
+    }
+    /// The first rows of a statement, `limit` being what says how many.
+    PostgresResult firstRows(PostgresHandle& reader, const Statement& statement, bool withIdentity,
+                             const QByteArray& limit);
     /// For the locks: lets go of a row; never fails.
     void unlock(const QByteArray& key) noexcept;
 
@@ -50,19 +56,22 @@ private:
     /// What the server's catalogue says about a table or view.
     struct Table {
         QHash<QString, ColumnType> types;  ///< by column
-        QStringList columns;               ///< the visible ones
         QString identity;                  ///< empty for a view
+        QByteArray select;                 ///< reads the visible columns of the row $1
     };
     /// Null when there is none of that name.
     const Table* find(QStringView name);
     PostgresHandle& writer();
-    void takeLock(const QString& table, RowIdentity row, const QByteArray& key);
+    PostgresCall selectRow(const QString& table, RowIdentity row);
+    /// Appends the one row that was found, if any; false when there is none.
+    static bool append(const PGresult* found, RowIdentity row, RowStore& into);
     QString holderOf(const QByteArray& key);
     void lockAgain();
 
     PostgresAddress address_;
     QString book_;
     int timeout_;
+    PostgresTexts texts_{*this};
     QHash<QString, Table> tables_;
     std::vector<std::shared_ptr<PostgresHandle>> readers_;  ///< idle ones
     std::unique_ptr<PostgresHandle> writer_;                ///< made by its first use

@@ -97,11 +97,15 @@ Column describe(const PGresult* result, int column) {
 }
 
 Cell cellOf(const PGresult* result, int row, int column) {
+    return cellOf(result, row, column, typeOf(PQftype(result, column), PQfmod(result, column)));
+}
+
+Cell cellOf(const PGresult* result, int row, int column, ColumnType type) {
     Cell cell;
     if (PQgetisnull(result, row, column)) return cell;
     const char* text = PQgetvalue(result, row, column);
     const auto length = static_cast<std::size_t>(PQgetlength(result, row, column));
-    switch (typeOf(PQftype(result, column), PQfmod(result, column))) {
+    switch (type) {
         case ColumnType::Integer16:
         case ColumnType::Integer32:
         case ColumnType::Integer64:

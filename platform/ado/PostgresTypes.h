@@ -16,6 +16,7 @@ ColumnType typeOf(Oid type, int modifier);
 Column describe(const PGresult* result, int column);
 
 /// A value of an answer, good as long as the answer lives.
+Cell cellOf(const PGresult* result, int row, int column, ColumnType type);
 Cell cellOf(const PGresult* result, int row, int column);
 
 /// The server's text of a value that was converted to its column's type; nothing for null.

@@ -218,8 +218,9 @@ RowIdentity Recordset::Implementation::identity() {
 void Recordset::Implementation::look() {
     if (table.isEmpty()) return;
     if (lockType == adLockPessimistic && !held && !settled) {
-        held = session()->lock(table, identity(), connection->CommandTimeout);
-        wantsFresh = true;
+        fresh.clear();
+        held = session()->lock(table, identity(), connection->CommandTimeout, fresh);
+        wantsFresh = false;
     }
     if (wantsFresh) readFresh();
 }

@@ -80,10 +80,10 @@ public:
                         const std::vector<QVariant>& values) = 0;
     virtual bool remove(const QString& table, RowIdentity row) = 0;
 
-    /// Holds a row, waiting at most `timeoutSeconds`; fails with RowInUse and a text that says who
-    /// holds it.
-    virtual std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row,
-                                          int timeoutSeconds) = 0;
+    /// Holds a row, waiting at most `timeoutSeconds`, and reads it afresh as read() does; fails
+    /// with RowInUse and a text that says who holds it.
+    virtual std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
+                                          RowStore& into) = 0;
 
     /// Seconds that a statement may wait for another program before it fails.
     virtual void setTimeout(int seconds) = 0;

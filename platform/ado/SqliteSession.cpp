@@ -194,8 +194,10 @@ int SqliteSession::write(const QByteArray& text, const std::vector<QVariant>& va
 }
 
 std::unique_ptr<RowLock> SqliteSession::lock(const QString& table, RowIdentity row,
-                                             int timeoutSeconds) {
-    return locks_.lock(table, row, timeoutSeconds);
+                                             int timeoutSeconds, RowStore& into) {
+    std::unique_ptr<RowLock> lock = locks_.lock(table, row, timeoutSeconds);
+    read(table, row, into);
+    return lock;
 }
 
 }  // namespace ado

@@ -25,8 +25,8 @@ public:
     bool update(const QString& table, RowIdentity row, const QStringList& columns,
                 const std::vector<QVariant>& values) override;
     bool remove(const QString& table, RowIdentity row) override;
-    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row,
-                                  int timeoutSeconds) override;
+    std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
+                                  RowStore& into) override;
     void setTimeout(int seconds) override;
     const QString& book() const override { return path_; }
 
