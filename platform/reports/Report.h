@@ -71,25 +71,25 @@ using Item = std::variant<Label, Field, Total, Rule, Band>;
 struct Section {
     QString name;
     double height = 0;  ///< 0 for a section that is not there
-    std::vector<Item> items;
+    std::vector<Item> items = {};
     bool onEachPage = false;  ///< a group header: again on each page that the group goes on to
 };
 
 /// A report as it is designed. Sections in printing order.
 struct Report {
-    QString name;
-    QString caption;     ///< title of preview, print job and PDF
-    QString dataMember;  ///< the row set of the data environment that it is bound to
+    QString name = {};
+    QString caption = {};     ///< title of preview, print job and PDF
+    QString dataMember = {};  ///< the row set of the data environment that it is bound to
     /// Chapter whose rows the detail prints, one group for each row of the row set; empty for a
     /// report of one level.
-    QString chapter;
-    Section reportHeader;
-    Section pageHeader;
-    Section groupHeader;
-    Section detail;
-    Section groupFooter;
-    Section pageFooter;
-    Section reportFooter;
+    QString chapter = {};
+    Section reportHeader = {};
+    Section pageHeader = {};
+    Section groupHeader = {};
+    Section detail = {};
+    Section groupFooter = {};
+    Section pageFooter = {};
+    Section reportFooter = {};
 };
 
 /// What reports share.
