@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "platform/reports/Report.h"
+
+/// What the printed reports share: letterhead, page footer, columns, totals.
+///
+/// A section is built from its top: each function adds its part below what the section holds
+/// already and makes the section that much higher. Lengths are millimetres.
+namespace reports {
+
+/// The organisation, as it stands at the head of what it sends out.
+inline constexpr QStringView OrganisationName = u"Tesmar Nacional";
+/// Its postal address, on one line. To be replaced by the one that it wants printed.
+inline constexpr QStringView OrganisationAddress = u"Lisboa";
+
+/// Height of a line of text at the usual size.
+inline constexpr double LineHeight = 4.8;
+
+/// A text that stays, and the value of a column, each on one line from `x`, `y` of the section on.
+Label label(double x, double y, double width, const QString& caption, const Style& style = {});
+Field field(double x, double y, double width, const QString& column, QStringView format = {},
+            const Style& style = {});
+
+/// Name and address of the organisation, the day of printing at the right, the title on a band.
+void addLetterhead(Section& section, const QString& title);
+
+/// A rule, "Processado por Computador", and at the right page and number of pages.
+Section pageFooter();
+
+/// A column of a listing.
+struct Column {
+    QString title;
+    QString column;
+    double width;
+    Align align = Align::Left;
+    QStringView format = {};  ///< of core/Format.h
+};
+
+/// The columns' titles on a shaded band, side by side from the left margin.
+void addTitles(Section& section, const std::vector<Column>& columns);
+/// The columns' values under their titles.
+void addValues(Section& section, const std::vector<Column>& columns);
+
+/// A line at the right: the caption and the figure over all rows.
+void addTotal(Section& section, Total::Of of, const QString& caption, const QString& column,
+              QStringView format);
+
+}  // namespace reports
