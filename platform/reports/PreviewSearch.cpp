@@ -66,17 +66,18 @@ void PreviewSearch::lookOn(bool forward) {
     start_ = page_;
 }
 
-PreviewSearch::State PreviewSearch::go(int milliseconds) {
+PreviewSearch::State PreviewSearch::go(int milliseconds, bool moreToCome) {
     QElapsedTimer clock;
     clock.start();
-    while (state_ == State::Looking && turnPage() && clock.elapsed() <= milliseconds) lookAtPage();
+    while (state_ == State::Looking && turnPage(moreToCome) && clock.elapsed() <= milliseconds)
+        lookAtPage();
     return state_;
 }
 
 /// Comes round the end or the beginning. False while the pages to look at are still to come.
-bool PreviewSearch::turnPage() {
+bool PreviewSearch::turnPage(bool moreToCome) {
     if (page_ >= 0 && page_ < pages_->count()) return true;
-    if (!pages_->isComplete()) return false;
+    if (moreToCome) return false;
     wrapped_ = true;
     page_ = forward_ ? 0 : pages_->count() - 1;
     return true;

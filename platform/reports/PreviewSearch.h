@@ -29,8 +29,9 @@ public:
     /// From a place found on to the next one, or back to the one before; the last place and the
     /// first are neighbours.
     void lookOn(bool forward);
-    /// Works for about so many milliseconds.
-    State go(int milliseconds);
+    /// Works for about so many milliseconds. While more pages are to come it waits for them at the
+    /// end of those that are there.
+    State go(int milliseconds, bool moreToCome);
 
     State state() const { return state_; }
     int hitPage() const { return page_; }
@@ -42,7 +43,7 @@ public:
 
 private:
     void lookAtPage();
-    bool turnPage();
+    bool turnPage(bool moreToCome);
 
     std::shared_ptr<const Pages> pages_;
     std::string text_;  ///< folded
