@@ -40,6 +40,13 @@ void frmMovimentosF::layOut() {
     forms::layOutSmallScreen(this, frame, Command1, 380);
 }
 
+void frmMovimentosF::offerOtherMember() {
+    Option2->hide();
+    Option3->hide();
+    Option4->setChecked(true);
+    Option4->setFocus();
+}
+
 void frmMovimentosF::Command1_Click() {
     if (Option2->isChecked())
         choose(Choice::SameMember);

@@ -14,6 +14,9 @@ public:
 
     frmMovimentosF();
 
+    /// The choice that is left after statements: another member, or to leave.
+    void offerOtherMember();
+
     /// Called on "OK" with the option chosen; closing the screen without a choice leaves.
     std::function<void(Choice)> onChosen;
 
