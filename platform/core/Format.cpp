@@ -56,7 +56,8 @@ bool isNumber(const QVariant& value) {
 }
 
 QString formattedNumber(const QVariant& value, QStringView format) {
-    if (format != format::Money && format != format::Amount && format != format::Rate)
+    const bool isAmount = format.startsWith(format::Amount);
+    if (format != format::Money && !isAmount && format != format::Rate)
         return toText(value).replace(u'.', decimalMark());
     const Cents rounded = cents(value);
     // What shows as nothing has no sign.
@@ -66,7 +67,9 @@ QString formattedNumber(const QVariant& value, QStringView format) {
         return negative ? u'(' + amount + u')' : amount;
     }
     const QString sign = negative ? QStringLiteral("-") : QString();
-    return sign + (format == format::Amount ? shown(rounded, true, 1) : shown(rounded, false, 2));
+    if (!isAmount) return sign + shown(rounded, false, 2);
+    const QStringView unit = format.sliced(format::Amount.size());
+    return sign + shown(rounded, true, 1) + unit.toString();
 }
 
 /// Takes the currency sign, brackets and sign off; false when they do not pair.

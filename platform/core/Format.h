@@ -12,6 +12,7 @@ namespace core {
 namespace format {
 inline constexpr QStringView Money = u"€ #,##0.00;(€ #,##0.00)";
 inline constexpr QStringView Amount = u"#,##0.00";
+inline constexpr QStringView Escudos = u"#,##0.00 Esc";
 inline constexpr QStringView Rate = u"00.00";
 inline constexpr QStringView Date = u"dd-MM-yyyy";
 inline constexpr QStringView Number = u"@@@@@.@";

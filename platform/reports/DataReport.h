@@ -16,8 +16,8 @@ public:
 
     const Report& design() const { return report_; }
 
-    /// Sets the text of a label of a section, both found by name. Fails with NoSuchItem and the
-    /// name when there is none.
+    /// Sets the text of a label of a section, both found by name; it is printed letter for letter.
+    /// Fails with NoSuchItem and the name when there is none.
     void setCaption(const QString& section, const QString& label, const QString& caption);
 
     /// Lays all pages out and sends them to the default printer, without a dialog, the report's

@@ -3,7 +3,10 @@
 
 #include <QElapsedTimer>
 
+#include "platform/core/Failure.h"
 #include "platform/reports/Sections.h"
+
+using namespace Qt::StringLiterals;
 
 namespace reports {
 
@@ -19,6 +22,7 @@ struct Layout::Implementation {
 
     /// Prints the next section of the body; behind the last one the pages are complete.
     void step();
+    bool areRowsClosed() const { return rows->State() == ado::adStateClosed; }
 
 private:
     PreparedSection prepared(const Section& section, Over over, RowValues& values) {
@@ -201,6 +205,9 @@ Layout::Layout(const Report& report, const ado::RecordsetPtr& rows)
 Layout::~Layout() = default;
 
 bool Layout::go(int milliseconds) {
+    if (!isComplete() && d->areRowsClosed())
+        throw core::Failure(core::ObjectClosed,
+                            u"As linhas foram fechadas antes de o mapa estar completo."_s);
     QElapsedTimer clock;
     clock.start();
     while (!isComplete() && (milliseconds < 0 || clock.elapsed() < milliseconds)) d->step();

@@ -21,8 +21,13 @@ QPen penOf(double millimetres) {
     return {Qt::black, millimetres * UnitsPerMillimetre, Qt::SolidLine, Qt::FlatCap, Qt::MiterJoin};
 }
 
+/// Whole units: nobody sees a hundredth of a millimetre, and a PDF is a third smaller.
+QPointF inUnits(const QPointF& point) {
+    return (point * UnitsPerMillimetre).toPoint();
+}
+
 QRectF inUnits(const QRectF& rect) {
-    return {rect.topLeft() * UnitsPerMillimetre, rect.size() * UnitsPerMillimetre};
+    return {inUnits(rect.topLeft()), inUnits(rect.bottomRight())};
 }
 
 /// The painter's unit is 1/1200 inch.
@@ -34,7 +39,7 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
     }
     for (const Line& line : page.lines) {
         painter.setPen(penOf(line.width));
-        painter.drawLine(line.line.p1() * UnitsPerMillimetre, line.line.p2() * UnitsPerMillimetre);
+        painter.drawLine(inUnits(line.line.p1()), inUnits(line.line.p2()));
     }
     painter.setPen(Qt::black);
     const Face* face = nullptr;
@@ -44,7 +49,7 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
             face = &faces.of(run.style);
             painter.setFont(face->font);
         }
-        painter.drawText(run.baseline * UnitsPerMillimetre, run.text);
+        painter.drawText(inUnits(run.baseline), run.text);
     }
 }
 

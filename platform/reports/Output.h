@@ -15,20 +15,27 @@ namespace reports {
 /// Paints a page, `unitsPerMillimetre` being the painter's; the page's corner is the origin.
 void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMillimetre);
 
+/// A caption as the name of a file, without a suffix and without what file systems do not take.
+QString fileName(const QString& caption);
+
 /// Writes complete pages as PDF, fonts embedded. Fails, leaving no half file, when the file cannot
 /// be written.
 void writePdf(const Pages& pages, const QString& file);
 
-/// Prints pages `from`..`to` (counted from 0) on a printer that is set up.
+/// Prints pages `from`..`to` (counted from 0) on a printer that is set up; paper smaller than A4
+/// takes them smaller. Fails when the printer does not take the job.
 void print(const Pages& pages, QPrinter& printer, int from, int to);
 
-/// Sends complete pages to the default printer; without one, writes a PDF into the person's
-/// documents folder and says so in a box that names the file.
+/// Sends complete pages to the default printer, the report's caption as the job's title. Without
+/// one, or when it does not take the job, writes a PDF into the person's documents folder (or,
+/// where that cannot be written, the home folder or the folder for temporary files) beside what is
+/// there already, and says so in a box that names the file.
 void printUnasked(const Pages& pages);
 
 /// The rows as a text that spreadsheets open: semicolons, decimal comma, UTF-8 with a mark. One
 /// line with the columns that the report shows, one for each detail row; of a report with groups
-/// the group's columns stand first. The rows are passed from the first on.
+/// the group's columns stand first. A text that a spreadsheet would run as a formula gets a leading
+/// apostrophe. Fails, leaving no half file, when the file cannot be written.
 void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file);
 
 }  // namespace reports

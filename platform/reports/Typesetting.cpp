@@ -17,6 +17,7 @@ QFont fontOf(const Style& style) {
     font.setBold(style.bold);
     font.setItalic(style.italic);
     font.setHintingPreference(QFont::PreferNoHinting);
+    font.setKerning(false);
     return font;
 }
 
@@ -68,22 +69,34 @@ void setLine(std::vector<TextRun>& into, Faces& faces, QString text, const QRect
         width = face->width(text);
     }
     if (width > box.width()) {
-        text = face->metrics.elidedText(text, Qt::ElideRight, box.width() * UnitsPerMillimetre);
+        text = face->elided(text, box.width());
         width = face->width(text);
     }
-    const double height = face->metrics.height() / UnitsPerMillimetre;
-    const double top = box.top() + (box.height() - height) / 2;
-    const QPointF baseline(alignedLeft(box, width, style.align),
-                           top + face->metrics.ascent() / UnitsPerMillimetre);
+    const double top = box.top() + (box.height() - face->height()) / 2;
+    const QPointF baseline(alignedLeft(box, width, style.align), top + face->ascent());
     into.push_back({baseline, width, text, face->style, false});
 }
 
 }  // namespace
 
-Face::Face(const Style& of) : style(of), font(fontOf(of)), metrics(font) {}
+Face::Face(const Style& of) : style(of), font(fontOf(of)), metrics_(font) {
+    widths_.fill(-1);
+}
 
 double Face::width(const QString& text) const {
-    return metrics.horizontalAdvance(text) / UnitsPerMillimetre;
+    double units = 0;
+    for (const QChar c : text) {
+        // The currency sign stands in nearly every row.
+        const size_t at = c == u'€' ? 0 : c.unicode();
+        if (at >= widths_.size()) return metrics_.horizontalAdvance(text) / UnitsPerMillimetre;
+        if (widths_[at] < 0) widths_[at] = static_cast<float>(metrics_.horizontalAdvance(c));
+        units += static_cast<double>(widths_[at]);
+    }
+    return units / UnitsPerMillimetre;
+}
+
+QString Face::elided(const QString& text, double width) const {
+    return metrics_.elidedText(text, Qt::ElideRight, width * UnitsPerMillimetre);
 }
 
 const Face& Faces::of(const Style& style) {

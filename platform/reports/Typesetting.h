@@ -3,6 +3,7 @@
 
 #include <QFont>
 #include <QFontMetricsF>
+#include <array>
 #include <list>
 #include <vector>
 
@@ -14,14 +15,25 @@ namespace reports {
 
 inline constexpr double UnitsPerMillimetre = 1200 / 25.4;
 
-/// A style's font, its size in those units.
-struct Face {
+/// A style's font, its size in those units, without kerning: a text is as wide as its letters.
+class Face {
+public:
     explicit Face(const Style& of);
-    Style style;
-    QFont font;
-    QFontMetricsF metrics;
 
-    double width(const QString& text) const;  ///< millimetres
+    /// In millimetres.
+    double width(const QString& text) const;
+    QString elided(const QString& text, double width) const;
+    double ascent() const { return metrics_.ascent() / UnitsPerMillimetre; }
+    double height() const { return metrics_.height() / UnitsPerMillimetre; }
+
+    const Style style;
+    const QFont font;
+
+private:
+    QFontMetricsF metrics_;
+    /// Widths of letters in units, negative where not known yet. Scripts beyond them join or
+    /// reorder their letters and are measured as a whole.
+    mutable std::array<float, 0x250> widths_;
 };
 
 /// Faces made so far: a font is costly to make, and a report uses few.

@@ -30,6 +30,7 @@ TEST(Format, ShowsValuesAsAPortugueseReaderExpects) {
         {87.35f, format::Money, u"€ 87,35"_s},
         {QVariant(), format::Money, QString()},
         {money("-1234.5"), format::Amount, u"-1.234,50"_s},
+        {money("-1234.5"), format::Escudos, u"-1.234,50 Esc"_s},
         {QDateTime(QDate(2024, 2, 29), QTime(13, 5), Qt::UTC), format::Date, u"29-02-2024"_s},
     };
     for (const auto& row : rows) EXPECT_EQ(core::formatted(row.value, row.format), row.shown);

@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: MIT
+#include <QSaveFile>
+#include <algorithm>
+
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+#include "platform/core/Values.h"
+#include "platform/reports/Output.h"
+#include "platform/reports/Sections.h"
+
+using namespace Qt::StringLiterals;
+
+namespace reports {
+
+namespace {
+
+/// The columns of a section in the order of its fields, each once.
+QStringList columnsOf(const Section& section) {
+    QStringList columns;
+    for (const Item& item : section.items)
+        if (const auto* field = std::get_if<Field>(&item);
+            field && !columns.contains(field->column, Qt::CaseInsensitive))
+            columns << field->column;
+    return columns;
+}
+
+/// A text that a spreadsheet would run as a formula is kept a text by a leading apostrophe. A
+/// number that happens to be kept as text stays a number.
+QString harmless(const QString& text) {
+    if (text.isEmpty() || !u"=+-@\t\r"_s.contains(text.front())) return text;
+    bool isNumber = false;
+    QString(text).replace(u',', u'.').toDouble(&isNumber);
+    return isNumber ? text : u'\'' + text;
+}
+
+QString cell(const QVariant& value) {
+    if (value.typeId() != QMetaType::QString) return core::formatted(value, u"");
+    const QString text = harmless(value.toString());
+    if (std::none_of(text.begin(), text.end(), [](QChar c) { return u";\"\n\r"_s.contains(c); }))
+        return text;
+    return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
+}
+
+class CsvFile {
+public:
+    explicit CsvFile(const QString& name) : file_(name) {
+        if (!file_.open(QIODevice::WriteOnly)) fail();
+        file_.write("\xEF\xBB\xBF");
+    }
+    void line(const QStringList& cells) { file_.write(cells.join(u';').toUtf8() + "\r\n"); }
+    void close() {
+        if (!file_.commit()) fail();
+    }
+
+private:
+    [[noreturn]] void fail() {
+        throw core::Failure(core::InvalidCall, u"Não foi possível escrever «%1»: %2"_s.arg(
+                                                   file_.fileName(), file_.errorString()));
+    }
+    QSaveFile file_;
+};
+
+/// The columns of one row set.
+class Cells {
+public:
+    Cells(const QStringList& names, ado::Recordset& rows) {
+        for (const QString& name : names) values_.place(name);
+        values_.lookUp(rows);
+    }
+    QStringList of(const ado::Recordset& rows, qint64 row) {
+        values_.read(rows, row);
+        QStringList cells;
+        for (const QVariant& value : values_.values()) cells << cell(value);
+        return cells;
+    }
+
+private:
+    RowValues values_;
+};
+
+void writeGroups(CsvFile& file, const Report& report, ado::Recordset& rows) {
+    Cells group(columnsOf(report.groupHeader), rows);
+    for (qint64 row = 0; row < rows.rowsInMemory(); ++row) {
+        rows.MoveTo(row);
+        const ado::RecordsetPtr children = rows.Chapter(report.chapter);
+        const QStringList head = group.of(rows, row);
+        Cells detail(columnsOf(report.detail), *children);
+        for (qint64 child = 0; child < children->rowsInMemory(); ++child)
+            file.line(head + detail.of(*children, child));
+    }
+}
+
+}  // namespace
+
+void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file) {
+    rows->readAll();
+    CsvFile out(file);
+    const QStringList columns = columnsOf(report.detail);
+    if (!report.chapter.isEmpty()) {
+        out.line(columnsOf(report.groupHeader) + columns);
+        writeGroups(out, report, *rows);
+    } else {
+        out.line(columns);
+        Cells detail(columns, *rows);
+        for (qint64 row = 0; row < rows->rowsInMemory(); ++row) out.line(detail.of(*rows, row));
+    }
+    out.close();
+}
+
+}  // namespace reports
