@@ -4,12 +4,14 @@
 #include <QApplication>
 
 #include "boundary/Login.h"
+#include "boundary/Registo.h"
 #include "boundary/environment/LoginState.h"
 #include "boundary/environment/dtZelmars.h"
 #include "entry/EntryRoute.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/MsgBoxes.h"
+#include "receipts/ReceiptRoute.h"
 
 using namespace Qt::StringLiterals;
 
@@ -46,6 +48,17 @@ void requireApplication() {
     if (!qobject_cast<QApplication*>(QCoreApplication::instance()))
         throw core::Failure(core::InvalidCall,
                             u"O programa que chamou esta operação não pode mostrar janelas."_s);
+}
+
+/// A screen on a new row. The open function replaces empty texts by their defaults, which the
+/// caller's variables receive.
+void openNew(QString* strConMember, QString* strSQL,
+             const std::function<void(QString&, QString&)>& open) {
+    const core::HandlerScope scope;
+    if (!loggedInOrRefused()) return;
+    requireApplication();
+    QString leftOut[2];
+    open(strConMember ? *strConMember : leftOut[0], strSQL ? *strSQL : leftOut[1]);
 }
 
 /// An operation whose screen is still to come.
@@ -103,27 +116,24 @@ void General::Registo(const QVariant&, const QVariant& Pkey, QString*, QString*,
     try {
         openingPreamble();
         requireApplication();
-        entry::openRegisto(Pkey, Caller);
+        boundary::openRegisto(Pkey, Caller);
     } catch (const std::exception& failure) {
         core::MsgBox(QString::fromUtf8(failure.what()));
     }
 }
 
 void General::NewMovimento(bool bHospital, QString* strConMember, QString* strSQL) {
-    const core::HandlerScope scope;
-    if (!loggedInOrRefused()) return;
-    requireApplication();
-    QString leftOut[2];
-    entry::openNewMovimento(bHospital, strConMember ? *strConMember : leftOut[0],
-                            strSQL ? *strSQL : leftOut[1]);
+    openNew(strConMember, strSQL, [bHospital](QString& connection, QString& statement) {
+        entry::openNewMovimento(bHospital, connection, statement);
+    });
 }
 
-void General::Correcao(QString*, QString*) {
-    openLater(u"Correcao"_s);
+void General::Correcao(QString* strConMember, QString* strSQL) {
+    openNew(strConMember, strSQL, receipts::openNewReposition);
 }
 
-void General::Recebimento(QString*, QString*) {
-    openLater(u"Recebimento"_s);
+void General::Recebimento(QString* strConMember, QString* strSQL) {
+    openNew(strConMember, strSQL, receipts::openNewReceipt);
 }
 
 void General::Extratos(QString*, QString*) {

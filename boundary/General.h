@@ -36,6 +36,7 @@ public:
     /// The entry screen on a new row, modeless. Empty texts receive the defaults that were used.
     Q_INVOKABLE void NewMovimento(bool bHospital, QString* strConMember = nullptr,
                                   QString* strSQL = nullptr);
+    /// A correction of an account, and a receipt, likewise.
     Q_INVOKABLE void Correcao(QString* strConMember = nullptr, QString* strSQL = nullptr);
     Q_INVOKABLE void Recebimento(QString* strConMember = nullptr, QString* strSQL = nullptr);
     /// Both arguments are ignored.

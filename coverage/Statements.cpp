@@ -11,8 +11,9 @@ QString rubric(const QVariant& rubrica_id) {
     return u"Select * from tbZelmar_plafonds where rubrica_id ="_s + core::toText(rubrica_id);
 }
 
-QString accumulator(const QVariant& rubrica_id, qint32 socio_id, const QString& codABC) {
-    return u"Select * from tbSocios_Acumulados WHERE (rubrica_id ="_s + core::toText(rubrica_id) +
+QString accumulator(const QVariant& rubrica_id, qint32 socio_id, const QString& codABC,
+                    const QString& table) {
+    return u"Select * from "_s + table + u" WHERE (rubrica_id ="_s + core::toText(rubrica_id) +
            u") AND (socio_id="_s + QString::number(socio_id) + u") AND (codABC='"_s + codABC +
            u"')"_s;
 }

@@ -5,6 +5,7 @@
 #include "coverage/Statements.h"
 #include "coverage/stages.h"
 #include "data/Procedures.h"
+#include "data/RowSets.h"
 #include "data/modDlookup.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
@@ -46,10 +47,7 @@ struct Accumulated {
 
 /// The row stays also when the operator gives the entry up.
 void addAccumulator(const Entry& entry, const ado::Recordset& rubric) {
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(u"Select * from tbSocios_Acumulados"_s,
-               environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
-               ado::adLockPessimistic, ado::adCmdUnknown);
+    const ado::RecordsetPtr rows = data::openToWrite(u"Select * from tbSocios_Acumulados"_s);
     rows->AddNew();
     rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
     rows->setCollect(u"Rubrica_ID"_s, core::toLong(rubric.Collect(u"Rubrica_ID"_s)));
@@ -113,9 +111,8 @@ bool documentsUsedUp(const Entry& entry, const ado::Recordset& rubric, qint32 no
 
 void narrowByGroup(const Entry& entry, const ado::Recordset& rubric, const Accumulated& found,
                    float& saldo, Progress& progress) {
-    const ado::RecordsetPtr main = ado::Recordset::create();
-    main->Open(statements::rubric(rubric.Collect(u"rubrica_id_main"_s)),
-               environment::dtZelmars::instance().MSAccess());
+    const ado::RecordsetPtr main =
+        data::openToRead(statements::rubric(rubric.Collect(u"rubrica_id_main"_s)));
     if (!main->atEnd()) {
         narrowBy(saldo, main->Collect(isMember(entry) ? u"socio"_s : u"familiar"_s),
                  found.tAgregadoPessoa);

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "coverage/Posting.h"
-#include "boundary/environment/dtZelmars.h"
 #include "coverage/Statements.h"
 #include "data/Codes.h"
-#include "data/MovementNumber.h"
+#include "data/NewMovement.h"
 #include "data/Procedures.h"
+#include "data/RowSets.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
@@ -35,8 +35,7 @@ bool entryChecks(const PostingEntry& posting) {
 
 /// Made for every mode of payment, cheques included. A member who has left only warns.
 bool bankNumberCheck(qint32 socio_id) {
-    const ado::RecordsetPtr member = ado::Recordset::create();
-    member->Open(statements::member(socio_id), environment::dtZelmars::instance().MSAccess());
+    const ado::RecordsetPtr member = data::openToRead(statements::member(socio_id));
     if (member->atEnd()) {
         MsgBox(u"Este Associado não se encontra na tabela de Activos."_s, Icon::Critical);
         return true;
@@ -53,46 +52,28 @@ bool bankNumberCheck(qint32 socio_id) {
     return true;
 }
 
-/// Draws the number and saves the row; a failing statement is passed over and the next one runs.
-/// False when one failed. A movement without a number is not saved: it would be paid without
-/// standing in the accumulators.
+/// A failing statement is passed over; false when one failed. A movement without a number is not
+/// saved: it would be paid without standing in the accumulators.
 bool save(const PostingEntry& posting) {
     ado::Recordset& record = *posting.entry.record;
-    qint32 number = 0;
-    if (passingOver([&] { data::drawMovementNumber(number); })) {
-        passingOver([&] { record.setCollect(u"movimento_no"_s, number); });
-        passingOver([&] { record.setCollect(u"created_by"_s, data::ObterUtilizador()); });
-        passingOver([&] { record.Update(); });
-    }
-    if (core::err().number() == 0) return true;
-    MsgBox(core::err().description());
-    MsgBox(u"Não foi possível registar o registo, contacte o Administrador do Sistema."_s,
-           Icon::Critical, posting.entry.caption);
-    return false;
-}
-
-/// A sum with a null stays null.
-QVariant plus(const QVariant& a, const QVariant& b) {
-    if (core::isNull(a) || core::isNull(b)) return {};
-    return core::toDouble(a) + core::toDouble(b);
+    passingOver([&] {
+        record.setCollect(u"created_by"_s, data::ObterUtilizador());
+        data::numberAndSave(record);
+    });
+    return data::savedOrTold(posting.entry.caption);
 }
 
 void addToAccumulators(const Entry& entry) {
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statements::accumulator(entry.rubrica_id, entry.Socio_ID, entry.Text3),
-               environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
-               ado::adLockPessimistic, ado::adCmdUnknown);
+    const ado::RecordsetPtr rows =
+        data::openToWrite(statements::accumulator(entry.rubrica_id, entry.Socio_ID, entry.Text3));
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
         rows->setCollect(u"Rubrica_ID"_s, entry.rubrica_id);
     }
-    const auto add = [&](const QString& column, const QVariant& amount) {
-        rows->setCollect(column, plus(rows->Collect(column), amount));
-    };
-    add(u"credito_ac"_s, entry.record->Collect(u"credito"_s));
-    add(u"debito_ac"_s, entry.record->Collect(u"debito"_s));
-    add(u"No_Docs"_s, 1);
+    data::add(*rows, u"credito_ac"_s, entry.record->Collect(u"credito"_s));
+    data::add(*rows, u"debito_ac"_s, entry.record->Collect(u"debito"_s));
+    data::add(*rows, u"No_Docs"_s, 1);
     rows->Update();
     rows->Close();
 }
@@ -101,9 +82,7 @@ void addToAccumulators(const Entry& entry) {
 
 bool post(const PostingEntry& posting, TryOut& run) {
     const Entry& entry = posting.entry;
-    if (MsgBox(u"Deseja finalizar o registo?"_s, Icon::Question, entry.caption,
-               core::Buttons::YesNo) != core::Answer::Yes)
-        return false;
+    if (!data::confirmPosting(entry.caption)) return false;
     tryOut(entry, run);
     // Still true after the boxes of the minimum and of the number of documents: the posting then
     // goes on with what the row holds. It is meant so.

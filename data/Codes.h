@@ -12,13 +12,21 @@ inline constexpr QStringView Document = u"DOC";
 inline constexpr QStringView Hospital = u"HOS";
 inline constexpr QStringView Receipt = u"PAG";
 inline constexpr QStringView Reposition = u"REP";
+inline constexpr QStringView Annulled = u"ANL";    ///< keeps the amounts it had
+inline constexpr QStringView Correcting = u"COR";  ///< stands beside an annulled movement
 }  // namespace tipo
 
 /// `modo_pagamento` of a movement.
 namespace modo {
 inline constexpr QStringView Cheque = u"CHQ";
 inline constexpr QStringView Transfer = u"TRF";
+inline constexpr QStringView Annulled = u"ANL";
 }  // namespace modo
+
+/// `ficheiro` of a movement in force; any other value means the tables of those who have left.
+namespace ficheiro {
+inline constexpr QStringView Active = u"ACTIVO";
+}  // namespace ficheiro
 
 /// `codABC`: who a document is for.
 namespace person {

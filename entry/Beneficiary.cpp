@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "entry/Beneficiary.h"
 
-#include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
 #include "data/MemberSearch.h"
-#include "data/modDlookup.h"
+#include "data/Members.h"
+#include "data/RowSets.h"
 #include "platform/core/Clock.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
@@ -22,23 +22,6 @@ using core::MsgBox;
 
 /// Stands for 25 years: a child who is exactly so many days old is too old.
 constexpr int ChildAgeLimitDays = 9132;
-
-ado::RecordsetPtr openRead(const QString& statement) {
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statement, environment::dtZelmars::instance().MSAccess());
-    return rows;
-}
-
-QVariant lookup(const QString& table, const QString& key, const QVariant& id,
-                const QString& column) {
-    return data::DLookup(
-        u"Select * from "_s + table + u" where "_s + key + u" ="_s + core::toText(id),
-        environment::dtZelmars::instance().MSAccess()->ConnectionString, column);
-}
-
-QVariant ofFamily(const QVariant& Familia_ID, const QString& column) {
-    return lookup(u"tbsocios_familias"_s, u"socio_familia_id"_s, Familia_ID, column);
-}
 
 /// A comparison with a null does not hold, neither this one.
 bool differ(const QVariant& a, const QVariant& b) {
@@ -80,7 +63,7 @@ bool refuse(const QString& text, const QString& title) {
 }
 
 bool relativeMayClaim(const QVariant& Familia_ID) {
-    return waitingIsOver(ofFamily(Familia_ID, u"data_carencia"_s)) ||
+    return waitingIsOver(data::ofPerson(Familia_ID, u"data_carencia"_s)) ||
            refuse(
                u"Este familiar está dentro do periodo de carência! Não pode ser processado o "
                "documento."_s,
@@ -88,7 +71,7 @@ bool relativeMayClaim(const QVariant& Familia_ID) {
 }
 
 bool childMayClaim(const QVariant& Familia_ID) {
-    const QVariant birth = ofFamily(Familia_ID, u"data_nascimento"_s);
+    const QVariant birth = data::ofPerson(Familia_ID, u"data_nascimento"_s);
     if (core::isNull(birth) || !(core::today().addDays(-ChildAgeLimitDays) < core::toDate(birth)))
         return refuse(u"Este familiar tem mais de 25 anos! Tente indicar outro."_s,
                       u"Familiares"_s);
@@ -96,8 +79,7 @@ bool childMayClaim(const QVariant& Familia_ID) {
 }
 
 bool memberMayClaim(qint32 Socio_ID) {
-    return waitingIsOver(
-               lookup(u"tbSocios"_s, u"socio_id"_s, Socio_ID, u"zelmar_data_carencia"_s)) ||
+    return waitingIsOver(data::ofMember(Socio_ID, u"zelmar_data_carencia"_s)) ||
            refuse(
                u"O Associado está dentro do periodo de carência! Não pode ser processado o "
                "documento."_s,
@@ -114,24 +96,10 @@ bool mayClaim(const QString& codABC, const QVariant& Familia_ID, qint32 Socio_ID
 
 }  // namespace
 
-ado::RecordsetPtr openMemberByNumber(const QString& no_kor) {
-    return openRead(u"select * from tbSocios where no_kor ='"_s + no_kor + u"'"_s);
-}
-
-ado::RecordsetPtr openMemberById(qint32 socio_id) {
-    return openRead(u"select * from tbsocios where socio_id ="_s + QString::number(socio_id));
-}
-
-bool checkEnrolled(const ado::Recordset& member) {
-    if (core::compareNumbers(member.Collect(u"zelmar"_s), 0) != 0) return true;
-    MsgBox(u"Este Associado não está inscrito no plano de Saúde."_s, Icon::Critical);
-    return false;
-}
-
 com::Object testPremium(qint32 socio_id) {
     const QString id = QString::number(socio_id);
     const ado::RecordsetPtr premium =
-        openRead(u"select * from tbQuotas_Socios where socio_id="_s + id);
+        data::openToRead(u"select * from tbQuotas_Socios where socio_id="_s + id);
     if (premium->atEnd())
         MsgBox(
             u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
@@ -170,10 +138,10 @@ QVariant choosePerson(qint32 Socio_ID) {
 }
 
 std::optional<Person> admitPerson(const QVariant& Familia_ID, qint32 Socio_ID) {
-    const QVariant codABC = ofFamily(Familia_ID, u"codABC"_s);
+    const QVariant codABC = data::ofPerson(Familia_ID, u"codABC"_s);
     if (core::isNull(codABC)) return std::nullopt;
     if (!mayClaim(codABC.toString(), Familia_ID, Socio_ID)) return std::nullopt;
-    return Person{codABC, ofFamily(Familia_ID, u"nome"_s)};
+    return Person{codABC, data::ofPerson(Familia_ID, u"nome"_s)};
 }
 
 }  // namespace entry

@@ -11,14 +11,6 @@
 /// Who a document is for, and whether that member or relative may have one processed.
 namespace entry {
 
-/// Members by the staff number that people type, or by key; values are joined in as they stand.
-ado::RecordsetPtr openMemberByNumber(const QString& no_kor);
-ado::RecordsetPtr openMemberById(qint32 socio_id);
-
-/// True when the member's row says that he is enrolled in the plan; otherwise says so to the
-/// operator.
-bool checkEnrolled(const ado::Recordset& member);
-
 /// Warns of premium arrears, and in every case offers the premium statement. Nothing of it stops
 /// the choice of the member. Gives the component that shows the statement, whose window lives as
 /// long as somebody keeps it; empty when no statement was wanted.

@@ -1,13 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "entry/EntryRoute.h"
 
-#include "boundary/environment/dtZelmars.h"
-#include "data/Codes.h"
+#include "data/NewMovement.h"
 #include "entry/frmMovimentos.h"
 #include "entry/frmMovimentosF.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
-#include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
 
@@ -75,25 +73,10 @@ void follow(Choice choice) {
     }
 }
 
-/// A read-only view holds nothing that a person typed: it makes room.
-void closeView() {
-    if (Entry::isLoaded() && Entry::get().bShowing) Entry::unload();
-}
-
 /// After an entry was posted or given up.
 void askHowToGoOn() {
     Exit::get().onChosen = follow;
     Exit::get().ShowModal();
-}
-
-/// The row set of a new entry; empty texts get their defaults.
-ado::RecordsetPtr openNewRow(QString& strConMember, QString& strSQL) {
-    if (strSQL.isEmpty()) strSQL = u"select * from tbzelmar_movimentos where movimento_id = 0"_s;
-    if (strConMember.isEmpty()) strConMember = u"MSAccess"_s;
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(strSQL, environment::dtZelmars::instance().Connections(strConMember),
-               ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
-    return rows;
 }
 
 void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {
@@ -102,20 +85,16 @@ void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {
     frmMovimentos& screen = Entry::get();
     screen.bHospital = bHospital;
     if (bHospital) screen.showAsHospital();
-    screen.Adodc1->setRecordset(rows);
-    rows->AddNew();
-    screen.bShowing = false;
     screen.onLeft = askHowToGoOn;
-    screen.startDefaults();
-    screen.Show();
+    screen.showNew(rows);
 }
 
 }  // namespace
 
 void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
     try {
-        const ado::RecordsetPtr rows = openNewRow(strConMember, strSQL);
-        closeView();
+        const ado::RecordsetPtr rows = data::openNewMovement(strConMember, strSQL);
+        forms::closeView<frmMovimentos>();
         showEntry(bHospital, rows);
     } catch (...) {
         // A hidden screen would stand in the way of the next one.
@@ -124,32 +103,22 @@ void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
     }
 }
 
-void openRegisto(const QVariant& Pkey, QObject* Caller) {
-    // A key that is no number fails here; as a number it is not used.
-    core::toLong(Pkey);
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(
-        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey),
-        environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
-        ado::adCmdUnknown);
-    if (rows->atEnd()) return;
-    const QString tipo = core::toText(rows->Collect(u"tipo"_s));
-    if (tipo == data::tipo::Receipt || tipo == data::tipo::Reposition)
-        throw core::Failure(core::InvalidCall,
-                            u"A vista de recebimentos e reposições ainda não está disponível "
-                            "nesta versão."_s);
-    if (tipo != data::tipo::Document && tipo != data::tipo::Hospital) return;
-    closeView();
+void attachMovement(const ado::RecordsetPtr& rows, QObject* Caller) {
+    forms::closeView<frmMovimentos>();
     if (Entry::isLoaded())
         throw core::Failure(core::InvalidCall,
                             u"Há um lançamento por terminar. Termine-o ou cancele-o antes de ver "
                             "outro movimento."_s);
     frmMovimentos& screen = Entry::get();
+    screen.bShowing = true;
     screen.Adodc1->setRecordset(rows);
     screen.CallbackClass = Caller;
     screen.Movimento_ID = rows->Collect(u"movimento_id"_s);
-    screen.showReadOnly(tipo);
-    screen.Show();
+}
+
+void showMovement(const QString& tipo) {
+    Entry::get().showReadOnly(tipo);
+    Entry::get().Show();
 }
 
 }  // namespace entry

@@ -3,7 +3,8 @@
 
 #include <QObject>
 #include <QString>
-#include <QVariant>
+
+#include "platform/ado/Recordset.h"
 
 /// The ways into the entry screens and between them. A screen only reports what was chosen; the
 /// routes here open the next one.
@@ -14,9 +15,12 @@ namespace entry {
 /// does.
 void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL);
 
-/// Opens the movement whose key is `Pkey` read-only, in the screen of its type. A movement that is
-/// not in force, or of a type without a screen, opens nothing. `Caller` (or null) is told of an
-/// annulment through its member RemoteKey.
-void openRegisto(const QVariant& Pkey, QObject* Caller);
+/// Gives an existing movement to the entry screen, which stays hidden: an existing movement of any
+/// type stays attached there. Fails while an entry is under way, which would lose its row.
+/// @param Caller  told of an annulment through its member RemoteKey; may be null
+void attachMovement(const ado::RecordsetPtr& rows, QObject* Caller);
+
+/// Shows the attached movement, a document or a hospital bill, read-only.
+void showMovement(const QString& tipo);
 
 }  // namespace entry

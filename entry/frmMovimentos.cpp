@@ -4,6 +4,7 @@
 #include <QLabel>
 
 #include "boundary/environment/dtZelmars.h"
+#include "coverage/annulment.h"
 #include "data/Codes.h"
 #include "entry/DocumentVat.h"
 #include "payments/frmPagamentoCheque.h"
@@ -21,7 +22,8 @@ using core::Icon;
 using core::MsgBox;
 using forms::BackColor;
 
-frmMovimentos::frmMovimentos() : Form(u"frmMovimentos"_s, u"Lançamento (Plano de Saúde)"_s) {
+frmMovimentos::frmMovimentos()
+    : RecordScreen(u"frmMovimentos"_s, u"Lançamento (Plano de Saúde)"_s) {
     makeControls();
     layOut();
     bindControls();
@@ -60,15 +62,8 @@ void frmMovimentos::connectHandlers() {
     Command2->onClick = [this] { Command2_Click(); };
     connectFieldHandlers();
     Command5->onClick = [this] { Command5_Click(); };
-    Command3->onClick = [this] { Command3_Click(); };
     Command4->onClick = [this] { Command4_Click(); };
-    Command6->onClick = [] {
-        MsgBox(u"A anulação de movimentos ainda não está disponível nesta versão."_s,
-               Icon::Information);
-    };
-    Timer1->onTimer = [this] { Timer1_Timer(); };
-    forms::passesValidation(Command4);
-    setCancelButton(Command4);
+    Command6->onClick = [this] { Command6_Click(); };
 }
 
 void frmMovimentos::connectFieldHandlers() {
@@ -79,10 +74,8 @@ void frmMovimentos::connectFieldHandlers() {
     Text9->onGotFocus = [this] { Text9->SelectAll(); };
     Text9->onValidate = [this](bool&) { emptyBecomesNull(Text9); };
     Text11->onValidate = [this](bool& cancel) { Text11_Validate(cancel); };
-    for (forms::DataCombo* combo : {DataCombo1, DataCombo2}) {
-        combo->onGotFocus = [this, combo] { remembered_ = combo->Text(); };
-        combo->onLostFocus = [this, combo] { Combo_LostFocus(combo); };
-    }
+    // A rubric or hospital that was wiped is held as 0, not as null.
+    for (forms::DataCombo* combo : {DataCombo1, DataCombo2}) combo->setWipedValue(0);
 }
 
 void frmMovimentos::showAsHospital() {
@@ -99,7 +92,7 @@ void frmMovimentos::setMember(qint32 id, const QString& number, const QString& n
     memberNumber_ = number;
     No_Kor->setText(number);
     Text2->setText(name);
-    for (forms::TextBox* box : {Text2, Text3, Text4}) box->setBackColor(BackColor::Window);
+    forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     Command2->setEnabled(true);
     Command2->setFocus();
 }
@@ -110,13 +103,7 @@ void frmMovimentos::showReadOnly(const QString& tipo) {
         Label18->show();
         DataCombo2->show();
     }
-    Timer1->setEnabled(false);
-    bShowing = true;
-    Command4->hide();
     Command5->hide();
-    Command3->setCaption(u"&Sair"_s);
-    Command3->setDefault(true);
-    setCancelButton(Command3);
     LimiteAplicavel->hide();
     Label12->hide();
 
@@ -135,20 +122,17 @@ void frmMovimentos::showReadOnly(const QString& tipo) {
     };
     for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
 
-    for (forms::TextBox* box : {Text2, Text3, Text4}) box->setBackColor(BackColor::Window);
+    forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     for (forms::TextBox* box : {No_Kor, Text2, Text3, Text4, Text1, Text5, Text6})
         box->setLocked(true);
     for (forms::DataCombo* combo : {DataCombo1, DataCombo2, DataCombo3}) combo->setLocked(true);
     Command1->hide();
     Command2->hide();
     Command6->show();
-    Command3->setFocus();
+    showForReading();
 }
 
-void frmMovimentos::Timer1_Timer() {
-    // The read-only view has no defaults to set; the timer stays as it is.
-    if (bShowing) return;
-    Timer1->setEnabled(false);
+void frmMovimentos::setDefaults() {
     Text7->setValue(core::fromDate(core::today()));
     Text8->setText((bHospital ? data::tipo::Hospital : data::tipo::Document).toString());
     DataCombo3->setBoundText((bHospital ? data::modo::Cheque : data::modo::Transfer).toString());
@@ -209,19 +193,7 @@ void frmMovimentos::workOutVat() {
     Text10->setValue(vatOf(core::toSingle(*value), *rate));
 }
 
-/// A rubric or hospital that was wiped is held as 0, not as null.
-void frmMovimentos::Combo_LostFocus(forms::DataCombo* combo) {
-    if (combo->Text() == remembered_ || !Adodc1->hasField(combo->DataField())) return;
-    const auto write = [&](const QVariant& value) {
-        Adodc1->Recordset()->setCollect(combo->DataField(), value);
-    };
-    if (combo->Text().isEmpty())
-        write(0);
-    else
-        core::passingOver([&] { write(combo->BoundText()); });
-}
-
-// --- Try-out, posting, giving up
+// --- Try-out, posting, giving up, annulment
 
 coverage::Entry frmMovimentos::entry() const {
     coverage::Entry entry;
@@ -243,11 +215,7 @@ void frmMovimentos::Command5_Click() {
     coverage::tryOut(entry(), run);
 }
 
-void frmMovimentos::Command3_Click() {
-    if (Command3->Caption() == u"&Sair"_s) {
-        Unload();
-        return;
-    }
+void frmMovimentos::post() {
     const coverage::PostingEntry posting{entry(),
                                          DataCombo3->Text(),
                                          DataCombo3->BoundText(),
@@ -268,6 +236,10 @@ void frmMovimentos::Command4_Click() {
 void frmMovimentos::leaveEntry() {
     Hide();
     if (onLeft) onLeft();
+}
+
+void frmMovimentos::Command6_Click() {
+    if (coverage::annul({Adodc1->Recordset(), Caption(), CallbackClass})) Unload();
 }
 
 void frmMovimentos::showResults(const coverage::Results& results) {

@@ -5,10 +5,8 @@
 
 #include "coverage/Posting.h"
 #include "platform/com/Component.h"
-#include "platform/forms/Bound.h"
-#include "platform/forms/Controls.h"
 #include "platform/forms/DataCombo.h"
-#include "platform/forms/Form.h"
+#include "platform/forms/RecordScreen.h"
 #include "platform/forms/TextBox.h"
 
 class QLabel;
@@ -16,7 +14,7 @@ class QLabel;
 namespace entry {
 
 /// Entry of a medical document or a hospital bill, and the read-only view of one.
-class frmMovimentos : public forms::Form {
+class frmMovimentos : public forms::RecordScreen {
     Q_OBJECT
 public:
     frmMovimentos();
@@ -25,9 +23,7 @@ public:
     QVariant Familia_ID;    ///< the chosen person's family row; null until one was chosen
     QVariant Movimento_ID;  ///< the movement under view
     bool bHospital = false;
-    bool bShowing = false;            ///< read-only view
     QPointer<QObject> CallbackClass;  ///< told of an annulment; may be null
-    forms::DataControl* Adodc1;
 
     /// Called when the entry was posted or given up; the screen is hidden by then.
     std::function<void()> onLeft;
@@ -41,8 +37,6 @@ public:
     const QString& memberNumber() const { return memberNumber_; }
     /// The read-only view of the row that Adodc1 holds, whose type is `tipo`.
     void showReadOnly(const QString& tipo);
-    /// Sets the new row's defaults a moment after the screen is up.
-    void startDefaults() { Timer1->setEnabled(true); }
 
     forms::TextBox* No_Kor;
     forms::TextBox* Text1;
@@ -72,13 +66,15 @@ public:
     forms::TextBox* Liquido;
     forms::Button* Command1;
     forms::Button* Command2;
-    forms::Button* Command3;
-    forms::Button* Command4;
     forms::Button* Command5;
     forms::Button* Command6;
     QLabel* Label12;
     QLabel* Label18;
     QLabel* Label19;
+
+protected:
+    void setDefaults() override;
+    void post() override;
 
 private:
     void makeControls();
@@ -92,7 +88,6 @@ private:
     void connectHandlers();
     void connectFieldHandlers();
 
-    void Timer1_Timer();
     void No_Kor_Validate(bool& cancel);
     void Command1_Click();
     void Command2_Click();
@@ -101,10 +96,9 @@ private:
     void Text6_Validate();
     void emptyBecomesNull(forms::TextBox* box);
     void Text11_Validate(bool& cancel);
-    void Combo_LostFocus(forms::DataCombo* combo);
-    void Command3_Click();
     void Command4_Click();
     void Command5_Click();
+    void Command6_Click();
 
     void takeMemberFound(ado::Recordset& member);
     void searchMember();
@@ -114,10 +108,8 @@ private:
     coverage::Entry entry() const;
     void showResults(const coverage::Results& results);
 
-    forms::Timer* Timer1;
     com::Object search_;  ///< the last search component; keeps its premium statement open
     QString memberNumber_;
-    QString remembered_;  ///< the text of DataCombo1 or DataCombo2 when it received the focus
 };
 
 }  // namespace entry

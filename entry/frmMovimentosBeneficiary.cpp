@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Who the document is for: the member by number or by search, and the person of his family.
 #include "data/MemberSearch.h"
+#include "data/Members.h"
 #include "entry/Beneficiary.h"
 #include "entry/frmMovimentos.h"
 #include "platform/core/Failure.h"
@@ -23,13 +24,13 @@ void frmMovimentos::No_Kor_Validate(bool& cancel) {
     }
     Text10->setText(u"0"_s);
     Text11->setText(u"0"_s);
-    const ado::RecordsetPtr member = openMemberByNumber(No_Kor->Text());
+    const ado::RecordsetPtr member = data::openMemberByNumber(No_Kor->Text());
     if (member->atEnd()) {
         MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Associados"_s);
         cancel = true;
         return;
     }
-    if (!checkEnrolled(*member)) {
+    if (!data::checkEnrolled(*member)) {
         clearMember();
         return;
     }
@@ -46,31 +47,22 @@ void frmMovimentos::takeMemberFound(ado::Recordset& member) {
                    [id] { return QVariant::fromValue(core::toInteger(id)); });
     Socio_ID = id;
     memberNumber_ = No_Kor->Text();
-    Text2->setBackColor(BackColor::Window);
     Text2->setText(core::toText(member.Collect(u"nome"_s)));
-    Text3->setBackColor(BackColor::Window);
-    Text4->setBackColor(BackColor::Window);
+    forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     Command2->setEnabled(true);
     member.Close();
 }
 
 void frmMovimentos::Command1_Click() {
     core::err().clear();
-    try {
-        searchMember();
-    } catch (const std::exception& failure) {
-        MsgBox(QString::fromUtf8(failure.what()));
-    }
+    forms::handlePlainly([this] { searchMember(); });
 }
 
 void frmMovimentos::searchMember() {
     search_ = data::openSearch();
     const qint32 id = data::chooseMember(search_);
     if (id == 0) return;
-    const ado::RecordsetPtr member = openMemberById(id);
-    if (member->atEnd()) {
-        MsgBox(u"Este Associado não se encontra na tabela de activos."_s, Icon::Critical);
-    } else if (checkEnrolled(*member)) {
+    if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
         com::Object statement = testPremium(id);
         testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
         Socio_ID = id;
@@ -79,10 +71,7 @@ void frmMovimentos::searchMember() {
         Text2->setText(core::toText(member->Collect(u"nome"_s)));
         Text2->setBackColor(BackColor::Window);
         Command2->setEnabled(true);
-        for (forms::TextBox* box : {Text3, Text4}) {
-            box->setBackColor(BackColor::Menu);
-            box->Clear();
-        }
+        forms::greyOut({Text3, Text4});
         Familia_ID = {};
         search_ = statement;
         return;
@@ -92,10 +81,7 @@ void frmMovimentos::searchMember() {
 }
 
 void frmMovimentos::clearMember() {
-    for (forms::TextBox* box : {Text2, Text3, Text4}) {
-        box->setBackColor(BackColor::Menu);
-        box->Clear();
-    }
+    forms::greyOut({Text2, Text3, Text4});
     Command2->setEnabled(false);
     Socio_ID = 0;
     memberNumber_.clear();

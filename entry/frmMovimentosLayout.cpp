@@ -5,99 +5,72 @@
 
 #include "entry/frmMovimentos.h"
 #include "platform/core/Format.h"
+#include "platform/forms/Fields.h"
 
 using namespace Qt::StringLiterals;
 
 namespace entry {
 
+using forms::displayBox;
 using forms::fieldLabel;
+using forms::pairsIn;
+using forms::textBox;
 using forms::TextBox;
+using forms::widthFor;
 namespace format = core::format;
 
 namespace {
 
-TextBox* box(const QString& name, QStringView shownAs = {}) {
-    auto* made = new TextBox(name);
-    made->setFormat(shownAs);
-    return made;
-}
-
-TextBox* displayOnly(const QString& name, QStringView shownAs = {}) {
-    TextBox* made = box(name, shownAs);
-    made->setDisplayOnly();
-    return made;
-}
-
-/// Width at which a field shows `text` whole, whatever the font.
-int widthFor(const QWidget* field, QStringView text) {
-    const int frame = field->fontMetrics().height();
-    return field->fontMetrics().horizontalAdvance(text.toString()) + frame;
-}
-
-/// Pairs of label and field, side by side. The labels' columns are as wide in every frame, so that
-/// the fields of all frames stand under each other.
-QGridLayout* pairsIn(QWidget* frame, int pairs) {
-    constexpr QStringView WidestLabels[] = {u"Modo de Pagamento:", u"Comparticipação:",
-                                            u"Saldo Plafond:"};
-    auto* grid = new QGridLayout(frame);
-    for (int pair = 0; pair < pairs; ++pair) {
-        grid->setColumnMinimumWidth(
-            2 * pair, frame->fontMetrics().horizontalAdvance(WidestLabels[pair].toString()));
-        grid->setColumnStretch(2 * pair + 1, pairs > 1 ? 1 : 0);
-    }
-    return grid;
-}
+/// Fields of all frames stand under each other.
+constexpr std::initializer_list<QStringView> OnePair = {u"Modo de Pagamento:"};
+constexpr std::initializer_list<QStringView> ThreePairs = {u"Modo de Pagamento:",
+                                                           u"Comparticipação:", u"Saldo Plafond:"};
 
 }  // namespace
 
 void frmMovimentos::makeControls() {
-    Adodc1 = new forms::DataControl(u"Adodc1"_s, this);
-    Timer1 = new forms::Timer(u"Timer1"_s, 1, this);
-
-    No_Kor = box(u"No_Kor"_s, format::Number);
-    Text2 = displayOnly(u"Text2"_s);
-    Text3 = displayOnly(u"Text3"_s);
-    Text4 = displayOnly(u"Text4"_s);
-    for (TextBox* person : {Text2, Text3, Text4}) person->setBackColor(forms::BackColor::Menu);
+    No_Kor = textBox(u"No_Kor"_s, format::Number);
+    Text2 = displayBox(u"Text2"_s);
+    Text3 = displayBox(u"Text3"_s);
+    Text4 = displayBox(u"Text4"_s);
     Command1 = new forms::Button(u"Command1"_s, u"&Procurar Sócio"_s);
     Command2 = new forms::Button(u"Command2"_s, u"&Indicar Familiar"_s);
     Command2->setEnabled(false);
 
-    Text1 = box(u"Text1"_s, format::Date);
-    Text5 = box(u"Text5"_s, format::Number);
-    Text6 = box(u"Text6"_s, format::Money);
-    Text9 = box(u"Text9"_s, format::Money);
-    Text11 = box(u"Text11"_s, format::Rate);
-    Text10 = displayOnly(u"Text10"_s, format::Amount);
-    Text12 = box(u"Text12"_s, format::Number);
+    Text1 = textBox(u"Text1"_s, format::Date);
+    Text5 = textBox(u"Text5"_s, format::Number);
+    Text6 = textBox(u"Text6"_s, format::Money);
+    Text9 = textBox(u"Text9"_s, format::Money);
+    Text11 = textBox(u"Text11"_s, format::Rate);
+    Text10 = displayBox(u"Text10"_s, format::Amount);
+    Text12 = textBox(u"Text12"_s, format::Number);
     DataCombo4 = new forms::DataCombo(u"DataCombo4"_s);
 
-    Text7 = displayOnly(u"Text7"_s, format::Date);
-    Text8 = displayOnly(u"Text8"_s);
+    Text7 = displayBox(u"Text7"_s, format::Date);
+    Text8 = displayBox(u"Text8"_s);
     DataCombo1 = new forms::DataCombo(u"DataCombo1"_s);
     DataCombo2 = new forms::DataCombo(u"DataCombo2"_s);
 
-    Incidencia = displayOnly(u"Incidencia"_s, format::Money);
-    Comparticipacao = displayOnly(u"Comparticipacao"_s, format::Money);
-    LimiteAplicavel = displayOnly(u"LimiteAplicavel"_s, format::Money);
-    SaldoCC = displayOnly(u"SaldoCC"_s, format::Money);
-    Iliquido = displayOnly(u"Iliquido"_s, format::Money);
-    SaldoPlafond = displayOnly(u"SaldoPlafond"_s, format::Money);
-    Credito = displayOnly(u"Credito"_s, format::Money);
-    Debito = displayOnly(u"Debito"_s, format::Money);
-    Liquido = displayOnly(u"Liquido"_s, format::Money);
+    Incidencia = displayBox(u"Incidencia"_s, format::Money);
+    Comparticipacao = displayBox(u"Comparticipacao"_s, format::Money);
+    LimiteAplicavel = displayBox(u"LimiteAplicavel"_s, format::Money);
+    SaldoCC = displayBox(u"SaldoCC"_s, format::Money);
+    Iliquido = displayBox(u"Iliquido"_s, format::Money);
+    SaldoPlafond = displayBox(u"SaldoPlafond"_s, format::Money);
+    Credito = displayBox(u"Credito"_s, format::Money);
+    Debito = displayBox(u"Debito"_s, format::Money);
+    Liquido = displayBox(u"Liquido"_s, format::Money);
 
     DataCombo3 = new forms::DataCombo(u"DataCombo3"_s);
-    Command3 = new forms::Button(u"Command3"_s, u"&OK"_s);
-    Command4 = new forms::Button(u"Command4"_s, u"&Cancelar"_s);
     Command5 = new forms::Button(u"Command5"_s, u"&Ensaio"_s);
     Command6 = new forms::Button(u"Command6"_s, u"Anular"_s);
+    Command6->setKey(u"Alt+A"_s);
     Command6->hide();
 }
 
 QWidget* frmMovimentos::beneficiaryFrame() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
-    QGridLayout* grid = pairsIn(frame, 1);
+    QGridLayout* grid = pairsIn(frame, OnePair);
     grid->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor, u"Label1"_s), 0, 0);
     grid->addWidget(No_Kor, 0, 1);
     grid->addWidget(Text2, 0, 2);
@@ -116,7 +89,7 @@ QWidget* frmMovimentos::beneficiaryFrame() {
 
 QWidget* frmMovimentos::documentFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Documento:"_s);
-    QGridLayout* grid = pairsIn(frame, 3);
+    QGridLayout* grid = pairsIn(frame, ThreePairs);
     Label19 = fieldLabel(u"Recebido Euros:"_s, Text9, u"Label19"_s);
     grid->addWidget(fieldLabel(u"Data:"_s, Text1), 0, 0);
     grid->addWidget(Text1, 0, 1);
@@ -139,7 +112,7 @@ QWidget* frmMovimentos::documentFrame() {
 
 QWidget* frmMovimentos::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Propriedades do Lançamento:"_s);
-    QGridLayout* grid = pairsIn(frame, 1);
+    QGridLayout* grid = pairsIn(frame, OnePair);
     Label18 = fieldLabel(u"Hospital:"_s, DataCombo2, u"Label18"_s);
     grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
     grid->addWidget(Text7, 0, 1);
@@ -161,7 +134,7 @@ QWidget* frmMovimentos::propertiesFrame() {
 
 QWidget* frmMovimentos::resultFrame() {
     auto* frame = new forms::Frame(u"Frame4"_s, u"Resultado do Lançamento:"_s);
-    QGridLayout* grid = pairsIn(frame, 3);
+    QGridLayout* grid = pairsIn(frame, ThreePairs);
     // What will be posted stands out.
     for (TextBox* outcome : {Credito, Debito}) {
         QFont bold = outcome->font();
@@ -191,7 +164,7 @@ QWidget* frmMovimentos::resultFrame() {
 
 void frmMovimentos::layOut() {
     auto* foot = new QWidget;
-    QGridLayout* below = pairsIn(foot, 1);
+    QGridLayout* below = pairsIn(foot, OnePair);
     below->setContentsMargins(12, 2, 0, 0);
     below->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 0, 0);
     below->addWidget(DataCombo3, 0, 1);

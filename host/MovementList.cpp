@@ -35,6 +35,26 @@ const ColumnLook& look(int column) {
     return looks[column];
 }
 
+constexpr QColor Amber(0x9a, 0x55, 0x00);
+constexpr QColor AmberOnDark(0xe8, 0xb0, 0x62);
+
+/// What was annulled is struck out and pale; the row that corrects it is slanted and amber. So the
+/// two are told apart also where the colours of a selected row cover theirs.
+QVariant lookOfType(const QString& tipo, int role) {
+    const bool annulled = tipo == "ANL"_L1;
+    if (!annulled && tipo != "COR"_L1) return {};
+    if (role == Qt::FontRole) {
+        QFont font = QApplication::font("QTableView");
+        font.setStrikeOut(annulled);
+        font.setItalic(!annulled);
+        return font;
+    }
+    const QPalette palette = QApplication::palette();
+    if (annulled) return palette.color(QPalette::PlaceholderText);
+    const bool dark = palette.color(QPalette::Base).lightness() < 128;
+    return dark ? AmberOnDark : Amber;
+}
+
 constexpr int BlockSize = 64;
 constexpr int MostRowsKept = 4096;
 
@@ -52,11 +72,11 @@ void MovementList::setFilter(const QString& filter) {
     refilter();
 }
 
-void MovementList::takeNewer() {
-    if (book_ && search_ && book_->takeNewer(*search_) > 0)
-        refilter();
-    else
-        forgetRows();
+void MovementList::takeNewer(qint32 opened) {
+    if (!book_ || !search_ || book_->takeNewer(*search_) == 0) return forgetRows();
+    // An annulment always brings a correcting row along.
+    if (opened != 0) book_->takeAgain(*search_, opened);
+    refilter();
 }
 
 void MovementList::takeAgain(qint32 movimento_id) {
@@ -103,15 +123,7 @@ QVariant MovementList::data(const QModelIndex& index, int role) const {
     const MovementRow& row = rowAt(index.row());
     if (role == Qt::DisplayRole)
         return core::formatted(row.values[index.column()], look(index.column()).format);
-    const QString tipo = row.values[MovementRow::Type].toString();
-    if (role == Qt::ForegroundRole && (tipo == "ANL"_L1 || tipo == "COR"_L1))
-        return QApplication::palette().color(QPalette::PlaceholderText);
-    if (role == Qt::FontRole && tipo == "ANL"_L1 && index.column() == MovementRow::Type) {
-        QFont struck = QApplication::font("QTableView");
-        struck.setStrikeOut(true);
-        return struck;
-    }
-    return {};
+    return lookOfType(row.values[MovementRow::Type].toString(), role);
 }
 
 QVariant MovementList::headerData(int section, Qt::Orientation orientation, int role) const {

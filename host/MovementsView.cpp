@@ -155,7 +155,7 @@ void MovementsView::changeList(Change&& change) {
 }
 
 void MovementsView::takeNewer() {
-    changeList([this] { movements_->takeNewer(); });
+    changeList([this] { movements_->takeNewer(opened_); });
 }
 
 void MovementsView::takeAgain(qint32 movimento_id) {
@@ -228,8 +228,9 @@ bool MovementsView::keyInList(const QKeyEvent& key) {
 
 void MovementsView::chooseCurrent() {
     const QModelIndex current = list_->currentIndex();
-    if (current.isValid() && stack_->currentIndex() == 0)
-        emit chosen(movements_->movimento_id(current.row()));
+    if (!current.isValid() || stack_->currentIndex() != 0) return;
+    opened_ = movements_->movimento_id(current.row());
+    emit chosen(opened_);
 }
 
 void MovementsView::filterChanged(const QString& text) {

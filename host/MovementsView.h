@@ -63,6 +63,7 @@ private:
     std::shared_ptr<MovementBook> book_;
     MovementList* movements_;
     MovementLoader* loader_;
+    qint32 opened_ = 0;  ///< the movement chosen last; 0 for none
     QLineEdit* filter_;
     QTableView* list_;
     QLabel* notice_;

@@ -20,15 +20,27 @@ namespace host {
 
 namespace {
 
-/// The component's entry screen with something typed into it, if there is one. A screen that only
-/// shows a movement is none: its main button reads "&Sair".
-QWidget* entryUnderWay() {
+/// The screens of the component on which movements are typed.
+const QStringList EntryScreens{u"frmMovimentos"_s, u"frmRecebimento"_s, u"frmReposicao"_s};
+
+/// One of those screens with something typed into it, if there is one. A screen that only shows a
+/// movement is none: its main button reads "&Sair".
+QWidget* entryUnderWay(const QStringList& screens) {
     for (QWidget* window : QApplication::topLevelWidgets()) {
-        if (!window->isVisible() || window->objectName() != "frmMovimentos"_L1) continue;
+        if (!window->isVisible() || !screens.contains(window->objectName())) continue;
         const auto* button = window->findChild<QPushButton*>(u"Command3"_s);
         if (!button || button->text() != "&Sair"_L1) return window;
     }
     return nullptr;
+}
+
+/// The screens that an operation would take away from what is typed into them. A movement that is
+/// only looked at stays attached to the screen of documents, whatever its type.
+QStringList screensTakenBy(const QString& operation) {
+    if (operation == "Recebimento"_L1) return {u"frmRecebimento"_s};
+    if (operation == "Correcao"_L1) return {u"frmReposicao"_s};
+    if (operation == "NewMovimento"_L1 || operation == "Registo"_L1) return {u"frmMovimentos"_s};
+    return {};
 }
 
 void bringForward(QWidget* window) {
@@ -147,10 +159,7 @@ QAction* frmPrincipal::addOperation(QMenu* menu, const QString& caption, const Q
 }
 
 void frmPrincipal::run(const OperationCall& call) {
-    QWidget* entry = entryUnderWay();
-    const bool takesTheScreen =
-        call.operation == "NewMovimento"_L1 || call.operation == "Registo"_L1;
-    if (entry && takesTheScreen) {
+    if (QWidget* entry = entryUnderWay(screensTakenBy(call.operation))) {
         bringForward(entry);
         core::MsgBox(u"Já há um lançamento aberto.\nTermine-o ou cancele-o antes de abrir outro."_s,
                      core::Icon::Information);
@@ -193,7 +202,7 @@ bool frmPrincipal::event(QEvent* event) {
 }
 
 void frmPrincipal::closeEvent(QCloseEvent* event) {
-    if (QWidget* entry = entryUnderWay()) {
+    if (QWidget* entry = entryUnderWay(EntryScreens)) {
         const auto answer = core::MsgBox(
             u"Há um lançamento aberto, que se perde ao sair.\nQuer voltar ao lançamento?"_s,
             core::Icon::Question, {}, core::Buttons::YesNo);

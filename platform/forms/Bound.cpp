@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "platform/forms/Bound.h"
 
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+
 namespace forms {
 
 DataControl::DataControl(const QString& name, QObject* parent) : QObject(parent) {
@@ -58,6 +61,19 @@ QVariant Bound::rowValue() const {
 
 void Bound::writeRow(const QVariant& value) {
     source_->Recordset()->setCollect(field_, value);
+}
+
+bool Bound::writeEntered(const std::function<void()>& step) {
+    try {
+        step();
+    } catch (const core::Failure& failure) {
+        if (failure.number() != core::NotUpdatable) {
+            core::MsgBox(failure.text(), core::Icon::Exclamation);
+            return false;
+        }
+        rowReplaced();
+    }
+    return true;
 }
 
 }  // namespace forms

@@ -4,6 +4,7 @@
 #include <QObject>
 #include <QPointer>
 #include <QString>
+#include <functional>
 
 #include "platform/ado/Recordset.h"
 
@@ -53,6 +54,10 @@ protected:
     QVariant rowValue() const;
     /// Only while hasRow(); fails as Recordset::setCollect does.
     void writeRow(const QVariant& value);
+    /// Runs the step that writes what a person has entered. In a row that cannot be written the
+    /// change goes nowhere: the control shows the row's value again. False when the step fails
+    /// otherwise, with a box that says why.
+    bool writeEntered(const std::function<void()>& step);
 
 private:
     QPointer<DataControl> source_;

@@ -18,6 +18,11 @@ Button::Button(const QString& name, const QString& caption, QWidget* parent)
     connect(this, &QPushButton::clicked, this, [this] { handle(onClick); });
 }
 
+void Button::setKey(const QString& key) {
+    setShortcut(QKeySequence(key));
+    setToolTip(key);
+}
+
 QSize Button::sizeHint() const {
     // Room beside the caption.
     return QPushButton::sizeHint() + QSize(fontMetrics().averageCharWidth() * 2, 2);

@@ -22,6 +22,9 @@ public:
     Button(const QString& name, const QString& caption, QWidget* parent = nullptr);
     QString Caption() const { return text(); }
     void setCaption(const QString& caption) { setText(caption); }
+    /// A key for a caption without an accelerator; the tool tip names it. A new caption takes the
+    /// key away.
+    void setKey(const QString& key);
     std::function<void()> onClick;
 
     QSize sizeHint() const override;

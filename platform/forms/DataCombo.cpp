@@ -9,8 +9,6 @@
 #include <QSignalBlocker>
 #include <QWheelEvent>
 
-#include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/Look.h"
@@ -131,27 +129,18 @@ void DataCombo::settleTypedText() {
     if (!edited_) return;
     edited_ = false;
     const int entry = entryFor(currentText());
+    const bool hadChoice = !core::isNull(chosen_);
     const QSignalBlocker quiet(this);
     setCurrentIndex(entry);
     // What is no entry must not look like a choice.
     setEditText(entry < 0 ? QString() : itemText(entry));
-    chosen_ = BoundText();
+    chosen_ = entry < 0 && hadChoice ? wiped_ : BoundText();
 }
 
 bool DataCombo::writeChoice() {
     const QVariant choice = chosen_;
     if (!hasRow() || rowValue() == choice) return true;
-    try {
-        writeRow(choice);
-    } catch (const core::Failure& failure) {
-        if (failure.number() == core::NotUpdatable) {
-            rowReplaced();
-            return true;
-        }
-        core::MsgBox(failure.text(), core::Icon::Exclamation);
-        return false;
-    }
-    return true;
+    return writeEntered([&] { writeRow(choice); });
 }
 
 bool DataCombo::leave() {

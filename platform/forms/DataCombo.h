@@ -29,6 +29,9 @@ public:
     /// is not in the list is written all the same and shown as no choice.
     void setBoundText(const QVariant& value);
 
+    /// What is stored when a person wipes a choice; null without this.
+    void setWipedValue(const QVariant& value) { wiped_ = value; }
+
     /// Locked: shown, but nobody can choose. Code still can.
     void setLocked(bool locked);
 
@@ -61,6 +64,7 @@ private:
     QString listField_;
     QString boundColumn_;
     QVariant chosen_;  ///< the stored value, also one that is not in the list
+    QVariant wiped_;
     bool locked_ = false;
     bool edited_ = false;   ///< a person has typed since the choice was last settled
     bool entered_ = false;  ///< has the focus, also while another window is active

@@ -37,9 +37,7 @@ public:
     Running& operator=(const Running&) = delete;
 };
 
-}  // namespace
-
-bool handle(const std::function<void()>& handler) {
+bool run(const std::function<void()>& handler, core::Icon icon) {
     if (!handler) return true;
     const Running scope;
     const core::HandlerScope pending;
@@ -54,8 +52,18 @@ bool handle(const std::function<void()>& handler) {
     } catch (...) {
         text = u"Erro inesperado."_s;
     }
-    core::MsgBox(text, core::Icon::Critical);
+    core::MsgBox(text, icon);
     return false;
+}
+
+}  // namespace
+
+bool handle(const std::function<void()>& handler) {
+    return run(handler, core::Icon::Critical);
+}
+
+bool handlePlainly(const std::function<void()>& handler) {
+    return run(handler, core::Icon::None);
 }
 
 Form::Form(const QString& name, const QString& caption) {

@@ -18,6 +18,8 @@ class Button;
 /// Qt signal calls it itself, because nothing thrown may reach Qt's event loop. Returns whether
 /// the handler passed.
 bool handle(const std::function<void()>& handler);
+/// The same with a plain box, for handlers that report their failures themselves.
+bool handlePlainly(const std::function<void()>& handler);
 
 /// A screen. Its objectName is its name in the code; so is each control's.
 ///

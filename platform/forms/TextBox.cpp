@@ -5,9 +5,7 @@
 #include <QKeyEvent>
 #include <QStyleOptionFrame>
 
-#include "platform/core/Failure.h"
 #include "platform/core/Format.h"
-#include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/Look.h"
@@ -102,18 +100,9 @@ bool TextBox::leave() {
     if (onValidate && !handle([this, &cancel] { onValidate(cancel); })) return false;
     if (cancel) return false;
     if (!edited_) return true;
-    try {
-        setValue(convert(QLineEdit::text()));
-    } catch (const core::Failure& failure) {
-        if (failure.number() == core::NotUpdatable) {
-            rowReplaced();
-            return true;
-        }
-        edited_ = true;
-        core::MsgBox(failure.text(), core::Icon::Exclamation);
-        return false;
-    }
-    return true;
+    if (writeEntered([this] { setValue(convert(QLineEdit::text())); })) return true;
+    edited_ = true;
+    return false;
 }
 
 void TextBox::focusInEvent(QFocusEvent* event) {
@@ -149,6 +138,15 @@ void TextBox::mousePressEvent(QMouseEvent* event) {
     keepSelection_ = false;
     QLineEdit::mousePressEvent(event);
     if (keep) selectAll();
+}
+
+void setBackColor(const std::initializer_list<TextBox*>& boxes, BackColor color) {
+    for (TextBox* box : boxes) box->setBackColor(color);
+}
+
+void greyOut(const std::initializer_list<TextBox*>& boxes) {
+    setBackColor(boxes, BackColor::Menu);
+    for (TextBox* box : boxes) box->Clear();
 }
 
 }  // namespace forms

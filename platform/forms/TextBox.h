@@ -77,4 +77,9 @@ private:
     BackColor backColor_ = BackColor::Window;
 };
 
+/// Colours several boxes alike.
+void setBackColor(const std::initializer_list<TextBox*>& boxes, BackColor color);
+/// Nothing is chosen any more: grey and empty.
+void greyOut(const std::initializer_list<TextBox*>& boxes);
+
 }  // namespace forms

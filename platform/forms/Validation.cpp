@@ -149,6 +149,7 @@ private:
         if (plain && (key->key() == Qt::Key_Tab || key->key() == Qt::Key_Backtab))
             return !agrees(widget);
         if (key->key() != Qt::Key_Return && key->key() != Qt::Key_Enter) return false;
+        if (dynamic_cast<Validating*>(widget)->takesEnter()) return false;
         const QPointer<QPushButton> button = defaultButtonOf(widget->window());
         if (!button || passes(button)) return false;
         if (!agrees(widget)) return true;

@@ -20,6 +20,8 @@ public:
     virtual ~Validating();
     /// Runs the validation and writes what was typed; false keeps the focus.
     virtual bool leave() = 0;
+    /// True when Enter belongs to the control itself and presses no default button.
+    virtual bool takesEnter() const { return false; }
 };
 
 class Button;

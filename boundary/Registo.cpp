@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: MIT
+#include "boundary/Registo.h"
+
+#include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
+#include "entry/EntryRoute.h"
+#include "platform/core/Values.h"
+#include "receipts/ReceiptRoute.h"
+
+using namespace Qt::StringLiterals;
+
+namespace boundary {
+
+namespace tipo = data::tipo;
+
+void openRegisto(const QVariant& Pkey, QObject* Caller) {
+    // A key that is no number fails here; as a number it is not used.
+    core::toLong(Pkey);
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(
+        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey),
+        environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
+        ado::adCmdUnknown);
+    if (rows->atEnd()) return;
+    const QString type = core::toText(rows->Collect(u"tipo"_s));
+    const bool isDocument = type == tipo::Document || type == tipo::Hospital;
+    if (!isDocument && type != tipo::Receipt && type != tipo::Reposition) return;
+    // Of every type: the hidden entry screen keeps the row as well as the screen that shows it.
+    entry::attachMovement(rows, Caller);
+    if (isDocument)
+        entry::showMovement(type);
+    else if (type == tipo::Receipt)
+        receipts::showReceipt(rows);
+    else
+        receipts::showReposition(rows);
+}
+
+}  // namespace boundary

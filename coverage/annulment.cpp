@@ -1,0 +1,67 @@
+// SPDX-License-Identifier: MIT
+// What undoes a document: the mark on its row, a row with the amounts negated beside it, and the
+// accumulators taken back, in the tables in which the member lives now.
+#include "coverage/annulment.h"
+
+#include "coverage/Statements.h"
+#include "data/Correction.h"
+#include "data/RowSets.h"
+#include "platform/com/Component.h"
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace coverage {
+
+namespace {
+
+/// Neither `liquido` nor `created_by` nor a mode is set: an annulled document therefore raises the
+/// franchise already used. It is meant so.
+void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
+    for (const QString& column : {u"codABC"_s, u"rubrica_id"_s, u"doc_no"_s, u"doc_data"_s})
+        correcting.setCollect(column, shown.Collect(column));
+    // The document's value keeps its sign.
+    correcting.setCollect(u"doc_valor"_s, core::toSingle(shown.Collect(u"doc_valor"_s)));
+    const QVariant hospital_id = shown.Collect(u"hospital_id"_s);
+    if (!core::isNull(hospital_id)) correcting.setCollect(u"hospital_id"_s, hospital_id);
+    correcting.setCollect(u"credito"_s, -core::toSingle(shown.Collect(u"credito"_s)));
+    correcting.setCollect(u"debito"_s, -core::toSingle(shown.Collect(u"debito"_s)));
+}
+
+/// The first row found; a missing one fails.
+void takeBack(const ado::Recordset& shown) {
+    const ado::RecordsetPtr rows = data::openToWrite(statements::accumulator(
+        shown.Collect(u"rubrica_id"_s), core::toLong(shown.Collect(u"socio_id"_s)),
+        core::toText(shown.Collect(u"codABC"_s)), data::twinsOf(shown).accumulators));
+    data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
+    data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
+    data::subtract(*rows, u"No_Docs"_s, 1);
+    rows->Update();
+    rows->Close();
+}
+
+}  // namespace
+
+bool annul(const Annulment& annulment) {
+    const ado::Recordset& shown = *annulment.shown;
+    if (!data::confirmAnnulment(u"Anular Lançamento"_s)) return false;
+    data::annul(shown, annulment.caption,
+                [&](ado::Recordset& correcting) { setCorrection(shown, correcting); });
+    // Failures above go up: only what an earlier procedure left pending is found here, and then
+    // the accumulators are left alone.
+    if (core::err().number() == 0)
+        takeBack(shown);
+    else
+        core::MsgBox(u"Erro não especificado, contacte o Administrador do Sistema. "_s +
+                         core::err().description(),
+                     core::Icon::Critical, annulment.caption);
+    if (annulment.CallbackClass)
+        core::passingOver([&] {
+            com::call(annulment.CallbackClass, u"RemoteKey"_s, {shown.Collect(u"movimento_id"_s)});
+        });
+    return true;
+}
+
+}  // namespace coverage

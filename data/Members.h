@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QVariant>
+
+#include "platform/ado/Recordset.h"
+
+/// Active members, as the screens find them. Values are joined into the statements as they stand.
+namespace data {
+
+/// The staff number is what people type.
+ado::RecordsetPtr openMemberByNumber(const QString& no_kor);
+ado::RecordsetPtr openMemberById(qint32 socio_id);
+
+/// The member's key by his staff number; empty text when there is no such member.
+QVariant memberIdOf(const QString& no_kor);
+/// One column of a member; null when the column is null, empty text when there is no such member.
+QVariant ofMember(qint32 socio_id, const QString& column);
+/// One column of a family row, likewise.
+QVariant ofPerson(const QVariant& socio_familia_id, const QString& column);
+
+/// True when the member's row says that he is enrolled in the plan; otherwise says so to the
+/// operator.
+bool checkEnrolled(const ado::Recordset& member);
+
+/// The row of a member who was searched for; null when he has left or is not enrolled, which the
+/// operator is told.
+ado::RecordsetPtr openEnrolledMember(qint32 socio_id);
+
+}  // namespace data

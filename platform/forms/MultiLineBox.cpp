@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: MIT
+#include "platform/forms/MultiLineBox.h"
+
+#include "platform/core/Values.h"
+#include "platform/forms/Look.h"
+
+namespace forms {
+
+MultiLineBox::MultiLineBox(const QString& name, QWidget* parent) : QPlainTextEdit(parent) {
+    setObjectName(name);
+    setTabChangesFocus(true);
+    connect(this, &QPlainTextEdit::textChanged, this, [this] {
+        if (!showing_) edited_ = true;
+    });
+}
+
+bool MultiLineBox::leave() {
+    if (!edited_ || !hasRow()) return true;
+    if (!writeEntered([this] { writeRow(Text()); })) return false;
+    edited_ = false;
+    return true;
+}
+
+void MultiLineBox::refreshFromRow() {
+    if (!edited_) rowReplaced();
+}
+
+void MultiLineBox::rowReplaced() {
+    edited_ = false;
+    const QString text = core::toText(rowValue());
+    if (text == Text()) return;
+    showing_ = true;
+    setPlainText(text);
+    showing_ = false;
+}
+
+void MultiLineBox::focusInEvent(QFocusEvent* event) {
+    QPlainTextEdit::focusInEvent(event);
+    if (isReadOnly()) return;
+    QPalette colours;
+    colours.setColor(QPalette::Base, focusedGround(palette()));
+    setPalette(colours);
+}
+
+void MultiLineBox::focusOutEvent(QFocusEvent* event) {
+    QPlainTextEdit::focusOutEvent(event);
+    if (!isAnotherWindows(event)) setPalette(QPalette());
+}
+
+}  // namespace forms

@@ -1,0 +1,133 @@
+// SPDX-License-Identifier: MIT
+#include "receipts/AccountScreen.h"
+
+#include <QGridLayout>
+#include <QLabel>
+
+#include "boundary/environment/dtZelmars.h"
+#include "data/Members.h"
+#include "platform/core/Format.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+#include "platform/forms/Fields.h"
+
+using namespace Qt::StringLiterals;
+
+namespace receipts {
+
+using forms::BackColor;
+using forms::fieldLabel;
+namespace format = core::format;
+
+AccountScreen::AccountScreen(const QString& name)
+    : RecordScreen(name, u"Lançamento de Zelmar"_s),
+      No_Kor(forms::textBox(u"No_Kor"_s, format::Number)),
+      Text2(forms::displayBox(u"Text2"_s)),
+      Text8(forms::displayBox(u"Text8"_s)),
+      Credito(forms::textBox(u"Credito"_s, format::Money)),
+      DataCombo3(new forms::DataCombo(u"DataCombo3"_s)),
+      Text1(new forms::MultiLineBox(u"Text1"_s)),
+      Command1(new forms::Button(u"Command1"_s, u"Procurar Sócio"_s)) {
+    Command1->setKey(u"Alt+P"_s);
+    makeBeneficiaryFrame();
+    bindControls();
+    No_Kor->onValidate = [this](bool& cancel) { No_Kor_Validate(cancel); };
+    Credito->onGotFocus = [this] { Credito->SelectAll(); };
+}
+
+void AccountScreen::bindControls() {
+    DataCombo3->setList(environment::dtZelmars::instance().Recordsets(u"msModosPagamento"_s),
+                        u"completo"_s, u"code"_s);
+    DataCombo3->bind(Adodc1, u"modo_pagamento"_s);
+    Text8->bind(Adodc1, u"tipo"_s);
+    Credito->bind(Adodc1, u"credito"_s);
+    Text1->bind(Adodc1, u"descrit"_s);
+}
+
+void AccountScreen::showReadOnly(const ado::RecordsetPtr& rows) {
+    Adodc1->setRecordset(rows);
+    No_Kor->bind(Adodc1, u"no_kor"_s);
+    Text2->bind(Adodc1, u"nome"_s);
+    Text2->setBackColor(BackColor::Window);
+    for (forms::TextBox* box : findChildren<forms::TextBox*>()) box->setLocked(true);
+    for (forms::DataCombo* combo : findChildren<forms::DataCombo*>()) combo->setLocked(true);
+    Text1->setLocked(true);
+    Command1->hide();
+    showForReading();
+}
+
+/// Whether the member is enrolled in the plan is not tested here, only where a search of the
+/// screen's own does. It is meant so.
+void AccountScreen::No_Kor_Validate(bool& cancel) {
+    if (bShowing) return;
+    if (No_Kor->Text().isEmpty()) {
+        numberWiped();
+        return;
+    }
+    const QVariant found = data::memberIdOf(No_Kor->Text());
+    if (core::isNullOrEmpty(found)) {
+        clearMember();
+        core::MsgBox(u"Número KOR não encontrado!"_s, core::Icon::Critical, u"Sócios"_s);
+        cancel = true;
+        return;
+    }
+    takeMember(core::toLong(found));
+}
+
+void AccountScreen::takeMember(qint32 socio_id) {
+    Socio_ID = socio_id;
+    Text2->setText(core::toText(data::ofMember(socio_id, u"nome"_s)));
+    Text2->setBackColor(BackColor::Window);
+}
+
+void AccountScreen::clearMember() {
+    forms::greyOut({Text2});
+    Socio_ID = 0;
+}
+
+void AccountScreen::makeBeneficiaryFrame() {
+    beneficiaryFrame_ = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
+    beneficiary_ = forms::pairsIn(beneficiaryFrame_, {u"Modo de Pagamento:"});
+    beneficiary_->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor), 0, 0);
+    beneficiary_->addWidget(No_Kor, 0, 1);
+    beneficiary_->addWidget(Text2, 0, 2);
+    beneficiary_->addWidget(Command1, 0, 3);
+    No_Kor->setFixedWidth(forms::widthFor(No_Kor, u"0000000000"));
+    Text2->setMinimumWidth(forms::widthFor(Text2, u"Maria da Conceição de Vasconcelos"));
+    beneficiary_->setColumnStretch(2, 1);
+}
+
+QWidget* AccountScreen::notesFrame() {
+    auto* frame = new forms::Frame(u"Frame4"_s, u"Obeservações"_s);
+    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:"});
+    grid->addWidget(fieldLabel(u"Notas:"_s, Text1), 0, 0, Qt::AlignTop | Qt::AlignRight);
+    grid->addWidget(Text1, 0, 1);
+    grid->setColumnStretch(1, 1);
+    Text1->setMinimumHeight(Text1->fontMetrics().lineSpacing() * 4);
+    return frame;
+}
+
+void AccountScreen::layOut(const QString& title, const QString& explanation,
+                           std::initializer_list<QWidget*> frames,
+                           std::initializer_list<forms::Button*> buttons) {
+    auto* all = new QVBoxLayout(this);
+    all->setContentsMargins(0, 0, 0, 0);
+    all->setSpacing(0);
+    all->addWidget(forms::headingBand(title, explanation, u"Label25"_s, u"Label26"_s, u"Image1"_s));
+    auto* body = new QVBoxLayout;
+    body->setContentsMargins(12, 10, 12, 12);
+    body->setSpacing(9);
+    all->addLayout(body);
+    body->addWidget(beneficiaryFrame_);
+    for (QWidget* frame : frames) body->addWidget(frame);
+    body->addWidget(notesFrame(), 1);
+    auto* foot = new QHBoxLayout;
+    foot->addStretch(1);
+    for (forms::Button* button : buttons) foot->addWidget(button);
+    body->addLayout(foot);
+    // It asks before it posts.
+    Command3->setDefault(true);
+    No_Kor->setFocus();
+}
+
+}  // namespace receipts

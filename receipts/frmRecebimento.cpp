@@ -1,0 +1,100 @@
+// SPDX-License-Identifier: MIT
+#include "receipts/frmRecebimento.h"
+
+#include <QGridLayout>
+#include <QLabel>
+
+#include "data/Codes.h"
+#include "data/MemberSearch.h"
+#include "data/Members.h"
+#include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+#include "platform/core/Values.h"
+#include "platform/forms/Fields.h"
+#include "receipts/receipt.h"
+
+using namespace Qt::StringLiterals;
+
+namespace receipts {
+
+using forms::fieldLabel;
+
+frmRecebimento::frmRecebimento()
+    : AccountScreen(u"frmRecebimento"_s),
+      Text3(forms::textBox(u"Text3"_s, core::format::Date)),
+      Text4(forms::textBox(u"Text4"_s)),
+      Command2(new forms::Button(u"Command2"_s, u"Anular"_s)) {
+    Command2->setKey(u"Alt+A"_s);
+    layOut(u"Recebimento"_s, u"Registo do dinheiro que o associado entrega ao Plano de Saúde."_s,
+           {receiptFrame()}, {Command2, Command3, Command4});
+    Command2->hide();
+    Text3->bind(Adodc1, u"data"_s);
+    Text4->bind(Adodc1, u"cheque"_s);
+    Command1->onClick = [this] { Command1_Click(); };
+    Command2->onClick = [this] { Command2_Click(); };
+    Command4->onClick = [this] { Unload(); };
+    QWidget* const order[] = {No_Kor, Command1, Text3,    Credito,  DataCombo3,
+                              Text4,  Text1,    Command3, Command2, Command4};
+    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+}
+
+QWidget* frmRecebimento::receiptFrame() {
+    auto* frame = new forms::Frame(u"Frame2"_s, u"Recebimento:"_s);
+    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Número do Cheque:"});
+    grid->addWidget(fieldLabel(u"Data:"_s, Text3), 0, 0);
+    grid->addWidget(Text3, 0, 1);
+    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 0, 2);
+    grid->addWidget(Text8, 0, 3);
+    grid->addWidget(fieldLabel(u"Valor a Creditar:"_s, Credito), 1, 0);
+    grid->addWidget(Credito, 1, 1);
+    grid->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 2, 0);
+    grid->addWidget(DataCombo3, 2, 1);
+    grid->addWidget(fieldLabel(u"Número do Cheque:"_s, Text4), 2, 2);
+    grid->addWidget(Text4, 2, 3);
+    return frame;
+}
+
+void frmRecebimento::showReadOnly(const ado::RecordsetPtr& rows) {
+    AccountScreen::showReadOnly(rows);
+    Command2->show();
+}
+
+void frmRecebimento::setDefaults() {
+    Text3->setValue(core::fromDate(core::today()));
+    Text8->setText(data::tipo::Receipt.toString());
+    DataCombo3->setBoundText(data::modo::Cheque.toString());
+}
+
+/// The date goes grey as well, and stays so. It is meant so.
+void frmRecebimento::numberWiped() {
+    AccountScreen::numberWiped();
+    Text3->setBackColor(forms::BackColor::Menu);
+}
+
+/// Gives up without a word when anything fails.
+void frmRecebimento::Command1_Click() {
+    core::passingOver([this] {
+        const qint32 id = data::chooseMember(data::openSearch());
+        if (id == 0) return;
+        if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
+            takeMember(id);
+            No_Kor->setText(core::toText(member->Collect(u"no_kor"_s)));
+        } else {
+            No_Kor->Clear();
+            clearMember();
+        }
+    });
+}
+
+void frmRecebimento::post() {
+    if (postReceipt({Adodc1->Recordset(), Socio_ID, Caption(), DataCombo3->Text(), No_Kor->Text(),
+                     Credito->Text()}))
+        Unload();
+}
+
+void frmRecebimento::Command2_Click() {
+    if (annulReceipt(Adodc1->Recordset(), Caption())) Unload();
+}
+
+}  // namespace receipts

@@ -1,0 +1,153 @@
+// SPDX-License-Identifier: MIT
+#include "receipts/frmReposicao.h"
+
+#include <QGridLayout>
+#include <QLabel>
+
+#include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
+#include "data/Members.h"
+#include "platform/core/Clock.h"
+#include "platform/core/Format.h"
+#include "platform/core/Values.h"
+#include "platform/forms/Fields.h"
+#include "receipts/reposition.h"
+
+using namespace Qt::StringLiterals;
+
+namespace receipts {
+
+using forms::fieldLabel;
+namespace format = core::format;
+
+frmReposicao::frmReposicao()
+    : AccountScreen(u"frmReposicao"_s),
+      Text3(forms::displayBox(u"Text3"_s)),
+      Text4(forms::displayBox(u"Text4"_s)),
+      Text7(forms::textBox(u"Text7"_s, format::Date)),
+      Debito(forms::textBox(u"Debito"_s, format::Money)),
+      DataCombo1(new forms::DataCombo(u"DataCombo1"_s)),
+      Command2(new forms::Button(u"Command2"_s, u"Indicar Familiar"_s)) {
+    Command2->setKey(u"Alt+I"_s);
+    Command2->setEnabled(false);
+    addPersonRow();
+    layOut(u"Correcção"_s, u"Correcção da conta corrente do associado, sem cálculo."_s,
+           {propertiesFrame(), resultFrame()}, {Command3, Command4});
+    bindControls();
+    Debito->onGotFocus = [this] { Debito->SelectAll(); };
+    Command1->onClick = [this] { Command1_Click(); };
+    Command2->onClick = [this] { Command2_Click(); };
+    Command4->onClick = [this] { Unload(); };
+    QWidget* const order[] = {No_Kor, Command1, Command2, Text7,    DataCombo1, DataCombo3,
+                              Debito, Credito,  Text1,    Command3, Command4};
+    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+}
+
+void frmReposicao::bindControls() {
+    DataCombo1->setList(environment::dtZelmars::instance().Recordsets(u"msRubricas"_s),
+                        u"completo"_s, u"rubrica_id"_s);
+    DataCombo1->setWipedValue(0);
+    DataCombo1->bind(Adodc1, u"rubrica_id"_s);
+    Text3->bind(Adodc1, u"codABC"_s);
+    Text7->bind(Adodc1, u"data"_s);
+    Debito->bind(Adodc1, u"debito"_s);
+}
+
+void frmReposicao::addPersonRow() {
+    QGridLayout* grid = beneficiary();
+    grid->addWidget(fieldLabel(u"Familiar:"_s, Text3), 1, 0);
+    grid->addWidget(Text3, 1, 1);
+    grid->addWidget(Text4, 1, 2);
+    grid->addWidget(Command2, 1, 3);
+    Text3->setFixedWidth(No_Kor->width());
+}
+
+QWidget* frmReposicao::propertiesFrame() {
+    auto* frame = new forms::Frame(u"Frame2"_s, u"Propriedades do Lançamento:"_s);
+    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Modo de Pagamento:"});
+    grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
+    grid->addWidget(Text7, 0, 1);
+    grid->addWidget(fieldLabel(u"Rúbrica:"_s, DataCombo1), 0, 2);
+    grid->addWidget(DataCombo1, 0, 3);
+    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 1, 0);
+    grid->addWidget(Text8, 1, 1);
+    grid->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 1, 2);
+    grid->addWidget(DataCombo3, 1, 3);
+    for (forms::TextBox* box : {Text7, Text8})
+        box->setFixedWidth(forms::widthFor(box, u"00-00-00000"));
+    grid->setColumnStretch(1, 0);
+    return frame;
+}
+
+QWidget* frmReposicao::resultFrame() {
+    auto* frame = new forms::Frame(u"Frame3"_s, u"Resultado do Lançamento:"_s);
+    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Modo de Pagamento:"});
+    grid->addWidget(fieldLabel(u"Débito:"_s, Debito), 0, 0);
+    grid->addWidget(Debito, 0, 1);
+    grid->addWidget(fieldLabel(u"Crédito:"_s, Credito), 0, 2);
+    grid->addWidget(Credito, 0, 3);
+    return frame;
+}
+
+void frmReposicao::showReadOnly(const ado::RecordsetPtr& rows) {
+    AccountScreen::showReadOnly(rows);
+    Text4->bind(Adodc1, u"familiar"_s);
+    forms::setBackColor({Text3, Text4}, forms::BackColor::Window);
+    Command2->hide();
+}
+
+/// A mode of payment is not preset.
+void frmReposicao::setDefaults() {
+    Text7->setValue(core::fromDate(core::today()));
+    Text8->setText(data::tipo::Reposition.toString());
+}
+
+void frmReposicao::takeMember(qint32 socio_id) {
+    AccountScreen::takeMember(socio_id);
+    forms::setBackColor({Text3, Text4}, forms::BackColor::Window);
+    Command2->setEnabled(true);
+}
+
+void frmReposicao::clearMember() {
+    AccountScreen::clearMember();
+    forms::greyOut({Text3, Text4});
+    Command2->setEnabled(false);
+    Familia_ID = 0;
+}
+
+com::Object frmReposicao::openMemberFile() {
+    const com::Object file = com::createObject(u"Tiqueta.General"_s);
+    file.call(u"Login"_s,
+              {u"MSAccess"_s, QVariant::fromValue(environment::dtZelmars::instance().MSAccess())});
+    return file;
+}
+
+/// Whether the member is enrolled is not tested. A search given up leaves no member, with the
+/// number and the name of the former one still shown. It is meant so.
+void frmReposicao::Command1_Click() {
+    forms::handlePlainly([this] {
+        Socio_ID = core::toLong(openMemberFile().call(u"FindSocios"_s));
+        if (Socio_ID == 0) return;
+        No_Kor->setText(core::toText(data::ofMember(Socio_ID, u"no_kor"_s)));
+        takeMember(Socio_ID);
+    });
+}
+
+void frmReposicao::Command2_Click() {
+    Familia_ID = openMemberFile().call(u"EscolherFamiliar"_s, {Socio_ID});
+    if (core::compareNumbers(Familia_ID, 0) == 0) return;
+    // A null leaves the control as it is.
+    for (const auto& [box, column] : {std::pair(Text3, u"codABC"_s), std::pair(Text4, u"nome"_s)}) {
+        const QVariant value = data::ofPerson(Familia_ID, column);
+        if (!core::isNull(value)) box->setText(core::toText(value));
+    }
+}
+
+void frmReposicao::post() {
+    if (postReposition({Adodc1->Recordset(), Socio_ID, Caption(), DataCombo1->Text(),
+                        DataCombo1->BoundText(), Text3->Text(), No_Kor->Text(), Debito->Text(),
+                        Credito->Text()}))
+        Unload();
+}
+
+}  // namespace receipts

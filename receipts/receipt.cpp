@@ -1,0 +1,95 @@
+// SPDX-License-Identifier: MIT
+#include "receipts/receipt.h"
+
+#include "data/Correction.h"
+#include "data/NewMovement.h"
+#include "data/RowSets.h"
+#include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+
+using namespace Qt::StringLiterals;
+
+namespace receipts {
+
+namespace {
+
+using core::Icon;
+using core::MsgBox;
+
+bool receiptChecks(const ReceiptEntry& receipt) {
+    const auto missing = [&](const QString& text) {
+        MsgBox(text, Icon::Information, receipt.caption);
+        return false;
+    };
+    if (receipt.DataCombo3.isEmpty()) return missing(u"Tem de indicar um modo de pagamento!"_s);
+    if (receipt.No_Kor.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
+    if (receipt.Credito.isEmpty()) return missing(u"Tem de indicar um valor para o crédito!"_s);
+    // Below 0 is let through, and lowers the account.
+    if (core::compareNumbers(receipt.record->Collect(u"credito"_s), 0) == 0)
+        return missing(u"Tem de indicar um valor diferente de 0(zero) para o crédito !"_s);
+    return true;
+}
+
+/// The account-level row alone, and there the credit alone.
+void addToAccount(const ReceiptEntry& receipt) {
+    const ado::RecordsetPtr rows =
+        data::openToWrite(u"Select * from tbSocios_Acumulados WHERE (socio_id="_s +
+                          QString::number(receipt.Socio_ID) + u") and (rubrica_id_main=0)"_s);
+    if (rows->atEnd()) {
+        rows->AddNew();
+        rows->setCollect(u"rubrica_id_main"_s, 0);
+    }
+    rows->setCollect(u"Socio_ID"_s, receipt.Socio_ID);
+    data::nullBecomesZero(*rows, u"credito_ac"_s);
+    data::nullBecomesZero(*rows, u"debito_ac"_s);
+    data::add(*rows, u"credito_ac"_s, receipt.record->Collect(u"credito"_s));
+    rows->Update();
+    rows->Close();
+}
+
+/// Not the account-level row that the posting added to, but the first of the member's rows,
+/// whichever it is. A row that has to be added is nobody's and keeps null sums. It is meant so.
+void takeBack(const ado::Recordset& shown) {
+    const ado::RecordsetPtr rows = data::openToWrite(
+        u"Select * from "_s + data::twinsOf(shown).accumulators + u" WHERE (socio_id="_s +
+        core::toText(shown.Collect(u"socio_id"_s)) + u")"_s);
+    if (rows->atEnd()) rows->AddNew();
+    data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
+    data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
+    rows->Update();
+    rows->Close();
+}
+
+}  // namespace
+
+bool postReceipt(const ReceiptEntry& receipt) {
+    if (!data::confirmPosting(receipt.caption) || !receiptChecks(receipt)) return false;
+    ado::Recordset& record = *receipt.record;
+    record.setCollect(u"doc_valor"_s, 0);
+    record.setCollect(u"debito"_s, 0);
+    record.setCollect(u"socio_id"_s, receipt.Socio_ID);
+    core::err().clear();
+    // Not passed over, unlike on the other screens: a failure goes up with the engine's text.
+    data::numberAndSave(record);
+    if (!data::savedOrTold(receipt.caption)) return false;
+    addToAccount(receipt);
+    return true;
+}
+
+bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption) {
+    if (!data::confirmAnnulment(u"Anular Recebimento"_s)) return false;
+    data::annul(*shown, caption, [&](ado::Recordset& correcting) {
+        const QVariant credito = shown->Collect(u"credito"_s);
+        if (!core::isNull(credito)) correcting.setCollect(u"credito"_s, -core::toDouble(credito));
+        correcting.setCollect(u"debito"_s, 0);
+    });
+    // Finds only what an earlier procedure left pending; the accumulators are then left alone.
+    if (core::err().number() == 0)
+        takeBack(*shown);
+    else
+        MsgBox(u"Erro inesperado, contacte o Administrador do Sistema"_s, Icon::Critical, caption);
+    return true;
+}
+
+}  // namespace receipts
