@@ -8,7 +8,7 @@ namespace reports {
 namespace {
 
 /// Between a text and the edge of its column.
-constexpr double Padding = 0.8;
+constexpr double Padding = 1.1;
 
 template <class MakeItem>
 void addColumns(Section& section, const std::vector<Column>& columns, const MakeItem& make) {

@@ -11,8 +11,8 @@ namespace reports {
 namespace {
 
 using core::format::Date;
+using core::format::Escudos;
 using core::format::Money;
-constexpr QStringView Escudos = u"#,##0.00 Esc";
 
 /// A caption that is set when the report is printed.
 Label memberLabel(double x, double y, double width, const QString& name) {
@@ -67,15 +67,15 @@ Report prtExtrato1() {
     const Style bold{.bold = true};
     const Style boldRight{.bold = true, .align = Align::Right};
     const std::vector<Column> amounts{
-        {u"Documento"_s, u"doc_valor"_s, 20.5, Align::Right, Money},
+        {u"Documento"_s, u"doc_valor"_s, 20, Align::Right, Money},
         // The percentage itself is not kept: under its title stands what it came to.
         {u"%%"_s, u"comparticipacao"_s, 20, Align::Right, Money},
         {u"Comparticipação"_s, u"comparticipacao"_s, 25, Align::Right, Money},
         {u"Recebido"_s, u"recebido"_s, 19.5, Align::Right, Money},
-        {u"Iliquido"_s, u"iliquido"_s, 20, Align::Right, Money},
-        {u"Saldo Plafond"_s, u"saldo_plafond"_s, 21.5, Align::Right, Money},
+        {u"Iliquido"_s, u"iliquido"_s, 19.5, Align::Right, Money},
+        {u"Saldo Plafond"_s, u"saldo_plafond"_s, 22, Align::Right, Money},
         {u"Liquído"_s, u"liquido"_s, 19.5, Align::Right, Money},
-        {u"Saldo C/C"_s, u"saldo_acumulado"_s, 20.5, Align::Right, Money},
+        {u"Saldo C/C"_s, u"saldo_acumulado"_s, 20, Align::Right, Money},
         {u"A Receber"_s, u"debito"_s, 19.5, Align::Right, Money},
     };
     Report report = statement(u"prtExtrato1"_s);
@@ -89,9 +89,9 @@ Report prtExtrato1() {
         field(134, first, 50, u"data"_s, Date, boldRight),
         field(2, second, 9, u"codABC"_s, {}, bold),
         label(12, second, 17, u"Familiar:"_s),
-        field(29, second, 74, u"Familiar"_s),
-        label(106, second, 16, u"Rúbrica:"_s),
-        field(122, second, 62, u"rubrica"_s),
+        field(29, second, 69, u"Familiar"_s),
+        label(100, second, 15, u"Rúbrica:"_s),
+        field(115, second, 69, u"rubrica"_s),
         label(2, third, 27, u"Nº Documento:"_s),
         field(29, third, 40, u"doc_no"_s),
         label(71, third, 29, u"Data Documento:"_s),
@@ -116,15 +116,15 @@ Report prtExtrato1() {
 Report rptExtrato2() {
     const std::vector<Column> columns{
         {u"No."_s, u"movimento_no"_s, 13, Align::Right},
-        {u"Data"_s, u"data"_s, 18, Align::Left, Date},
-        {u"F."_s, u"codABC"_s, 8},
-        {u"Tipo"_s, u"tipo"_s, 10},
-        {u"Rúbrica"_s, u"rubrica"_s, 40},
+        {u"Data"_s, u"data"_s, 18.5, Align::Left, Date},
+        {u"F."_s, u"codABC"_s, 7},
+        {u"Tipo"_s, u"tipo"_s, 9.5},
+        {u"Rúbrica"_s, u"rubrica"_s, 43.5},
         {u"Documento"_s, u"doc_no"_s, 24},
-        {u"Valor"_s, u"doc_valor"_s, 22, Align::Right, Money},
+        {u"Valor"_s, u"doc_valor"_s, 20.5, Align::Right, Money},
         {{}, u"modo_pagamento"_s, 9},
-        {u"Crédito"_s, u"credito"_s, 21, Align::Right, Money},
-        {u"Recebido"_s, u"debito"_s, 21, Align::Right, Money},
+        {u"Crédito"_s, u"credito"_s, 20.5, Align::Right, Money},
+        {u"Recebido"_s, u"debito"_s, 20.5, Align::Right, Money},
     };
     Report report = statement(u"rptExtrato2"_s);
     addTitles(report.reportHeader, columns);

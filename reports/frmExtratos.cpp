@@ -7,7 +7,7 @@
 
 #include "boundary/environment/dtZelmars.h"
 #include "data/MemberSearch.h"
-#include "data/modDlookup.h"
+#include "data/Members.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -25,16 +25,6 @@ namespace reports {
 using core::Icon;
 using core::MsgBox;
 using forms::BackColor;
-
-namespace {
-
-ado::RecordsetPtr openRead(const QString& statement) {
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statement, environment::dtZelmars::instance().MSAccess());
-    return rows;
-}
-
-}  // namespace
 
 frmExtratos::frmExtratos() : Form(u"frmExtratos"_s, u"Impressão de Extratos"_s) {
     makeControls();
@@ -76,7 +66,7 @@ QWidget* frmExtratos::beneficiaryFrame() {
     row->addWidget(Text2, 1);
     row->addWidget(Command1);
     No_Kor->setFixedWidth(No_Kor->fontMetrics().horizontalAdvance(u"000000000000"_s));
-    Text2->setMinimumWidth(Text2->fontMetrics().averageCharWidth() * 40);
+    Text2->setMinimumWidth(Text2->fontMetrics().averageCharWidth() * 50);
     return frame;
 }
 
@@ -145,6 +135,7 @@ void frmExtratos::setMember(qint32 id, const QString& number, const QString& nam
     No_Kor->setText(number);
     Text2->setText(name);
     Text2->setBackColor(id != 0 ? BackColor::Window : BackColor::Menu);
+    if (id != 0) Text3->setFocus();
 }
 
 void frmExtratos::clearMember() {
@@ -158,8 +149,7 @@ void frmExtratos::No_Kor_Validate(bool& cancel) {
         clearMember();
         return;
     }
-    const ado::RecordsetPtr member =
-        openRead(u"select * from tbsocios where no_kor ='"_s + No_Kor->Text() + u"'"_s);
+    const ado::RecordsetPtr member = data::openMemberByNumber(No_Kor->Text());
     if (member->atEnd()) {
         clearMember();
         MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Sócios"_s);
@@ -178,12 +168,8 @@ void frmExtratos::Command1_Click() {
         const qint32 id = data::chooseMember(data::openSearch());
         if (id == 0) return;
         socio_id_ = id;
-        const auto lookedUp = [id](const QString& column) {
-            return core::toText(data::DLookup(
-                u"select * from tbsocios where socio_id ="_s + QString::number(id), {}, column));
-        };
-        No_Kor->setText(lookedUp(u"no_kor"_s));
-        Text2->setText(lookedUp(u"nome"_s));
+        No_Kor->setText(core::toText(data::ofMember(id, u"no_kor"_s)));
+        Text2->setText(core::toText(data::ofMember(id, u"nome"_s)));
         Text2->setBackColor(BackColor::Window);
     });
 }
@@ -223,8 +209,7 @@ void frmExtratos::Imprimir_Click() {
     Imprimir->setEnabled(false);
     const auto again = qScopeGuard([this] { Imprimir->setEnabled(true); });
     // Who has left the file of active members gets no statement, and nobody is told.
-    const ado::RecordsetPtr member =
-        openRead(u"Select * from tbSocios where socio_id="_s + QString::number(socio_id_));
+    const ado::RecordsetPtr member = data::openMemberById(socio_id_);
     if (!member->atEnd()) print(*member);
     member->Close();
     Unload();
