@@ -58,7 +58,8 @@ public:
 
     /// Opens a statement: one SELECT, or a SHAPE on a shaping connection; anything else, or a
     /// second statement behind it, is refused before it reaches the engine. The first row, if any,
-    /// is current.
+    /// is current. A dynamic pessimistic set of a table without rows holds the place of the first
+    /// one until Update or Close, so that of several workstations one alone adds a counter's row.
     void Open(const QString& source, const ConnectionPtr& connection,
               CursorType cursor = adOpenUnspecified, LockType lock = adLockUnspecified,
               CommandType options = adCmdUnspecified);

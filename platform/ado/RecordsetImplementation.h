@@ -67,6 +67,7 @@ struct Recordset::Implementation {
     RowStore fresh;   ///< the current row, read afresh from the table
     bool wantsFresh = false;
     std::unique_ptr<RowLock> held;
+    std::unique_ptr<RowLock> heldPlace;  ///< of the first row of a table that has none
     bool settled =
         false;  ///< the current row was stored; until it is changed again nobody holds it
     bool deleted = false;                        ///< the current row was deleted here
@@ -81,6 +82,7 @@ struct Recordset::Implementation {
 
     // Opening.
     void openRows();
+    void openStatement(const Statement& statement);
     void openShape(const Statement& statement);
     void close();
 

@@ -38,11 +38,24 @@ void Recordset::Implementation::openRows() {
     if (ShapeStatement::isShape(statement)) {
         openShape(statement);
     } else {
-        if (!readOnly()) table = statement.singleTable();
-        if (!table.isEmpty() && !engine->isTable(table)) table.clear();
-        rows = std::make_unique<Rows>(engine->open(statement, table), clientSide);
+        openStatement(statement);
     }
     at = rows->toFirst() ? At::Row : At::Nothing;
+}
+
+void Recordset::Implementation::openStatement(const Statement& statement) {
+    Session& engine = *connection->session();
+    if (!readOnly()) table = statement.singleTable();
+    if (!table.isEmpty() && !engine.isTable(table)) table.clear();
+    rows = std::make_unique<Rows>(engine.open(statement, table), clientSide);
+    // A counter without its row: of all that find none, one alone adds it; the others wait here
+    // and find it then.
+    const bool isCounter = cursor == adOpenDynamic && lockType == adLockPessimistic;
+    if (!isCounter || table.isEmpty() || rows->toFirst()) return;
+    RowStore nothing;
+    heldPlace = engine.lock(table, NoRow, connection->CommandTimeout, nothing);
+    rows = std::make_unique<Rows>(engine.open(statement, table), clientSide);
+    if (rows->toFirst()) heldPlace.reset();
 }
 
 void Recordset::Implementation::openShape(const Statement& statement) {
@@ -74,6 +87,7 @@ void Recordset::Implementation::openShape(const Statement& statement) {
 
 void Recordset::Implementation::close() {
     leaveRow();
+    heldPlace.reset();
     rows.reset();
     chapter.reset();
     table.clear();

@@ -57,6 +57,7 @@ void Recordset::Implementation::insertNew() {
         values.push_back(value);
     }
     added.push_back(session()->insert(table, columns, values));
+    heldPlace.reset();
     addedAt = static_cast<qint64>(added.size()) - 1;
     at = At::Added;
     changes.clear();

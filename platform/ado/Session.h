@@ -27,6 +27,9 @@ struct Column {
 /// PostgreSQL). Distinct for rows that are equal in every column.
 using RowIdentity = qint64;
 
+/// The identity of no row: no engine gives it to one.
+inline constexpr RowIdentity NoRow = 0;
+
 /// A forward pass over the rows of one statement. The rows are those of the moment of opening.
 class Pass {
 public:

@@ -31,6 +31,9 @@ struct Record {
     char owner[OwnerLength] = {};
 };
 
+/// Milliseconds between two looks at a row that somebody holds. A number is drawn in less.
+constexpr unsigned long LongestPause = 4;
+
 /// A place in the file for a row of a table; the same in every process.
 quint64 offsetOf(const QString& table, RowIdentity row) {
     quint64 hash = 14695981039346656037ULL;  // FNV-1a
@@ -126,7 +129,7 @@ std::unique_ptr<RowLock> SqliteLocks::lock(const QString& table, RowIdentity row
     if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
     QElapsedTimer waited;
     waited.start();
-    for (unsigned long pause = 1; !lock->take(); pause = qMin(pause * 2, 50UL)) {
+    for (unsigned long pause = 1; !lock->take(); pause = qMin(pause * 2, LongestPause)) {
         if (waited.hasExpired(qint64{timeoutSeconds} * 1000)) refuseRow(table, row, lock->holder());
         QThread::msleep(pause);
     }

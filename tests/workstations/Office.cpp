@@ -222,7 +222,7 @@ Outcome Office::workThroughKills(int workstations, int kills) {
 }
 
 Outcome Office::finish(Outcome outcome) {
-    outcome.faults << audit(connect(0), engine_, said_, wasEmpty_);
+    outcome.faults << audit(connect(2), engine_, said_, wasEmpty_);
     return outcome;
 }
 
