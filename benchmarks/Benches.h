@@ -6,7 +6,9 @@
 namespace benchmarks {
 
 void measureCoverage(Report& report);
+void measureEngines(Report& report);
 void measureScreens(Report& report);
 void measureSearches(Report& report);
+void measureWorkstations(Report& report);
 
 }  // namespace benchmarks

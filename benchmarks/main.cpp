@@ -28,8 +28,10 @@ int main(int argc, char** argv) {
     benchmarks::Report report(application.arguments().mid(1));
     try {
         benchmarks::measureCoverage(report);
+        benchmarks::measureEngines(report);
         benchmarks::measureScreens(report);
         benchmarks::measureSearches(report);
+        benchmarks::measureWorkstations(report);
     } catch (const std::exception& failure) {
         std::fprintf(stderr, "%s\n", failure.what());
         return 2;
