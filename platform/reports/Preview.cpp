@@ -6,13 +6,11 @@
 #include <QScreen>
 #include <QShortcut>
 
-#include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
 #include "platform/forms/Controls.h"
-#include "platform/reports/Layout.h"
 #include "platform/reports/PreviewFindBar.h"
 #include "platform/reports/PreviewOutput.h"
 #include "platform/reports/PreviewSearch.h"
+#include "platform/reports/PreviewSource.h"
 
 using namespace Qt::StringLiterals;
 
@@ -21,20 +19,16 @@ namespace reports {
 namespace {
 
 constexpr int Slice = 12;  // milliseconds of work between two looks at keys and mouse
-constexpr QSize UsualSize(1040, 860);
+constexpr QSize UsualSize(1120, 860);
 
 }  // namespace
 
 struct Preview::Implementation {
-    Implementation(Preview* window, const Report& design, const ado::RecordsetPtr& source);
+    Implementation(Preview* window, const Report& design, const ado::RecordsetPtr& rows);
 
-    // What is shown and where it comes from.
     Preview* form;
-    Report report;
-    ado::RecordsetPtr rows;
-    std::unique_ptr<Layout> layout;  ///< none any more once all pages are there, or none can follow
+    PreviewSource source;
     std::shared_ptr<Pages> pages;
-    bool rowsTaken = false;  ///< the rows were closed or read anew under the preview
     PreviewSearch search;
     int awaitedPage = -1;  ///< to be shown as soon as it is laid out
 
@@ -51,8 +45,7 @@ struct Preview::Implementation {
     void stop();
 
     void work();
-    void layOutPages();
-    void endLayout();
+    void addPages();
     void lookFor();
 
     void act(PreviewCommand command);
@@ -73,13 +66,8 @@ Preview::Preview(const Report& report, const ado::RecordsetPtr& rows)
 Preview::~Preview() = default;
 
 Preview::Implementation::Implementation(Preview* window, const Report& design,
-                                        const ado::RecordsetPtr& source)
-    : form(window),
-      report(design),
-      rows(source),
-      layout(std::make_unique<Layout>(design, source)),
-      pages(layout->pages()),
-      search(pages) {
+                                        const ado::RecordsetPtr& rows)
+    : form(window), source(design, rows), pages(source.pages()), search(pages) {
     layOutWindow();
     connectControls();
     view->setPages(pages);
@@ -121,17 +109,14 @@ void Preview::Implementation::connectControls() {
     form->onUnload = [this] { stop(); };
     timer->onTimer = [this] { work(); };
     bar->onPage = [this](int page) { goToPage(page); };
-    bar->onPercent = [this](double percent) { view->setPercent(percent), view->setFocus(); };
-    bar->onFit = [this](PreviewView::Fit fit) { view->setFit(fit), view->setFocus(); };
+    bar->onPercent = [this](double percent) { view->setFocus(), view->setPercent(percent); };
+    bar->onFit = [this](PreviewView::Fit fit) { view->setFocus(), view->setFit(fit); };
     findBar->onText = [this] { find(); };
     view->setHighlights([this](int page) { return highlightsOn(page); });
     connect(view, &PreviewView::moved, form, [this] { showPlace(); });
-    const auto taken = [this] { rowsTaken = true; };
-    connect(rows.get(), &ado::Recordset::closed, form, taken);
-    connect(rows.get(), &ado::Recordset::opened, form, taken);
     for (const PreviewAction& action : previewActions()) {
         if (action.keys.isEmpty()) continue;
-        auto* key = new QShortcut(QKeySequence(action.keys.toString()), form);
+        auto* key = new QShortcut(QKeySequence::fromString(action.keys.toString()), form);
         const PreviewCommand command = action.command;
         connect(key, &QShortcut::activated, form,
                 [this, command] { forms::handle([this, command] { act(command); }); });
@@ -141,50 +126,41 @@ void Preview::Implementation::connectControls() {
 void Preview::Implementation::stop() {
     timer->setEnabled(false);
     if (waiting) waiting->reject();
-    layout.reset();
-    rows.reset();
+    source.stop();
     view->setPages(nullptr);
 }
 
 // The work between keys and mouse.
 
 void Preview::Implementation::work() {
-    layOutPages();
+    addPages();
     if (search.state() == PreviewSearch::State::Looking) lookFor();
-    if (awaitedPage >= 0 && (awaitedPage < pages->count() || !layout)) {
+    if (awaitedPage >= 0 && (awaitedPage < pages->count() || !source.isAtWork())) {
         view->goToPage(awaitedPage);
         awaitedPage = -1;
     }
-    timer->setEnabled(layout || search.state() == PreviewSearch::State::Looking);
+    timer->setEnabled(source.isAtWork() || search.state() == PreviewSearch::State::Looking);
 }
 
-void Preview::Implementation::layOutPages() {
-    if (!layout) return;
+void Preview::Implementation::addPages() {
+    if (!source.isAtWork()) return;
+    const auto show = [this] {
+        if (waiting && !source.isAtWork()) waiting->accept();
+        view->pagesAdded();
+        showPlace();
+    };
     try {
-        if (rowsTaken)
-            throw core::Failure(core::ObjectClosed,
-                                u"As linhas desta listagem foram fechadas antes de todas as "
-                                u"páginas estarem prontas."_s);
-        if (layout->go(Slice)) endLayout();
+        source.go(Slice);
     } catch (...) {
-        endLayout();
+        show();
         throw;
     }
-    view->pagesAdded();
-    showPlace();
-}
-
-/// No page is to come any more.
-void Preview::Implementation::endLayout() {
-    layout.reset();
-    if (waiting) waiting->accept();
-    view->pagesAdded();
-    showPlace();
+    show();
 }
 
 void Preview::Implementation::lookFor() {
     using enum PreviewSearch::State;
-    const PreviewSearch::State state = search.go(Slice, layout != nullptr);
+    const PreviewSearch::State state = search.go(Slice, source.isAtWork());
     if (state == Found) view->reveal(search.hitPage(), search.hitBox());
     view->viewport()->update();
     findBar->showMessage(state == Looking      ? u"A procurar…"_s
@@ -255,17 +231,14 @@ void Preview::Implementation::output(PreviewCommand command) {
         done = printAsking(form, *pages, view->currentPage());
     else if (command == PreviewCommand::SavePdf)
         done = savePdfAsking(form, *pages);
-    else if (rowsTaken)
-        throw core::Failure(core::ObjectClosed,
-                            u"As linhas desta listagem já foram fechadas. Abra-a de novo."_s);
     else
-        done = exportCsvAsking(form, report, rows);
+        done = exportCsvAsking(form, source.report(), source.rows());
     message->setText(done);
 }
 
 /// Waits for the last page, unless the person loses patience.
 bool Preview::Implementation::allPagesAreThere() {
-    if (layout) {
+    if (source.isAtWork()) {
         QProgressDialog dialog(u"A preparar as páginas…"_s, u"&Cancelar"_s, 0, 0, form);
         dialog.setObjectName(u"Espera"_s);
         dialog.setWindowTitle(form->Caption());
@@ -277,7 +250,7 @@ bool Preview::Implementation::allPagesAreThere() {
 
 void Preview::Implementation::goToPage(int page) {
     message->clear();
-    if (page >= pages->count() && layout)
+    if (page >= pages->count() && source.isAtWork())
         message->setText(u"A preparar a página %1…"_s.arg(page + 1));
     else if (page >= pages->count())
         message->setText(u"O relatório tem %1 páginas."_s.arg(pages->count()));
@@ -319,13 +292,15 @@ std::vector<Highlight> Preview::Implementation::highlightsOn(int page) const {
 }
 
 void Preview::Implementation::showPlace() {
-    const QString more = layout ? u"…"_s : pages->isComplete() ? QString() : u" (incompleto)"_s;
+    const QString more = source.isAtWork()     ? u"…"_s
+                         : pages->isComplete() ? QString()
+                                               : u" (incompleto)"_s;
     place->setText(
         u"Página %1 de %2%3"_s.arg(view->currentPage() + 1).arg(pages->count()).arg(more));
     bar->showPage(view->currentPage(), pages->count());
     bar->showZoom(view->percent());
     bar->showContinuous(view->isContinuous());
-    bar->setOutputEnabled(layout || pages->isComplete());
+    bar->setOutputEnabled(source.isAtWork() || pages->isComplete());
 }
 
 }  // namespace reports

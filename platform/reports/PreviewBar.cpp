@@ -2,7 +2,6 @@
 #include "platform/reports/PreviewBar.h"
 
 #include <QComboBox>
-#include <QIntValidator>
 #include <QLabel>
 #include <QLineEdit>
 
@@ -69,13 +68,14 @@ void PreviewBar::addPages(QBoxLayout* row, const PreviewHandler& handler) {
     page_->setToolTip(u"Ir para a página (Ctrl+G)"_s);
     page_->setAlignment(Qt::AlignRight);
     page_->setMaxLength(MostDigits);
-    page_->setValidator(new QIntValidator(1, 999'999, page_));
     page_->setFixedWidth(page_->fontMetrics().horizontalAdvance(u"0000000"_s) + 12);
     connect(page_, &QLineEdit::returnPressed, this,
             [this] { forms::handle([this] { pageTyped(); }); });
+    connect(page_, &QLineEdit::editingFinished, this,
+            [this] { showPage(shownPage_, shownCount_); });
     count_ = new QLabel;
     count_->setObjectName(u"Paginas"_s);
-    count_->setMinimumWidth(count_->fontMetrics().horizontalAdvance(u"de 00000"_s));
+    count_->setMinimumWidth(count_->fontMetrics().horizontalAdvance(u"de 0000"_s));
     back_[0] = previewButton(PreviewCommand::FirstPage, handler);
     back_[1] = previewButton(PreviewCommand::PreviousPage, handler);
     ahead_[0] = previewButton(PreviewCommand::NextPage, handler);
@@ -102,6 +102,8 @@ void PreviewBar::addZoom(QBoxLayout* row, const PreviewHandler& handler) {
     connect(zoom_, &QComboBox::textActivated, this, chosen);
     connect(zoom_->lineEdit(), &QLineEdit::returnPressed, this,
             [this, chosen] { chosen(zoom_->currentText()); });
+    connect(zoom_->lineEdit(), &QLineEdit::editingFinished, this,
+            [this] { showZoom(shownPercent_); });
     const PreviewAction& action = previewAction(PreviewCommand::Continuous);
     continuous_ = new forms::CheckBox(action.name.toString(), action.caption.toString());
     continuous_->setToolTip(action.toolTip.toString());
@@ -116,6 +118,7 @@ void PreviewBar::addZoom(QBoxLayout* row, const PreviewHandler& handler) {
 
 void PreviewBar::showPage(int page, int count) {
     shownPage_ = page;
+    shownCount_ = count;
     if (!page_->hasFocus()) page_->setText(page < 0 ? QString() : QString::number(page + 1));
     count_->setText(u"de %1"_s.arg(count));
     for (forms::Button* button : back_) button->setEnabled(page > 0);
@@ -124,7 +127,7 @@ void PreviewBar::showPage(int page, int count) {
 
 void PreviewBar::showZoom(double percent) {
     shownPercent_ = percent;
-    zoom_->setEditText(percentText(percent));
+    if (!zoom_->lineEdit()->hasFocus()) zoom_->setEditText(percentText(percent));
 }
 
 void PreviewBar::showContinuous(bool continuous) {
@@ -141,7 +144,11 @@ void PreviewBar::askPage() {
 }
 
 void PreviewBar::pageTyped() {
-    onPage(page_->text().toInt() - 1);
+    bool isNumber = false;
+    const int page = page_->text().toInt(&isNumber);
+    if (isNumber && page > 0) return onPage(page - 1);
+    core::MsgBox(u"Indique o número da página."_s, core::Icon::Information);
+    page_->selectAll();
 }
 
 void PreviewBar::zoomTyped(const QString& text) {
@@ -153,7 +160,7 @@ void PreviewBar::zoomTyped(const QString& text) {
     core::MsgBox(u"Indique o tamanho em percentagem, de %1 a %2."_s.arg(PreviewView::LeastPercent)
                      .arg(PreviewView::MostPercent),
                  core::Icon::Information);
-    showZoom(shownPercent_);
+    zoom_->lineEdit()->selectAll();
 }
 
 }  // namespace reports

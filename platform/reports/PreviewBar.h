@@ -62,6 +62,7 @@ private:
     forms::CheckBox* continuous_;
     forms::Button* close_;
     int shownPage_ = -1;
+    int shownCount_ = 0;
     double shownPercent_ = 0;
 };
 

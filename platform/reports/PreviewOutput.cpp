@@ -33,16 +33,6 @@ struct Kind {
     QString suffix;
 };
 
-/// A caption without what file systems do not take.
-QString fileName(QString caption) {
-    for (QChar& letter : caption)
-        if (letter.isNonCharacter() || letter < u' ' || u"/\\:*?\"<>|"_s.contains(letter))
-            letter = u'-';
-    caption = caption.simplified().left(100);
-    while (caption.startsWith(u'.')) caption.remove(0, 1);
-    return caption.isEmpty() ? u"Listagem"_s : caption;
-}
-
 bool mayWriteOver(const QString& file) {
     if (!QFileInfo::exists(file)) return true;
     return core::MsgBox(u"O ficheiro «%1» já existe.\n\nQuer substituí-lo?"_s.arg(

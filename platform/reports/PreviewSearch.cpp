@@ -105,9 +105,9 @@ std::vector<QRectF> PreviewSearch::hitsOn(int page) const {
     std::vector<QRectF> hits;
     if (text_.empty() || page < 0 || page >= pages_->count()) return hits;
     const Page laidOut = pages_->at(page);
+    if (!mayHold(laidOut)) return hits;
     for (const TextRun& unresolved : laidOut.texts) {
         const TextRun run = pages_->resolved(unresolved);
-        if (core::folded(run.text).find(text_) == std::string::npos) continue;
         const FoldedRun folded = foldedRun(run.text);
         for (size_t at = folded.plain.find(text_); at != std::string::npos;
              at = folded.plain.find(text_, at + text_.size()))
@@ -115,6 +115,13 @@ std::vector<QRectF> PreviewSearch::hitsOn(int page) const {
     }
     std::stable_sort(hits.begin(), hits.end(), readsBefore);
     return hits;
+}
+
+/// Folds all texts of a page in one go: that is quick, and most pages hold none.
+bool PreviewSearch::mayHold(const Page& page) const {
+    QString all;
+    for (const TextRun& run : page.texts) all += pages_->resolved(run).text + u'\n';
+    return core::folded(all).find(text_) != std::string::npos;
 }
 
 }  // namespace reports

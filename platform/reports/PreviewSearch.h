@@ -43,6 +43,7 @@ public:
 
 private:
     void lookAtPage();
+    bool mayHold(const Page& page) const;
     bool turnPage(bool moreToCome);
 
     std::shared_ptr<const Pages> pages_;

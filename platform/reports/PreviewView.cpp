@@ -36,13 +36,17 @@ PreviewView::PreviewView(const QString& name, QWidget* parent) : QAbstractScroll
 
 void PreviewView::setPages(std::shared_ptr<const Pages> pages) {
     pages_ = std::move(pages);
+    known_ = 0;
     pagesAdded();
 }
 
 void PreviewView::pagesAdded() {
     settleRanges();
     setCurrent(std::clamp(current_, std::min(0, count() - 1), count() - 1));
-    viewport()->update();
+    // Pages out of sight change nothing, unless their number has become known.
+    const bool inSight = onScreen(known_).top() <= viewport()->height();
+    if (inSight || count() == 0 || pages_->isComplete()) viewport()->update();
+    known_ = count();
 }
 
 void PreviewView::setHighlights(std::function<std::vector<Highlight>(int)> highlights) {
@@ -218,7 +222,8 @@ void PreviewView::paintEvent(QPaintEvent* event) {
 /// Paper is white under any theme.
 void PreviewView::paintPage(QPainter& painter, int page) const {
     const QRect paper = onScreen(page);
-    painter.fillRect(paper.translated(2, 2), QColor(0, 0, 0, 70));
+    painter.setPen(QColor(0, 0, 0, 90));
+    painter.drawRect(paper.adjusted(-1, -1, 0, 0));
     painter.fillRect(paper, Qt::white);
     painter.setClipRect(paper, Qt::IntersectClip);
     painter.translate(paper.topLeft());

@@ -82,6 +82,7 @@ private:
 
     std::shared_ptr<const Pages> pages_;
     std::function<std::vector<Highlight>(int)> highlights_;
+    int known_ = 0;  ///< pages that were there when pagesAdded() was last called
     int current_ = -1;
     bool continuous_ = true;
     Fit fit_ = Fit::Width;
