@@ -25,7 +25,7 @@ void removeBook(const QString& file) {
 }
 
 /// Makes the book under a name of its own first; the book's name appears when all of it stands.
-void makeStaged(const QString& file) {
+void makeStaged(const QString& file, const std::function<void(sqlite::Database&)>& fill) {
     const QString staged = file + u".novo"_s;
     removeBook(staged);
     auto cleanup = qScopeGuard([&] { removeBook(staged); });
@@ -35,6 +35,7 @@ void makeStaged(const QString& file) {
         book.run(schemaText(u"sqlite.sql"_s));
         book.run(schemaText(u"codes.sql"_s));
         book.run("COMMIT");
+        if (fill) fill(book);
     }
     if (!QFile::rename(staged, file))  // never over an existing file
         throw core::Failure(core::InvalidCall, u"Não foi possível criar o livro «%1»."_s.arg(file));
@@ -47,7 +48,8 @@ QString bookFile(const QString& folder, const QString& catalogue) {
     return QDir(folder).absoluteFilePath(catalogue + u".db"_s);
 }
 
-void createBook(const QString& folder, const QString& catalogue) {
+void createBook(const QString& folder, const QString& catalogue,
+                const std::function<void(sqlite::Database&)>& fill) {
     const QString file = bookFile(folder, catalogue);
     if (QFile::exists(file) || QFileInfo(file).isSymLink())
         throw core::Failure(core::InvalidCall,
@@ -59,20 +61,24 @@ void createBook(const QString& folder, const QString& catalogue) {
     auto cleanup = qScopeGuard([&] {
         if (madeFolder) QDir().rmdir(folder);
     });
-    makeStaged(file);
+    makeStaged(file, fill);
     cleanup.dismiss();
 }
 
-void writeSettings(const QString& folder, const QString& catalogue) {
+void writeSettings(const LoginValues& values) {
     const QString key = u"SOFTWARE\\Norvanta\\Corvenda"_s;
     const auto write = [&](const QString& name, const QString& value) {
         registry::writeValue(registry::Hive::LocalMachine, key, name, value);
     };
     write(u"dtSecurityInfo"_s, u"True"_s);
-    write(u"dtUser"_s, u"zelmars"_s);
-    write(u"dtPassword"_s, u""_s);
-    write(u"dtInitialCatalog"_s, catalogue);
-    write(u"dtDataSource"_s, u"sqlite:"_s + QDir(folder).absolutePath());
+    write(u"dtUser"_s, values.user);
+    write(u"dtPassword"_s, values.password);
+    write(u"dtInitialCatalog"_s, values.catalogue);
+    write(u"dtDataSource"_s, values.dataSource);
+}
+
+void writeSettings(const QString& folder, const QString& catalogue) {
+    writeSettings({u"zelmars"_s, {}, catalogue, u"sqlite:"_s + QDir(folder).absolutePath()});
 }
 
 void fillSample(const QString& folder, const QString& catalogue, const BookSizes& sizes,

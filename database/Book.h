@@ -3,12 +3,17 @@
 
 #include <QDate>
 #include <QString>
+#include <functional>
 
 /// Makes books: schema, code lists, the sample content, and the settings that name a book.
 ///
 /// Every failure is a core::Failure with a Portuguese text (or the engine's own). Nothing half-made
 /// stays behind one.
 namespace database {
+
+namespace sqlite {
+class Database;
+}
 
 /// How large a sample book is. The defaults are the sample that the documents show.
 struct BookSizes {
@@ -24,8 +29,10 @@ struct BookSizes {
 QString bookFile(const QString& folder, const QString& catalogue);
 
 /// Makes an empty book: all tables, the code lists and counters that start at 1. Makes the folder
-/// if it is missing. Fails if the file is there already, whatever it holds.
-void createBook(const QString& folder, const QString& catalogue);
+/// if it is missing. Fails if the file is there already, whatever it holds. What `fill` puts into
+/// the book is there when the file appears; the book is not made when it fails.
+void createBook(const QString& folder, const QString& catalogue,
+                const std::function<void(sqlite::Database&)>& fill = {});
 
 /// Fills an empty book with members, rubrics, hospitals, premiums, movements, accumulators and
 /// closed years. All dates derive from `asOf`, an invalid one being today: the same sizes and day
@@ -52,7 +59,16 @@ void fillSample(const QString& folder, const QString& catalogue, const BookSizes
                 QDate asOf = {});
 // clang-format on
 
-/// Writes the five values that every login reads, so that they name this book.
+/// Four of the five values that every login reads; the fifth is always the same.
+struct LoginValues {
+    QString user;
+    QString password;
+    QString catalogue;
+    QString dataSource;
+};
+/// Writes the five values.
+void writeSettings(const LoginValues& values);
+/// Writes the five values so that they name this book.
 void writeSettings(const QString& folder, const QString& catalogue);
 
 /// `zelmars init [--sample] FOLDER`: makes the book "zelmars" in the folder, with or without the

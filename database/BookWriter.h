@@ -11,10 +11,13 @@
 
 namespace database {
 
-/// A table and the columns that are written to it, in the order in which values come.
+/// A table and the columns that are written to it or read, in the order in which values come.
 struct Table {
-    const char* name;
-    std::vector<const char*> columns;
+    QByteArray name;
+    std::vector<QByteArray> columns;
+
+    /// The columns as a list for a statement.
+    QByteArray columnList() const;
 };
 
 /// One value of a row: null, a whole number, a number, an amount, or UTF-8 text.
@@ -38,6 +41,10 @@ public:
     virtual void add(const Table& table, const std::vector<Value>& values) = 0;
     /// Removes all rows of a table.
     virtual void clear(const Table& table) = 0;
+    /// From here on every row that was added can be read, through the connection that writes.
+    virtual void flush() = 0;
+    /// The keys that the table generates go on behind this one. The rows must have been flushed.
+    virtual void continueAfter(const Table& table, qint64 lastKey) = 0;
 };
 
 }  // namespace database

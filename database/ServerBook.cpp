@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "database/ServerBook.h"
 
-#include <libpq-fe.h>
+#include <QScopeGuard>
 
-#include <memory>
-
+#include "database/PostgresBookWriter.h"
 #include "database/SchemaText.h"
+#include "database/sample/SampleBook.h"
+#include "platform/ado/Connection.h"
+#include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 
 namespace database {
@@ -14,42 +16,197 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-using Connection = std::unique_ptr<PGconn, decltype(&PQfinish)>;
-using Result = std::unique_ptr<PGresult, decltype(&PQclear)>;
-
-core::Failure failure(const ServerCatalogue& catalogue, PGconn* connection, const char* code) {
-    return core::Failure(core::DatabaseFailure,
-                         u"Não foi possível criar o livro «%1» em «%2»: %3"_s.arg(
-                             catalogue.name, catalogue.host,
-                             QString::fromUtf8(PQerrorMessage(connection)).simplified()),
-                         QString::fromLatin1(code));
+core::Failure refusal(const QString& text) {
+    return {core::InvalidCall, text};
 }
 
-Connection connect(const ServerCatalogue& catalogue) {
-    const QByteArray values[] = {catalogue.host.toUtf8(), catalogue.port.toUtf8(),
-                                 catalogue.user.toUtf8(), catalogue.password.toUtf8(),
-                                 catalogue.name.toUtf8()};
-    const char* const names[] = {
-        "host", "port", "user", "password", "dbname", "client_encoding", "connect_timeout",
-        nullptr};
-    const char* const texts[] = {values[0], values[1], values[2], values[3],
-                                 values[4], "UTF8",    "15",      nullptr};
-    return {PQconnectdbParams(names, texts, 0), &PQfinish};
+void makeTables(postgres::Database& book) {
+    book.run(schemaText(u"postgresql.sql"_s));
+    book.run(schemaText(u"codes.sql"_s));
 }
+
+void writeSample(postgres::Database& book, const BookSizes& sizes, QDate asOf) {
+    PostgresBookWriter writer(book);
+    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
+    writer.finish();
+}
+
+/// The name that a connection string takes as it stands.
+void refuseUnusable(const QString& what, const QString& text) {
+    const bool isUsable = !text.isEmpty() && text == text.trimmed() && !text.contains(u';') &&
+                          !text.startsWith(u'"') && !text.startsWith(u'\'') &&
+                          text.toUtf8().size() < 50;
+    if (!isUsable)
+        throw refusal(
+            u"%1 tem de ter entre 1 e 49 letras, sem «;», sem aspas no início e sem espaços nas "
+            "pontas."_s.arg(what));
+}
+
+/// Makes a book on a server, step by step, and knows how to take each step back.
+class Installation {
+public:
+    Installation(const ServerCatalogue& catalogue, const ServerOperator& worker)
+        : catalogue_(catalogue), worker_(worker), server_(administration(catalogue)) {}
+
+    void run(bool sample) {
+        refuseUnfit();
+        auto undo = qScopeGuard([this] { takeBack(); });
+        makeCatalogue();
+        makeBook(sample);
+        enterAsOperator();
+        writeSettings({worker_.user, worker_.password, catalogue_.name, dataSource()});
+        undo.dismiss();
+    }
+
+private:
+    /// The catalogue that every server has, from where others are made.
+    static ServerCatalogue administration(ServerCatalogue catalogue) {
+        catalogue.name = u"postgres"_s;
+        return catalogue;
+    }
+
+    bool has(const QByteArray& condition) {
+        return server_.number("SELECT EXISTS (" + condition + ')');
+    }
+    bool hasRole(const QString& role) {
+        return has("SELECT FROM pg_roles WHERE rolname = " + server_.literal(role));
+    }
+
+    void refuseUnfit() {
+        if (!has("SELECT FROM pg_roles WHERE rolname = current_user AND rolsuper"))
+            throw refusal(
+                u"«%1» não é administrador do servidor; só um administrador pode fazer um livro."_s
+                    .arg(catalogue_.user));
+        if (has("SELECT FROM pg_roles WHERE (rolsuper OR rolcreaterole OR rolcreatedb OR "
+                "rolreplication OR rolbypassrls OR NOT rolcanlogin) AND rolname = " +
+                server_.literal(worker_.user)))
+            throw refusal(
+                u"«%1» tem outros direitos no servidor; escolha outro nome para o operador."_s.arg(
+                    worker_.user));
+        makesCatalogue_ =
+            !has("SELECT FROM pg_database WHERE datname = " + server_.literal(catalogue_.name));
+        makesOwner_ = !hasRole(owner());
+        makesOperator_ = !hasRole(worker_.user);
+    }
+
+    void makeCatalogue() {
+        if (!makesCatalogue_) return;
+        // Texts sort by the collation of their columns, whatever the catalogue's own.
+        server_.run("CREATE DATABASE " + server_.name(catalogue_.name) +
+                    " TEMPLATE template0 ENCODING 'UTF8' LOCALE 'C'");
+        madeCatalogue_ = true;
+    }
+
+    void makeBook(bool sample) {
+        postgres::Database book(catalogue_);
+        refuseFilled(book);
+        postgres::Transaction transaction(book);
+        makeRoles(book);
+        book.run("SET LOCAL ROLE " + book.name(owner()));
+        makeTables(book);
+        book.run("RESET ROLE");
+        book.run(rights(book));
+        if (sample) writeSample(book, {}, {});
+        transaction.commit();
+        madeBook_ = true;
+    }
+
+    void refuseFilled(postgres::Database& book) {
+        if (book.number("SELECT EXISTS (SELECT FROM pg_class WHERE relkind IN ('r', 'p', 'v', 'm')"
+                        " AND relnamespace::regnamespace::text !~ '^(pg_|information_schema)')"))
+            throw refusal(
+                u"O catálogo «%1» não está vazio. Não foi alterado."_s.arg(catalogue_.shown()));
+        if (book.number("SELECT getdatabaseencoding() <> 'UTF8'"))
+            throw refusal(u"O catálogo «%1» não guarda textos em UTF-8. Não foi alterado."_s.arg(
+                catalogue_.shown()));
+    }
+
+    void makeRoles(postgres::Database& book) {
+        const QByteArray ownerName = book.name(owner());
+        if (makesOwner_) book.run("CREATE ROLE " + ownerName + " NOLOGIN");
+        if (makesOperator_)
+            book.run(
+                "CREATE ROLE " + book.name(worker_.user) + " LOGIN PASSWORD " +
+                book.literal(QString::fromUtf8(book.encrypted(worker_.password, worker_.user))));
+        if (madeCatalogue_)
+            book.run("ALTER DATABASE " + book.name(catalogue_.name) + " OWNER TO " + ownerName);
+        book.run("GRANT CREATE, USAGE ON SCHEMA public TO " + ownerName);
+    }
+
+    QByteArray rights(postgres::Database& book) const {
+        return schemaText(u"roles.sql"_s)
+            .replace("{catalogue}", book.name(catalogue_.name))
+            .replace("{operator}", book.name(worker_.user));
+    }
+
+    void enterAsOperator() {
+        ado::Connection connection;
+        connection.ConnectionString =
+            u"User ID=%1;Password=%2;Initial Catalog=%3;Data Source=%4;Connect Timeout=15"_s.arg(
+                worker_.user, worker_.password, catalogue_.name, dataSource());
+        connection.Open();
+    }
+
+    /// What fails here stays behind, but the failure that led here is what the operator must read.
+    void takeBack() noexcept {
+        try {
+            if (madeCatalogue_)
+                server_.run("DROP DATABASE " + server_.name(catalogue_.name) + " WITH (FORCE)");
+            else if (madeBook_)
+                takeBookBack();
+            if (madeBook_ && makesOperator_) server_.run("DROP ROLE " + server_.name(worker_.user));
+            if (madeBook_ && makesOwner_) server_.run("DROP ROLE " + server_.name(owner()));
+        } catch (const core::Failure&) {
+        }
+    }
+
+    void takeBookBack() {
+        postgres::Database book(catalogue_);
+        book.run("DROP OWNED BY " + book.name(owner()));
+        book.run("REVOKE ALL ON DATABASE " + book.name(catalogue_.name) + " FROM " +
+                 book.name(worker_.user));
+        book.run("REVOKE ALL ON SCHEMA public FROM " + book.name(worker_.user));
+    }
+
+    QString owner() const { return catalogue_.name + u"_dono"_s; }
+    QString dataSource() const {
+        return catalogue_.shown().chopped(catalogue_.name.size() + 1);  // without "/NAME"
+    }
+
+    ServerCatalogue catalogue_;
+    ServerOperator worker_;
+    postgres::Database server_;
+    bool makesCatalogue_ = false;
+    bool makesOwner_ = false;
+    bool makesOperator_ = false;
+    bool madeCatalogue_ = false;
+    bool madeBook_ = false;
+};
 
 }  // namespace
 
 void createBook(const ServerCatalogue& catalogue) {
-    const Connection connection = connect(catalogue);
-    if (PQstatus(connection.get()) != CONNECTION_OK)
-        throw failure(catalogue, connection.get(), "08001");
-    // Several statements in one text are one transaction.
-    const QByteArray statements = "SET client_min_messages = warning;" +
-                                  schemaText(u"postgresql.sql"_s) + schemaText(u"codes.sql"_s);
-    const Result result(PQexec(connection.get(), statements.constData()), &PQclear);
-    if (PQresultStatus(result.get()) != PGRES_COMMAND_OK)
-        throw failure(catalogue, connection.get(),
-                      PQresultErrorField(result.get(), PG_DIAG_SQLSTATE));
+    postgres::Database book(catalogue);
+    postgres::Transaction transaction(book);
+    makeTables(book);
+    transaction.commit();
+}
+
+void fillSample(const ServerCatalogue& catalogue, const BookSizes& sizes, QDate asOf) {
+    postgres::Database book(catalogue);
+    if (book.number("SELECT EXISTS (SELECT FROM tbSocios)"
+                    " OR EXISTS (SELECT FROM tbZelmar_Movimentos)"))
+        throw refusal(u"O livro «%1» já tem associados ou movimentos."_s.arg(catalogue.shown()));
+    postgres::Transaction transaction(book);
+    writeSample(book, sizes, asOf);
+    transaction.commit();
+}
+
+void initBook(const ServerCatalogue& catalogue, const ServerOperator& worker, bool sample) {
+    refuseUnusable(u"O nome do catálogo"_s, catalogue.name);
+    refuseUnusable(u"O nome do operador"_s, worker.user);
+    refuseUnusable(u"A palavra-passe do operador"_s, worker.password);
+    Installation(catalogue, worker).run(sample);
 }
 
 }  // namespace database

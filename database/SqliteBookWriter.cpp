@@ -10,10 +10,8 @@ namespace {
 // A rollback journal notes only what was there before, so filling an empty book writes each page
 // once; the write-ahead log would write all of it twice.
 constexpr const char* Begin =
-    "PRAGMA journal_mode=DELETE; PRAGMA synchronous=OFF; PRAGMA cache_size=-200000; BEGIN "
-    "EXCLUSIVE";
-constexpr const char* BackToDailyWork =
-    "PRAGMA cache_size=-2000; PRAGMA synchronous=FULL; PRAGMA journal_mode=WAL";
+    "PRAGMA journal_mode=DELETE; PRAGMA cache_size=-200000; BEGIN EXCLUSIVE";
+constexpr const char* BackToDailyWork = "PRAGMA cache_size=-2000; PRAGMA journal_mode=WAL";
 
 void bindValue(sqlite::Statement& row, int parameter, const Value& value) {
     if (const auto* number = std::get_if<qint64>(&value))
@@ -29,11 +27,6 @@ void bindValue(sqlite::Statement& row, int parameter, const Value& value) {
 }
 
 }  // namespace
-
-Value dayValue(QDate day) {
-    if (!day.isValid()) return Null;
-    return day.toString(Qt::ISODate).toLatin1() + " 00:00:00";
-}
 
 SqliteBookWriter::SqliteBookWriter(sqlite::Database& book) : book_(book) {
     try {
@@ -66,7 +59,14 @@ void SqliteBookWriter::add(const Table& table, const std::vector<Value>& values)
 }
 
 void SqliteBookWriter::clear(const Table& table) {
-    book_.run(QByteArray("DELETE FROM ") + table.name);
+    book_.run("DELETE FROM " + table.name);
+}
+
+void SqliteBookWriter::continueAfter(const Table& table, qint64 lastKey) {
+    const QByteArray name = '\'' + table.name + '\'';
+    book_.run("DELETE FROM sqlite_sequence WHERE name = " + name +
+              "; INSERT INTO sqlite_sequence (name, seq) VALUES (" + name + ", " +
+              QByteArray::number(lastKey) + ")");
 }
 
 void SqliteBookWriter::commit() {
@@ -76,15 +76,11 @@ void SqliteBookWriter::commit() {
 sqlite::Statement& SqliteBookWriter::statement(const Table& table) {
     std::unique_ptr<sqlite::Statement>& known = statements_[&table];
     if (!known) {
-        QByteArray columns;
-        QByteArray marks;
-        for (const char* column : table.columns) {
-            columns += (columns.isEmpty() ? "" : ",") + QByteArray(column);
-            marks += marks.isEmpty() ? "?" : ",?";
-        }
+        QByteArray marks = QByteArray("?,").repeated(static_cast<qsizetype>(table.columns.size()));
+        marks.chop(1);
         known = std::make_unique<sqlite::Statement>(
             book_,
-            QByteArray("INSERT INTO ") + table.name + " (" + columns + ") VALUES (" + marks + ")");
+            "INSERT INTO " + table.name + " (" + table.columnList() + ") VALUES (" + marks + ')');
     }
     return *known;
 }

@@ -20,6 +20,8 @@ public:
 
     void add(const Table& table, const std::vector<Value>& values) override;
     void clear(const Table& table) override;
+    void flush() override {}
+    void continueAfter(const Table& table, qint64 lastKey) override;
     void commit();
 
 private:

@@ -9,13 +9,30 @@ namespace host {
 
 /// What a command line asks for.
 struct CommandLine {
-    enum class Task { Window, Operation, Init, Register, Tour, Help, Version, Wrong };
+    enum class Task {
+        Window,
+        Operation,
+        Init,
+        InitServer,
+        Copy,
+        Register,
+        Tour,
+        Help,
+        Version,
+        Wrong
+    };
     Task task = Task::Window;
     OperationCall call = {};  ///< of Operation
     QString folder = {};      ///< of Init and Tour
-    bool sample = false;      ///< of Init: with the sample content
-    bool ifNeeded = false;    ///< of Init: only when no book is set up for this user
-    bool undo = false;        ///< of Register
+    QString server = {};      ///< of InitServer: "postgresql:HOST[:PORT]"
+    QString catalogue = {};   ///< of InitServer
+    QString user = {};        ///< of InitServer: the operator
+    QString admin = {};       ///< of InitServer and Copy: the server's administrator
+    QString from = {};        ///< of Copy, as database::BookPlace reads it
+    QString into = {};
+    bool sample = false;    ///< of Init and InitServer: with the sample content
+    bool ifNeeded = false;  ///< of Init: only when no book is set up for this user
+    bool undo = false;      ///< of Register
 
     /// @param words  without the program's name
     static CommandLine parsed(const QStringList& words);

@@ -4,8 +4,7 @@
 #include <QLibrary>
 #include <QTextStream>
 
-#include "database/Book.h"
-#include "host/BookSettings.h"
+#include "host/BookTasks.h"
 #include "host/Tour.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/Failure.h"
@@ -24,19 +23,6 @@ void say(const QString& text) {
 
 void complain(const QString& text) {
     QTextStream(stderr) << text << Qt::endl;
-}
-
-int init(const CommandLine& line) {
-    const QString folder = QDir(line.folder).absolutePath();
-    if (line.ifNeeded && BookSettings::read().isComplete) return Done;
-    const QString catalogue = u"zelmars"_s;
-    if (line.ifNeeded && QFile::exists(database::bookFile(folder, catalogue))) {
-        database::writeSettings(folder, catalogue);
-        return Done;
-    }
-    database::initBook(folder, line.sample);
-    say(u"Livro feito em %1"_s.arg(database::bookFile(folder, catalogue)));
-    return Done;
 }
 
 bool hasWindow() {
@@ -94,7 +80,14 @@ int performUntrapped(const CommandLine& line) {
         case Task::Operation:
             return showOperation(line.call);
         case Task::Init:
-            return init(line);
+            makeBook(line);
+            return Done;
+        case Task::InitServer:
+            makeServerBook(line);
+            return Done;
+        case Task::Copy:
+            copyBook(line);
+            return Done;
         case Task::Register:
             registerComponents(line.undo);
             return Done;

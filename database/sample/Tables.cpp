@@ -5,7 +5,7 @@ namespace database::sample::tables {
 
 namespace {
 
-using Columns = std::vector<const char*>;
+using Columns = std::vector<QByteArray>;
 
 const Columns Member{"socio_id",
                      "no_kor",

@@ -1,0 +1,236 @@
+// SPDX-License-Identifier: MIT
+#include "database/Copy.h"
+
+#include <QFile>
+#include <QRegularExpression>
+#include <QSet>
+
+#include "database/Book.h"
+#include "database/PostgresBookReader.h"
+#include "database/PostgresBookWriter.h"
+#include "database/SchemaText.h"
+#include "database/SqliteBookReader.h"
+#include "database/SqliteBookWriter.h"
+#include "platform/ado/PostgresHandle.h"
+#include "platform/core/Failure.h"
+
+namespace database {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+constexpr qint64 RowsBetweenReports = 5000;
+
+core::Failure refusal(const QString& text) {
+    return {core::InvalidCall, text};
+}
+
+QByteArray folded(const QByteArray& name) {
+    return name.toLower();
+}
+
+/// Tables that a new book has rows in: its code lists and counters.
+QSet<QByteArray> filledTables() {
+    QSet<QByteArray> names;
+    static const QRegularExpression insertion(u"INSERT INTO (\\w+)"_s);
+    auto found = insertion.globalMatch(QString::fromUtf8(schemaText(u"codes.sql"_s)));
+    while (found.hasNext()) names += folded(found.next().captured(1).toLatin1());
+    return names;
+}
+
+/// A table on both sides, its columns in one order, and what it comes to in the source.
+struct Pair {
+    TableShape from;
+    TableShape into;
+    Totals totals;
+};
+
+/// The shape with its columns in the order of another one.
+TableShape ordered(const TableShape& shape, const Table& model) {
+    TableShape result{{shape.table.name, {}}, {}};
+    for (const QByteArray& column : model.columns)
+        for (size_t at = 0; at < shape.types.size(); ++at)
+            if (folded(shape.table.columns[at]) == folded(column)) {
+                result.table.columns.push_back(shape.table.columns[at]);
+                result.types.push_back(shape.types[at]);
+            }
+    return result;
+}
+
+QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes) {
+    QSet<QByteArray> names;
+    for (const TableShape& shape : shapes)
+        for (const QByteArray& column : shape.table.columns)
+            names += folded(shape.table.name + '.' + column);
+    return names;
+}
+
+/// Nothing may be left behind, and nothing made up.
+void refuseDifferences(const std::vector<TableShape>& from, const std::vector<TableShape>& into) {
+    const QSet<QByteArray> source = columnsOf(from);
+    const QSet<QByteArray> target = columnsOf(into);
+    const auto refuse = [](const QSet<QByteArray>& lacking, const QString& where) {
+        if (lacking.isEmpty()) return;
+        QList<QByteArray> names = lacking.values();
+        std::sort(names.begin(), names.end());
+        throw refusal(u"Os dois livros não têm as mesmas tabelas: %1 falta a coluna %2."_s.arg(
+            where, QString::fromUtf8(names.first())));
+    };
+    refuse(source - target, u"no de destino"_s);
+    refuse(target - source, u"no de origem"_s);
+}
+
+std::vector<Pair> paired(BookReader& from, BookReader& into) {
+    const std::vector<TableShape> source = from.tables();
+    const std::vector<TableShape> target = into.tables();
+    refuseDifferences(source, target);
+    std::vector<Pair> pairs;
+    for (const TableShape& shape : target)
+        for (const TableShape& each : source)
+            if (folded(each.table.name) == folded(shape.table.name))
+                pairs.push_back({ordered(each, shape.table), shape, {}});
+    return pairs;
+}
+
+void refuseFilled(BookReader& into, const std::vector<Pair>& pairs) {
+    const QSet<QByteArray> filled = filledTables();
+    for (const Pair& pair : pairs)
+        if (!filled.contains(folded(pair.into.table.name)) && into.totals(pair.into).rows > 0)
+            throw refusal(u"O livro de destino não está vazio: a tabela %1 tem linhas."_s.arg(
+                QString::fromUtf8(pair.into.table.name)));
+}
+
+void carryRows(BookReader& from, BookWriter& writer, const Pair& pair, CopyProgress& progress,
+               const CopyListener& listener) {
+    progress.table = QString::fromUtf8(pair.into.table.name);
+    progress.rows = 0;
+    progress.isTableDone = false;
+    from.eachRow(pair.from, [&](const std::vector<Value>& values) {
+        writer.add(pair.into.table, values);
+        ++progress.allRows;
+        if (++progress.rows % RowsBetweenReports == 0) listener(progress);
+    });
+    writer.flush();
+    progress.isTableDone = true;
+    listener(progress);
+}
+
+/// What each side comes to is worked out by its own engine.
+void compare(BookReader& into, const Pair& pair) {
+    if (into.totals(pair.into) == pair.totals) return;
+    throw refusal(
+        u"A cópia não ficou igual: na tabela %1 o número de linhas ou a soma de um montante "
+        "difere."_s.arg(QString::fromUtf8(pair.into.table.name)));
+}
+
+CopySummary carry(BookReader& from, BookReader& into, BookWriter& writer,
+                  const CopyListener& listener) {
+    std::vector<Pair> pairs = paired(from, into);
+    refuseFilled(into, pairs);
+    CopyProgress progress;
+    for (Pair& pair : pairs) {
+        pair.totals = from.totals(pair.from);
+        progress.total += pair.totals.rows;
+    }
+    for (const Pair& pair : pairs) writer.clear(pair.into.table);
+    for (const Pair& pair : pairs) carryRows(from, writer, pair, progress, listener);
+    CopySummary summary{static_cast<int>(pairs.size()), progress.allRows, 0};
+    const std::map<QByteArray, qint64> lastKeys = from.lastKeys();
+    for (const Pair& pair : pairs) {
+        compare(into, pair);
+        summary.sums += static_cast<int>(pair.totals.sums.size());
+        if (const auto last = lastKeys.find(folded(pair.from.table.name)); last != lastKeys.end())
+            writer.continueAfter(pair.into.table, last->second);
+    }
+    return summary;
+}
+
+/// Lends a reader that sees the book as it stands now, whatever is written meanwhile.
+void withSource(const BookPlace& place, const std::function<void(BookReader&)>& use) {
+    if (place.isOnServer()) {
+        postgres::Database book(place.server);
+        book.run("BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY");
+        PostgresBookReader reader(book);
+        use(reader);
+        return;
+    }
+    const QString file = bookFile(place.folder, place.name);
+    if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
+    sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
+    book.run("BEGIN");
+    SqliteBookReader reader(book);
+    use(reader);
+}
+
+CopySummary copyToFile(BookReader& from, const BookPlace& into, const CopyListener& listener) {
+    CopySummary summary;
+    createBook(into.folder, into.name, [&](sqlite::Database& book) {
+        SqliteBookWriter writer(book);
+        SqliteBookReader reader(book);
+        summary = carry(from, reader, writer, listener);
+        writer.commit();
+    });
+    return summary;
+}
+
+/// Keeps everybody else from writing to the book until the transaction ends.
+void hold(postgres::Database& book, BookReader& reader) {
+    QByteArray names;
+    for (const TableShape& shape : reader.tables())
+        names += (names.isEmpty() ? "" : ", ") + shape.table.name;
+    if (!names.isEmpty()) book.run("LOCK TABLE " + names + " IN SHARE ROW EXCLUSIVE MODE");
+}
+
+CopySummary copyToServer(BookReader& from, const BookPlace& into, const CopyListener& listener) {
+    postgres::Database book(into.server);
+    postgres::Transaction transaction(book);
+    PostgresBookWriter writer(book);
+    PostgresBookReader reader(book);
+    hold(book, reader);
+    const CopySummary summary = carry(from, reader, writer, listener);
+    writer.finish();
+    transaction.commit();
+    return summary;
+}
+
+}  // namespace
+
+BookPlace BookPlace::parsed(const QString& text) {
+    const QString engine = text.section(u':', 0, 0);
+    const qsizetype slash = text.lastIndexOf(u'/');
+    const QString where = text.mid(engine.size() + 1, slash - engine.size() - 1);
+    BookPlace place;
+    place.name = text.mid(slash + 1);
+    const bool isServer = engine == "postgresql"_L1;
+    if (slash < 0 || where.isEmpty() || place.name.isEmpty() ||
+        (!isServer && engine != "sqlite"_L1))
+        throw refusal(
+            u"«%1» não diz onde está um livro; as formas são «sqlite:PASTA/NOME» e "
+            "«postgresql:SERVIDOR[:PORTA]/NOME»."_s.arg(text));
+    if (isServer)
+        place.server = ServerCatalogue::at(where, place.name);
+    else
+        place.folder = where;
+    return place;
+}
+
+QString BookPlace::shown() const {
+    return isOnServer() ? server.shown() : bookFile(folder, name);
+}
+
+CopySummary copyBook(const BookPlace& from, const BookPlace& into, const CopyListener& listener) {
+    CopySummary summary;
+    try {
+        withSource(from, [&](BookReader& reader) {
+            summary = into.isOnServer() ? copyToServer(reader, into, listener)
+                                        : copyToFile(reader, into, listener);
+        });
+    } catch (const core::Failure& failure) {
+        throw core::Failure(failure.number(), u"Nada foi copiado: "_s + failure.text(),
+                            failure.code());
+    }
+    return summary;
+}
+
+}  // namespace database

@@ -1,0 +1,172 @@
+// SPDX-License-Identifier: MIT
+#include "database/Postgres.h"
+
+#include <libpq-fe.h>
+
+#include <memory>
+
+#include "platform/ado/PostgresHandle.h"
+#include "platform/core/Failure.h"
+
+namespace database {
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+ado::PostgresAddress addressOf(const ServerCatalogue& catalogue) {
+    return {catalogue.host, catalogue.port, catalogue.user, catalogue.password, catalogue.name};
+}
+
+struct Free {
+    void operator()(char* text) const { PQfreemem(text); }
+};
+
+QByteArray taken(char* text) {
+    return std::unique_ptr<char, Free>(text).get();
+}
+
+}  // namespace
+
+ServerCatalogue ServerCatalogue::at(const QString& place, const QString& name) {
+    ado::PostgresAddress address;
+    address.catalog = name;
+    address.place(place);
+    return {.host = address.host, .port = address.port, .user = {}, .password = {}, .name = name};
+}
+
+QString ServerCatalogue::shown() const {
+    return addressOf(*this).shown();
+}
+
+namespace postgres {
+
+Database::Database(const ServerCatalogue& catalogue) {
+    // Whether the server can be reached at all, and is new enough, has one rule and its texts.
+    { const ado::PostgresHandle probe(addressOf(catalogue), ado::PostgresHandle::Role::Reader); }
+    const QByteArray values[] = {catalogue.host.toUtf8(), catalogue.port.toUtf8(),
+                                 catalogue.user.toUtf8(), catalogue.password.toUtf8(),
+                                 catalogue.name.toUtf8()};
+    // A server that is gone is noticed after half a minute, however long a statement may run.
+    const std::pair<const char*, const char*> settings[] = {
+        {"host", values[0]},       {"port", values[1]},           {"user", values[2]},
+        {"password", values[3]},   {"dbname", values[4]},         {"client_encoding", "UTF8"},
+        {"connect_timeout", "15"}, {"tcp_user_timeout", "30000"}, {"application_name", "zelmars"},
+        {nullptr, nullptr}};
+    std::vector<const char*> names;
+    std::vector<const char*> texts;
+    for (const auto& [name, text] : settings) {
+        names.push_back(name);
+        texts.push_back(text);
+    }
+    connection_ = PQconnectdbParams(names.data(), texts.data(), 0);
+    PQsetNoticeProcessor(
+        connection_, [](void*, const char*) {}, nullptr);
+    try {
+        if (PQstatus(connection_) != CONNECTION_OK) fail(nullptr);
+        run("SET datestyle = ISO, MDY; SET extra_float_digits = 1; SET jit = off");
+    } catch (...) {
+        PQfinish(connection_);
+        throw;
+    }
+}
+
+Database::~Database() {
+    PQfinish(connection_);
+}
+
+void Database::run(const QByteArray& statements) {
+    PQclear(checked(PQexec(connection_, statements.constData())));
+}
+
+qint64 Database::number(const QByteArray& statement) {
+    const ado::PostgresResult result(checked(PQexec(connection_, statement.constData())));
+    if (PQntuples(result.get()) == 0) return 0;
+    const QByteArray text = PQgetvalue(result.get(), 0, 0);
+    return text == "t" ? 1 : text.toLongLong();
+}
+
+void Database::eachRow(const QByteArray& statement,
+                       const std::function<void(const pg_result*)>& row) {
+    if (!PQsendQuery(connection_, statement.constData())) fail(nullptr);
+    PQsetSingleRowMode(connection_);
+    while (PGresult* next = PQgetResult(connection_)) {
+        const ado::PostgresResult result(checked(next));
+        if (PQresultStatus(next) == PGRES_SINGLE_TUPLE) row(next);
+    }
+}
+
+void Database::copyIn(const QByteArray& statement, const QByteArray& lines) {
+    PQclear(checked(PQexec(connection_, statement.constData())));
+    if (PQputCopyData(connection_, lines.constData(), static_cast<int>(lines.size())) != 1 ||
+        PQputCopyEnd(connection_, nullptr) != 1)
+        fail(nullptr);
+    finish();
+}
+
+/// Reads the answers to the end; fails with the first one that tells of a failure.
+void Database::finish() {
+    ado::PostgresResult failed;
+    while (PGresult* next = PQgetResult(connection_)) {
+        ado::PostgresResult result(next);
+        if (!failed && PQresultStatus(next) != PGRES_COMMAND_OK) failed = std::move(result);
+    }
+    if (failed) fail(failed.get());
+}
+
+QByteArray Database::name(const QString& text) const {
+    const QByteArray utf8 = text.toUtf8();
+    return taken(PQescapeIdentifier(connection_, utf8, static_cast<size_t>(utf8.size())));
+}
+
+QByteArray Database::literal(const QString& text) const {
+    const QByteArray utf8 = text.toUtf8();
+    return taken(PQescapeLiteral(connection_, utf8, static_cast<size_t>(utf8.size())));
+}
+
+QByteArray Database::encrypted(const QString& password, const QString& role) const {
+    char* secret = PQencryptPasswordConn(connection_, password.toUtf8(), role.toUtf8(), nullptr);
+    if (!secret) fail(nullptr);
+    return taken(secret);
+}
+
+/// The result itself, unless it tells of a failure.
+PGresult* Database::checked(PGresult* result) const {
+    switch (PQresultStatus(result)) {
+        case PGRES_COMMAND_OK:
+        case PGRES_TUPLES_OK:
+        case PGRES_SINGLE_TUPLE:
+        case PGRES_COPY_IN:
+            return result;
+        default:
+            const ado::PostgresResult failed(result);
+            fail(failed.get());
+    }
+}
+
+void Database::fail(const PGresult* result) const {
+    QStringList lines;
+    for (const int part : {PG_DIAG_MESSAGE_PRIMARY, PG_DIAG_MESSAGE_DETAIL, PG_DIAG_CONTEXT})
+        if (const char* text = PQresultErrorField(result, part)) lines << QString::fromUtf8(text);
+    if (lines.isEmpty()) lines << QString::fromUtf8(PQerrorMessage(connection_)).simplified();
+    throw core::Failure(core::DatabaseFailure, lines.join(u'\n'),
+                        QString::fromLatin1(PQresultErrorField(result, PG_DIAG_SQLSTATE)));
+}
+
+Transaction::~Transaction() {
+    if (!isOpen_) return;
+    try {
+        book_.run("ROLLBACK");
+    } catch (const core::Failure&) {
+        // The connection is lost, and the server undoes it by itself.
+    }
+}
+
+void Transaction::commit() {
+    book_.run("COMMIT");
+    isOpen_ = false;
+}
+
+}  // namespace postgres
+
+}  // namespace database

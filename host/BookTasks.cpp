@@ -1,0 +1,112 @@
+// SPDX-License-Identifier: MIT
+#include "host/BookTasks.h"
+
+#include <unistd.h>
+
+#include <QTextStream>
+#include <csignal>
+
+#include "database/Book.h"
+#include "database/Copy.h"
+#include "database/ServerBook.h"
+#include "host/BookSettings.h"
+#include "host/Password.h"
+#include "platform/core/Failure.h"
+#include "platform/core/Format.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+namespace {
+
+void say(const QString& text) {
+    QTextStream(stdout) << text << Qt::endl;
+}
+
+void enterAsAdministrator(database::ServerCatalogue& server, const QString& admin) {
+    server.user = admin;
+    server.password =
+        password(AdminPasswordVariable,
+                 u"Palavra-passe de «%1» em %2 (vazia, se o servidor não a pedir): "_s.arg(
+                     admin, server.shown()));
+}
+
+QString counted(qint64 number) {
+    return core::userLocale().toString(number);
+}
+
+volatile std::sig_atomic_t interrupted = 0;
+
+/// While it lives, Ctrl+C is a wish and not the end.
+class Interruptible {
+public:
+    Interruptible() {
+        for (const int signal : {SIGINT, SIGTERM})
+            std::signal(signal, [](int) { interrupted = 1; });
+    }
+    ~Interruptible() {
+        for (const int signal : {SIGINT, SIGTERM}) std::signal(signal, SIG_DFL);
+    }
+    Interruptible(const Interruptible&) = delete;
+    Interruptible& operator=(const Interruptible&) = delete;
+};
+
+/// One line that changes at a terminal; one line for each table elsewhere.
+void showProgress(const database::CopyProgress& progress) {
+    if (interrupted) throw core::Failure(core::InvalidCall, u"a cópia foi interrompida."_s);
+    static const bool isTerminal = isatty(STDOUT_FILENO);
+    if (!isTerminal && !progress.isTableDone) return;
+    const qint64 percent = progress.total == 0 ? 100 : progress.allRows * 100 / progress.total;
+    const QString line =
+        u"%1 %  %2: %3 linhas"_s.arg(percent, 3).arg(progress.table, counted(progress.rows));
+    if (isTerminal)
+        QTextStream(stdout) << '\r' << line << "\x1b[K" << (progress.isTableDone ? "\n" : "")
+                            << Qt::flush;
+    else
+        say(line);
+}
+
+}  // namespace
+
+void makeBook(const CommandLine& line) {
+    const QString folder = QDir(line.folder).absolutePath();
+    if (line.ifNeeded && BookSettings::read().isComplete) return;
+    const QString catalogue = u"zelmars"_s;
+    if (line.ifNeeded && QFile::exists(database::bookFile(folder, catalogue))) {
+        database::writeSettings(folder, catalogue);
+        return;
+    }
+    database::initBook(folder, line.sample);
+    say(u"Livro feito em %1"_s.arg(database::bookFile(folder, catalogue)));
+}
+
+void makeServerBook(const CommandLine& line) {
+    auto place = database::BookPlace::parsed(line.server + u'/' + line.catalogue);
+    if (!place.isOnServer())
+        throw core::Failure(
+            core::InvalidCall,
+            u"«%1» não é um servidor; a forma é «postgresql:SERVIDOR[:PORTA]»."_s.arg(line.server));
+    enterAsAdministrator(place.server, line.admin);
+    const database::ServerOperator worker{
+        line.user,
+        password(UserPasswordVariable, u"Palavra-passe do operador «%1»: "_s.arg(line.user))};
+    database::initBook(place.server, worker, line.sample);
+    say(u"Livro feito em %1. O programa passa a usá-lo como «%2»."_s.arg(place.shown(),
+                                                                         worker.user));
+}
+
+void copyBook(const CommandLine& line) {
+    auto from = database::BookPlace::parsed(line.from);
+    auto into = database::BookPlace::parsed(line.into);
+    if (from.isOnServer()) enterAsAdministrator(from.server, line.admin);
+    if (into.isOnServer()) enterAsAdministrator(into.server, line.admin);
+    const Interruptible interruptible;
+    const database::CopySummary summary = database::copyBook(from, into, showProgress);
+    say(u"Copiado de %1 para %2: %3 tabelas, %4 linhas. Os números de linhas e as somas de %5 "
+        "colunas de montantes são iguais nos dois livros."_s.arg(
+            from.shown(), into.shown(), counted(summary.tables), counted(summary.rows),
+            counted(summary.sums)));
+}
+
+}  // namespace host

@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "host/CommandLine.h"
+
+/// The commands that make books and carry them over. Failures are core::Failure.
+namespace host {
+
+void makeBook(const CommandLine& line);
+void makeServerBook(const CommandLine& line);
+/// Shows how far it is. Ctrl+C ends it as a failure does: nothing stays in the target.
+void copyBook(const CommandLine& line);
+
+}  // namespace host
