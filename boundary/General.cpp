@@ -12,6 +12,7 @@
 #include "platform/core/MsgBox.h"
 #include "platform/forms/MsgBoxes.h"
 #include "receipts/ReceiptRoute.h"
+#include "reports/frmExtratos.h"
 
 using namespace Qt::StringLiterals;
 
@@ -59,6 +60,15 @@ void openNew(QString* strConMember, QString* strSQL,
     requireApplication();
     QString leftOut[2];
     open(strConMember ? *strConMember : leftOut[0], strSQL ? *strSQL : leftOut[1]);
+}
+
+/// A screen that the operation waits for.
+template <class Screen>
+void showModal() {
+    const core::HandlerScope scope;
+    if (!loggedInOrRefused()) return;
+    requireApplication();
+    forms::DefaultInstance<Screen>::get().ShowModal();
 }
 
 /// An operation whose screen is still to come.
@@ -137,7 +147,7 @@ void General::Recebimento(QString* strConMember, QString* strSQL) {
 }
 
 void General::Extratos(QString*, QString*) {
-    openLater(u"Extratos"_s);
+    showModal<reports::frmExtratos>();
 }
 
 void General::LPagamentos() {

@@ -5,7 +5,7 @@
 #include "entry/frmMovimentos.h"
 #include "entry/frmMovimentosF.h"
 #include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
+#include "reports/frmExtratos.h"
 
 using namespace Qt::StringLiterals;
 
@@ -15,6 +15,7 @@ namespace {
 
 using Entry = forms::DefaultInstance<frmMovimentos>;
 using Exit = forms::DefaultInstance<frmMovimentosF>;
+using Statements = forms::DefaultInstance<reports::frmExtratos>;
 using Choice = frmMovimentosF::Choice;
 
 /// Who an entry was for.
@@ -32,6 +33,7 @@ void closeEntry() {
     if (Exit::isLoaded()) Exit::get().onChosen = nullptr;
     Exit::unload();
     Entry::unload();
+    Statements::unload();
 }
 
 void openAnother(bool bHospital) {
@@ -49,10 +51,23 @@ void continueWithSameMember() {
     openAnother(bHospital);
 }
 
+/// After statements there is no entry left, and the next one is an ordinary one.
 void continueWithNewMember() {
-    const bool bHospital = Entry::get().bHospital;
+    const bool bHospital = Entry::isLoaded() && Entry::get().bHospital;
     closeEntry();
     openAnother(bHospital);
+}
+
+void offerOtherMember();
+
+void printStatements() {
+    const Member member = memberOf(Entry::get());
+    closeEntry();
+    reports::frmExtratos& screen = Statements::get();
+    screen.setMember(member.id, member.number, member.name);
+    screen.Show_Options = true;
+    screen.onClosed = offerOtherMember;
+    screen.ShowModal();
 }
 
 void follow(Choice choice) {
@@ -64,8 +79,7 @@ void follow(Choice choice) {
             continueWithNewMember();
             break;
         case Choice::Statements:
-            core::MsgBox(u"Os extratos ainda não estão disponíveis nesta versão."_s,
-                         core::Icon::Information);
+            printStatements();
             break;
         case Choice::Leave:
             closeEntry();
@@ -77,6 +91,12 @@ void follow(Choice choice) {
 void askHowToGoOn() {
     Exit::get().onChosen = follow;
     Exit::get().ShowModal();
+}
+
+/// On the way back from statements.
+void offerOtherMember() {
+    Exit::get().offerOtherMember();
+    askHowToGoOn();
 }
 
 void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {

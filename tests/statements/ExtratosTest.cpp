@@ -1,0 +1,273 @@
+// SPDX-License-Identifier: MIT
+// The dialog and what comes out of it. Without a printer the pages become a file, whose text is
+// read back.
+#include <QAbstractButton>
+#include <QDir>
+#include <QProcess>
+
+#include "boundary/General.h"
+#include "boundary/environment/dtZelmars.h"
+#include "reports/frmExtratos.h"
+#include "tests/entry/EntryTest.h"
+
+using namespace Qt::StringLiterals;
+
+namespace reports {
+
+namespace {
+
+using core::Icon;
+
+class Extratos : public entry::EntryTest {
+protected:
+    Extratos() {
+        qputenv("HOME", home.path().toUtf8());
+        book.exec(u"update tbSocios set morada1 = 'Rua do Ouro, 5', code_postal1 = '1100-060'"_s);
+        movement(u"tbZelmar_Movimentos"_s, 1, u"DOC"_s, 50, 40);
+        movement(u"tbZelmar_Movimentos"_s, 2, u"HOS"_s, 300, 250.5);
+        movement(u"tbZelmar_Movimentos_Inactivos"_s, 3, u"DOC"_s, 20, 16);
+    }
+
+    /// Of today, document "D/7"; the fee's credit is half the debit.
+    void movement(const QString& table, int number, const QString& tipo, double value,
+                  const QVariant& debit) {
+        book.insert(table, {{"movimento_id", 900 + number},
+                            {"movimento_no", number},
+                            {"socio_id", socio},
+                            {"codABC", u"A"_s},
+                            {"rubrica_id", rubric},
+                            {"data", QDate(2026, 3, 15)},
+                            {"tipo", tipo},
+                            {"doc_no", u"D/7"_s},
+                            {"doc_valor", value},
+                            {"comparticipacao", debit},
+                            {"credito", debit.isValid() ? debit.toDouble() / 2 : QVariant()},
+                            {"debito", debit},
+                            {"modo_pagamento", u"TRF"_s}});
+    }
+
+    /// Opens the dialog as a host does and runs the steps on it.
+    void open(const std::function<void()>& steps) {
+        person.onScreen(u"frmExtratos"_s, steps);
+        General().Extratos();
+        EXPECT_FALSE(person.isShown(u"frmExtratos"_s));
+    }
+    /// Prints; the file's name is told in a box.
+    void print() {
+        person.expectBox({.text = u"Extracto de Lançamentos 15-03-2026.pdf"_s, .partly = true});
+        person.accelerator(u'I');
+    }
+    void choose(const QString& name, bool on) {
+        if (person.find<QAbstractButton>(name)->isChecked() != on) person.click(name);
+    }
+    QString shown(const QString& box) { return person.peek<forms::TextBox>(box)->Text(); }
+    /// The words of the file that was printed, which goes; empty when there is none.
+    QString printed() {
+        QDir documents(home.filePath(u"Documents"_s));
+        const QStringList files = documents.entryList({u"*.pdf"_s});
+        EXPECT_LE(files.size(), 1);
+        if (files.isEmpty()) return {};
+        QProcess reader;
+        reader.start(u"pdftotext"_s, {u"-layout"_s, documents.filePath(files.first()), u"-"_s});
+        EXPECT_TRUE(reader.waitForFinished());
+        EXPECT_EQ(reader.readAllStandardError(), QByteArray());
+        documents.remove(files.first());
+        return QString::fromUtf8(reader.readAllStandardOutput()).simplified();
+    }
+
+    QTemporaryDir home;
+};
+
+TEST_F(Extratos, BothStatementsInBothSelectionsAddUpWhatTheyList) {
+    struct Case {
+        bool detailed, byDocument;
+        QString first, last;
+        QStringList expected;
+    };
+    const QString today = u"15-03-2026"_s;
+    const Case cases[] = {
+        {true,
+         false,
+         today,
+         today,
+         {u"Lançamento Nº: 1 "_s, u"Lançamento Nº: 3 "_s,
+          u"Total a Receber: € 56,00 Escudos: 11.226,99 Esc"_s}},
+        {true, true, {}, {}, {u"Total a Receber: € 56,00"_s}},
+        {false,
+         false,
+         today,
+         today,
+         {u"1 15-03-2026 A DOC"_s, u"2 15-03-2026 A HOS"_s, u"3 15-03-2026 A DOC"_s,
+          u"Total Creditado: € 153,25 Total Recebido: € 306,50 Total em Dívida: € 153,25"_s,
+          u"Escudos 61.447,73 Esc"_s}},
+        {false, true, {}, {}, {u"Total Creditado: € 28,00 Total Recebido: € 56,00"_s}},
+        // From a later day to an earlier one there is nothing.
+        {true, false, today, u"14-03-2026"_s, {u"Total a Receber: € 0,00 Escudos: 0,00 Esc"_s}},
+    };
+    for (const Case& each : cases) {
+        SCOPED_TRACE(each.expected.last().toStdString());
+        open([&] {
+            person.fill(u"No_Kor"_s, u"100015"_s);
+            choose(u"Check2"_s, each.detailed);
+            if (each.byDocument) {
+                choose(u"Option2"_s, true);
+                EXPECT_FALSE(person.peek(u"Text3"_s)->isVisible());
+                person.fill(u"Text1"_s, u"D/7"_s);
+            } else {
+                EXPECT_FALSE(person.peek(u"Text1"_s)->isVisible());
+                person.fill(u"Text3"_s, each.first);
+                person.fill(u"Text4"_s, each.last);
+            }
+            print();
+        });
+        const QString text = printed();
+        for (const QString& expected :
+             QStringList{u"Associado: António Manuel Silva Matos"_s, u"Morada: Rua do Ouro, 5"_s,
+                         u"Localidade: 1100-060 Lisboa"_s, u"NIB: 001300000000000000186"_s,
+                         u"15 de março de 2026"_s} +
+                 each.expected)
+            EXPECT_TRUE(text.contains(expected)) << expected.toStdString() << text.toStdString();
+    }
+}
+
+TEST_F(Extratos, WhatIsMissingIsSaidInItsOrderAndNothingIsPrinted) {
+    open([this] {
+        const auto refused = [this](const QString& text) {
+            person.expectBox(
+                {.text = text, .icon = Icon::Information, .title = u"Impressão de Extratos"_s});
+            person.click(u"Imprimir"_s);
+            person.expectNoBoxesLeft();
+        };
+        person.fill(u"Text3"_s, {});
+        refused(u"Tem de indicar um associado!"_s);
+        person.fill(u"No_Kor"_s, u"100015"_s);
+        refused(u"Tem de preencher os campos da data!"_s);
+        choose(u"Option2"_s, true);
+        refused(u"Tem de preencher o campo do documento!"_s);
+        person.escape();
+    });
+    EXPECT_EQ(printed(), QString());
+}
+
+TEST_F(Extratos, MemberIsFoundByNumberOrBySearch) {
+    open([this] {
+        person.expectBox({.text = u"Número de Empresa não encontrado!"_s,
+                          .icon = Icon::Critical,
+                          .title = u"Sócios"_s});
+        person.fill(u"No_Kor"_s, u"999999"_s);
+        EXPECT_TRUE(person.find(u"No_Kor"_s)->hasFocus());
+        person.fill(u"No_Kor"_s, {});
+        // Given up; failed, which says nothing; found, in the plan or not.
+        book.exec(u"update tbSocios set zelmar = 0"_s);
+        const std::pair<QVariant, QString> answers[] = {
+            {0, {}}, {u"nenhum número"_s, {}}, {socio, u"António Manuel Silva Matos"_s}};
+        for (const auto& [answer, name] : answers) {
+            companions.memberFound = answer;
+            person.click(u"Command1"_s);
+            EXPECT_EQ(shown(u"Text2"_s), name);
+            EXPECT_EQ(person.peek<forms::TextBox>(u"Text2"_s)->backColor(),
+                      name.isEmpty() ? forms::BackColor::Menu : forms::BackColor::Window);
+        }
+        EXPECT_EQ(shown(u"No_Kor"_s), u"100015"_s);
+        person.accelerator(u'F');
+    });
+}
+
+TEST_F(Extratos, WhoHasLeftGetsNothingAndNobodyIsTold) {
+    open([this] {
+        person.fill(u"No_Kor"_s, u"100015"_s);
+        book.exec(u"delete from tbSocios"_s);
+        person.accelerator(u'I');
+    });
+    EXPECT_EQ(printed(), QString());
+}
+
+TEST_F(Extratos, OddTextsAndNullsPrintOrAreRefusedWithAText) {
+    book.exec(
+        u"update tbSocios set morada1 = null, code_postal1 = null, localidade1 = null, "
+        "nib = null"_s);
+    movement(u"tbZelmar_Movimentos"_s, 4, u"DOC"_s, 10, {});
+    open([this] {
+        person.fill(u"No_Kor"_s, u"100015"_s);
+        choose(u"Option2"_s, true);
+        for (const QString& hostile : {u"D'7"_s, u"';delete from tbSocios --"_s}) {
+            person.put(u"Text1"_s, hostile);
+            person.expectBox({.icon = Icon::Critical, .partly = true});
+            person.accelerator(u'I');
+            EXPECT_EQ(person.find<forms::TextBox>(u"Text1"_s)->Text(), hostile);
+            EXPECT_TRUE(person.find(u"Imprimir"_s)->isEnabled());
+        }
+        person.put(u"Text1"_s, u"D/7"_s);
+        print();
+    });
+    const QString text = printed();
+    EXPECT_TRUE(text.contains(u"Morada: Localidade: Lançamento Nº: 1 "_s)) << text.toStdString();
+    EXPECT_TRUE(text.contains(u"Total a Receber: € 56,00"_s));
+
+    for (const QString& odd : {QString(500, u'9'), u"فاتورة ١٧"_s}) {
+        open([&] {
+            person.fill(u"No_Kor"_s, u"100015"_s);
+            choose(u"Option2"_s, true);
+            person.put(u"Text1"_s, odd);
+            print();
+        });
+        EXPECT_TRUE(printed().contains(u"Total a Receber: € 0,00"_s));
+    }
+}
+
+TEST_F(Extratos, PreviewIsWaitedForAndItsRowsAreClosed) {
+    const ado::RecordsetPtr rows =
+        environment::dtZelmars::instance().Recordsets(u"Print_Extrato1"_s);
+    open([&] {
+        person.fill(u"No_Kor"_s, u"100015"_s);
+        choose(u"Check1"_s, false);
+        choose(u"Check2"_s, false);
+        person.onScreen(u"rptExtrato2"_s, [&] {
+            EXPECT_EQ(rows->State(), ado::adStateOpen);
+            person.escape();
+        });
+        person.accelerator(u'I');
+    });
+    EXPECT_EQ(rows->State(), ado::adStateClosed);
+    EXPECT_EQ(printed(), QString());
+}
+
+TEST_F(Extratos, WayFromAnEntryLeadsBackToAnother) {
+    enum class End { NewMember, Leave, Print };
+    for (const End end : {End::NewMember, End::Leave, End::Print}) {
+        openNew(true);
+        typeMember();
+        const auto wayBack = [&] {
+            EXPECT_FALSE(person.peek(u"Option2"_s)->isVisible());
+            EXPECT_FALSE(person.peek(u"Option3"_s)->isVisible());
+            EXPECT_TRUE(person.find<QAbstractButton>(u"Option4"_s)->isChecked());
+            if (end == End::Leave) person.accelerator(u'S');
+            person.enter();
+        };
+        const auto statements = [&] {
+            EXPECT_FALSE(forms::DefaultInstance<entry::frmMovimentos>::isLoaded());
+            EXPECT_EQ(shown(u"No_Kor"_s), u"100015"_s);
+            EXPECT_EQ(shown(u"Text2"_s), u"António Manuel Silva Matos"_s);
+            if (end == End::Print) return print();
+            person.onScreen(u"frmMovimentosF"_s, wayBack);
+            person.accelerator(u'F');
+        };
+        person.onScreen(u"frmMovimentosF"_s, [&] {
+            person.onScreen(u"frmExtratos"_s, statements);
+            person.accelerator(u'E');
+            person.enter();
+        });
+        person.accelerator(u'C');
+        EXPECT_FALSE(person.isShown(u"frmMovimentosF"_s));
+        EXPECT_EQ(printed().contains(u"Total a Receber: € 56,00"_s), end == End::Print);
+        EXPECT_EQ(forms::DefaultInstance<entry::frmMovimentos>::isLoaded(), end == End::NewMember);
+        if (end != End::NewMember) continue;
+        EXPECT_FALSE(form().bHospital);
+        EXPECT_EQ(form().Socio_ID, 0);
+        form().Unload();
+    }
+}
+
+}  // namespace
+
+}  // namespace reports
