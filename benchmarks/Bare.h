@@ -1,27 +1,51 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <sqlite3.h>
-
 #include <QByteArray>
-#include <QString>
+#include <memory>
+#include <variant>
+#include <vector>
+
+#include "benchmarks/Books.h"
 
 namespace benchmarks {
 
-/// The engine without anything around it, with the settings that a book is opened with.
+/// Texts must live as long as the call.
+using BareValue = std::variant<qint64, double, const char*>;
+
+/// Rows of a statement, one after the other.
+class BareRows {
+public:
+    virtual ~BareRows() = default;
+    virtual bool next() = 0;
+    virtual qint64 integer(int column) const = 0;
+    virtual double real(int column) const = 0;
+    virtual const char* text(int column) const = 0;
+};
+
+/// An engine's client library without anything around it.
 class Bare {
 public:
-    explicit Bare(const QString& file);
-    ~Bare();
-    Bare(const Bare&) = delete;
-    Bare& operator=(const Bare&) = delete;
+    virtual ~Bare() = default;
 
-    /// Prepares, steps through and finalises one statement; reads `column` of its first row.
-    double run(const QByteArray& statement, int column = 0);
-    sqlite3* handle() const { return handle_; }
+    /// Prepares, runs and drops one statement; reads `column` of its first row.
+    virtual double run(const QByteArray& statement, int column = 0) = 0;
+    /// Runs and commits a write that stays prepared; its values are $1 and so on.
+    virtual void write(const QByteArray& statement, const std::vector<BareValue>& values) = 0;
+    /// A pass over a statement, on a connection of its own.
+    virtual std::unique_ptr<BareRows> rows(const QByteArray& statement) = 0;
 
-private:
-    sqlite3* handle_ = nullptr;
+    // A row held against other workstations. On SQLite nothing is held, which costs no statement.
+    virtual bool hold(const QByteArray&) { return false; }
+    virtual void letGo(const QByteArray&) {}
+    /// Holds a row, reads it and lets it go again, all in one round trip.
+    virtual void touch(const QByteArray&, const QByteArray& /*statement*/) {}
 };
+
+std::unique_ptr<Bare> bareSqlite(const Book& book);
+std::unique_ptr<Bare> barePostgres(const Book& book);
+inline std::unique_ptr<Bare> bare(const Book& book) {
+    return book.engine == Engine::Sqlite ? bareSqlite(book) : barePostgres(book);
+}
 
 }  // namespace benchmarks

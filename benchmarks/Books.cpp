@@ -6,6 +6,7 @@
 #include <cstdio>
 
 #include "benchmarks/Bare.h"
+#include "benchmarks/BenchServer.h"
 #include "boundary/Login.h"
 #include "database/Book.h"
 
@@ -15,49 +16,12 @@ namespace benchmarks {
 
 namespace {
 
+const QString Catalogue = u"zelmars"_s;
+
 /// One fixed day, so that a book made earlier and one made today hold the same.
 const QDate AsOf(2026, 11, 20);
 
-Book book(const QString& name, const database::BookSizes& sizes) {
-    Book made{QDir::current().absoluteFilePath(u"build/bench/books/"_s + name)};
-    if (!QFileInfo::exists(made.file())) {
-        std::printf("Making the book %s …\n", qUtf8Printable(name));
-        std::fflush(stdout);
-        // Under another name first, so that a book that was cut short is never taken for whole.
-        const QString half = made.folder + u"-half"_s;
-        QDir(half).removeRecursively();
-        database::createBook(half, u"zelmars"_s);
-        database::fillSample(half, u"zelmars"_s, sizes, AsOf);
-        QDir().rename(half, made.folder);
-    }
-    return made;
-}
-
-std::vector<Case> cases(const Book& book, const QByteArray& statement) {
-    const Bare bare(book.file());
-    sqlite3_stmt* rows = nullptr;
-    sqlite3_prepare_v2(bare.handle(), statement.constData(), -1, &rows, nullptr);
-    std::vector<Case> found;
-    while (sqlite3_step(rows) == SQLITE_ROW)
-        found.push_back(
-            {sqlite3_column_int(rows, 0),
-             QString::fromUtf8(reinterpret_cast<const char*>(sqlite3_column_text(rows, 1))),
-             sqlite3_column_int(rows, 2)});
-    sqlite3_finalize(rows);
-    return found;
-}
-
-}  // namespace
-
-QString Book::file() const {
-    return database::bookFile(folder, u"zelmars"_s);
-}
-
-Book sampleBook() {
-    return book(u"sample"_s, {});
-}
-
-Book largeBook() {
+database::BookSizes largeSizes() {
     database::BookSizes sizes;
     sizes.members = 100'000;
     sizes.relatives = 230'000;
@@ -65,11 +29,127 @@ Book largeBook() {
     sizes.movements = 1'000'000;
     sizes.historyPerYear = 3'500;
     sizes.accumulators = 1'000'000;
-    return book(u"large"_s, sizes);
+    return sizes;
+}
+
+void tell(const QString& name) {
+    std::printf("Making the book %s …\n", qUtf8Printable(name));
+    std::fflush(stdout);
+}
+
+Book fileBook(const QString& name, const database::BookSizes& sizes) {
+    Book made{Engine::Sqlite, QDir::current().absoluteFilePath(u"build/bench/books/"_s + name), {}};
+    if (!QFileInfo::exists(made.file())) {
+        tell(name);
+        // Under another name first, so that a book that was cut short is never taken for whole.
+        const QString half = made.folder + u"-half"_s;
+        QDir(half).removeRecursively();
+        database::createBook(half, Catalogue);
+        database::fillSample(half, Catalogue, sizes, AsOf);
+        QDir().rename(half, made.folder);
+    }
+    return made;
+}
+
+Book serverBook(const QString& name) {
+    return {Engine::Postgres, BenchServer::instance().folder(), name};
+}
+
+Book serverBook(const QString& name, const database::BookSizes& sizes) {
+    const Book made = serverBook(name);
+    database::postgres::Database server(serverBook(u"postgres"_s).server());
+    if (server.number(
+            "SELECT EXISTS (SELECT FROM pg_database WHERE datname = " + server.literal(name) + ')'))
+        return made;
+    tell(name + u" (server)"_s);
+    const Book half = serverBook(name + u"_half"_s);
+    server.run("DROP DATABASE IF EXISTS " + server.name(half.catalogue));
+    server.run("CREATE DATABASE " + server.name(half.catalogue) + " TEMPLATE template0");
+    database::createBook(half.server());
+    database::fillSample(half.server(), sizes, AsOf);
+    database::postgres::Database(half.server()).run("VACUUM ANALYZE");
+    server.run("ALTER DATABASE " + server.name(half.catalogue) + " RENAME TO " + server.name(name));
+    return made;
+}
+
+Book book(Engine engine, const QString& name, const database::BookSizes& sizes) {
+    return engine == Engine::Sqlite ? fileBook(name, sizes) : serverBook(name, sizes);
+}
+
+std::vector<Case> cases(const Book& book, const QByteArray& statement) {
+    const std::unique_ptr<BareRows> rows = bareSqlite(book)->rows(statement);
+    std::vector<Case> found;
+    while (rows->next())
+        found.push_back({static_cast<qint32>(rows->integer(0)), QString::fromUtf8(rows->text(1)),
+                         static_cast<qint32>(rows->integer(2))});
+    return found;
+}
+
+}  // namespace
+
+QString nameOf(Engine engine) {
+    return engine == Engine::Sqlite ? u"sqlite"_s : u"postgresql"_s;
+}
+
+QString Book::file() const {
+    return database::bookFile(folder, Catalogue);
+}
+
+database::ServerCatalogue Book::server() const {
+    return {folder, {}, QString::fromLatin1(BenchServer::User), {}, catalogue};
+}
+
+QString Book::connectionString() const {
+    const bool isFile = engine == Engine::Sqlite;
+    return u"Provider=SQLOLEDB.1;User ID=%1;Initial Catalog=%2;Data Source=%3:%4"_s.arg(
+        QString::fromLatin1(BenchServer::User), isFile ? Catalogue : catalogue, nameOf(engine),
+        folder);
+}
+
+Book sampleBook(Engine engine) {
+    return book(engine, u"sample"_s, {});
+}
+
+Book largeBook(Engine engine) {
+    return book(engine, u"large"_s, largeSizes());
+}
+
+BookCopy::BookCopy(const Book& original) : book_(original) {
+    if (book_.engine == Engine::Sqlite) {
+        book_.folder += u"-copy"_s;
+        QDir(book_.folder).removeRecursively();
+        QDir().mkpath(book_.folder);
+        QFile::copy(original.file(), book_.file());
+    } else {
+        book_.catalogue += u"_copy"_s;
+        database::postgres::Database server(serverBook(u"postgres"_s).server());
+        server.run("DROP DATABASE IF EXISTS " + server.name(book_.catalogue) + " WITH (FORCE)");
+        // Nobody may be on a catalogue that is copied; what is connected here connects anew.
+        server.number(
+            "SELECT count(pg_terminate_backend(pid, 5000)) FROM pg_stat_activity WHERE datname = " +
+            server.literal(original.catalogue));
+        server.run("CREATE DATABASE " + server.name(book_.catalogue) + " TEMPLATE " +
+                   server.name(original.catalogue));
+    }
+}
+
+BookCopy::~BookCopy() {
+    if (book_.engine == Engine::Sqlite) {
+        QDir(book_.folder).removeRecursively();
+    } else {
+        database::postgres::Database server(serverBook(u"postgres"_s).server());
+        server.run("DROP DATABASE " + server.name(book_.catalogue) + " WITH (FORCE)");
+    }
 }
 
 void use(const Book& book) {
-    database::writeSettings(book.folder, u"zelmars"_s);
+    if (book.engine == Engine::Sqlite)
+        database::writeSettings(book.folder, Catalogue);
+    else
+        database::writeSettings({QString::fromLatin1(BenchServer::User),
+                                 {},
+                                 book.catalogue,
+                                 u"postgresql:"_s + book.folder});
     boundary::Login();
 }
 

@@ -4,18 +4,45 @@
 #include <QString>
 #include <vector>
 
+#include "database/ServerBook.h"
+
 namespace benchmarks {
+
+enum class Engine { Sqlite, Postgres };
+
+/// As the rows of the report name it.
+QString nameOf(Engine engine);
 
 /// A book that measurements run on; made once and kept beside the build.
 struct Book {
-    QString folder;
-    QString file() const;
+    Engine engine = Engine::Sqlite;
+    QString folder;     ///< of the file, or of the server's socket
+    QString catalogue;  ///< of a server; an SQLite book has the usual name
+
+    QString file() const;                      ///< of an SQLite book
+    database::ServerCatalogue server() const;  ///< of a server's book
+    /// What a connection opens it by.
+    QString connectionString() const;
 };
 
 /// The sample book as every new user gets it.
-Book sampleBook();
+Book sampleBook(Engine engine = Engine::Sqlite);
 /// 100,000 members, 1,000,000 movements, 1,000,000 accumulator rows.
-Book largeBook();
+Book largeBook(Engine engine = Engine::Sqlite);
+
+/// A copy of a book for measurements that write much; gone with this.
+class BookCopy {
+public:
+    explicit BookCopy(const Book& original);
+    ~BookCopy();
+    BookCopy(const BookCopy&) = delete;
+    BookCopy& operator=(const BookCopy&) = delete;
+
+    const Book& book() const { return book_; }
+
+private:
+    Book book_;
+};
 
 /// Points the registry at the book and logs the component in. Fails as the login does.
 void use(const Book& book);
@@ -26,6 +53,8 @@ struct Case {
     QString codABC;
     qint32 rubrica_id;
 };
+
+// Both look into an SQLite book; a server's book of the same size holds the same.
 
 /// Cases whose accumulator row exists already, spread over the book.
 std::vector<Case> usedCases(const Book& book, int count);

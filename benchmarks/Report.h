@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QString>
+#include <QStringList>
 #include <functional>
 #include <vector>
 

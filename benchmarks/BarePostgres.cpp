@@ -1,0 +1,151 @@
+// SPDX-License-Identifier: MIT
+#include <libpq-fe.h>
+
+#include <QHash>
+#include <cstdio>
+#include <cstdlib>
+
+#include "benchmarks/Bare.h"
+
+namespace benchmarks {
+
+namespace {
+
+[[noreturn]] void stop(PGconn* connection, const QByteArray& statement) {
+    std::fprintf(stderr, "%s: %s\n", PQerrorMessage(connection), statement.constData());
+    std::exit(1);
+}
+
+PGconn* connect(const Book& book) {
+    const database::ServerCatalogue server = book.server();
+    PGconn* connection =
+        PQsetdbLogin(server.host.toUtf8().constData(), nullptr, nullptr, nullptr,
+                     server.name.toUtf8().constData(), server.user.toUtf8().constData(), nullptr);
+    if (PQstatus(connection) != CONNECTION_OK) stop(connection, "connect");
+    return connection;
+}
+
+PGresult* checked(PGconn* connection, PGresult* result, const QByteArray& statement) {
+    const ExecStatusType status = PQresultStatus(result);
+    if (status != PGRES_COMMAND_OK && status != PGRES_TUPLES_OK) stop(connection, statement);
+    return result;
+}
+
+PGresult* run(PGconn* connection, const QByteArray& statement) {
+    return checked(connection, PQexec(connection, statement.constData()), statement);
+}
+
+class BarePostgresRows final : public BareRows {
+public:
+    BarePostgresRows(const Book& book, const QByteArray& statement) : connection_(connect(book)) {
+        PQclear(run(connection_, "BEGIN"));
+        PQclear(run(connection_, "DECLARE c NO SCROLL CURSOR FOR " + statement));
+    }
+    ~BarePostgresRows() override {
+        PQclear(batch_);
+        PQfinish(connection_);
+    }
+
+    bool next() override {
+        if (++row_ < PQntuples(batch_)) return true;
+        PQclear(batch_);
+        batch_ = run(connection_, "FETCH 1000 FROM c");
+        row_ = 0;
+        return PQntuples(batch_) > 0;
+    }
+    qint64 integer(int column) const override { return std::atoll(text(column)); }
+    double real(int column) const override { return std::strtod(text(column), nullptr); }
+    const char* text(int column) const override { return PQgetvalue(batch_, row_, column); }
+
+private:
+    PGconn* connection_;
+    PGresult* batch_ = nullptr;
+    int row_ = 0;
+};
+
+class BarePostgres final : public Bare {
+public:
+    explicit BarePostgres(const Book& book) : book_(book), connection_(connect(book)) {}
+    ~BarePostgres() override { PQfinish(connection_); }
+
+    double run(const QByteArray& statement, int column) override {
+        PGresult* result = benchmarks::run(connection_, statement);
+        const double value =
+            PQntuples(result) > 0 ? std::strtod(PQgetvalue(result, 0, column), nullptr) : 0;
+        PQclear(result);
+        return value;
+    }
+
+    void write(const QByteArray& statement, const std::vector<BareValue>& values) override {
+        const QByteArray name = prepared(statement);
+        std::vector<QByteArray> texts;
+        for (const BareValue& value : values) texts.push_back(textOf(value));
+        std::vector<const char*> pointers;
+        for (const QByteArray& text : texts) pointers.push_back(text.constData());
+        PQclear(
+            checked(connection_,
+                    PQexecPrepared(connection_, name.constData(), static_cast<int>(pointers.size()),
+                                   pointers.data(), nullptr, nullptr, 0),
+                    statement));
+    }
+
+    std::unique_ptr<BareRows> rows(const QByteArray& statement) override {
+        return std::make_unique<BarePostgresRows>(book_, statement);
+    }
+
+    bool hold(const QByteArray& row) override {
+        write(Hold, {row.constData()});
+        return true;
+    }
+    void letGo(const QByteArray& row) override { write(LetGo, {row.constData()}); }
+
+    void touch(const QByteArray& row, const QByteArray& statement) override {
+        const QByteArray names[] = {prepared(Hold), prepared(statement), prepared(LetGo)};
+        const char* const value = row.constData();
+        PQenterPipelineMode(connection_);
+        for (const QByteArray& name : names)
+            PQsendQueryPrepared(connection_, name.constData(), name == names[1] ? 0 : 1, &value,
+                                nullptr, nullptr, 0);
+        PQpipelineSync(connection_);
+        for (int answers = 0; answers < 3; ++answers) {
+            PQclear(checked(connection_, PQgetResult(connection_), statement));
+            PQgetResult(connection_);  // the end of its rows
+        }
+        PQclear(PQgetResult(connection_));
+        PQexitPipelineMode(connection_);
+    }
+
+private:
+    static constexpr auto Hold = "SELECT pg_advisory_lock(hashtextextended($1, 1))";
+    static constexpr auto LetGo = "SELECT pg_advisory_unlock(hashtextextended($1, 1))";
+
+    QByteArray prepared(const QByteArray& statement) {
+        QByteArray& name = names_[statement];
+        if (!name.isEmpty()) return name;
+        name = 'b' + QByteArray::number(names_.size());
+        PQclear(checked(connection_,
+                        PQprepare(connection_, name.constData(), statement.constData(), 0, nullptr),
+                        statement));
+        return name;
+    }
+
+    static QByteArray textOf(const BareValue& value) {
+        if (const auto* number = std::get_if<qint64>(&value)) return QByteArray::number(*number);
+        if (const auto* real = std::get_if<double>(&value))
+            return QByteArray::number(*real, 'g', 17);
+        return QByteArray::fromRawData(std::get<const char*>(value),
+                                       qstrlen(std::get<const char*>(value)));
+    }
+
+    Book book_;
+    PGconn* connection_;
+    QHash<QByteArray, QByteArray> names_;  ///< of prepared statements
+};
+
+}  // namespace
+
+std::unique_ptr<Bare> barePostgres(const Book& book) {
+    return std::make_unique<BarePostgres>(book);
+}
+
+}  // namespace benchmarks
