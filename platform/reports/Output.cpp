@@ -63,7 +63,7 @@ void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMilli
     painter.restore();
 }
 
-void writePdf(const Pages& pages, const QString& file) {
+bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn) {
     QSaveFile out(file);
     bool done = out.open(QIODevice::WriteOnly);
     if (done) {
@@ -79,12 +79,14 @@ void writePdf(const Pages& pages, const QString& file) {
         for (int page = 0; done && page < pages.count(); ++page) {
             if (page > 0) writer.newPage();
             paint(painter, pages, pages.at(page), faces);
+            if (goesOn && !goesOn(page + 1)) return false;
         }
         painter.end();
     }
     if (!done || !out.commit())
         throw core::Failure(core::InvalidCall,
                             u"Não foi possível escrever «%1»: %2"_s.arg(file, out.errorString()));
+    return true;
 }
 
 }  // namespace reports

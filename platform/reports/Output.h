@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QString>
+#include <functional>
 
 #include "platform/ado/Recordset.h"
 #include "platform/reports/Pages.h"
@@ -18,13 +19,16 @@ void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMilli
 /// A caption as the name of a file, without a suffix and without what file systems do not take.
 QString fileName(const QString& caption);
 
-/// Writes complete pages as PDF, fonts embedded. Fails, leaving no half file, when the file cannot
-/// be written.
-void writePdf(const Pages& pages, const QString& file);
+/// Told of each page that is done, counted from 1. False gives up: nothing is written or printed.
+using GoesOn = std::function<bool(int done)>;
+
+/// Writes complete pages as PDF, fonts embedded; false when given up. Fails, leaving no half file,
+/// when the file cannot be written.
+bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn = {});
 
 /// Prints pages `from`..`to` (counted from 0) on a printer that is set up; paper smaller than A4
-/// takes them smaller. Fails when the printer does not take the job.
-void print(const Pages& pages, QPrinter& printer, int from, int to);
+/// takes them smaller. False when given up. Fails when the printer does not take the job.
+bool print(const Pages& pages, QPrinter& printer, int from, int to, const GoesOn& goesOn = {});
 
 /// Sends complete pages to the default printer, the report's caption as the job's title. Without
 /// one, or when it does not take the job, writes a PDF into the person's documents folder (or,

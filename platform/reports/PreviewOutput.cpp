@@ -2,10 +2,10 @@
 #include "platform/reports/PreviewOutput.h"
 
 #include <QFileDialog>
-#include <QGuiApplication>
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QPrinterInfo>
+#include <QProgressDialog>
 #include <QStandardPaths>
 
 #include "platform/core/MsgBox.h"
@@ -17,12 +17,26 @@ namespace reports {
 
 namespace {
 
-class Busy {
+/// Shows how far long work has come, and lets the person give it up.
+class Progress {
 public:
-    Busy() { QGuiApplication::setOverrideCursor(Qt::WaitCursor); }
-    ~Busy() { QGuiApplication::restoreOverrideCursor(); }
-    Busy(const Busy&) = delete;
-    Busy& operator=(const Busy&) = delete;
+    Progress(QWidget* parent, const QString& text, int pages)
+        : dialog_(text, u"&Cancelar"_s, 0, pages, parent) {
+        dialog_.setObjectName(u"Progresso"_s);
+        dialog_.setWindowTitle(parent->windowTitle());
+        dialog_.setWindowModality(Qt::WindowModal);
+        dialog_.setMinimumDuration(400);
+        dialog_.setValue(0);
+    }
+    GoesOn goesOn() {
+        return [this](int done) {
+            dialog_.setValue(done);
+            return !dialog_.wasCanceled();
+        };
+    }
+
+private:
+    QProgressDialog dialog_;
 };
 
 /// What is being written, as dialogs and file names call it.
@@ -91,8 +105,8 @@ QString printAsking(QWidget* parent, const Pages& pages, int current) {
         from = std::max(from, printer.fromPage() - 1);
         to = std::min(to, printer.toPage() - 1);
     }
-    const Busy busy;
-    print(pages, printer, from, to);
+    Progress progress(parent, u"A imprimir…"_s, to - from + 1);
+    if (!print(pages, printer, from, to, progress.goesOn())) return {};
     return u"Enviado para a impressora: %1 a %2 de %3 páginas"_s.arg(from + 1).arg(to + 1).arg(
         pages.count());
 }
@@ -101,9 +115,8 @@ QString savePdfAsking(QWidget* parent, const Pages& pages) {
     const Kind kind{u"FicheiroPdf"_s, u"Guardar PDF"_s, u"Documento PDF (*.pdf)"_s, u"pdf"_s};
     const QString file = askFile(parent, kind, pages.caption);
     if (file.isEmpty()) return {};
-    const Busy busy;
-    writePdf(pages, file);
-    return written(file);
+    Progress progress(parent, u"A guardar o PDF…"_s, pages.count());
+    return writePdf(pages, file, progress.goesOn()) ? written(file) : QString();
 }
 
 QString exportCsvAsking(QWidget* parent, const Report& report, const ado::RecordsetPtr& rows) {
@@ -111,7 +124,6 @@ QString exportCsvAsking(QWidget* parent, const Report& report, const ado::Record
                     u"csv"_s};
     const QString file = askFile(parent, kind, report.caption);
     if (file.isEmpty()) return {};
-    const Busy busy;
     writeCsv(report, rows, file);
     return written(file);
 }

@@ -86,13 +86,17 @@ QString fileName(const QString& caption) {
     return name.isEmpty() ? u"Mapa"_s : name;
 }
 
-void print(const Pages& pages, QPrinter& printer, int from, int to) {
+bool print(const Pages& pages, QPrinter& printer, int from, int to, const GoesOn& goesOn) {
     printer.setFullPage(true);
     QPainter painter;
     bool going = painter.begin(&printer);
     for (int page = from; going && page <= to; ++page) {
         if (page > from) going = printer.newPage();
         if (going) paint(painter, pages, page, unitsPerMillimetre(printer));
+        if (going && goesOn && !goesOn(page - from + 1)) {
+            printer.abort();
+            return false;
+        }
     }
     if (!going) {
         printer.abort();
@@ -102,6 +106,7 @@ void print(const Pages& pages, QPrinter& printer, int from, int to) {
     if (!painter.end()) fail(printer, {});
     const bool toServer = printer.outputFileName().isEmpty();
     if (const QString why = toServer ? refusal() : QString(); !why.isEmpty()) fail(printer, why);
+    return true;
 }
 
 void printUnasked(const Pages& pages) {
@@ -111,7 +116,8 @@ void printUnasked(const Pages& pages) {
             QPrinter printer(preset, QPrinter::HighResolution);
             printer.setPageSize(QPageSize(QPageSize::A4));
             printer.setDocName(pages.caption);
-            return print(pages, printer, 0, pages.count() - 1);
+            print(pages, printer, 0, pages.count() - 1);
+            return;
         } catch (const core::Failure& failure) {
             why = failure.text();
         }
