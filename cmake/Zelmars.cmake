@@ -116,10 +116,12 @@ function(zelmars_program name)
     zelmars_settle(${name})
 endfunction()
 
-# zelmars_suite(NAME [WIDGETS] SOURCES … LINKS …): a test program, one ctest entry. A forgotten
-# message box fails by the time-out instead of hanging.
+# zelmars_suite(NAME [WIDGETS] [ENGINES …] SOURCES … LINKS …): a test program, one ctest entry. With
+# ENGINES sqlite postgresql there is a second entry, NAME@postgresql, whose books lie on a server of
+# the run's own; with postgresql alone they do in the only one. A forgotten message box fails by the
+# time-out instead of hanging.
 function(zelmars_suite name)
-    cmake_parse_arguments(ZELMARS "WIDGETS" "TIMEOUT" "SOURCES;LINKS;NEEDS" ${ARGN})
+    cmake_parse_arguments(ZELMARS "WIDGETS" "TIMEOUT" "ENGINES;SOURCES;LINKS;NEEDS" ${ARGN})
     if(NOT ZELMARS_TIMEOUT)
         set(ZELMARS_TIMEOUT 120)
     endif()
@@ -133,7 +135,15 @@ function(zelmars_suite name)
         add_dependencies(test_${name} ${ZELMARS_NEEDS})
     endif()
     zelmars_settle(test_${name})
-    add_test(NAME ${name} COMMAND test_${name})
-    set_tests_properties(${name} PROPERTIES TIMEOUT ${ZELMARS_TIMEOUT}
-        ENVIRONMENT "QT_QPA_PLATFORM=offscreen;LC_ALL=C.UTF-8;TZ=Europe/Lisbon")
+    set(surroundings "QT_QPA_PLATFORM=offscreen" "LC_ALL=C.UTF-8" "TZ=Europe/Lisbon")
+    if(NOT ZELMARS_ENGINES)
+        set(ZELMARS_ENGINES sqlite)
+    endif()
+    set(entry ${name})
+    foreach(engine ${ZELMARS_ENGINES})
+        add_test(NAME ${entry} COMMAND test_${name})
+        set_tests_properties(${entry} PROPERTIES TIMEOUT ${ZELMARS_TIMEOUT}
+            ENVIRONMENT "${surroundings};ZELMARS_TEST_ENGINE=${engine}")
+        set(entry ${name}@postgresql)
+    endforeach()
 endfunction()

@@ -15,7 +15,7 @@ protected:
                             .localidade1 = u"Évora"_s});
         joao = book.member({.no_kor = u"100020"_s, .nome = u"João Sá Carneiro"_s});
         luis = book.member({.no_kor = u"100021"_s, .nome = u"Luís Antunes"_s});
-        lumbra.call(u"Login"_s, {u"zelmars"_s, u""_s});
+        lumbra.call(u"Login"_s, {book.user(), u""_s});
     }
 
     /// Searches; the person does the steps in the window.

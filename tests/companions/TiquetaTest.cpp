@@ -91,16 +91,14 @@ TEST_F(TiquetaTest, CancelAbandons) {
 }
 
 TEST_F(TiquetaTest, AWriteTheBookRefusesLeavesTheScreenAsItIs) {
-    book.exec(
-        u"create trigger refuses before update on tbSocios "
-        "begin select raise(abort, 'o livro recusa'); end"_s);
+    book.refuse(u"update on tbSocios"_s, u"o livro recusa"_s);
     edit([&] {
         person.fill(u"txtNome"_s, u"Novo Nome"_s);
         person.expectBox(
             {.text = u"o livro recusa"_s, .icon = core::Icon::Critical, .partly = true});
         person.accelerator(u'O');
         EXPECT_EQ(field(u"txtNome"_s), u"Novo Nome"_s);
-        book.exec(u"drop trigger refuses"_s);
+        book.refuseNoMore();
         person.accelerator(u'O');
     });
     EXPECT_EQ(stored(u"nome"_s), u"Novo Nome"_s);

@@ -94,7 +94,7 @@ TEST_F(DocumentFields, RefusalsHoldTheFocusAndLeaveTheRow) {
 TEST_F(DocumentFields, BadInputIsSaidAndLosesNothing) {
     openNew(true);
     typeDocument(u"87,35"_s, u"10"_s);
-    const QString before = everything();
+    const QString before = book.everything();
     const Operator::Box failed{.icon = Icon::Critical, .partly = true};
     const Operator::Box unknown{.text = u"Número de Empresa não encontrado!"_s};
     const std::pair<QString, Operator::Box> rows[] = {
@@ -114,7 +114,7 @@ TEST_F(DocumentFields, BadInputIsSaidAndLosesNothing) {
         EXPECT_EQ(form().Socio_ID, socio);
     }
     typeMember();
-    EXPECT_EQ(everything(), before);
+    EXPECT_EQ(book.everything(), before);
     const QString wild = u"O'Neil \"%\" 😀 "_s + QString(3000, u'ã');
     person.fill(u"DataCombo3"_s, u"TRF"_s);
     person.put(u"Text12"_s, QString());

@@ -101,13 +101,4 @@ QVariant EntryTest::pending(const QString& column) const {
     return form().Adodc1->Recordset()->Collect(column);
 }
 
-QString EntryTest::everything() {
-    QStringList all;
-    const QString names =
-        book.text(u"select name from sqlite_master where type = 'table' order by name"_s);
-    for (const QString& table : names.split(u'\n'))
-        all << table << book.text(u"select * from "_s + table);
-    return all.join(u'\n');
-}
-
 }  // namespace entry

@@ -41,8 +41,6 @@ protected:
 
     /// A value of the pending row.
     QVariant pending(const QString& column) const;
-    /// Every row of every table.
-    QString everything();
 
     support::Book book;
     qint64 socio = 0;   ///< staff number 100015, in order in every respect

@@ -55,13 +55,13 @@ TEST_F(ReadOnlyView, ShowsAHospitalBillAndLocksIt) {
          {form().No_Kor, form().Text1, form().Text3, form().Text5, form().Text6})
         EXPECT_TRUE(box->isReadOnly()) << box->objectName().toStdString();
 
-    const QString before = everything();
+    const QString before = book.everything();
     // Through every field, as they are: no box, no field that holds.
     for (int at = 0; at < 20; ++at) person.tab();
     for (const QString& name : {u"Text9"_s, u"Text11"_s, u"Text12"_s}) person.fill(name, u"1"_s);
     person.accelerator(u'S');
     EXPECT_FALSE(forms::DefaultInstance<frmMovimentos>::isLoaded());
-    EXPECT_EQ(everything(), before);
+    EXPECT_EQ(book.everything(), before);
 }
 
 TEST_F(ReadOnlyView, RegistoIsSilentAboutUnknownKeysAndTypesWithoutAScreen) {

@@ -44,7 +44,7 @@ TEST_F(Route, TheWayOutOffersFourOptions) {
         {u"Option3"_s, u"Imprimir &Extratos de Lançamentos"_s, u'E'},
         {u"Option1"_s, u"&Sair"_s, u'S'},
     };
-    const QString before = everything();
+    const QString before = book.everything();
     for (const auto& [name, text, key] : options) {
         SCOPED_TRACE(text.toStdString());
         openNew(true);
@@ -68,7 +68,7 @@ TEST_F(Route, TheWayOutOffersFourOptions) {
         if (forms::DefaultInstance<frmMovimentos>::isLoaded()) form().Unload();
         person.settle();
     }
-    EXPECT_EQ(everything(), before);
+    EXPECT_EQ(book.everything(), before);
 }
 
 TEST_F(Route, NumberTypedButNeverAcceptedDoesNotTravelOn) {

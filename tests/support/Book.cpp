@@ -1,14 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "tests/support/Book.h"
 
-#include <sqlite3.h>
-
-#include <QDir>
-#include <QFile>
-#include <stdexcept>
-
-#include "database/Book.h"
 #include "platform/core/Clock.h"
+#include "platform/registry/Registry.h"
 
 using namespace Qt::StringLiterals;
 
@@ -17,19 +11,6 @@ namespace support {
 namespace {
 
 constexpr const char* RegistryVariable = "ZELMARS_REGISTRY";
-
-/// A book made once in the process and copied for each test.
-QString pattern(Book::Content content) {
-    static QTemporaryDir folders;
-    const QString sub = content == Book::Content::Sample ? u"sample"_s : u"empty"_s;
-    const QString folder = folders.filePath(sub);
-    const QString file = database::bookFile(folder, u"zelmars"_s);
-    if (!QFile::exists(file)) {
-        database::createBook(folder, u"zelmars"_s);
-        if (content == Book::Content::Sample) database::fillSample(folder, u"zelmars"_s);
-    }
-    return file;
-}
 
 QString literal(const QVariant& value) {
     if (!value.isValid() || value.isNull()) return u"null"_s;
@@ -41,26 +22,27 @@ QString literal(const QVariant& value) {
 
 }  // namespace
 
-Book::Book(Content content) : registryBefore_(qgetenv(RegistryVariable)) {
-    QDir(root_.path()).mkpath(u"book"_s);
-    QDir(root_.path()).mkpath(u"registry"_s);
-    const QString file = database::bookFile(folder(), catalogue());
-    if (!QFile::copy(pattern(content), file)) throw std::runtime_error("no copy of the book");
+Book::Book(Content content)
+    : registryBefore_(qgetenv(RegistryVariable)), handle_(BookHandle::make(content, folder())) {
     qputenv(RegistryVariable, registryFolder().toUtf8());
-    database::writeSettings(folder(), catalogue());
-    sqlite3_open(file.toUtf8().constData(), &handle_);
-    sqlite3_busy_timeout(handle_, 5000);
+    const std::pair<QString, QString> settings[] = {{u"dtSecurityInfo"_s, u"True"_s},
+                                                    {u"dtUser"_s, user()},
+                                                    {u"dtPassword"_s, u""_s},
+                                                    {u"dtInitialCatalog"_s, catalogue()},
+                                                    {u"dtDataSource"_s, dataSource()}};
+    for (const auto& [name, value] : settings)
+        registry::writeValue(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s, name,
+                             value);
 }
 
 Book::~Book() {
-    sqlite3_close(handle_);
     qputenv(RegistryVariable, registryBefore_);
 }
 
 QString Book::connectionString() const {
-    return u"Provider=SQLOLEDB.1;Persist Security Info=True;User ID=zelmars;Password=;"
-           "Initial Catalog=%1;Data Source=sqlite:%2;Connect Timeout=15"_s.arg(catalogue(),
-                                                                               folder());
+    return u"Provider=SQLOLEDB.1;Persist Security Info=True;User ID=%1;Password=;"
+           "Initial Catalog=%2;Data Source=%3;Connect Timeout=15"_s.arg(user(), catalogue(),
+                                                                        dataSource());
 }
 
 QString Book::shapingConnectionString() const {
@@ -68,28 +50,21 @@ QString Book::shapingConnectionString() const {
                                       u"Provider=MSDataShape.1;Data Provider=SQLOLEDB.1"_s);
 }
 
-QList<QStringList> Book::rows(const QString& statements) {
-    const auto take = [](void* rows, int count, char** cells, char**) {
-        QStringList row;
-        for (int at = 0; at < count; ++at) row << QString::fromUtf8(cells[at]);
-        static_cast<QList<QStringList>*>(rows)->append(row);
-        return 0;
-    };
-    QList<QStringList> rows;
-    if (sqlite3_exec(handle_, statements.toUtf8().constData(), take, &rows, nullptr) != SQLITE_OK)
-        throw std::runtime_error(std::string(sqlite3_errmsg(handle_)) + ": " +
-                                 statements.toStdString());
-    return rows;
+QString Book::everything() {
+    QStringList all;
+    for (const QString& table : handle_->tables())
+        all << table << text(u"select * from "_s + table);
+    return all.join(u'\n');
 }
 
 QVariant Book::value(const QString& statement) {
-    const QString cell = rows(statement).value(0).value(0);
+    const QString cell = handle_->rows(statement).value(0).value(0);
     return cell.isNull() ? QVariant() : cell;
 }
 
 QString Book::text(const QString& statement) {
     QStringList lines;
-    for (QStringList cells : rows(statement)) {
+    for (QStringList cells : handle_->rows(statement)) {
         for (QString& cell : cells)
             if (cell.isNull()) cell = u"NULL"_s;
         lines << cells.join(u'|');
@@ -110,9 +85,10 @@ qint64 Book::insert(const QString& table,
         names << QString::fromLatin1(name);
         values << literal(value);
     }
-    exec(u"insert into "_s + table + u" ("_s + names.join(u',') + u") values ("_s +
-         values.join(u',') + u")"_s);
-    return sqlite3_last_insert_rowid(handle_);
+    // A table's key stands first.
+    return value(u"insert into %1 (%2) values (%3) returning *"_s.arg(table, names.join(u','),
+                                                                      values.join(u',')))
+        .toLongLong();
 }
 
 qint64 Book::member(const MemberRow& row) {

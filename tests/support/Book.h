@@ -9,7 +9,7 @@
 #include <initializer_list>
 #include <utility>
 
-struct sqlite3;
+#include "tests/support/BookHandle.h"
 
 namespace support {
 
@@ -49,7 +49,7 @@ struct RubricRow {
     QVariant franquia = {};
 };
 
-/// A book of its own for one test: a temporary folder, the schema with its code lists, and a
+/// A book of its own for one test, on the run's engine: the schema with its code lists, and a
 /// registry folder (ZELMARS_REGISTRY) whose five values name it, so that General::Login finds it.
 /// Both are gone with the object. Make one at a time.
 ///
@@ -63,29 +63,39 @@ struct RubricRow {
 /// failing one throws std::runtime_error with the engine's text.
 class Book {
 public:
-    enum class Content {
-        Empty,   ///< schema, code lists, counters at 1
-        Sample,  ///< the sample book as of core::today()
-    };
+    /// Empty: schema, code lists, counters at 1. Sample: the sample book as of core::today().
+    using Content = BookHandle::Content;
     explicit Book(Content content = Content::Empty);
     ~Book();
     Book(const Book&) = delete;
     Book& operator=(const Book&) = delete;
 
-    QString folder() const { return root_.filePath(QStringLiteral("book")); }
-    QString catalogue() const { return QStringLiteral("zelmars"); }
+    /// Where a book file lies.
+    QString folder() const { return root_.path(); }
+    QString catalogue() const { return handle_->catalogue(); }
+    QString dataSource() const { return handle_->dataSource(); }
+    /// Who the values let log in.
+    QString user() const { return handle_->user(); }
     QString registryFolder() const { return root_.filePath(QStringLiteral("registry")); }
     /// Of the plain provider, as a login would set it, and of the shaping one.
     QString connectionString() const;
     QString shapingConnectionString() const;
 
-    void exec(const QString& statements) { rows(statements); }
+    void exec(const QString& statements) { handle_->rows(statements); }
     /// The first column of the first row as text; invalid for null and for no row.
     QVariant value(const QString& statement);
     /// All rows: columns parted by '|', rows by '\n', null as "NULL".
     QString text(const QString& statement);
+    /// Every row of every table.
+    QString everything();
     /// Number of rows of a table, `where` being a condition or empty.
     qint64 count(const QString& table, const QString& where = {});
+
+    // What goes wrong in an office. See BookHandle.
+    void hold(const QString& table) { handle_->hold(table); }
+    void letGo() { exec(QStringLiteral("commit")); }
+    void refuse(const QString& write, const QString& text) { handle_->refuse(write, text); }
+    void refuseNoMore() { handle_->refuseNoMore(); }
 
     /// Inserts one row and gives its key. Columns left out take their defaults.
     qint64 insert(const QString& table,
@@ -103,11 +113,9 @@ public:
     void premiumInOrder(qint64 socio_id);
 
 private:
-    QList<QStringList> rows(const QString& statements);  ///< a null text for null
-
     QTemporaryDir root_;
     QByteArray registryBefore_;
-    sqlite3* handle_ = nullptr;
+    std::unique_ptr<BookHandle> handle_;
 };
 
 }  // namespace support
