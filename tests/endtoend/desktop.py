@@ -2,6 +2,7 @@
 """A virtual display with a window manager, and a person at its keyboard."""
 
 import os
+import re
 import signal
 import subprocess
 import time
@@ -22,6 +23,12 @@ def wait_until(what, condition):
             return found
         time.sleep(0.02)
     raise Failed("waited in vain until " + what)
+
+
+def surroundings(own, pictures=None):
+    """The environment of all programs; what they keep lies in the folder `own`."""
+    return dict(os.environ, ZELMARS_REGISTRY=own + "/registry", XDG_CONFIG_HOME=own,
+                XDG_RUNTIME_DIR=own, TZ="Europe/Lisbon", LC_ALL="C.UTF-8", PICTURES=pictures or "")
 
 
 class Desktop:
@@ -71,6 +78,16 @@ class Desktop:
 
     def active_title(self):
         return self.run(["xdotool", "getactivewindow", "getwindowname"]).strip()
+
+    def window_of(self, program, title):
+        """The program's visible window of that title, once there is one; the newest of several."""
+        def search():
+            return self.run(["xdotool", "search", "--all", "--onlyvisible", "--pid",
+                             str(program.pid), "--name", re.escape(title)]).split()
+        return max(wait_until(f"«{title}» is there", search), key=int)
+
+    def turn_to(self, window):
+        self.run(["xdotool", "windowactivate", "--sync", window])
 
     def at(self, title):
         """Waits until the window with that title (or the beginning of it) has the keyboard."""

@@ -2,29 +2,20 @@
 """A medical document and a hospital bill, from the main window to the book, by key presses alone.
 
 The amounts in the book are compared with a calculation of this script's own, from the rubric's row.
-Usage: road_of_one_document.py FOLDER_OF_THE_PROGRAMS [FOLDER_FOR_PICTURES]
+Usage: road_of_one_document.py FOLDER_OF_THE_PROGRAMS [sqlite|postgresql [FOLDER_FOR_PICTURES]]
 """
 
 import os
-import sqlite3
-import struct
-import subprocess
 import sys
 import tempfile
+from contextlib import ExitStack
 from datetime import date
 from decimal import ROUND_HALF_UP, Decimal
 
-from desktop import Desktop, Failed, wait_until
-
-MEMBER = "100015"
-ENTRY = "Lançamento (Plano de Saúde)"
-EXIT = "Sair de Lançamentos"
-MAIN = "Zelmars"
-
-
-def single(value):
-    """The nearest 32-bit float, as the calculation works."""
-    return struct.unpack("f", struct.pack("f", value))[0]
+from books import Helper, make_sample, single
+from desktop import Desktop, Failed, surroundings, wait_until
+from entry import (ENTRY, EXIT, MAIN, MEMBER, choose_member_and_person, choose_person,
+                   fill_in_fields, leave, post)
 
 
 def money(value):
@@ -32,72 +23,33 @@ def money(value):
     return float(Decimal(value).quantize(Decimal("0.0001"), ROUND_HALF_UP))
 
 
-class Book:
-    def __init__(self, file):
-        self.file = file
+def rubric_of(book, code):
+    return book.row("SELECT * FROM tbZelmar_Plafonds WHERE code = ?", code)
 
-    def row(self, statement, *values):
-        with sqlite3.connect(f"file:{self.file}?mode=ro", uri=True) as book:
-            book.row_factory = sqlite3.Row
-            return book.execute(statement, values).fetchone()
 
-    def rubric(self, code):
-        return self.row("SELECT * FROM tbZelmar_Plafonds WHERE code = ?", code)
-
-    def room(self, rubric, person):
-        """The lowest ceiling of a family that has used nothing yet."""
-        main = self.row("SELECT * FROM tbZelmar_Plafonds WHERE rubrica_id = ?",
-                        rubric["rubrica_id_main"])
-        own = "socio" if person == "A" else "familiar"
-        ceilings = [rubric[own] or 0, rubric["agregado"], main[own], main["agregado"],
-                    rubric[own + "_max_lan"]]
-        if person != "A":
-            ceilings += [rubric["total_familia"], main["total_familia"]]
-        return min(c for c in ceilings if c is not None)
+def room_of(book, rubric, person):
+    """The lowest ceiling of a family that has used nothing yet."""
+    main = book.row("SELECT * FROM tbZelmar_Plafonds WHERE rubrica_id = ?",
+                    rubric["rubrica_id_main"])
+    own = "socio" if person == "A" else "familiar"
+    ceilings = [rubric[own] or 0, rubric["agregado"], main[own], main["agregado"],
+                rubric[own + "_max_lan"]]
+    if person != "A":
+        ceilings += [rubric["total_familia"], main["total_familia"]]
+    return min(c for c in ceilings if c is not None)
 
 
 def expect(row, **wanted):
     for column, value in wanted.items():
-        if row[column] != value:
-            raise Failed(f"{column} is {row[column]!r} and not {value!r}")
-        print(f"  {column:16} {row[column]}")
-
-
-def choose_member_and_person(desktop, *way_to_person):
-    desktop.at(ENTRY)
-    desktop.type(MEMBER)
-    desktop.keys("Tab")
-    desktop.at("Quotizações")
-    desktop.keys("alt+n")
-    desktop.at(ENTRY)
-    choose_person(desktop, *way_to_person)
-
-
-def choose_person(desktop, *way):
-    desktop.keys("alt+i")
-    desktop.at("Escolher Familiar")
-    desktop.keys(*way, "Return")
-    desktop.at(ENTRY)
-
-
-def fill_in_fields(desktop, *texts):
-    """Types one field after the other, beginning behind «Indicar Familiar»."""
-    desktop.keys("Tab")
-    for text in texts:
-        if text:
-            desktop.type(text)
-        desktop.keys("Tab")
-
-
-def post(desktop):
-    desktop.keys("alt+o")
-    desktop.at(ENTRY)  # the question bears the screen's caption
-    desktop.keys("alt+s")
+        found = row[column.lower()]
+        if found != value:
+            raise Failed(f"{column} is {found!r} and not {value!r}")
+        print(f"  {column:16} {found}")
 
 
 def medical_document(desktop, book, today):
     """Glasses for 87,35 at rate 23, for the member himself."""
-    rubric = book.rubric("5.02")
+    rubric = rubric_of(book, "5.02")
     desktop.at(MAIN)
     desktop.keys("ctrl+n")
     choose_member_and_person(desktop)
@@ -112,7 +64,7 @@ def medical_document(desktop, book, today):
     desktop.at(EXIT)
 
     share = money(87.35 * single(rubric["percent"]))
-    room = money(single(book.room(rubric, "A")))
+    room = money(single(room_of(book, rubric, "A")))
     net = money(min(single(share), single(87.35), single(room)))
     franchise = single(rubric["franquia"] or 0)
     credit = money(single(single(net) - franchise)) if franchise < single(net) else 0.0
@@ -127,7 +79,7 @@ def medical_document(desktop, book, today):
 
 def hospital_bill(desktop, book, today):
     """A bill of 1.250,00 with an incidence of 1.000,00 for the spouse, by cheque 500."""
-    rubric = book.rubric("7.01")
+    rubric = rubric_of(book, "7.01")
     hospital = book.row("SELECT * FROM tbHospitais ORDER BY nome LIMIT 1")
     desktop.at(MAIN)
     desktop.keys("ctrl+h")
@@ -144,7 +96,7 @@ def hospital_bill(desktop, book, today):
     desktop.at(EXIT)
 
     share = money(1000 * single(rubric["percent"]))
-    room = money(single(book.room(rubric, "B")))
+    room = money(single(room_of(book, rubric, "B")))
     net = money(min(single(share), single(room)))
     row = newest(book)
     expect(row, tipo="HOS", codABC="B", doc_no="H-2001", doc_valor=1250, incidencia=1000,
@@ -162,7 +114,7 @@ def newest(book):
 def check_accumulators(book, *rows):
     for row in rows:
         expect(book.row("SELECT * FROM tbSocios_Acumulados WHERE socio_id = ? AND codABC = ? "
-                        "AND rubrica_id = ?", row["socio_id"], row["codABC"], row["rubrica_id"]),
+                        "AND rubrica_id = ?", row["socio_id"], row["codabc"], row["rubrica_id"]),
                credito_ac=single(row["credito"]), debito_ac=single(row["debito"]), no_docs=1)
 
 
@@ -197,23 +149,16 @@ def road(desktop, programs, book):
     desktop.show("lista")
 
 
-def leave(desktop):
-    desktop.at(EXIT)
-    desktop.keys("alt+s", "Return")
-    desktop.gone(EXIT)
-
-
-def main(programs, pictures=None):
-    with tempfile.TemporaryDirectory() as own:
-        environment = dict(os.environ, ZELMARS_REGISTRY=own + "/registry", XDG_CONFIG_HOME=own,
-                           XDG_RUNTIME_DIR=own, TZ="Europe/Lisbon", LC_ALL="C.UTF-8",
-                           PICTURES=pictures or "")
-        zelmars = os.path.join(programs, "zelmars")
-        for command in ([zelmars, "init", "--sample", own + "/book"], [zelmars, "register"]):
-            subprocess.run(command, env=dict(environment, QT_QPA_PLATFORM="offscreen"), check=True)
+def main(programs, engine="sqlite", pictures=None):
+    with tempfile.TemporaryDirectory() as own, ExitStack() as stack:
+        environment = surroundings(own, pictures)
+        host = None
+        if engine == "postgresql":
+            host = stack.enter_context(Helper(programs, environment, "server")).said
+        book = make_sample(programs, environment, own, host)
         with Desktop(environment) as desktop:
             try:
-                road(desktop, programs, Book(own + "/book/zelmars.db"))
+                road(desktop, programs, book)
             except Failed as failure:
                 desktop.show("falhou")
                 sys.exit(f"failed: {failure}")
