@@ -9,7 +9,6 @@
 #include "platform/forms/Controls.h"
 #include "platform/reports/PreviewFindBar.h"
 #include "platform/reports/PreviewOutput.h"
-#include "platform/reports/PreviewSearch.h"
 #include "platform/reports/PreviewSource.h"
 
 using namespace Qt::StringLiterals;
@@ -29,7 +28,6 @@ struct Preview::Implementation {
     Preview* form;
     PreviewSource source;
     std::shared_ptr<Pages> pages;
-    PreviewSearch search;
     int awaitedPage = -1;  ///< to be shown as soon as it is laid out
 
     PreviewBar* bar;
@@ -46,17 +44,12 @@ struct Preview::Implementation {
 
     void work();
     void addPages();
-    void lookFor();
 
     void act(PreviewCommand command);
     void run(PreviewCommand command);
     void output(PreviewCommand command);
     bool allPagesAreThere();
     void goToPage(int page);
-    void find();
-    void findNext(bool forward);
-    void endFind();
-    std::vector<Highlight> highlightsOn(int page) const;
     void showPlace();
 };
 
@@ -67,7 +60,7 @@ Preview::~Preview() = default;
 
 Preview::Implementation::Implementation(Preview* window, const Report& design,
                                         const ado::RecordsetPtr& rows)
-    : form(window), source(design, rows), pages(source.pages()), search(pages) {
+    : form(window), source(design, rows), pages(source.pages()) {
     layOutWindow();
     connectControls();
     view->setPages(pages);
@@ -78,7 +71,7 @@ void Preview::Implementation::layOutWindow() {
     const PreviewHandler handler = [this](PreviewCommand command) { act(command); };
     bar = new PreviewBar(handler);
     view = new PreviewView(u"Folhas"_s, form);
-    findBar = new PreviewFindBar(handler);
+    findBar = new PreviewFindBar(handler, pages, view);
     place = new QLabel;
     place->setObjectName(u"Estado"_s);
     message = new QLabel;
@@ -111,8 +104,7 @@ void Preview::Implementation::connectControls() {
     bar->onPage = [this](int page) { goToPage(page); };
     bar->onPercent = [this](double percent) { view->setFocus(), view->setPercent(percent); };
     bar->onFit = [this](PreviewView::Fit fit) { view->setFocus(), view->setFit(fit); };
-    findBar->onText = [this] { find(); };
-    view->setHighlights([this](int page) { return highlightsOn(page); });
+    findBar->onSearch = [this] { timer->setEnabled(true); };
     connect(view, &PreviewView::moved, form, [this] { showPlace(); });
     for (const PreviewAction& action : previewActions()) {
         if (action.keys.isEmpty()) continue;
@@ -134,12 +126,12 @@ void Preview::Implementation::stop() {
 
 void Preview::Implementation::work() {
     addPages();
-    if (search.state() == PreviewSearch::State::Looking) lookFor();
+    if (findBar->isLooking()) findBar->look(Slice, source.isAtWork());
     if (awaitedPage >= 0 && (awaitedPage < pages->count() || !source.isAtWork())) {
         view->goToPage(awaitedPage);
         awaitedPage = -1;
     }
-    timer->setEnabled(source.isAtWork() || search.state() == PreviewSearch::State::Looking);
+    timer->setEnabled(source.isAtWork() || findBar->isLooking());
 }
 
 void Preview::Implementation::addPages() {
@@ -156,17 +148,6 @@ void Preview::Implementation::addPages() {
         throw;
     }
     show();
-}
-
-void Preview::Implementation::lookFor() {
-    using enum PreviewSearch::State;
-    const PreviewSearch::State state = search.go(Slice, source.isAtWork());
-    if (state == Found) view->reveal(search.hitPage(), search.hitBox());
-    view->viewport()->update();
-    findBar->showMessage(state == Looking      ? u"A procurar…"_s
-                         : state == NotFound   ? u"Não encontrado"_s
-                         : search.wasWrapped() ? u"Deu a volta ao relatório"_s
-                                               : QString());
 }
 
 // What the person asks for.
@@ -214,11 +195,11 @@ void Preview::Implementation::run(PreviewCommand command) {
         case Find:
             return findBar->open();
         case FindPrevious:
-            return findNext(false);
+            return findBar->findNext(false);
         case FindNext:
-            return findNext(true);
+            return findBar->findNext(true);
         case EndFind:
-            return endFind();
+            return findBar->end();
         case Close:
             return form->Unload();
     }
@@ -257,38 +238,6 @@ void Preview::Implementation::goToPage(int page) {
     awaitedPage = page;
     timer->setEnabled(true);
     view->setFocus();
-}
-
-// Finding.
-
-void Preview::Implementation::find() {
-    search.look(findBar->text(), view->currentPage());
-    findBar->showMessage({});
-    view->viewport()->update();
-    timer->setEnabled(true);
-}
-
-void Preview::Implementation::findNext(bool forward) {
-    if (findBar->isHidden()) {
-        findBar->open();
-        return find();
-    }
-    search.lookOn(forward);
-    timer->setEnabled(true);
-}
-
-void Preview::Implementation::endFind() {
-    findBar->hide();
-    search.look({}, 0);
-    view->viewport()->update();
-}
-
-std::vector<Highlight> Preview::Implementation::highlightsOn(int page) const {
-    std::vector<Highlight> result;
-    const bool isHere = search.state() == PreviewSearch::State::Found && search.hitPage() == page;
-    for (const QRectF& box : search.hitsOn(page))
-        result.push_back({box, isHere && box == search.hitBox()});
-    return result;
 }
 
 void Preview::Implementation::showPlace() {

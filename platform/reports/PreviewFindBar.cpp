@@ -12,13 +12,14 @@ using namespace Qt::StringLiterals;
 
 namespace reports {
 
-PreviewFindBar::PreviewFindBar(const PreviewHandler& handler) : handler_(handler) {
+PreviewFindBar::PreviewFindBar(const PreviewHandler& handler, std::shared_ptr<const Pages> pages,
+                               PreviewView* view)
+    : handler_(handler), search_(std::move(pages)), view_(view) {
     text_ = new QLineEdit;
     text_->setObjectName(u"Texto"_s);
     text_->setToolTip(u"Maiúsculas e acentos não contam; Enter procura mais adiante"_s);
     text_->setClearButtonEnabled(true);
     text_->setFixedWidth(text_->fontMetrics().averageCharWidth() * 40);
-    connect(text_, &QLineEdit::textChanged, this, [this] { forms::handle(onText); });
     message_ = new QLabel;
     message_->setObjectName(u"Procura"_s);
     message_->setTextFormat(Qt::PlainText);
@@ -34,20 +35,54 @@ PreviewFindBar::PreviewFindBar(const PreviewHandler& handler) : handler_(handler
     row->addWidget(message_, 1);
     row->addWidget(previewButton(PreviewCommand::EndFind, handler));
     hide();
-}
 
-QString PreviewFindBar::text() const {
-    return text_->text();
+    connect(text_, &QLineEdit::textChanged, this, [this] { forms::handle([this] { start(); }); });
+    view->setHighlights([this](int page) { return highlightsOn(page); });
 }
 
 void PreviewFindBar::open() {
+    const bool again = isHidden() && !text_->text().isEmpty();
     show();
     text_->setFocus(Qt::ShortcutFocusReason);
     text_->selectAll();
+    if (again) start();
 }
 
-void PreviewFindBar::showMessage(const QString& message) {
-    message_->setText(message);
+void PreviewFindBar::start() {
+    search_.look(text_->text(), view_->currentPage());
+    message_->clear();
+    view_->viewport()->update();
+    onSearch();
+}
+
+void PreviewFindBar::findNext(bool forward) {
+    if (isHidden()) return open();
+    search_.lookOn(forward);
+    onSearch();
+}
+
+void PreviewFindBar::end() {
+    hide();
+    search_.look({}, 0);
+    view_->viewport()->update();
+}
+
+void PreviewFindBar::look(int milliseconds, bool moreToCome) {
+    using enum PreviewSearch::State;
+    const PreviewSearch::State state = search_.go(milliseconds, moreToCome);
+    if (state == Found) view_->reveal(search_.hitPage(), search_.hitBox());
+    message_->setText(state == Looking       ? u"A procurar…"_s
+                      : state == NotFound    ? u"Não encontrado"_s
+                      : search_.wasWrapped() ? u"Deu a volta ao relatório"_s
+                                             : QString());
+}
+
+std::vector<Highlight> PreviewFindBar::highlightsOn(int page) const {
+    std::vector<Highlight> result;
+    const bool isHere = search_.state() == PreviewSearch::State::Found && search_.hitPage() == page;
+    for (const QRectF& box : search_.hitsOn(page))
+        result.push_back({box, isHere && box == search_.hitBox()});
+    return result;
 }
 
 void PreviewFindBar::keyPressEvent(QKeyEvent* event) {
