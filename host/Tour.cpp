@@ -3,6 +3,7 @@
 
 #include <QAbstractButton>
 #include <QDir>
+#include <QLabel>
 #include <QLineEdit>
 #include <QTableView>
 #include <QTemporaryDir>
@@ -41,10 +42,25 @@ std::function<bool(QWidget*)> shows(const QString& field) {
     };
 }
 
+/// A label of the screen begins with that text.
+std::function<bool(QWidget*)> says(const QString& label, const QString& text) {
+    return [label, text](QWidget* screen) {
+        const auto* found = screen->findChild<QLabel*>(label);
+        return found && found->text().startsWith(text);
+    };
+}
+
 std::function<bool(QWidget*)> canPress(const QString& button) {
     return [button](QWidget* screen) {
         const auto* found = screen->findChild<QAbstractButton*>(button);
         return found && found->isEnabled();
+    };
+}
+
+std::function<bool(QWidget*)> unticked(const QString& check) {
+    return [check](QWidget* screen) {
+        const auto* found = screen->findChild<QAbstractButton*>(check);
+        return found && !found->isChecked();
     };
 }
 
@@ -128,6 +144,23 @@ public:
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
+    /// The member's documents of the year, looked at and kept as PDF.
+    void statement(const QString& file) {
+        open({}, {u"Extratos"_s, {}});
+        const QString newYear = core::today().toString(u"01-01-yyyy"_s);
+        player_.step(u"frmExtratos"_s, {},
+                     typing({GoodMember, u"<Tab>"_s, u"<Tab>"_s, u"<Tab>"_s, newYear, u"<Tab>"_s,
+                             u"<Tab>"_s, u"<Space>"_s}));
+        player_.step(u"frmExtratos"_s, u"17-extratos"_s, typing({u"<Alt+I>"_s}),
+                     unticked(u"Check1"_s));
+        player_.step(u"prtExtrato1"_s, u"18-pre-visualizacao"_s, typing({u"<Ctrl+S>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        player_.step(u"FicheiroPdf"_s, {}, typing({u"<Ctrl+A>"_s, file, u"<Return>"_s}));
+        player_.step(u"prtExtrato1"_s, {}, typing({u"<Escape>"_s}),
+                     says(u"Mensagem"_s, u"Guardado: "_s));
+        player_.step(u"frmPrincipal"_s, {}, {});
+    }
+
 private:
     void open(const QString& picture, const OperationCall& call) {
         player_.step(u"frmPrincipal"_s, picture,
@@ -188,6 +221,9 @@ int playTour(const QString& folder) {
     script.hospitalBill();
     script.view();
     script.otherWindows();
+    const QString statement = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);
+    QFile::remove(statement);
+    script.statement(statement);
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
     return played ? Done : Failed;
