@@ -1,0 +1,173 @@
+// SPDX-License-Identifier: MIT
+// What an annulment writes, and what the book holds when a write fails.
+#include "coverage/annulment.h"
+
+#include "boundary/environment/dtZelmars.h"
+#include "coverage/Statements.h"
+#include "platform/core/Failure.h"
+#include "tests/coverage/Desk.h"
+#include "tests/support/Failure.h"
+
+using namespace Qt::StringLiterals;
+using core::Icon;
+
+namespace {
+
+/// The host's object, which is called back and fails.
+class Caller : public QObject {
+    Q_OBJECT
+public:
+    qint32 key = 0;
+    Q_INVOKABLE void RemoteKey(const QVariant& movimento_id) {
+        key = movimento_id.toInt();
+        throw core::Failure(core::InvalidCall, u"não interessa"_s);
+    }
+};
+
+class Annulment : public Desk {
+protected:
+    /// A movement with an accumulator that counts it, of an active member or of one who has left.
+    qint64 movement(bool active, const QVariant& hospital_id = {}) {
+        const QString suffix = active ? QString() : u"_Inactivos"_s;
+        book.insert(u"tbSocios_Acumulados"_s + suffix, {{"socio_id", socio},
+                                                        {"codABC", u"B"_s},
+                                                        {"rubrica_id", 7},
+                                                        {"debito_ac", 150},
+                                                        {"credito_ac", 90.5},
+                                                        {"no_docs", 3}});
+        return book.insert(u"tbZelmar_Movimentos"_s + suffix,
+                           {{"movimento_no", 31},
+                            {"socio_id", socio},
+                            {"codABC", u"B"_s},
+                            {"rubrica_id", 7},
+                            {"hospital_id", hospital_id},
+                            {"tipo", hospital_id.isValid() ? u"HOS"_s : u"DOC"_s},
+                            {"modo_pagamento", u"TRF"_s},
+                            {"doc_no", u"FT 9"_s},
+                            {"doc_data", QDate(2026, 2, 1)},
+                            {"doc_valor", 100},
+                            {"incidencia", 100},
+                            {"liquido", 50},
+                            {"credito", 40.25},
+                            {"debito", 100},
+                            {"created_by", u"ana"_s}});
+    }
+    bool annul(qint64 key, core::Answer answer = core::Answer::Yes) {
+        const core::HandlerScope handler;
+        const auto row = ado::Recordset::create();
+        row->Open(u"select * from vwZelmars_Movimentos_Vigor where movimento_id = %1"_s.arg(key),
+                  environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic,
+                  ado::adLockOptimistic, ado::adCmdUnknown);
+        if (vanishes) book.exec(u"delete from tbZelmar_Movimentos"_s);
+        person.expectBox({.text = u"Deseja anular este registo?"_s,
+                          .answer = answer,
+                          .icon = Icon::Question,
+                          .title = u"Anular Lançamento"_s});
+        if (vanishes) expectBox(u"Não foi possível anular este registo"_s, Icon::Critical, caption);
+        if (!afterwards.isEmpty()) expectBox(afterwards, Icon::Critical, caption);
+        return coverage::annul({row, caption, &caller});
+    }
+    std::string movements(const QString& suffix = {}) {
+        return book
+            .text(
+                u"select movimento_no, tipo, modo_pagamento, data, codABC, rubrica_id, doc_no, "
+                "doc_data, doc_valor, hospital_id, credito, debito, incidencia, liquido, "
+                "created_by from tbZelmar_Movimentos%1 order by movimento_id"_s.arg(suffix))
+            .toStdString();
+    }
+    std::string totals(const QString& suffix = {}) {
+        return book
+            .text(u"select debito_ac, credito_ac, no_docs from tbSocios_Acumulados"_s + suffix)
+            .toStdString();
+    }
+
+    bool vanishes = false;  ///< the movement, after it was read
+    QString afterwards;     ///< the box that closes the annulment; empty for none
+    Caller caller;
+};
+
+TEST_F(Annulment, MarksTheMovementAddsItsCorrectionAndTakesTheTotalsBack) {
+    const qint64 document = movement(true);
+    const qint64 bill = movement(false, 5);
+    EXPECT_FALSE(annul(document, core::Answer::No));
+    EXPECT_EQ(totals(), "150|90.5|3");
+    const std::string before = movements(u"_Inactivos"_s);
+
+    EXPECT_TRUE(annul(document));
+    EXPECT_EQ(caller.key, document);
+    EXPECT_EQ(movements(),
+              "31|ANL|ANL|NULL|B|7|FT 9|2026-02-01 00:00:00|100|NULL|40.25|100|100|50|ana\n"
+              "1|COR|NULL|2026-05-15 00:00:00|B|7|FT 9|2026-02-01 00:00:00|100|NULL|-40.25|-100|"
+              "NULL|NULL|NULL");
+    EXPECT_EQ(totals(), "50|50.25|2");
+    EXPECT_EQ(movements(u"_Inactivos"_s), before);
+    EXPECT_EQ(totals(u"_Inactivos"_s), "150|90.5|3");
+
+    EXPECT_TRUE(annul(bill));
+    EXPECT_EQ(movements(u"_Inactivos"_s),
+              "31|ANL|ANL|NULL|B|7|FT 9|2026-02-01 00:00:00|100|5|40.25|100|100|50|ana\n"
+              "2|COR|NULL|2026-05-15 00:00:00|B|7|FT 9|2026-02-01 00:00:00|100|5|-40.25|-100|"
+              "NULL|NULL|NULL");
+    EXPECT_EQ(totals(u"_Inactivos"_s), "50|50.25|2");
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 2);
+    EXPECT_EQ(totals(), "50|50.25|2");
+}
+
+TEST_F(Annulment, RaisesTheFranchiseAlreadyUsed) {
+    const qint64 document = movement(true);
+    const QString used = u"select t_iliquido - t_credito from (%1) f"_s.arg(
+        coverage::statements::franchise(socio, 7));
+    EXPECT_EQ(book.value(used).toDouble(), 9.75);
+    EXPECT_TRUE(annul(document));
+    EXPECT_EQ(book.value(used).toDouble(), 50) << "by the credit annulled";
+}
+
+TEST_F(Annulment, OfAMovementThatVanishedOrWasAnnulledMeanwhileGoesOn) {
+    const qint64 document = movement(true);
+    EXPECT_TRUE(annul(document));
+    EXPECT_TRUE(annul(document)) << "another workstation had it on its screen too";
+    EXPECT_EQ(totals(), "-50|10|1");
+    vanishes = true;
+    EXPECT_TRUE(annul(document));
+    EXPECT_EQ(stored("select tipo, credito from tbZelmar_Movimentos"), "COR|-40.25");
+    EXPECT_EQ(totals(), "-150|-30.25|0");
+}
+
+TEST_F(Annulment, LeavesTheTotalsAloneWhenAFailureWasPending) {
+    const core::HandlerScope handler;
+    core::err().set(core::RowInUse, u"em uso"_s);
+    afterwards = u"Erro não especificado, contacte o Administrador do Sistema. em uso"_s;
+    EXPECT_TRUE(annul(movement(true)));
+    EXPECT_EQ(stored("select count(*) from tbZelmar_Movimentos"), "2");
+    EXPECT_EQ(totals(), "150|90.5|3");
+}
+
+// Mark, counter, correcting row and accumulator are four writes.
+TEST_F(Annulment, ThatFailsLeavesWhatWasWrittenBeforeAndShowsTheEnginesText) {
+    const qint64 document = movement(true);
+    const std::tuple<const char*, const char*, const char*> failures[] = {
+        // refused; the movements' types, the next number; the totals
+        {"update on tbZelmar_Movimentos", "1|DOC|NULL", "150|90.5|3"},
+        {"update on tbContadores", "1|ANL|NULL", "150|90.5|3"},
+        {"insert on tbZelmar_Movimentos", "2|ANL|NULL", "150|90.5|3"},
+        {"update on tbSocios_Acumulados", "3|ANL|2", "150|90.5|3"},
+    };
+    const char* const state =
+        "select zelmars, min(tipo), max(case tipo when 'COR' then movimento_no end) "
+        "from tbContadores, tbZelmar_Movimentos group by 1";
+    for (const auto& [write, rows, sums] : failures) {
+        book.refuse(QString::fromLatin1(write), u"disco cheio"_s);
+        EXPECT_TRUE(support::failureOf([&] { annul(document); }).text().contains(u"disco cheio"_s));
+        book.refuseNoMore();
+        EXPECT_EQ(stored(state), rows) << write;
+        EXPECT_EQ(totals(), sums) << write;
+    }
+    book.exec(u"delete from tbSocios_Acumulados"_s);
+    EXPECT_EQ(support::failureOf([&] { annul(document); }).number(), core::NoCurrentRow);
+    EXPECT_EQ(stored(state), "4|ANL|3");
+    EXPECT_EQ(caller.key, 0) << "is not called back";
+}
+
+}  // namespace
+
+#include "annulment.moc"

@@ -1,0 +1,191 @@
+// SPDX-License-Identifier: MIT
+// Money that a member pays in: at the screen, to the stored rows.
+#include "entry/frmMovimentos.h"
+#include "receipts/frmRecebimento.h"
+#include "tests/receipts/AccountTest.h"
+
+using namespace Qt::StringLiterals;
+using core::Icon;
+
+namespace {
+
+const QString Screen = u"frmRecebimento"_s;
+
+class Receipt : public AccountTest {
+protected:
+    void openNew() { open(&General::Recebimento, Screen); }
+    void typeReceipt(const QString& amount) {
+        person.fill(u"No_Kor"_s, u"100015"_s);
+        person.fill(u"Credito"_s, amount);
+    }
+    void annul(const QList<support::Operator::Box>& boxes = {}) {
+        press(u'A', u"Deseja anular este registo?"_s, u"Anular Recebimento"_s, boxes);
+    }
+    std::string movements(const QString& suffix = {}) {
+        return book
+            .text(
+                u"select movimento_no, tipo, modo_pagamento, cheque, data, codABC, doc_valor, "
+                "credito, debito, descrit, created_by from tbZelmar_Movimentos%1 "
+                "order by movimento_id"_s.arg(suffix))
+            .toStdString();
+    }
+};
+
+TEST_F(Receipt, IsPostedByKeysAndAddsItsCreditToTheAccountLevelRowAlone) {
+    book.exec(u"update tbSocios set zelmar = 0"_s);  // a number that is typed is not tested for it
+    accumulated(u"A"_s, rubric, 12);
+    openNew();
+    EXPECT_EQ(shown(u"Text3"_s), u"15-05-2026"_s);
+    EXPECT_EQ(person.find<forms::DataCombo>(u"DataCombo3"_s)->Text(), u"CHQ - Cheque"_s);
+    person.type(u"100015"_s);
+    person.tab();
+    EXPECT_EQ(shown(u"Text2"_s), u"António Manuel Silva Matos"_s);
+    for (const QString& typed : {u""_s, u""_s, u"1234,5"_s, u""_s, u"500"_s, u"entregue"_s}) {
+        person.type(typed);
+        if (typed != u"entregue"_s) person.tab();
+    }
+    person.enter();  // a new line, not the default button
+    person.type(u"em mão"_s);
+    postAnd();
+    EXPECT_FALSE(person.isShown(Screen));
+    EXPECT_EQ(movements(),
+              "1|PAG|CHQ|500|2026-05-15 00:00:00|NULL|0|1234.5|0|entregue\nem mão|NULL");
+    const std::string others = totals().substr(0, totals().find('\n'));
+    EXPECT_EQ(totals(), others + "\n2|1|NULL|NULL|0|0|1234.5|NULL");
+    // A row found with null sums counts from 0, and a negative amount lowers it.
+    book.exec(u"update tbSocios_Acumulados set credito_ac = null where rubrica_id_main = 0"_s);
+    openNew();
+    typeReceipt(u"(0,5)"_s);
+    postAnd();
+    EXPECT_EQ(totals(), "3" + others.substr(1) + "\n3|1|NULL|NULL|0|0|-0.5|NULL");
+}
+
+TEST_F(Receipt, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
+    openNew();
+    typeReceipt(u"10"_s);
+    const std::tuple<QString, QString, QString> missing[] = {
+        {u"DataCombo3"_s, u"CHQ"_s, u"Tem de indicar um modo de pagamento!"_s},
+        {u"No_Kor"_s, u"100015"_s, u"Tem de indicar um Sócio!"_s},
+        {u"Credito"_s, u"10"_s, u"Tem de indicar um valor para o crédito!"_s},
+    };
+    for (const auto& [field, text, box] : missing) {
+        person.fill(field, {});
+        postAnd({{.text = box, .icon = Icon::Information, .title = title}});
+        person.fill(field, text);
+    }
+    person.fill(u"Credito"_s, u"0"_s);
+    postAnd({{.text = u"Tem de indicar um valor diferente de 0(zero) para o crédito !"_s,
+              .icon = Icon::Information}});
+    for (const QString& text : {u"abc"_s, u"1,2,3"_s, u"99999999999999999999"_s}) {
+        expectHeld(u"Credito"_s, text, text);
+        person.fill(u"Credito"_s, u"10"_s);
+    }
+    expectHeld(u"Text4"_s, u"cheque 7"_s, u"cheque 7"_s);
+    person.fill(u"Text4"_s, u"7"_s);
+    expectHeld(u"No_Kor"_s, u"1000'15"_s, {});
+    expectHeld(u"No_Kor"_s, u"100099"_s, u"Número KOR não encontrado!"_s);
+    EXPECT_TRUE(isGrey(u"Text2"_s));
+    EXPECT_EQ(shown(u"Text2"_s), QString());
+    person.fill(u"No_Kor"_s, u"100015"_s);
+    postAnd();
+    EXPECT_EQ(movements(), "1|PAG|CHQ|7|2026-05-15 00:00:00|NULL|0|10|0|NULL|NULL");
+}
+
+TEST_F(Receipt, SearchTakesEnrolledActiveMembersAndIsSilentWhenItFails) {
+    const qint64 other = book.member({.no_kor = u"100023"_s, .nome = u"Rui Sá"_s, .zelmar = 0});
+    const auto search = [&](qint64 member) {
+        FakeSearch::member = member;
+        person.accelerator(u'P');
+        return shown(u"No_Kor"_s) + u' ' + shown(u"Text2"_s);
+    };
+    openNew();
+    EXPECT_EQ(search(socio), u"100015 António Manuel Silva Matos"_s);
+    EXPECT_EQ(search(0), u"100015 António Manuel Silva Matos"_s);
+    FakeSearch::failure = u"sem ficha"_s;
+    EXPECT_EQ(search(socio), u"100015 António Manuel Silva Matos"_s);
+    FakeSearch::failure.clear();
+    expectBox(u"Este Associado não está inscrito no plano de Saúde."_s, Icon::Critical);
+    EXPECT_EQ(search(other), u" "_s);
+    expectBox(u"Este Associado não se encontra na tabela de activos."_s, Icon::Critical);
+    EXPECT_EQ(search(9999), u" "_s);
+    EXPECT_TRUE(isGrey(u"Text2"_s));
+}
+
+TEST_F(Receipt, WipedNumberTurnsTheDateGreyForGood) {
+    openNew();
+    person.fill(u"No_Kor"_s, u"100015"_s);
+    EXPECT_FALSE(isGrey(u"Text3"_s));
+    person.fill(u"No_Kor"_s, {});
+    EXPECT_TRUE(isGrey(u"Text3"_s));
+    person.fill(u"No_Kor"_s, u"100015"_s);
+    EXPECT_TRUE(isGrey(u"Text3"_s));
+}
+
+TEST_F(Receipt, AnnulmentTakesFromTheFirstAccumulatorRowOfTheMember) {
+    accumulated(u"A"_s, rubric, 12);
+    book.insert(u"tbSocios_Acumulados"_s,
+                {{"socio_id", socio}, {"rubrica_id_main", 0}, {"credito_ac", 40.25}});
+    const qint64 key = insert(u"PAG"_s);
+    openView(key, Screen);
+    const auto& entry = forms::DefaultInstance<entry::frmMovimentos>::get();
+    EXPECT_EQ(entry.Adodc1->Recordset(),
+              forms::DefaultInstance<receipts::frmRecebimento>::get().Adodc1->Recordset());
+    EXPECT_FALSE(entry.isVisible());
+    for (const QString& field :
+         {u"No_Kor"_s, u"Text2"_s, u"Text3"_s, u"Text4"_s, u"Text8"_s, u"Credito"_s})
+        EXPECT_TRUE(person.find<forms::TextBox>(field)->isReadOnly()) << field.toStdString();
+    EXPECT_EQ(shown(u"Text2"_s) + u'|' + shown(u"Credito"_s) + u'|' + shown(u"Text4"_s),
+              u"António Manuel Silva Matos|€ 40,25|77"_s);
+    annul();
+    EXPECT_FALSE(person.isShown(Screen));
+    EXPECT_EQ(movements(),
+              "31|ANL|ANL|77|2026-02-01 00:00:00|B|NULL|40.25|3|acerto|NULL\n"
+              "1|COR|NULL|NULL|2026-05-15 00:00:00|NULL|NULL|-40.25|0|NULL|NULL");
+    EXPECT_EQ(stored("select debito_ac, credito_ac from tbSocios_Acumulados order by 2"),
+              "9|-28.25\nNULL|40.25");
+    general.Registo({}, key);
+    EXPECT_FALSE(person.isShown(Screen)) << "an annulled receipt opens no more";
+}
+
+TEST_F(Receipt, AnnulmentForAMemberWhoHasLeftAddsARowWithNullSums) {
+    openView(insert(u"PAG"_s, false), Screen);
+    book.exec(u"delete from tbZelmar_Movimentos_Inactivos"_s);
+    annul({{.text = u"Não foi possível anular este registo"_s,
+            .icon = Icon::Critical,
+            .title = title}});
+    EXPECT_EQ(movements(u"_Inactivos"_s),
+              "1|COR|NULL|NULL|2026-05-15 00:00:00|NULL|NULL|-40.25|0|NULL|NULL");
+    EXPECT_EQ(totals(u"_Inactivos"_s), "2|NULL|NULL|NULL|NULL|NULL|NULL|NULL");
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s) + book.count(u"tbSocios_Acumulados"_s), 0);
+}
+
+// Each write can fail: the rows then stand as they were written, and the screen stays.
+TEST_F(Receipt, FailingWriteShowsTheEnginesTextAndStays) {
+    const auto failing = [&](const QString& write, const auto& action) {
+        book.refuse(write, u"disco cheio"_s);
+        action({{.text = u"disco cheio"_s, .icon = Icon::Critical, .partly = true}});
+        book.refuseNoMore();
+        EXPECT_TRUE(person.isShown(Screen));
+        return stored(
+            "select zelmars, min(tipo), max(tipo), count(credito_ac), max(movimento_no) "
+            "from tbContadores left join tbZelmar_Movimentos on true "
+            "left join tbSocios_Acumulados on true group by 1");
+    };
+    const auto posting = [&](const QList<support::Operator::Box>& boxes) { postAnd(boxes); };
+    const auto annulling = [&](const QList<support::Operator::Box>& boxes) { annul(boxes); };
+    openNew();
+    typeReceipt(u"10"_s);
+    EXPECT_EQ(failing(u"update on tbContadores"_s, posting), "1|NULL|NULL|0|NULL");
+    EXPECT_EQ(failing(u"insert on tbZelmar_Movimentos"_s, posting), "2|NULL|NULL|0|NULL");
+    EXPECT_EQ(failing(u"insert on tbSocios_Acumulados"_s, posting), "3|PAG|PAG|0|2");
+    postAnd();  // the same row once more, under a new number
+    EXPECT_EQ(movements(), "3|PAG|CHQ|NULL|2026-05-15 00:00:00|NULL|0|10|0|NULL|NULL");
+
+    openView(book.value(u"select movimento_id from tbZelmar_Movimentos"_s).toLongLong(), Screen);
+    EXPECT_EQ(failing(u"update on tbZelmar_Movimentos"_s, annulling), "4|PAG|PAG|1|3");
+    EXPECT_EQ(failing(u"update on tbContadores"_s, annulling), "4|ANL|ANL|1|3");
+    EXPECT_EQ(failing(u"insert on tbZelmar_Movimentos"_s, annulling), "5|ANL|ANL|1|3");
+    EXPECT_EQ(failing(u"update on tbSocios_Acumulados"_s, annulling), "6|ANL|COR|2|5");
+}
+
+}  // namespace
