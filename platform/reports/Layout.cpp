@@ -210,7 +210,10 @@ bool Layout::go(int milliseconds) {
                             u"As linhas foram fechadas antes de o mapa estar completo."_s);
     QElapsedTimer clock;
     clock.start();
-    while (!isComplete() && (milliseconds < 0 || clock.elapsed() < milliseconds)) d->step();
+    while (!isComplete()) {
+        d->step();
+        if (milliseconds >= 0 && clock.elapsed() >= milliseconds) break;
+    }
     return isComplete();
 }
 

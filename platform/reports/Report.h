@@ -69,7 +69,7 @@ using Item = std::variant<Label, Field, Total, Rule, Band>;
 
 /// Items in the order in which they are painted. A section is never split over two pages.
 struct Section {
-    QString name;
+    QString name = {};
     double height = 0;  ///< 0 for a section that is not there
     std::vector<Item> items = {};
     bool onEachPage = false;  ///< a group header: again on each page that the group goes on to

@@ -50,13 +50,6 @@ Filled filled(const QString& caption, int page) {
     return result;
 }
 
-void setLabel(std::vector<TextRun>& into, Faces& faces, const Label& label, int page) {
-    const Filled text = filled(label.caption, page);
-    const size_t before = into.size();
-    set(into, faces, text.text, label.box, label.style, label.lines);
-    for (size_t at = before; at < into.size(); ++at) into[at].open = text.open;
-}
-
 }  // namespace
 
 // --- Rows
@@ -97,46 +90,59 @@ PreparedSection::PreparedSection(const Section& section, Over over, Faces& faces
     for (const Item& item : section.items) {
         if (const auto* label = std::get_if<Label>(&item)) {
             if (label->caption.contains(u"%p"_s) || label->caption.contains(u"%P"_s))
-                numbered_.push_back(*label);
+                texts_.emplace_back(*label);
             else
-                setLabel(fixed_.texts, faces_, *label, 0);
+                add(std::get<Runs>(texts_.emplace_back(Runs())), *label, 0);
         } else if (const auto* field = std::get_if<Field>(&item)) {
-            fields_.emplace_back(*field, row.place(field->column));
+            texts_.emplace_back(FieldOfRow{*field, row.place(field->column)});
         } else if (const auto* total = std::get_if<Total>(&item)) {
             const bool sum = total->of == Total::Of::Sum;
-            totals_.emplace_back(*total, tallies.add(details.place(total->column), sum));
+            texts_.emplace_back(TotalSoFar{*total, tallies.add(details.place(total->column), sum)});
         } else if (const auto* rule = std::get_if<Rule>(&item)) {
-            fixed_.lines.push_back({rule->line, rule->width});
+            lines_.push_back({rule->line, rule->width});
         } else if (const auto* band = std::get_if<Band>(&item)) {
-            fixed_.boxes.push_back({band->box, band->shaded, band->framed});
+            boxes_.push_back({band->box, band->shaded, band->framed});
         }
     }
 }
 
 void PreparedSection::print(Page& page, double top, int number) const {
-    for (const Box& box : fixed_.boxes)
+    for (const Box& box : boxes_)
         page.boxes.push_back({box.rect.translated(page::Margin, top), box.shaded, box.framed});
-    for (const Line& line : fixed_.lines)
+    for (const Line& line : lines_)
         page.lines.push_back({line.line.translated(page::Margin, top), line.width});
     const size_t first = page.texts.size();
-    page.texts.insert(page.texts.end(), fixed_.texts.begin(), fixed_.texts.end());
-    for (const Label& label : numbered_) setLabel(page.texts, faces_, label, number);
-    for (const auto& [field, place] : fields_) {
-        const QVariant& value = row_.values()[place];
-        const bool isText = value.typeId() == QMetaType::QString;
-        set(page.texts, faces_, core::formatted(value, field.format), field.box, field.style,
-            field.lines, isText ? Overlong::Cut : Overlong::Shrink);
-    }
-    for (const auto& [total, place] : totals_) {
-        const Tallies::Tally& tally =
-            over_ == Over::Group ? tallies_.ofGroup(place) : tallies_.ofReport(place);
-        const QVariant value =
-            total.of == Total::Of::Sum ? QVariant::fromValue(tally.sum) : QVariant(tally.count);
-        set(page.texts, faces_, core::formatted(value, total.format), total.box, total.style, 1,
-            Overlong::Shrink);
-    }
+    for (const auto& text : texts_)
+        std::visit([&](const auto& kind) { add(page.texts, kind, number); }, text);
     for (size_t at = first; at < page.texts.size(); ++at)
         page.texts[at].baseline += QPointF(page::Margin, top);
+}
+
+void PreparedSection::add(Runs& texts, const Runs& fixed, int) const {
+    texts.insert(texts.end(), fixed.begin(), fixed.end());
+}
+
+void PreparedSection::add(Runs& texts, const Label& label, int number) const {
+    const Filled text = filled(label.caption, number);
+    const size_t first = texts.size();
+    set(texts, faces_, text.text, label.box, label.style, label.lines);
+    for (size_t at = first; at < texts.size(); ++at) texts[at].open = text.open;
+}
+
+void PreparedSection::add(Runs& texts, const FieldOfRow& of, int) const {
+    const QVariant& value = row_.values()[of.place];
+    const bool isText = value.typeId() == QMetaType::QString;
+    set(texts, faces_, core::formatted(value, of.field.format), of.field.box, of.field.style,
+        of.field.lines, isText ? Overlong::Cut : Overlong::Shrink);
+}
+
+void PreparedSection::add(Runs& texts, const TotalSoFar& of, int) const {
+    const Tallies::Tally& tally =
+        over_ == Over::Group ? tallies_.ofGroup(of.place) : tallies_.ofReport(of.place);
+    const QVariant value =
+        of.total.of == Total::Of::Sum ? QVariant::fromValue(tally.sum) : QVariant(tally.count);
+    set(texts, faces_, core::formatted(value, of.total.format), of.total.box, of.total.style, 1,
+        Overlong::Shrink);
 }
 
 }  // namespace reports

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <variant>
 #include <vector>
 
 #include "platform/ado/Recordset.h"
@@ -44,15 +45,32 @@ public:
     void print(Page& page, double top, int number) const;
 
 private:
+    using Runs = std::vector<TextRun>;
+    struct FieldOfRow {
+        Field field;
+        size_t place;  ///< among the row's values
+    };
+    struct TotalSoFar {
+        Total total;
+        size_t place;  ///< among the tallies
+    };
+
+    // What each kind of text adds to a page, from the section's upper edge.
+    void add(Runs& texts, const Runs& fixed, int) const;
+    void add(Runs& texts, const Label& label, int number) const;
+    void add(Runs& texts, const FieldOfRow& field, int) const;
+    void add(Runs& texts, const TotalSoFar& total, int) const;
+
     double height_;
     Over over_;
     Faces& faces_;
     const RowValues& row_;
     const Tallies& tallies_;
-    Page fixed_;  ///< from the section's upper edge
-    std::vector<Label> numbered_;
-    std::vector<std::pair<Field, size_t>> fields_;
-    std::vector<std::pair<Total, size_t>> totals_;
+    std::vector<Box> boxes_;
+    std::vector<Line> lines_;
+    /// In the order of the declaration, which is the one of reading. Labels that show the page's
+    /// number are set for each page, the others once.
+    std::vector<std::variant<Runs, Label, FieldOfRow, TotalSoFar>> texts_;
 };
 
 }  // namespace reports

@@ -13,6 +13,8 @@ void settleSurroundings(const QTemporaryDir& folder) {
     if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
     qputenv("LC_ALL", "C.UTF-8");
     qputenv("TZ", "Europe/Lisbon");
+    qputenv("HOME", path);
+    qputenv("CUPS_SERVER", path + "/printing/socket");
     qputenv("XDG_RUNTIME_DIR", path);
     qputenv("XDG_CONFIG_HOME", path + "/config");
     qputenv("XDG_DATA_HOME", path + "/data");

@@ -1,0 +1,100 @@
+// SPDX-License-Identifier: MIT
+// Whole pages against lists that somebody has looked at: text, place and style of everything on
+// them. ZELMARS_WRITE_GOLDEN=1 writes the lists anew; look at what changed.
+#include <QFile>
+
+#include "reports/StatementReports.h"
+#include "tests/reports/Ledger.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QString number(double millimetres) {
+    return QString::number(millimetres, 'f', 1);
+}
+
+QString describe(const reports::Style& style) {
+    return u"[%1%2%3%4]"_s.arg(style.points)
+        .arg(style.bold ? u"b"_s : QString(), style.italic ? u"i"_s : QString())
+        .arg(u"lcr"_s.at(static_cast<int>(style.align)));
+}
+
+QString describe(const reports::Pages& pages) {
+    QStringList lines;
+    for (int at = 0; at < pages.count(); ++at) {
+        lines << u"page %1 of %2"_s.arg(at + 1).arg(pages.count());
+        const reports::Page page = pages.at(at);
+        for (const reports::Box& box : page.boxes)
+            lines << u"box %1 %2 %3 %4%5%6"_s.arg(
+                number(box.rect.left()), number(box.rect.top()), number(box.rect.width()),
+                number(box.rect.height()), box.shaded ? u" shaded"_s : QString(),
+                box.framed ? u" framed"_s : QString());
+        for (const reports::Line& line : page.lines)
+            lines << u"line %1 %2 %3 %4"_s.arg(number(line.line.x1()), number(line.line.y1()),
+                                               number(line.line.x2()), number(line.line.y2()));
+        for (const reports::TextRun& each : page.texts) {
+            const reports::TextRun run = pages.resolved(each);
+            lines << u"%1 %2 %3 %4"_s.arg(number(run.baseline.x()), number(run.baseline.y()),
+                                          describe(run.style), run.text);
+        }
+    }
+    return lines.join(u'\n') + u'\n';
+}
+
+/// What the file holds; what it ought to hold is written there when that is asked for.
+QString golden(const QString& name, const QString& shown) {
+    QFile file(QStringLiteral(GOLDEN_FOLDER "/") + name + u".txt"_s);
+    if (qEnvironmentVariableIsSet("ZELMARS_WRITE_GOLDEN"))
+        if (file.open(QIODevice::WriteOnly)) file.write(shown.toUtf8()), file.close();
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll())
+                                          : u"missing: "_s + file.fileName();
+}
+
+TEST_F(Ledger, PrintsStatementsAsTheyWereSeen) {
+    const struct {
+        reports::Report report;
+        const char16_t* name;
+        int rows;
+        int pages;
+    } statements[] = {
+        {reports::rptExtrato2(), u"summary-empty", 0, 1},
+        {reports::rptExtrato2(), u"summary-one", 1, 1},
+        {reports::rptExtrato2(), u"summary-full-page", 39, 1},
+        {reports::rptExtrato2(), u"summary-one-too-many", 40, 2},
+        {reports::rptExtrato2(), u"summary-many", 120, 3},
+        {reports::prtExtrato1(), u"detailed-empty", 0, 1},
+        {reports::prtExtrato1(), u"detailed-one", 1, 1},
+        {reports::prtExtrato1(), u"detailed-full-page", 7, 1},
+        {reports::prtExtrato1(), u"detailed-many", 20, 3},
+    };
+    for (const auto& statement : statements) {
+        const QString name = QString::fromUtf16(statement.name);
+        SCOPED_TRACE(name.toStdString());
+        book.exec(u"delete from tbZelmar_Movimentos"_s);
+        fill(statement.rows);
+        const auto pages = laidOut(statement.report, movements());
+        EXPECT_EQ(pages->count(), statement.pages);
+        const QString shown = describe(*pages);
+        EXPECT_EQ(shown, golden(name, shown));
+    }
+}
+
+TEST_F(Ledger, PrintsGroupsOverSeveralPages) {
+    for (const QString& name : {u"Hospital A"_s, u"Hospital B"_s, u"Hospital sem contas"_s})
+        book.hospital(name.right(1), name);
+    fill(130);
+    const auto pages = laidOut(twoLevels(), open(TwoLevelStatement));
+    const QString shown = describe(*pages);
+    EXPECT_EQ(shown, golden(u"two-levels"_s, shown));
+    // 65 movements of each hospital, each one euro more debit than credit.
+    const QString last = textsOf(*pages, pages->count() - 1);
+    EXPECT_TRUE(
+        last.contains(u"Total:|€ 65,00|Hospital:|Hospital sem contas|Nº|Dívida|Total:|"
+                      "€ 0,00|Registos:|130|Soma:|€ 130,00"_s))
+        << last.toStdString();
+    for (int page = 0; page < pages->count(); ++page)
+        EXPECT_TRUE(textsOf(*pages, page).startsWith(u"Hospital:|Hospital "_s));
+}
+
+}  // namespace

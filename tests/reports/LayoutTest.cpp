@@ -1,0 +1,131 @@
+// SPDX-License-Identifier: MIT
+// How rows become texts on pages.
+#include "platform/core/Format.h"
+#include "platform/core/Money.h"
+#include "platform/reports/DataReport.h"
+#include "platform/reports/Output.h"
+#include "platform/reports/Typesetting.h"
+#include "reports/Furniture.h"
+#include "tests/reports/Ledger.h"
+
+using namespace Qt::StringLiterals;
+using support::failureOf;
+
+namespace {
+
+constexpr reports::Style Right{.points = 9, .align = reports::Align::Right};
+
+TEST(Typesetting, NeverLeavesItsBox) {
+    const QString longName = QString(u"Maria da Conceição "_s).repeated(11);
+    const struct {
+        QString text;
+        int lines;
+        reports::Overlong overlong;
+        QString shown;  ///< lines parted by '|'; '…' at the end stands for any cut
+    } rows[] = {
+        {QString(), 1, reports::Overlong::Cut, QString()},
+        {u"Olá €"_s, 1, reports::Overlong::Cut, u"Olá €"_s},
+        {u"um\tdois\ntrês"_s, 1, reports::Overlong::Cut, u"um dois três"_s},
+        {longName, 1, reports::Overlong::Cut, u"Maria da Conceição…"_s},
+        {u"Consulta de cardiologia pediátrica"_s, 2, reports::Overlong::Cut,
+         u"Consulta de cardiologia|pediátrica"_s},
+        {longName, 2, reports::Overlong::Cut, u"Maria da Conceição Maria|da Conceição…"_s},
+        {QString(u"X"_s).repeated(500), 1, reports::Overlong::Cut, u"XXXX…"_s},
+        {u"(€ 922.337.203.685.477,00) menos"_s, 1, reports::Overlong::Shrink,
+         u"(€ 922.337.203.685.477,00) menos"_s},
+        {u"שלום עולם"_s, 1, reports::Overlong::Cut, u"שלום עולם"_s},
+    };
+    reports::Faces faces;
+    const QRectF box(10, 20, 40, 10);
+    for (const auto& row : rows) {
+        SCOPED_TRACE(row.shown.toStdString());
+        for (const reports::Align align :
+             {reports::Align::Left, reports::Align::Centre, reports::Align::Right}) {
+            std::vector<reports::TextRun> runs;
+            set(runs, faces, row.text, box, {.align = align}, row.lines, row.overlong);
+            QStringList lines;
+            for (const reports::TextRun& run : runs) {
+                lines << run.text;
+                EXPECT_GE(run.baseline.x(), box.left() - 0.01);
+                EXPECT_LE(run.baseline.x() + run.width, box.right() + 0.01);
+                EXPECT_TRUE(box.contains(QPointF(box.center().x(), run.baseline.y())));
+                // The sum of the letters is what the toolkit makes of the whole text.
+                EXPECT_NEAR(run.width,
+                            QFontMetricsF(faces.of(run.style).font).horizontalAdvance(run.text) /
+                                reports::UnitsPerMillimetre,
+                            0.01);
+            }
+            const QString shown = lines.join(u'|');
+            if (row.shown.endsWith(u'…'))
+                EXPECT_TRUE(shown.startsWith(row.shown.chopped(1)) && shown.endsWith(u'…'));
+            else
+                EXPECT_EQ(shown, row.shown);
+        }
+    }
+}
+
+TEST_F(Ledger, FillsInDatePageNumbersAndCaptionsLetterForLetter) {
+    reports::Report design{.name = u"carta"_s};
+    design.reportHeader = {.name = u"Section4"_s,
+                           .height = 5,
+                           .items = {reports::Label{u"nome"_s, QRectF(0, 0, 90, 5), u"?"_s, {}},
+                                     reports::label(90, 0, 60, u"%D, 100%% %p/%P %"_s)}};
+    // One document a page: the detail is as high as the page.
+    design.detail = {.height = reports::page::InnerHeight - 10,
+                     .items = {reports::field(0, 0, 50, u"doc_no"_s)}};
+    design.pageFooter = {.height = 10, .items = {reports::label(0, 0, 186, u"%p de %P"_s, Right)}};
+    reports::DataReport report(design);
+    report.setCaption(u"section4"_s, u"Nome"_s, u"Ana %P & Filhos"_s);
+    EXPECT_EQ(failureOf([&] { report.setCaption(u"Section4"_s, u"nib"_s, u""_s); }).number(),
+              core::NoSuchItem);
+    fill(7);
+    const auto pages = laidOut(report.design(), movements());
+    ASSERT_EQ(pages->count(), 8);
+    EXPECT_EQ(textsOf(*pages, 0), u"Ana %P & Filhos|9 de março de 2026, 100% 1/8 %|1 de 8"_s);
+    EXPECT_EQ(textsOf(*pages, 1), u"FT 2026/1|2 de 8"_s);
+    EXPECT_EQ(textsOf(*pages, 7), u"8 de 8"_s);  // a null is empty
+    const reports::Page last = pages->at(7);
+    const reports::TextRun number = pages->resolved(last.texts.back());
+    EXPECT_NEAR(number.baseline.x() + number.width, 198, 0.01);
+}
+
+TEST_F(Ledger, KeepsTotalsExactAndBesideTheirLastRow) {
+    reports::Report design;
+    addValues(design.detail, {{u""_s, u"movimento_no"_s, 20}});
+    addTotal(design.reportFooter, reports::Total::Of::Sum, u"Soma:"_s, u"valor"_s,
+             core::format::Money);
+    addTotal(design.reportFooter, reports::Total::Of::Count, u"Linhas:"_s, u"doc_no"_s, {});
+    const int perPage = static_cast<int>(reports::page::InnerHeight / reports::LineHeight);
+    fill(perPage);  // the totals no longer fit below them
+    const auto pages = laidOut(design, open(u"SELECT movimento_no, doc_no, 0.1 * 1 AS valor FROM "
+                                            "tbZelmar_Movimentos ORDER BY movimento_no"_s));
+    ASSERT_EQ(pages->count(), 2);
+    const QString sum = core::formatted(QVariant::fromValue(core::Money::fromUnits(perPage * 1000)),
+                                        core::format::Money);
+    EXPECT_EQ(textsOf(*pages, 1),
+              u"%1|Soma:|%2|Linhas:|%3"_s.arg(perPage).arg(sum).arg(perPage - perPage / 7));
+}
+
+TEST_F(Ledger, NamesWhatTheRowsDoNotHave) {
+    reports::Report design;
+    addValues(design.detail, {{u""_s, u"inventada"_s, 20}});
+    fill(1);
+    EXPECT_TRUE(failureOf([&] { laidOut(design, movements()); }).text().contains(u"«inventada»"_s));
+    reports::Report groups = twoLevels();
+    groups.chapter = u"outro"_s;
+    book.hospital();
+    EXPECT_TRUE(
+        failureOf([&] { laidOut(groups, open(TwoLevelStatement)); }).text().contains(u"«outro»"_s));
+
+    // Rows that somebody closes under way stop it too.
+    fill(500);
+    const ado::RecordsetPtr rows = movements();
+    design.detail = {};
+    addValues(design.detail, {{u""_s, u"doc_no"_s, 20}});
+    reports::Layout layout(design, rows);
+    while (layout.pages()->count() == 0) layout.go(0);
+    rows->Close();
+    EXPECT_EQ(failureOf([&] { layout.go(-1); }).number(), core::ObjectClosed);
+}
+
+}  // namespace

@@ -1,0 +1,133 @@
+// SPDX-License-Identifier: MIT
+// The ways out of pages: PDF, a real print queue, rows for a spreadsheet.
+#include "platform/reports/Output.h"
+
+#include <QDir>
+#include <QProcess>
+
+#include "platform/reports/DataReport.h"
+#include "reports/StatementReports.h"
+#include "tests/reports/Ledger.h"
+#include "tests/support/Operator.h"
+#include "tests/support/PrintServer.h"
+
+using namespace Qt::StringLiterals;
+using support::failureOf;
+
+namespace {
+
+/// What a program writes; the test fails when the program does.
+QString outputOf(const QString& program, const QStringList& arguments) {
+    QProcess process;
+    process.start(program, arguments);
+    EXPECT_TRUE(process.waitForFinished() && process.exitCode() == 0)
+        << program.toStdString() << process.readAllStandardError().toStdString();
+    EXPECT_EQ(process.readAllStandardError().toStdString(), "");
+    return QString::fromUtf8(process.readAllStandardOutput());
+}
+
+/// The text of a PDF that is sound and brings its fonts along.
+QString textOfPdf(const QString& file) {
+    EXPECT_TRUE(outputOf(u"qpdf"_s, {u"--check"_s, file}).contains(u"No syntax"_s));
+    EXPECT_TRUE(outputOf(u"pdffonts"_s, {file}).contains(u"LiberationSans"_s));
+    return outputOf(u"pdftotext"_s, {u"-layout"_s, file, u"-"_s}).simplified();
+}
+
+class ReportOutput : public Ledger {
+protected:
+    ReportOutput() {
+        fill(40);
+        report.setCaption(u"Section4"_s, u"nome"_s, u"Conceição Muñoz"_s);
+    }
+    /// The pages say what was asked for, to the last total: 40 debits of n + 0.1, credits a euro
+    /// less.
+    static void expectStatement(const QString& file) {
+        const QString text = textOfPdf(file);
+        for (const QString& part :
+             {u"Extracto de Lançamentos"_s, u"Associado: Conceição Muñoz"_s, u"FT 2026/39"_s,
+              u"9 de março de 2026"_s, u"Página: 2 / 2"_s, u"Total Creditado: € 784,00"_s,
+              u"Total Recebido: € 824,00"_s, u"Total em Dívida: € 40,00"_s, u"165.197,17 Esc"_s})
+            EXPECT_TRUE(text.contains(part)) << part.toStdString() << "\n" << text.toStdString();
+    }
+    static QStringList documents() {
+        return QDir(QDir::homePath() + u"/Documents"_s).entryList(QDir::Files);
+    }
+    static QString document(const QString& name) {
+        return QDir::homePath() + u"/Documents/"_s + name;
+    }
+
+    reports::DataReport report{reports::rptExtrato2()};
+    QTemporaryDir folder;
+    support::Operator person;
+};
+
+TEST_F(ReportOutput, WritesPdfsOrSaysWhyNot) {
+    const auto pages = laidOut(report.design(), movements());
+    const QString file = folder.filePath(u"extracto.pdf"_s);
+    writePdf(*pages, file);
+    expectStatement(file);
+    const QString nowhere = folder.filePath(u"não há/extracto.pdf"_s);
+    EXPECT_TRUE(failureOf([&] { writePdf(*pages, nowhere); })
+                    .text()
+                    .startsWith(u"Não foi possível escrever «%1»"_s.arg(nowhere)));
+}
+
+TEST_F(ReportOutput, PrintsOnTheDefaultPrinterWithoutAsking) {
+    support::PrintServer server;
+    report.PrintReport(movements());
+    EXPECT_EQ(server.titles(1), QStringList{u"Extracto de Lançamentos"_s});
+    expectStatement(server.file(1));
+}
+
+TEST_F(ReportOutput, LosesNothingWithoutAPrinter) {
+    const QString name = u"Extracto de Lançamentos 09-03-2026"_s;
+    const auto expectBox = [&](const QString& text) {
+        person.expectBox({.text = text, .icon = core::Icon::Information, .partly = true});
+    };
+    {
+        const support::PrintServer server(support::PrintServer::Printer::Refusing);
+        expectBox(u"not accepting jobs.\n\nAs páginas ficaram guardadas no ficheiro\n"_s +
+                  document(name));
+        report.PrintReport(movements());
+    }
+    expectBox(u"impressora predefinida.\n\nAs páginas ficaram guardadas no ficheiro\n"_s +
+              document(name + u" (2).pdf"_s));
+    report.PrintReport(movements());
+    EXPECT_EQ(documents(), QStringList({name + u" (2).pdf"_s, name + u".pdf"_s}));
+    expectStatement(document(name + u".pdf"_s));
+
+    // Where the documents should be stands something else.
+    QDir(document({})).removeRecursively();
+    QFile inTheWay(QDir::homePath() + u"/Documents"_s);
+    ASSERT_TRUE(inTheWay.open(QIODevice::WriteOnly));
+    expectBox(QDir::homePath() + u'/' + name + u".pdf"_s);
+    report.PrintReport(movements());
+    expectStatement(QDir::homePath() + u'/' + name + u".pdf"_s);
+    QFile::remove(inTheWay.fileName());
+}
+
+TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
+    book.exec(
+        u"update tbZelmar_Movimentos set doc_no = '=1+1', debito = -1234.5 where movimento_no = 1;"
+        "update tbZelmar_Movimentos set doc_no = 'a;\"b\"' where movimento_no = 2;"
+        "update tbZelmar_Movimentos set doc_no = '-12,5' where movimento_no = 3;"
+        "delete from tbZelmar_Movimentos where movimento_no > 3"_s);
+    const QString file = folder.filePath(u"linhas.csv"_s);
+    const auto written = [&](const reports::Report& design, const ado::RecordsetPtr& rows) {
+        writeCsv(design, rows, file);
+        QFile csv(file);
+        EXPECT_TRUE(csv.open(QIODevice::ReadOnly));
+        return csv.readAll().toStdString();
+    };
+    EXPECT_EQ(written(report.design(), movements()),
+              "\ufeffmovimento_no;data;codABC;tipo;rubrica;doc_no;doc_valor;modo_pagamento;"
+              "credito;debito\r\n"
+              "1;02-01-2026;A;DOC;Consultas de especialidade;'=1+1;1,25;TRF;0,1;-1234,5\r\n"
+              "2;03-01-2026;A;DOC;Consultas de especialidade;\"a;\"\"b\"\"\";2,25;TRF;1,1;2,1\r\n"
+              "3;04-01-2026;A;DOC;Consultas de especialidade;-12,5;3,25;TRF;2,1;3,1\r\n");
+    book.hospital(u"1"_s, u"Hospital A"_s);
+    EXPECT_EQ(written(twoLevels(), open(TwoLevelStatement)),
+              "\ufeffhospital;movimento_no;divida\r\nHospital A;2;1\r\n");
+}
+
+}  // namespace
