@@ -15,6 +15,8 @@ GRANT INSERT, UPDATE, DELETE ON
     tbSocios_Acumulados, tbSocios_Acumulados_Inactivos,
     tbZelmar_Plafonds, tbHospitais, tbContadores, tbCheques
     TO {operator};
+-- The member file changes what it shows; members come and go by other programs.
+GRANT UPDATE ON tbSocios TO {operator};
 
 -- A SELECT can call functions. These do more than read, and some of them also where nothing may be
 -- written: they keep large objects, send messages, end or stop other workstations' statements, run

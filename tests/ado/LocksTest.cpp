@@ -93,6 +93,18 @@ TEST_F(Locks, AreNotTakenByOtherSetsAndNewRows) {
     EXPECT_EQ(adding->Collect(u"proximo"_s), QVariant(5));
 }
 
+TEST_F(Locks, OfThisProgramAreRefusedAtOnce) {
+    const auto first = open(Counter, connection);
+    EXPECT_EQ(lookedAt(first), 0);
+    QElapsedTimer waited;
+    waited.start();
+    for (const auto& workstation : {connection, connect(30)}) {
+        const QString text = failureOf([&] { open(Counter, workstation)->value(0); }).text();
+        EXPECT_TRUE(text.contains(u"outra janela deste programa"_s)) << qPrintable(text);
+    }
+    EXPECT_LT(waited.elapsed(), 5000);
+}
+
 TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
     const pid_t holder = startHolder();
     const auto rows = open(Counter, connect(1));
@@ -100,7 +112,9 @@ TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
     waited.start();
     const QString text = failureOf([&] { rows->value(0); }).text();
     EXPECT_GE(waited.elapsed(), 900);
+    EXPECT_LT(waited.elapsed(), 4000);
     EXPECT_TRUE(text.contains(u"tbConta"_s) && text.contains(u'@')) << qPrintable(text);
+    EXPECT_EQ(open(Counter, connection, ado::adLockReadOnly)->value(0), QVariant(1));
     const auto impatient = open(Counter, connect(0));
     EXPECT_EQ(lookedAt(impatient), core::RowInUse);
     kill(holder, SIGKILL);

@@ -18,10 +18,8 @@ protected:
             u"INSERT INTO tbMov(socio, nome, valor, data) VALUES (1, 'a', 10, '2001-01-01'),"
             "(2, 'b', 20, '2001-01-01'), (1, 'a', 30, '2001-01-01'), (1, 'a', 40, '1999-01-01'),"
             "(NULL, 'z', 50, '2001-01-01')"_s);
-        shaping->ConnectionString = book.shapingConnectionString();
-        shaping->Open();
     }
-    ado::ConnectionPtr shaping = std::make_shared<ado::Connection>();
+    ado::ConnectionPtr shaping = connectShaping();
 };
 
 TEST_F(Shapes, GiveEachRowItsChildren) {

@@ -5,9 +5,9 @@
 
 #include "boundary/environment/LoginState.h"
 #include "boundary/environment/dtZelmars.h"
-#include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
 #include "tests/support/Book.h"
+#include "tests/support/Failure.h"
 
 /// A book with the five values that name it. Afterwards the component is as it was when loaded.
 class Configured : public testing::Test {
@@ -31,12 +31,7 @@ protected:
     /// The text with which an operation fails; empty when it passes.
     template <class Operation>
     static QString failureOf(const Operation& operation) {
-        try {
-            operation();
-        } catch (const core::Failure& failure) {
-            return failure.text();
-        }
-        return {};
+        return support::failureOf(operation).text();
     }
 
     support::Book book;

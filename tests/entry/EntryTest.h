@@ -6,12 +6,8 @@
 #include "entry/frmMovimentos.h"
 #include "tests/entry/Companions.h"
 #include "tests/support/Book.h"
+#include "tests/support/Failure.h"
 #include "tests/support/Operator.h"
-
-/// So that a failing comparison shows the text.
-inline void PrintTo(const QString& text, std::ostream* out) {
-    *out << '"' << text.toStdString() << '"';
-}
 
 namespace entry {
 

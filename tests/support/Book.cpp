@@ -22,9 +22,9 @@ QString literal(const QVariant& value) {
 
 }  // namespace
 
-Book::Book(Content content)
-    : registryBefore_(qgetenv(RegistryVariable)), handle_(BookHandle::make(content, folder())) {
+Book::Book(Content content) : registryBefore_(qgetenv(RegistryVariable)) {
     qputenv(RegistryVariable, registryFolder().toUtf8());
+    handle_ = BookHandle::make(content, folder());
     const std::pair<QString, QString> settings[] = {{u"dtSecurityInfo"_s, u"True"_s},
                                                     {u"dtUser"_s, user()},
                                                     {u"dtPassword"_s, u""_s},

@@ -71,24 +71,19 @@ void administer(const QString& statement) {
     run(handle.get(), statement);
 }
 
-/// A catalogue made once in the process and copied for each test.
+/// A catalogue made once in the process, as an administrator makes it, and copied for each test.
 QString pattern(BookHandle::Content content) {
     static QStringList made;
-    const QString name = content == BookHandle::Content::Sample ? u"exemplo"_s : u"vazio"_s;
+    const bool sample = content == BookHandle::Content::Sample;
+    const QString name = sample ? u"exemplo"_s : u"vazio"_s;
     if (made.contains(name)) return name;
-    if (made.isEmpty()) administer(u"create role "_s + Operator + u" login"_s);
+    database::initBook({.host = Server::instance().folder(),
+                        .port = {},
+                        .user = QString::fromLatin1(Server::User),
+                        .password = {},
+                        .name = name},
+                       {.user = Operator, .password = u"segredo"_s}, sample);
     made << name;
-    administer(u"create database "_s + name);
-    database::createBook({.host = Server::instance().folder(),
-                          .port = {},
-                          .user = QString::fromLatin1(Server::User),
-                          .password = {},
-                          .name = name});
-    const std::unique_ptr<PGconn, decltype(&PQfinish)> handle(connect(name), &PQfinish);
-    run(handle.get(),
-        u"grant select, insert, update, delete on all tables in schema public to %1;"
-        "alter default privileges grant select, insert, update, delete on tables to %1"_s.arg(
-            Operator));
     return name;
 }
 
@@ -99,6 +94,11 @@ PostgresBook::PostgresBook(Content content) {
     catalogue_ = u"livro%1"_s.arg(++made);
     administer(u"create database %1 template %2"_s.arg(catalogue_, pattern(content)));
     handle_ = connect(catalogue_);
+    // Rights to a catalogue are not copied with it; nor are there any to what a test adds.
+    rows(
+        u"revoke all on database %1 from public; grant connect on database %1 to %2;"
+        "alter default privileges grant select, insert, update, delete on tables to %2"_s.arg(
+            catalogue_, Operator));
 }
 
 PostgresBook::~PostgresBook() {
