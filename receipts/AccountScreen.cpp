@@ -103,7 +103,6 @@ QWidget* AccountScreen::notesFrame() {
     grid->addWidget(fieldLabel(u"Notas:"_s, Text1), 0, 0, Qt::AlignTop | Qt::AlignRight);
     grid->addWidget(Text1, 0, 1);
     grid->setColumnStretch(1, 1);
-    Text1->setMinimumHeight(Text1->fontMetrics().lineSpacing() * 4);
     return frame;
 }
 

@@ -217,6 +217,9 @@ QPalette withAccent(QPalette palette) {
     const bool dark = palette.color(QPalette::Window).lightness() < 128;
     palette.setColor(QPalette::Highlight, dark ? AccentOnDark : Accent);
     palette.setColor(QPalette::HighlightedText, Qt::white);
+    // Dark desktops leave it near black.
+    palette.setColor(QPalette::PlaceholderText,
+                     blended(palette.color(QPalette::Base), palette.color(QPalette::Text), 0.55));
     return palette;
 }
 

@@ -14,6 +14,10 @@ MultiLineBox::MultiLineBox(const QString& name, QWidget* parent) : QPlainTextEdi
     });
 }
 
+QSize MultiLineBox::sizeHint() const {
+    return {QPlainTextEdit::sizeHint().width(), fontMetrics().lineSpacing() * 5 + 12};
+}
+
 bool MultiLineBox::leave() {
     if (!edited_ || !hasRow()) return true;
     if (!writeEntered([this] { writeRow(Text()); })) return false;

@@ -21,6 +21,8 @@ public:
     /// Locked: shown and selectable, but nobody can type into it.
     void setLocked(bool locked) { setReadOnly(locked); }
 
+    /// Five lines high.
+    QSize sizeHint() const override;
     bool leave() override;
     bool takesEnter() const override { return true; }
 
