@@ -5,6 +5,7 @@
 
 namespace benchmarks {
 
+void measureAccounts(Report& report);
 void measureCoverage(Report& report);
 void measureEngines(Report& report);
 void measureScreens(Report& report);

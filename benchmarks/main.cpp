@@ -28,6 +28,7 @@ int main(int argc, char** argv) {
     benchmarks::Report report(application.arguments().mid(1));
     try {
         benchmarks::measureCoverage(report);
+        benchmarks::measureAccounts(report);
         benchmarks::measureEngines(report);
         benchmarks::measureScreens(report);
         benchmarks::measureSearches(report);

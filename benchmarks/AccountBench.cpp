@@ -1,0 +1,128 @@
+// SPDX-License-Identifier: MIT
+// Receipts and annulments at the level of the rules, against the bare engine that runs the same
+// statements with the same locks.
+#include "benchmarks/Bare.h"
+#include "benchmarks/Benches.h"
+#include "boundary/environment/dtZelmars.h"
+#include "coverage/Statements.h"
+#include "coverage/annulment.h"
+#include "data/NewMovement.h"
+#include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
+#include "receipts/receipt.h"
+
+using namespace Qt::StringLiterals;
+
+namespace benchmarks {
+
+namespace {
+
+core::Answer yes(const QString&, core::Icon, const QString&, core::Buttons buttons) {
+    return buttons == core::Buttons::YesNo ? core::Answer::Yes : core::Answer::Ok;
+}
+
+/// A document in force, as a screen shows it.
+ado::RecordsetPtr anyDocument() {
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(
+        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = (SELECT max("
+        "movimento_id) FROM tbZelmar_Movimentos WHERE tipo = 'DOC')"_s,
+        environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
+        ado::adCmdUnknown);
+    return rows;
+}
+
+void runReceipt(qint32 socio_id) {
+    QString connection;
+    QString statement;
+    const ado::RecordsetPtr row = data::openNewMovement(connection, statement);
+    row->AddNew();
+    row->setCollect(u"data"_s, QDateTime(QDate(2026, 11, 20), QTime(0, 0), Qt::UTC));
+    row->setCollect(u"tipo"_s, u"PAG"_s);
+    row->setCollect(u"modo_pagamento"_s, u"CHQ"_s);
+    row->setCollect(u"credito"_s, 40);
+    receipts::postReceipt({row, socio_id, u"Medição"_s, u"CHQ"_s, u"1"_s, u"40"_s});
+}
+
+/// A row is found, held, read as it is then, written and let go. Its first column as it was.
+double writeHeld(Bare& bare, const QByteArray& select, const QByteArray& update) {
+    double first = bare.run(select);
+    if (bare.hold(select)) first = bare.run(select);
+    bare.run(update);
+    bare.letGo(select);
+    return first;
+}
+
+QByteArray drawNumber(Bare& bare) {
+    const double number = writeHeld(bare, "SELECT zelmars FROM tbContadores",
+                                    "UPDATE tbContadores SET zelmars = zelmars + 1");
+    return QByteArray::number(number, 'f', 0);
+}
+
+void runBareReceipt(Bare& bare, qint32 socio_id) {
+    const QByteArray member = QByteArray::number(socio_id);
+    bare.run("SELECT * FROM tbZelmar_Movimentos WHERE movimento_id = 0");
+    bare.run(
+        "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, data, tipo, modo_pagamento, "
+        "doc_valor, debito, credito) VALUES (" +
+        drawNumber(bare) + ", " + member + ", '2026-11-20 00:00:00', 'PAG', 'CHQ', 0, 0, 40)");
+    const QByteArray where =
+        " tbSocios_Acumulados WHERE (socio_id=" + member + ") and (rubrica_id_main=0)";
+    writeHeld(bare, "SELECT * FROM" + where,
+              "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac + 40 WHERE socio_id = " +
+                  member + " AND rubrica_id_main = 0");
+}
+
+void runBareAnnulment(Bare& bare, const ado::Recordset& shown) {
+    const auto value = [&](const QString& column) {
+        return core::toText(shown.Collect(column)).toUtf8();
+    };
+    const QByteArray key = " WHERE movimento_id = " + value(u"movimento_id"_s);
+    writeHeld(bare, "SELECT * FROM tbZelmar_Movimentos" + key,
+              "UPDATE tbZelmar_Movimentos SET tipo = 'ANL', modo_pagamento = 'ANL'" + key);
+    bare.run(
+        "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, data, tipo, "
+        "doc_no, doc_data, doc_valor, credito, debito) VALUES (" +
+        drawNumber(bare) + ", " + value(u"socio_id"_s) + ", '" + value(u"codABC"_s) + "', " +
+        value(u"rubrica_id"_s) +
+        ", '2026-11-20 00:00:00', 'COR', '1234', '2026-11-20 00:00:00', 40, -28, -28)");
+    const QByteArray own =
+        coverage::statements::accumulator(shown.Collect(u"rubrica_id"_s),
+                                          core::toLong(shown.Collect(u"socio_id"_s)),
+                                          core::toText(shown.Collect(u"codABC"_s)))
+            .toUtf8();
+    writeHeld(bare, own,
+              "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac - 28, debito_ac = debito_ac "
+              "- 28, no_docs = no_docs - 1" +
+                  own.mid(own.indexOf(" WHERE")));
+}
+
+void measureOn(Report& report, Engine engine) {
+    const QString receipt = u"receipt/"_s + nameOf(engine);
+    const QString annulment = u"annulment/"_s + nameOf(engine);
+    if (!report.wanted(receipt) && !report.wanted(annulment)) return;
+    const BookCopy copy(sampleBook(engine));
+    use(copy.book());
+    const std::unique_ptr<Bare> alone = bare(copy.book());
+    const qint32 member = usedCases(sampleBook(), 1).front().socio_id;
+    runReceipt(member);  // adds the account-level row
+    const ado::RecordsetPtr shown = anyDocument();
+    report.pair(
+        receipt, 1.5, 20, [&] { runReceipt(member); }, [&] { runBareReceipt(*alone, member); });
+    report.pair(
+        annulment, 1.5, 20,
+        [&] {
+            coverage::annul({shown, u"Medição"_s});
+        },
+        [&] { runBareAnnulment(*alone, *shown); });
+}
+
+}  // namespace
+
+void measureAccounts(Report& report) {
+    core::setMsgBoxPresenter(yes);
+    measureOn(report, Engine::Sqlite);
+    measureOn(report, Engine::Postgres);
+}
+
+}  // namespace benchmarks
