@@ -22,11 +22,22 @@ TEST(CommandLine, NamesOneTask) {
         {u"register"_s, Task::Register},
         {u"init pasta"_s, Task::Init},
         {u"init --sample --if-needed pasta"_s, Task::Init},
+        {u"init --server postgresql:srv --catalog livro --sample"_s, Task::InitServer},
+        {u"init --server postgresql:srv --catalog livro --admin ana --user rui"_s,
+         Task::InitServer},
+        {u"copy sqlite:pasta/livro postgresql:srv/livro"_s, Task::Copy},
+        {u"copy --admin ana postgresql:srv/livro sqlite:pasta/livro"_s, Task::Copy},
         {u"callplafonds MSAccess x"_s, Task::Operation},
         // Refused, so that nothing is done that was not meant.
         {u"--hlep"_s, Task::Wrong},
         {u"init"_s, Task::Wrong},
         {u"init --sampel pasta"_s, Task::Wrong},
+        {u"init --server postgresql:srv"_s, Task::Wrong},
+        {u"init --server --catalog livro"_s, Task::Wrong},
+        {u"init --server postgresql:srv --catalog livro pasta"_s, Task::Wrong},
+        {u"init --catalog livro pasta"_s, Task::Wrong},
+        {u"copy sqlite:pasta/livro"_s, Task::Wrong},
+        {u"copy --force sqlite:pasta/livro"_s, Task::Wrong},
         {u"tour --sample"_s, Task::Wrong},
         {u"Despesas"_s, Task::Wrong},
         {u"NewMovimento talvez"_s, Task::Wrong},
@@ -37,6 +48,14 @@ TEST(CommandLine, NamesOneTask) {
     };
     for (const auto& [words, task] : cases)
         EXPECT_EQ(parsed(words).task, task) << words.toStdString();
+}
+
+TEST(CommandLine, KnowsWhoEntersAServer) {
+    EXPECT_EQ(parsed(u"init --server s --catalog c"_s).user, u"zelmars"_s);
+    EXPECT_EQ(parsed(u"init --server s --catalog c --user u"_s).user, u"u"_s);
+    EXPECT_EQ(parsed(u"copy a b"_s).admin, u"postgres"_s);
+    const host::CommandLine line = parsed(u"copy a --admin x b"_s);
+    EXPECT_EQ(line.from + line.into + line.admin, u"abx"_s);
 }
 
 TEST(CommandLine, GivesOperationsTheirArguments) {
