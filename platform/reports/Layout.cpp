@@ -172,7 +172,9 @@ void Layout::Implementation::endPage() {
     y = bodyBottom;
     put(pageFooter);
     pages->add(page);
-    page = {};
+    page.boxes.clear();
+    page.lines.clear();
+    page.texts.clear();
 }
 
 void Layout::Implementation::print(const PreparedSection& section, double more) {

@@ -43,8 +43,9 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
     }
     painter.setPen(Qt::black);
     const Face* face = nullptr;
+    TextRun numbered;
     for (const TextRun& each : page.texts) {
-        const TextRun run = pages.resolved(each);
+        const TextRun& run = each.open ? numbered = pages.resolved(each) : each;
         if (!face || face->style != run.style) {
             face = &faces.of(run.style);
             painter.setFont(face->font);

@@ -11,110 +11,128 @@ namespace reports {
 
 namespace {
 
-/// A page as a run of bytes. Positions keep a thousandth of a millimetre.
-class Packer {
-public:
-    void add(double length) { addPlain(static_cast<float>(length)); }
-    void add(const QPointF& point) { add(point.x()), add(point.y()); }
-    void add(const Style& style) {
-        addPlain(static_cast<quint16>(style.points * 100));
-        addPlain(static_cast<quint8>(static_cast<int>(style.align) | (style.bold ? 4 : 0) |
-                                     (style.italic ? 8 : 0)));
-    }
-    void add(const Box& box) {
-        add(box.rect.topLeft()), add(box.rect.bottomRight());
-        addPlain(box.shaded), addPlain(box.framed);
-    }
-    void add(const Line& line) { add(line.line.p1()), add(line.line.p2()), add(line.width); }
-    void add(const TextRun& run) {
-        add(run.baseline), add(run.width), add(run.style), addPlain(run.open);
-        addPlain(static_cast<qint32>(run.text.size()));
-        bytes_.append(reinterpret_cast<const char*>(run.text.constData()),
-                      run.text.size() * static_cast<qsizetype>(sizeof(QChar)));
-    }
-    template <class Element>
-    void add(const std::vector<Element>& elements) {
-        addPlain(static_cast<qint32>(elements.size()));
-        for (const Element& element : elements) add(element);
-    }
-    QByteArray packed() const { return qCompress(bytes_, 1); }
+// A page is packed as counts, plain records and the letters of its texts. Positions keep a
+// thousandth of a millimetre.
 
-private:
-    template <class Plain>
-    void addPlain(Plain value) {
-        bytes_.append(reinterpret_cast<const char*>(&value), sizeof value);
-    }
-    QByteArray bytes_;
+struct PackedBox {
+    float left, top, right, bottom;
+    bool shaded, framed;
 };
 
-/// Takes what a Packer gave, in the same order.
-class Unpacker {
-public:
-    explicit Unpacker(const QByteArray& packed) : bytes_(qUncompress(packed)) {}
-    void take(double& length) { length = static_cast<double>(plain<float>()); }
-    void take(QPointF& point) { take(point.rx()), take(point.ry()); }
-    void take(Style& style) {
-        style.points = plain<quint16>() / 100.0;
-        const int bits = plain<quint8>();
-        style.align = static_cast<Align>(bits & 3);
-        style.bold = (bits & 4) != 0;
-        style.italic = (bits & 8) != 0;
-    }
-    void take(Box& box) {
-        QPointF from, to;
-        take(from), take(to);
-        box.rect = QRectF(from, to);
-        box.shaded = plain<bool>();
-        box.framed = plain<bool>();
-    }
-    void take(Line& line) {
-        QPointF from, to;
-        take(from), take(to), take(line.width);
-        line.line = QLineF(from, to);
-    }
-    void take(TextRun& run) {
-        take(run.baseline), take(run.width), take(run.style);
-        run.open = plain<bool>();
-        run.text.resize(plain<qint32>());
-        const auto size = static_cast<size_t>(run.text.size()) * sizeof(QChar);
-        std::memcpy(run.text.data(), bytes_.constData() + at_, size);
-        at_ += static_cast<qsizetype>(size);
-    }
-    template <class Element>
-    void take(std::vector<Element>& elements) {
-        elements.resize(static_cast<size_t>(plain<qint32>()));
-        for (Element& element : elements) take(element);
-    }
-
-private:
-    template <class Plain>
-    Plain plain() {
-        Plain value;
-        std::memcpy(&value, bytes_.constData() + at_, sizeof value);
-        at_ += static_cast<qsizetype>(sizeof value);
-        return value;
-    }
-    const QByteArray bytes_;
-    qsizetype at_ = 0;
+struct PackedLine {
+    float x1, y1, x2, y2, width;
 };
+
+struct PackedRun {
+    float x, y, width;
+    qint32 length;
+    quint16 points;  ///< hundredths
+    quint8 align;
+    bool bold, italic, open;
+};
+
+float packed(double length) {
+    return static_cast<float>(length);
+}
+
+PackedBox packed(const Box& box) {
+    return {packed(box.rect.left()),
+            packed(box.rect.top()),
+            packed(box.rect.right()),
+            packed(box.rect.bottom()),
+            box.shaded,
+            box.framed};
+}
+
+Box unpacked(const PackedBox& box) {
+    return {QRectF(QPointF(box.left, box.top), QPointF(box.right, box.bottom)), box.shaded,
+            box.framed};
+}
+
+PackedLine packed(const Line& line) {
+    return {packed(line.line.x1()), packed(line.line.y1()), packed(line.line.x2()),
+            packed(line.line.y2()), packed(line.width)};
+}
+
+Line unpacked(const PackedLine& line) {
+    return {QLineF(line.x1, line.y1, line.x2, line.y2), line.width};
+}
+
+PackedRun packed(const TextRun& run) {
+    return {packed(run.baseline.x()),
+            packed(run.baseline.y()),
+            packed(run.width),
+            static_cast<qint32>(run.text.size()),
+            static_cast<quint16>(run.style.points * 100),
+            static_cast<quint8>(run.style.align),
+            run.style.bold,
+            run.style.italic,
+            run.open};
+}
+
+TextRun unpacked(const PackedRun& run) {
+    const Style style{run.points / 100.0, run.bold, run.italic, static_cast<Align>(run.align)};
+    return {QPointF(run.x, run.y), run.width, QString(run.length, Qt::Uninitialized), style,
+            run.open};
+}
+
+template <class Plain>
+void append(QByteArray& bytes, const Plain* values, qsizetype count = 1) {
+    bytes.append(reinterpret_cast<const char*>(values),
+                 count * static_cast<qsizetype>(sizeof(Plain)));
+}
+
+template <class Element>
+void append(QByteArray& bytes, const std::vector<Element>& elements) {
+    const size_t count = elements.size();
+    append(bytes, &count);
+    for (const Element& element : elements) {
+        const auto plain = packed(element);
+        append(bytes, &plain);
+    }
+}
+
+template <class Plain>
+void take(const char*& bytes, Plain* values, qsizetype count = 1) {
+    const size_t size = static_cast<size_t>(count) * sizeof(Plain);
+    std::memcpy(values, bytes, size);
+    bytes += size;
+}
+
+template <class Packed, class Element>
+void take(const char*& bytes, std::vector<Element>& elements) {
+    size_t count = 0;
+    take(bytes, &count);
+    elements.reserve(count);
+    while (elements.size() < count) {
+        Packed plain;
+        take(bytes, &plain);
+        elements.push_back(unpacked(plain));
+    }
+}
 
 }  // namespace
 
-Page Pages::at(int page) const {
-    Unpacker bytes(pages_[static_cast<size_t>(page)]);
-    Page result;
-    bytes.take(result.boxes);
-    bytes.take(result.lines);
-    bytes.take(result.texts);
-    return result;
+void Pages::add(const Page& page) {
+    QByteArray bytes;
+    bytes.reserve(32 * 1024);
+    append(bytes, page.boxes);
+    append(bytes, page.lines);
+    append(bytes, page.texts);
+    for (const TextRun& run : page.texts) append(bytes, run.text.constData(), run.text.size());
+    pages_.push_back(qCompress(bytes, 1));
+    pages_.back().squeeze();
 }
 
-void Pages::add(const Page& page) {
-    Packer bytes;
-    bytes.add(page.boxes);
-    bytes.add(page.lines);
-    bytes.add(page.texts);
-    pages_.push_back(bytes.packed());
+Page Pages::at(int page) const {
+    const QByteArray bytes = qUncompress(pages_[static_cast<size_t>(page)]);
+    const char* next = bytes.constData();
+    Page result;
+    take<PackedBox>(next, result.boxes);
+    take<PackedLine>(next, result.lines);
+    take<PackedRun>(next, result.texts);
+    for (TextRun& run : result.texts) take(next, run.text.data(), run.text.size());
+    return result;
 }
 
 TextRun Pages::resolved(const TextRun& run) const {

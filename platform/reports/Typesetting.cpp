@@ -21,9 +21,10 @@ QFont fontOf(const Style& style) {
     return font;
 }
 
+/// Control characters and ends of lines and paragraphs.
 bool isBlank(QChar c) {
-    return c.category() == QChar::Other_Control || c.category() == QChar::Separator_Line ||
-           c.category() == QChar::Separator_Paragraph;
+    return c < u' ' || (c >= u'\u007f' && c < u'\u00a0') || c == QChar::LineSeparator ||
+           c == QChar::ParagraphSeparator;
 }
 
 /// Only what can stand on one line.
