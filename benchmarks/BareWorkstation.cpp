@@ -9,9 +9,9 @@
 
 #include <QCoreApplication>
 #include <QElapsedTimer>
-#include <QHash>
 #include <cstdio>
 #include <memory>
+#include <string_view>
 
 #include "coverage/Statements.h"
 #include "platform/registry/Registry.h"
@@ -64,10 +64,12 @@ public:
 
 private:
     void lock(const QByteArray& row, short type, int how) const {
+        // The same in every process, which qHash is not.
+        const std::size_t hash = std::hash<std::string_view>{}(row.constData());
         struct flock range {};
         range.l_type = type;
         range.l_whence = SEEK_SET;
-        range.l_start = static_cast<off_t>(qHash(row, 1) >> 2);
+        range.l_start = static_cast<off_t>(hash >> 2);
         range.l_len = 1;
         if (::fcntl(locks_, how, &range) != 0) stop("lock");
     }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/SqliteHandle.h"
 
+#include <QThread>
+
 #include "platform/ado/SqliteCollation.h"
 #include "platform/core/Failure.h"
 
@@ -47,7 +49,17 @@ SqliteHandle::~SqliteHandle() {
 void SqliteHandle::setTimeout(int seconds) {
     if (seconds == timeout_) return;
     timeout_ = seconds;
-    sqlite3_busy_timeout(db_, seconds * 1000);
+    sqlite3_busy_handler(db_, awaitOthers, this);
+}
+
+/// Waits while another program writes; 0 when the time is over. The engine's own waiting lengthens
+/// its pauses to 100 ms: where several write without end, some are then kept out for seconds.
+int SqliteHandle::awaitOthers(void* handle, int tries) {
+    auto* const self = static_cast<SqliteHandle*>(handle);
+    if (tries == 0) self->waited_.start();
+    if (self->waited_.elapsed() >= qint64{self->timeout_} * 1000) return 0;
+    QThread::msleep(tries == 0 ? 1 : 2);
+    return 1;
 }
 
 SqliteStatement SqliteHandle::prepare(const QByteArray& text) {

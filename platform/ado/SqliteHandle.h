@@ -4,6 +4,7 @@
 #include <sqlite3.h>
 
 #include <QByteArray>
+#include <QElapsedTimer>
 #include <QHash>
 #include <QString>
 #include <memory>
@@ -55,8 +56,11 @@ public:
     [[noreturn]] void fail();
 
 private:
+    static int awaitOthers(void* handle, int tries);
+
     sqlite3* db_ = nullptr;
     int timeout_ = -1;
+    QElapsedTimer waited_;
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
     std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
 };

@@ -5,6 +5,7 @@
 // that was cut short by a kill is therefore in one of these states: nothing; a number that no
 // movement bears; a movement that the accumulator lacks; complete, but not said to be.
 #include <QDeadlineTimer>
+#include <bit>
 #include <tuple>
 
 #include "platform/ado/Recordset.h"
@@ -36,10 +37,10 @@ using Account = std::tuple<int, QString, int>;
 
 class Audit {
 public:
-    Audit(ado::ConnectionPtr book, const std::map<int, Said>& said)
-        : book_(std::move(book)), said_(said) {}
+    Audit(ado::ConnectionPtr book, const std::map<int, Said>& said, Outcome& outcome)
+        : book_(std::move(book)), said_(said), outcome_(outcome) {}
 
-    QStringList run(Engine engine, bool counterWasEmpty) {
+    void run(Engine engine, bool counterWasEmpty) {
         if (engine == Engine::Postgres) awaitSilence();
         readMovements();
         checkPostings();
@@ -50,11 +51,10 @@ public:
             for (const auto rows = open(u"select * from pragma_integrity_check"_s); !rows->atEnd();
                  rows->MoveNext())
                 if (rows->value(0) != u"ok"_s) fault(rows->value(0).toString());
-        return faults_;
     }
 
 private:
-    void fault(const QString& text) { faults_ << text; }
+    void fault(const QString& text) { outcome_.faults << text; }
 
     ado::RecordsetPtr open(const QString& statement,
                            ado::LockType lock = ado::adLockReadOnly) const {
@@ -128,6 +128,7 @@ private:
         missing += next - expected;
         counter->MoveNext();
         if (!counter->atEnd()) fault(u"the counter has several rows"_s);
+        outcome_.lostNumbers = missing;
         if (missing < 0 || missing > mayHaveLostNumber_)
             fault(u"%1 numbers are missing, %2 may be"_s.arg(missing).arg(mayHaveLostNumber_));
     }
@@ -161,7 +162,7 @@ private:
     /// The sums are those of the movements, each rounded to a 32-bit float in the order of the
     /// numbers; movements that nobody said to be done may be left out. (Where several
     /// workstations post for one account the amounts are such that the order does not matter.)
-    static bool follows(const Sums& sums, const std::vector<Movement>& movements) {
+    bool follows(const Sums& sums, const std::vector<Movement>& movements) {
         std::vector<std::size_t> unsaid;
         for (std::size_t at = 0; at < movements.size(); ++at)
             if (movements[at].isUnsaid) unsaid.push_back(at);
@@ -178,15 +179,16 @@ private:
                 expected.debit = plus(expected.debit, movements[at].debit);
                 ++expected.documents;
             }
-            if (sums == expected) return true;
+            if (sums != expected) continue;
+            outcome_.lagging += std::popcount(leftOut);
+            return true;
         }
         return false;
     }
 
     /// Nobody works any more, so every row can be held at once.
     void checkLocks() {
-        for (const QString& table :
-             {u"tbContadores"_s, u"tbCheques"_s, u"tbSocios_Acumulados"_s, u"tbZelmar_Plafonds"_s})
+        for (const QString& table : {u"tbContadores"_s, u"tbCheques"_s, u"tbSocios_Acumulados"_s})
             try {
                 for (const auto rows = open(u"select * from "_s + table, ado::adLockPessimistic);
                      !rows->atEnd(); rows->MoveNext())
@@ -198,7 +200,7 @@ private:
 
     ado::ConnectionPtr book_;
     const std::map<int, Said>& said_;
-    QStringList faults_;
+    Outcome& outcome_;
     std::map<int, int> numbers_;                  ///< how often each was given
     std::map<int, std::map<int, int>> postings_;  ///< by workstation: how often each is there
     std::map<Account, std::vector<Movement>> movements_;
@@ -207,9 +209,9 @@ private:
 
 }  // namespace
 
-QStringList audit(const ado::ConnectionPtr& book, Engine engine, const std::map<int, Said>& said,
-                  bool counterWasEmpty) {
-    return Audit(book, said).run(engine, counterWasEmpty);
+void audit(const ado::ConnectionPtr& book, Engine engine, const std::map<int, Said>& said,
+           bool counterWasEmpty, Outcome& outcome) {
+    Audit(book, said, outcome).run(engine, counterWasEmpty);
 }
 
 }  // namespace office

@@ -35,14 +35,19 @@ struct Desk {
 }  // namespace
 
 QString Outcome::text() const {
-    return u"%1 postings in %2 s (%3/s), slowest %4 ms; %5 killed, counter held again after at "
-           u"most %6 ms; %7 faults"_s.arg(posted)
-               .arg(seconds, 0, 'f', 2)
-               .arg(posted / qMax(seconds, 1e-6), 0, 'f', 0)
-               .arg(slowestPosting, 0, 'f', 0)
-               .arg(killed)
-               .arg(slowestRelease, 0, 'f', 0)
-               .arg(faults.size());
+    QString line = u"%1 postings in %2 s (%3/s), slowest %4 ms; %5 faults"_s.arg(posted)
+                       .arg(seconds, 0, 'f', 2)
+                       .arg(posted / qMax(seconds, 1e-6), 0, 'f', 0)
+                       .arg(slowestPosting, 0, 'f', 0)
+                       .arg(faults.size());
+    if (killed > 0)
+        line +=
+            u"; %1 killed, leaving %2 unused numbers and %3 movements that the accumulators "
+            u"lack; counter held again after at most %4 ms"_s.arg(killed)
+                .arg(lostNumbers)
+                .arg(lagging)
+                .arg(slowestRelease, 0, 'f', 0);
+    return line;
 }
 
 /// A stretch of work with its processes.
@@ -222,7 +227,7 @@ Outcome Office::workThroughKills(int workstations, int kills) {
 }
 
 Outcome Office::finish(Outcome outcome) {
-    outcome.faults << audit(connect(2), engine_, said_, wasEmpty_);
+    audit(connect(2), engine_, said_, wasEmpty_, outcome);
     return outcome;
 }
 

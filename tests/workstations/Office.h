@@ -25,6 +25,8 @@ struct Outcome {
     double seconds = 0;         ///< from the first posting to the last
     double slowestPosting = 0;  ///< milliseconds
     double slowestRelease = 0;  ///< milliseconds from a kill until the counter could be held
+    int lostNumbers = 0;        ///< drawn by a workstation that was killed before it used them
+    int lagging = 0;            ///< movements that the accumulators lack, for the same reason
     QStringList faults;         ///< empty when all was as it has to be
     QString text() const;       ///< one line for people
 };
@@ -69,9 +71,9 @@ private:
     std::map<int, Said> said_;  ///< by workstation, over all stretches
 };
 
-/// What in the book does not follow from what the workstations said: numbers, postings,
-/// accumulators, locks. Empty when all does.
-QStringList audit(const ado::ConnectionPtr& book, Engine engine, const std::map<int, Said>& said,
-                  bool counterWasEmpty);
+/// Adds to the outcome what in the book does not follow from what the workstations said: numbers,
+/// postings, accumulators, locks.
+void audit(const ado::ConnectionPtr& book, Engine engine, const std::map<int, Said>& said,
+           bool counterWasEmpty, Outcome& outcome);
 
 }  // namespace office

@@ -2,6 +2,7 @@
 // Many workstations on one book lose nothing, also when some of them are killed.
 #include <gtest/gtest.h>
 
+#include "platform/ado/Recordset.h"
 #include "tests/workstations/Office.h"
 
 using namespace Qt::StringLiterals;
@@ -24,6 +25,11 @@ protected:
 TEST_P(Workstations, PostAtOnceAndLoseNothing) {
     const int postings = many("ZELMARS_POSTINGS", 60);
     office::Office office(GetParam(), 8);
+    // An editing screen that stays open over lunch: nobody who posts waits for its row.
+    const ado::RecordsetPtr rubric = ado::Recordset::create();
+    rubric->Open(u"Select * from tbZelmar_Plafonds where rubrica_id = 2"_s, office.connect(30),
+                 ado::adOpenStatic, ado::adLockPessimistic);
+    rubric->setCollect(u"percent"_s, 0.4);
     const office::Outcome outcome = office.work(8, postings);
     EXPECT_EQ(outcome.posted, 8 * postings);
     expectSound(outcome);
