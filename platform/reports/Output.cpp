@@ -50,7 +50,7 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
             face = &faces.of(run.style);
             painter.setFont(face->font);
         }
-        painter.drawText(inUnits(run.baseline), run.text);
+        face->draw(painter, inUnits(run.baseline), run.text);
     }
 }
 

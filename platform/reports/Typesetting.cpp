@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "platform/reports/Typesetting.h"
 
+#include <QGlyphRun>
+#include <QPainter>
 #include <QTextLayout>
+#include <QVarLengthArray>
 #include <algorithm>
 #include <cmath>
 
@@ -80,20 +83,46 @@ void setLine(std::vector<TextRun>& into, Faces& faces, QString text, const QRect
 
 }  // namespace
 
-Face::Face(const Style& of) : style(of), font(fontOf(of)), metrics_(font) {
-    widths_.fill(-1);
+Face::Face(const Style& of)
+    : style(of), font(fontOf(of)), metrics_(font), raw_(QRawFont::fromFont(font)) {}
+
+const Face::Letter* Face::letter(QChar c) const {
+    // The currency sign stands in nearly every row.
+    const size_t at = c == u'€' ? 0 : c.unicode();
+    if (at >= letters_.size() || c == QChar::SoftHyphen) return nullptr;
+    Letter& known = letters_[at];
+    if (known.width < 0) {
+        known.glyph = raw_.glyphIndexesForString(c).value(0);
+        known.width = static_cast<float>(metrics_.horizontalAdvance(c));
+    }
+    return known.glyph != 0 ? &known : nullptr;
 }
 
 double Face::width(const QString& text) const {
     double units = 0;
     for (const QChar c : text) {
-        // The currency sign stands in nearly every row.
-        const size_t at = c == u'€' ? 0 : c.unicode();
-        if (at >= widths_.size()) return metrics_.horizontalAdvance(text) / UnitsPerMillimetre;
-        if (widths_[at] < 0) widths_[at] = static_cast<float>(metrics_.horizontalAdvance(c));
-        units += static_cast<double>(widths_[at]);
+        const Letter* known = letter(c);
+        if (!known) return metrics_.horizontalAdvance(text) / UnitsPerMillimetre;
+        units += static_cast<double>(known->width);
     }
     return units / UnitsPerMillimetre;
+}
+
+void Face::draw(QPainter& painter, const QPointF& at, const QString& text) const {
+    QVarLengthArray<quint32, 64> glyphs;
+    QVarLengthArray<QPointF, 64> places;
+    double x = 0;
+    for (const QChar c : text) {
+        const Letter* known = letter(c);
+        if (!known) return painter.drawText(at, text);
+        glyphs.append(known->glyph);
+        places.append(QPointF(x, 0));
+        x += static_cast<double>(known->width);
+    }
+    QGlyphRun run;
+    run.setRawFont(raw_);
+    run.setRawData(glyphs.constData(), places.constData(), static_cast<int>(glyphs.size()));
+    painter.drawGlyphRun(at, run);
 }
 
 QString Face::elided(const QString& text, double width) const {

@@ -3,11 +3,14 @@
 
 #include <QFont>
 #include <QFontMetricsF>
+#include <QRawFont>
 #include <array>
 #include <list>
 #include <vector>
 
 #include "platform/reports/Pages.h"
+
+class QPainter;
 
 /// Texts set into boxes. Everything is measured with unhinted fonts in units of 1/1200 inch,
 /// whatever the screen is, so that a page is the same wherever it is laid out and painted.
@@ -26,14 +29,24 @@ public:
     double ascent() const { return metrics_.ascent() / UnitsPerMillimetre; }
     double height() const { return metrics_.height() / UnitsPerMillimetre; }
 
+    /// Paints a text, `at` being the painter's units, with the painter's font set to this one.
+    void draw(QPainter& painter, const QPointF& at, const QString& text) const;
+
     const Style style;
     const QFont font;
 
 private:
+    struct Letter {
+        quint32 glyph = 0;
+        float width = -1;  ///< in units; negative while the letter is not known
+    };
+    /// Null for a letter of scripts that join or reorder theirs, and for one that the font lacks:
+    /// a text with such a letter is left to the toolkit as a whole, which takes twice as long.
+    const Letter* letter(QChar c) const;
+
     QFontMetricsF metrics_;
-    /// Widths of letters in units, negative where not known yet. Scripts beyond them join or
-    /// reorder their letters and are measured as a whole.
-    mutable std::array<float, 0x250> widths_;
+    QRawFont raw_;
+    mutable std::array<Letter, 0x250> letters_;
 };
 
 /// Faces made so far: a font is costly to make, and a report uses few.
