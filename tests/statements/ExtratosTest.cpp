@@ -21,27 +21,19 @@ class Extratos : public entry::EntryTest {
 protected:
     Extratos() {
         book.exec(u"update tbSocios set morada1 = 'Rua do Ouro, 5', code_postal1 = '1100-060'"_s);
-        movement(u"tbZelmar_Movimentos"_s, 1, u"DOC"_s, 50, 40);
-        movement(u"tbZelmar_Movimentos"_s, 2, u"HOS"_s, 300, 250.5);
-        movement(u"tbZelmar_Movimentos_Inactivos"_s, 3, u"DOC"_s, 20, 16);
+        movement(u"tbZelmar_Movimentos"_s, u"901, 1, 'DOC', 50, 40, 20"_s);
+        movement(u"tbZelmar_Movimentos"_s, u"902, 2, 'HOS', 300, 250.5, 125.25"_s);
+        movement(u"tbZelmar_Movimentos_Inactivos"_s, u"903, 3, 'DOC', 20, 16, 8"_s);
     }
 
-    /// Of today, document "D/7"; the fee's credit is half the debit.
-    void movement(const QString& table, int number, const QString& tipo, double value,
-                  const QVariant& debit) {
-        book.insert(table, {{"movimento_id", 900 + number},
-                            {"movimento_no", number},
-                            {"socio_id", socio},
-                            {"codABC", u"A"_s},
-                            {"rubrica_id", rubric},
-                            {"data", QDate(2026, 3, 15)},
-                            {"tipo", tipo},
-                            {"doc_no", u"D/7"_s},
-                            {"doc_valor", value},
-                            {"comparticipacao", debit},
-                            {"credito", debit.isValid() ? debit.toDouble() / 2 : QVariant()},
-                            {"debito", debit},
-                            {"modo_pagamento", u"TRF"_s}});
+    /// Of today, document "D/7".
+    void movement(const QString& table, const QString& values) {
+        book.exec(
+            u"insert into %1 (movimento_id, movimento_no, tipo, doc_valor, debito, credito, "
+            "socio_id, rubrica_id, codABC, data, doc_no, modo_pagamento) values "
+            "(%2, %3, %4, 'A', '2026-03-15 00:00:00', 'D/7', 'TRF')"_s.arg(table, values)
+                .arg(socio)
+                .arg(rubric));
     }
 
     /// Opens the dialog as a host does and runs the steps on it.
@@ -155,7 +147,7 @@ TEST_F(Extratos, OddTextsAndNullsPrintOrAreRefusedWithAText) {
     book.exec(
         u"update tbSocios set morada1 = null, code_postal1 = null, localidade1 = null, "
         "nib = null"_s);
-    movement(u"tbZelmar_Movimentos"_s, 4, u"DOC"_s, 10, {});
+    movement(u"tbZelmar_Movimentos"_s, u"904, 4, 'DOC', null, null, null"_s);
     support::PrintServer printer;
     open([this] {
         person.fill(u"No_Kor"_s, u"100015"_s);
