@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
 // Eight workstations that post at once, on both engines, against eight processes that do the bare
-// statements and locks; and workstations that are killed at random instants.
+// statements and locks; and workstations that are killed at random instants. The script of the
+// tests runs the office.
 #include <QCoreApplication>
+#include <QProcess>
 #include <cstdio>
+#include <stdexcept>
 
 #include "benchmarks/Benches.h"
-#include "tests/workstations/Office.h"
 
 using namespace Qt::StringLiterals;
 
@@ -13,70 +15,71 @@ namespace benchmarks {
 
 namespace {
 
-constexpr int Workstations = 8;
-constexpr int Postings = 1000;
-constexpr int Kills = 200;
+const QString Workstations = u"8"_s;
+const QString Postings = u"1000"_s;
+const QString Kills = u"200"_s;
 /// Shorter stretches of work, each on a book of its own, measured in turn.
 constexpr int Rounds = 5;
-constexpr int RoundPostings = 200;
+const QString RoundPostings = u"200"_s;
 
 /// At least 0.6 of the postings that the bare statements reach in the same time.
 constexpr double Throughput = 1 / 0.6;
 
-/// Prints a stretch of work. What is wrong in the book is counted over all of them.
-void tell(const office::Outcome& outcome, int& faults) {
-    std::printf("  %s\n", qUtf8Printable(outcome.text()));
-    for (const QString& fault : outcome.faults.mid(0, 10))
-        std::printf("    %s\n", qUtf8Printable(fault));
-    std::fflush(stdout);
-    faults += static_cast<int>(outcome.faults.size());
-}
-
-/// Milliseconds of the whole office for one posting.
-double pace(const office::Outcome& outcome) {
-    return outcome.seconds * 1000 / outcome.posted;
-}
-
-void measurePostings(Report& report, office::Engine engine, const QString& name) {
-    if (!report.wanted(name)) return;
-    const QString bareProgram = QCoreApplication::applicationDirPath() + u"/bare_workstation"_s;
-    std::vector<double> ours, bare;
+struct Outcome {
+    double pace = 0;  ///< milliseconds of the whole office for one posting
     int faults = 0;
-    for (int round = 0; round < Rounds; ++round) {
-        for (const bool isOurs : {round % 2 == 0, round % 2 != 0}) {
-            office::Office office(engine, Workstations);
-            const office::Outcome outcome =
-                office.work(Workstations, RoundPostings, isOurs ? QString() : bareProgram);
-            // The bare sums are the engine's own, not 32-bit floats: nobody audits them.
-            if (isOurs) tell(outcome, faults);
-            (isOurs ? ours : bare).push_back(pace(outcome));
-        }
+    double release = 0;  ///< milliseconds from a kill until what was held was free
+};
+
+/// Runs the office and prints what it says.
+Outcome office(const QString& engine, const QStringList& task) {
+    QProcess script;
+    script.setProcessChannelMode(QProcess::ForwardedErrorChannel);
+    script.start(u"python3"_s, QStringList{u"tests/workstations/office.py"_s,
+                                           QCoreApplication::applicationDirPath(), engine} +
+                                   task);
+    script.waitForFinished(-1);
+    const QList<QByteArray> lines = script.readAll().trimmed().split('\n');
+    const QList<QByteArray> figures = lines.last().split(' ');
+    if (figures.size() != 4) throw std::runtime_error("the office did not work");
+    for (const QByteArray& line : lines.mid(0, lines.size() - 1))
+        std::printf("%s\n", line.constData());
+    std::fflush(stdout);
+    return {figures[0].toDouble() * 1000 / figures[1].toDouble(), figures[2].toInt(),
+            figures[3].toDouble()};
+}
+
+void measurePostings(Report& report, const QString& engine) {
+    const QString name = u"workstations/"_s + engine;
+    if (!report.wanted(name)) return;
+    const QStringList round{u"work"_s, Workstations, RoundPostings};
+    std::vector<double> ours, bare;
+    for (int at = 0; at < Rounds; ++at) {
+        // The order changes, so that neither always runs behind the other.
+        if (at % 2 != 0) ours.push_back(office(engine, round).pace);
+        bare.push_back(office(engine, round + QStringList{u"bare_workstation"_s}).pace);
+        if (at % 2 == 0) ours.push_back(office(engine, round).pace);
     }
     report.ratio(name, Throughput, ours, bare);
-    office::Office office(engine, Workstations);
-    tell(office.work(Workstations, Postings), faults);
-    report.value(name + u" faults"_s, u""_s, 0, faults);
+    report.value(name + u" faults"_s, u""_s, 0,
+                 office(engine, {u"work"_s, Workstations, Postings}).faults);
 }
 
-void measureKills(Report& report, office::Engine engine, const QString& name) {
+void measureKills(Report& report, const QString& engine) {
+    const QString name = u"workstations/"_s + engine + u" killed"_s;
     if (!report.wanted(name)) return;
-    office::Office office(engine, Kills + Workstations);
-    int faults = 0;
-    const office::Outcome outcome = office.workThroughKills(4, Kills);
-    tell(outcome, faults);
-    tell(office.work(4, 50), faults);
-    report.value(name + u" release"_s, u"ms"_s, 1000, outcome.slowestRelease);
-    report.value(name + u" faults"_s, u""_s, 0, faults);
+    const Outcome outcome = office(engine, {u"kill"_s, u"4"_s, Kills});
+    report.value(name + u", release"_s, u"ms"_s, 1000, outcome.release);
+    report.value(name + u", faults"_s, u""_s, 0, outcome.faults);
 }
 
 }  // namespace
 
 void measureWorkstations(Report& report) {
-    using office::Engine;
-    measurePostings(report, Engine::Sqlite, u"workstations/sqlite"_s);
-    measurePostings(report, Engine::Postgres, u"workstations/postgresql"_s);
-    measureKills(report, Engine::Sqlite, u"workstations killed/sqlite"_s);
-    measureKills(report, Engine::Postgres, u"workstations killed/postgresql"_s);
+    for (const QString& engine : {u"sqlite"_s, u"postgresql"_s}) {
+        measurePostings(report, engine);
+        measureKills(report, engine);
+    }
 }
 
 }  // namespace benchmarks

@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
 // What the scripts cannot do by themselves. Each runs until its input ends.
 //
-//   endtoend_helper server               a private PostgreSQL server; says its folder
-//   endtoend_helper hold SECONDS SELECT  holds the first row of a statement as an editing screen
-//                                        does; says "held", or why not after so many seconds
+//   endtoend_helper server   a private PostgreSQL server; says its folder
+//   endtoend_helper hold     holds rows as editing screens do. A line of its input is a number of
+//                            seconds and a statement: it lets go of the row that it held, goes
+//                            through those of the statement, holding each, keeps the last one and
+//                            says "held", or why not after so many seconds
 #include <QCoreApplication>
+#include <QTextStream>
 #include <cstdio>
 
 #include "boundary/Login.h"
@@ -16,35 +19,39 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-void sayAndWait(const QString& text) {
+void say(const QString& text) {
     std::printf("%s\n", qUtf8Printable(text));
     std::fflush(stdout);
-    while (std::getchar() != EOF) {
-    }
 }
 
-void hold(int seconds, const QString& statement) {
-    const ado::RecordsetPtr rows = ado::Recordset::create();
-    QString said = u"held"_s;
+QString hold(ado::Recordset& rows, const QString& line) {
+    const ado::ConnectionPtr book = environment::dtZelmars::instance().MSAccess();
+    book->CommandTimeout = line.section(u' ', 0, 0).toInt();
     try {
-        boundary::Login();
-        const ado::ConnectionPtr book = environment::dtZelmars::instance().MSAccess();
-        book->CommandTimeout = seconds;
-        rows->Open(statement, book, ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
-        rows->value(0);
+        if (rows.State() == ado::adStateOpen) rows.Close();
+        rows.Open(line.section(u' ', 1), book, ado::adOpenStatic, ado::adLockPessimistic,
+                  ado::adCmdUnknown);
+        rows.MoveLast();
+        const qint64 count = rows.RecordCount();
+        rows.MoveFirst();
+        for (qint64 row = 1; row < count; ++row, rows.MoveNext()) rows.value(0);
+        if (count > 0) rows.value(0);
     } catch (const core::Failure& failure) {
-        said = failure.text();
+        return failure.text();
     }
-    sayAndWait(said);
+    return u"held"_s;
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
     const QCoreApplication application(argc, argv);
-    const QStringList words = QCoreApplication::arguments();
-    if (words.value(1) == "server"_L1)
-        sayAndWait(support::Server::instance().folder());
+    const bool isServer = QCoreApplication::arguments().value(1) == "server"_L1;
+    if (isServer)
+        say(support::Server::instance().folder());
     else
-        hold(words.value(2).toInt(), words.value(3));
+        boundary::Login();
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    QTextStream input(stdin);
+    for (QString line; input.readLineInto(&line);) say(hold(*rows, line));
 }

@@ -7,13 +7,12 @@ Usage: account.py FOLDER_OF_THE_PROGRAMS [sqlite|postgresql [FOLDER_FOR_PICTURES
 
 import os
 import sys
-import tempfile
-from contextlib import ExitStack
 from datetime import date
 
-from books import Helper, make_sample, single
-from desktop import Desktop, Failed, surroundings, wait_until
+from books import single
+from desktop import Failed, wait_until
 from entry import ENTRY, MAIN, MEMBER
+from play import play
 
 ACCOUNT = "Lançamento de Zelmar"
 COLUMNS = ("movimento_no, socio_id, tipo, modo_pagamento, data, codABC, rubrica_id, doc_valor, "
@@ -165,21 +164,5 @@ def account(desktop, programs, book):
         {date.today().isoformat()})
 
 
-def main(programs, engine="sqlite", pictures=None):
-    with tempfile.TemporaryDirectory() as own, ExitStack() as stack:
-        environment = surroundings(own, pictures)
-        host = None
-        if engine == "postgresql":
-            host = stack.enter_context(Helper(programs, environment, "server")).said
-        book = make_sample(programs, environment, own, host)
-        with Desktop(environment) as desktop:
-            try:
-                account(desktop, programs, book)
-            except Failed as failure:
-                desktop.show("falhou")
-                sys.exit(f"failed: {failure}")
-    print("1 passed, 0 failed")
-
-
 if __name__ == "__main__":
-    main(*sys.argv[1:])
+    play(account, *sys.argv[1:])

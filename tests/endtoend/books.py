@@ -14,13 +14,12 @@ def single(value):
 
 
 class Helper:
-    """A helper process; it says one line and ends when it is let go."""
+    """A helper process; it ends when it is let go."""
 
-    def __init__(self, programs, environment, *words):
+    def __init__(self, programs, environment, word):
         self.process = subprocess.Popen(
-            [os.path.join(programs, "endtoend_helper"), *words], env=environment, text=True,
+            [os.path.join(programs, "endtoend_helper"), word], env=environment, text=True,
             stdin=subprocess.PIPE, stdout=subprocess.PIPE)
-        self.said = self.process.stdout.readline().strip()
 
     def __enter__(self):
         return self
@@ -29,6 +28,16 @@ class Helper:
         self.process.stdin.close()
         self.process.stdout.close()
         self.process.wait(20)
+
+    def answer(self):
+        return self.process.stdout.readline().strip()
+
+    def hold(self, seconds, statement):
+        """Holds the rows of a statement one after the other and keeps the last; "held", or why
+        not after so many seconds."""
+        self.process.stdin.write(f"{seconds} {statement}\n")
+        self.process.stdin.flush()
+        return self.answer()
 
 
 class SqliteBook:
@@ -41,6 +50,10 @@ class SqliteBook:
             return [{name.lower(): row[name] for name in row.keys()}
                     for row in book.execute(statement, values)]
 
+    def write(self, statements):
+        with sqlite3.connect(self.file) as book:
+            book.executescript(statements)
+
     def row(self, statement, *values):
         return next(iter(self.rows(statement, *values)), None)
 
@@ -52,25 +65,32 @@ class ServerBook(SqliteBook):
     def rows(self, statement, *values):
         for value in values:
             statement = statement.replace("?", f"'{value}'", 1)
-        lines = subprocess.run(
-            ["psql", "-XAtq", "-h", self.host, "-U", "dono", "zelmars", "-c",
-             f"SELECT row_to_json(t) FROM ({statement}) t"],
-            check=True, text=True, stdout=subprocess.PIPE).stdout.splitlines()
+        lines = self._psql(f"SELECT row_to_json(t) FROM ({statement}) t").splitlines()
         # The server shows a 32-bit float by its shortest decimal.
         return [{name: single(value) if name.endswith("_ac") and value is not None else value
                  for name, value in json.loads(line).items()} for line in lines]
 
 
-def make_sample(programs, environment, own, host=None):
-    """A sample book in a folder, or on the server at that host, which the registry then names."""
+    def write(self, statements):
+        self._psql(statements)
+
+    def _psql(self, statements):
+        return subprocess.run(["psql", "-XAtq", "-h", self.host, "-U", "dono", "zelmars"],
+                              input=statements, check=True, text=True,
+                              stdout=subprocess.PIPE).stdout
+
+
+def make_book(programs, environment, own, host=None, content=("--sample",)):
+    """A book in a folder, or on the server at that host, which the registry then names."""
     def zelmars(*words):
         subprocess.run([os.path.join(programs, "zelmars"), *words], check=True,
+                       stdout=subprocess.DEVNULL,
                        env=dict(environment, QT_QPA_PLATFORM="offscreen",
                                 ZELMARS_ADMIN_PASSWORD="-", ZELMARS_USER_PASSWORD="segredo"))
     zelmars("register")
     if host:
         zelmars("init", "--server", "postgresql:" + host, "--catalog", "zelmars", "--admin", "dono",
-                "--sample")
+                *content)
         return ServerBook(host)
-    zelmars("init", "--sample", own + "/book")
+    zelmars("init", *content, own + "/book")
     return SqliteBook(own + "/book")

@@ -7,15 +7,14 @@ Usage: road_of_one_document.py FOLDER_OF_THE_PROGRAMS [sqlite|postgresql [FOLDER
 
 import os
 import sys
-import tempfile
-from contextlib import ExitStack
 from datetime import date
 from decimal import ROUND_HALF_UP, Decimal
 
-from books import Helper, make_sample, single
-from desktop import Desktop, Failed, surroundings, wait_until
+from books import single
+from desktop import Failed, wait_until
 from entry import (ENTRY, EXIT, MAIN, MEMBER, choose_member_and_person, choose_person,
                    fill_in_fields, leave, post)
+from play import play
 
 
 def money(value):
@@ -149,21 +148,5 @@ def road(desktop, programs, book):
     desktop.show("lista")
 
 
-def main(programs, engine="sqlite", pictures=None):
-    with tempfile.TemporaryDirectory() as own, ExitStack() as stack:
-        environment = surroundings(own, pictures)
-        host = None
-        if engine == "postgresql":
-            host = stack.enter_context(Helper(programs, environment, "server")).said
-        book = make_sample(programs, environment, own, host)
-        with Desktop(environment) as desktop:
-            try:
-                road(desktop, programs, book)
-            except Failed as failure:
-                desktop.show("falhou")
-                sys.exit(f"failed: {failure}")
-    print("1 passed, 0 failed")
-
-
 if __name__ == "__main__":
-    main(*sys.argv[1:])
+    play(road, *sys.argv[1:])

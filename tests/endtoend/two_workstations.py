@@ -12,7 +12,7 @@ import tempfile
 import time
 from datetime import date
 
-from books import Helper, make_sample, single
+from books import Helper, make_book, single
 from desktop import Desktop, Failed, surroundings, wait_until
 from entry import ENTRY, EXIT, choose_member_and_person, fill_in_fields
 
@@ -50,8 +50,8 @@ def post_both(desktop, programs, book):
                  for document, amount in AMOUNTS.items()]
     desktop.show("perguntas")
     # Held up at the counter, both are let go at one moment.
-    with Helper(programs, desktop.environment, "hold", "5", "select * from tbContadores") as gate:
-        require(gate.said == "held", gate.said)
+    with Helper(programs, desktop.environment, "hold") as gate:
+        require(gate.hold(5, "select * from tbContadores") == "held", "the counter is not held")
         for _, question in questions:
             desktop.turn_to(question)
             desktop.keys("alt+s")
@@ -86,13 +86,14 @@ def work(desktop, programs, book):
     rubric = book.row("SELECT * FROM tbZelmar_Plafonds WHERE code = ?", RUBRIC)
     counter = book.row("SELECT zelmars FROM tbContadores")["zelmars"]
     row = f"Select * from tbZelmar_Plafonds where rubrica_id = {rubric['rubrica_id']}"
-    with Helper(programs, desktop.environment, "hold", "5", row) as screen:
-        require(screen.said == "held", screen.said)
+    with Helper(programs, desktop.environment, "hold") as screen:
+        require(screen.hold(5, row) == "held", "the rubric is not held")
         post_both(desktop, programs, book)
         check_book(book, rubric, counter)
-        with Helper(programs, desktop.environment, "hold", "1", row) as other:
-            print(" ", other.said)
-            require("está a ser usada por" in other.said and "@" in other.said,
+        with Helper(programs, desktop.environment, "hold") as other:
+            refusal = other.hold(1, row)
+            print(" ", refusal)
+            require("está a ser usada por" in refusal and "@" in refusal,
                     "the row was not held all the time")
 
 
@@ -100,7 +101,7 @@ def main(programs, pictures=None):
     with tempfile.TemporaryDirectory() as own:
         environment = surroundings(own, pictures)
         with Helper(programs, environment, "server") as server:
-            book = make_sample(programs, environment, own, server.said)
+            book = make_book(programs, environment, own, server.answer())
             with Desktop(environment) as desktop:
                 try:
                     work(desktop, programs, book)
