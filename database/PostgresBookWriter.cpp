@@ -1,9 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "database/PostgresBookWriter.h"
 
+#include <QRegularExpression>
 #include <charconv>
 
+#include "platform/core/Failure.h"
+
 namespace database {
+
+using namespace Qt::StringLiterals;
 
 namespace {
 
@@ -73,6 +78,16 @@ void append(QByteArray& line, const Value& value) {
     }
 }
 
+/// The row that the server stumbled over. It counts the lines of what it was given; people know a
+/// row by what stands in it.
+QString stumblingBlock(const QString& failure, const QByteArray& lines) {
+    static const QRegularExpression numbered(u"COPY [^,]+, \\w+ (\\d+)"_s);
+    const int number = numbered.match(failure).captured(1).toInt();
+    if (number < 1) return {};
+    QString row = QString::fromUtf8(lines.split('\n').value(number - 1)).left(200);
+    return u"\nLinha: "_s + row.replace(u'\t', u" | "_s);
+}
+
 }  // namespace
 
 void PostgresBookWriter::add(const Table& table, const std::vector<Value>& values) {
@@ -97,7 +112,12 @@ void PostgresBookWriter::flush() {
 
 void PostgresBookWriter::flush(const Table& table, QByteArray& lines) {
     if (lines.isEmpty()) return;
-    book_.copyIn("COPY " + table.name + " (" + table.columnList() + ") FROM STDIN", lines);
+    try {
+        book_.copyIn("COPY " + table.name + " (" + table.columnList() + ") FROM STDIN", lines);
+    } catch (const core::Failure& failure) {
+        throw core::Failure(failure.number(),
+                            failure.text() + stumblingBlock(failure.text(), lines), failure.code());
+    }
     lines.resize(0);
 }
 

@@ -30,7 +30,7 @@ BEGIN
         SELECT oid FROM pg_proc
          WHERE pronamespace = 'pg_catalog'::regnamespace
            AND (proname ~ '^lo_|^pg_sleep|^(query|cursor)_to_xml|^(table|schema|database)_to_xml'
-                OR proname IN ('loread', 'lowrite', 'set_config', 'setseed', 'ts_stat',
+                OR proname IN ('loread', 'lowrite', 'set_config', 'setseed', 'ts_stat', 'ts_rewrite',
                                'pg_terminate_backend', 'pg_cancel_backend', 'pg_notify',
                                'pg_logical_emit_message', 'pg_export_snapshot'))
     LOOP

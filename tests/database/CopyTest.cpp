@@ -165,7 +165,7 @@ TEST_F(Copy, RefusesAndLeavesTheTargetAsItWas) {
     expect(u"basta"_s, failureOf(inFile, back, interrupt));
     file.rows(
         u"update tbSocios set nome_guerra = '%1' where socio_id = 9"_s.arg(QString(41, u'x')));
-    expect(u"character varying(40)"_s, failureOf(inFile, onServer));
+    expect(u"Linha: 9 | "_s, failureOf(inFile, onServer));
     file.rows(u"update tbSocios set nome_guerra = null, nib = 1; alter table tbSocios add x"_s);
     expect(u"destino falta a coluna tbsocios.x"_s, failureOf(inFile, onServer));
     file.rows(u"alter table tbSocios drop x; drop view vwZelmars_Movimentos_Vigor"_s);
