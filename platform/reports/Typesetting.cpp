@@ -93,7 +93,7 @@ const Face::Letter* Face::letter(QChar c) const {
     Letter& known = letters_[at];
     if (known.width < 0) {
         known.glyph = raw_.glyphIndexesForString(c).value(0);
-        known.width = static_cast<float>(metrics_.horizontalAdvance(c));
+        known.width = std::round(metrics_.horizontalAdvance(c));
     }
     return known.glyph != 0 ? &known : nullptr;
 }
@@ -103,7 +103,7 @@ double Face::width(const QString& text) const {
     for (const QChar c : text) {
         const Letter* known = letter(c);
         if (!known) return metrics_.horizontalAdvance(text) / UnitsPerMillimetre;
-        units += static_cast<double>(known->width);
+        units += known->width;
     }
     return units / UnitsPerMillimetre;
 }
@@ -117,7 +117,7 @@ void Face::draw(QPainter& painter, const QPointF& at, const QString& text) const
         if (!known) return painter.drawText(at, text);
         glyphs.append(known->glyph);
         places.append(QPointF(x, 0));
-        x += static_cast<double>(known->width);
+        x += known->width;
     }
     QGlyphRun run;
     run.setRawFont(raw_);

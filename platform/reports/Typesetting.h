@@ -18,7 +18,8 @@ namespace reports {
 
 inline constexpr double UnitsPerMillimetre = 1200 / 25.4;
 
-/// A style's font, its size in those units, without kerning: a text is as wide as its letters.
+/// A style's font, its size in those units. Letters are whole units wide and not kerned: a text is
+/// as wide as its letters together, and a PDF is a tenth smaller.
 class Face {
 public:
     explicit Face(const Style& of);
@@ -38,7 +39,7 @@ public:
 private:
     struct Letter {
         quint32 glyph = 0;
-        float width = -1;  ///< in units; negative while the letter is not known
+        double width = -1;  ///< in units; negative while the letter is not known
     };
     /// Null for a letter of scripts that join or reorder theirs, and for one that the font lacks:
     /// a text with such a letter is left to the toolkit as a whole, which takes twice as long.
