@@ -156,10 +156,12 @@ void Preview::Implementation::act(PreviewCommand command) {
     message->clear();
     run(command);
     if (form->isUnloaded()) return;
+    // Behind a dialog, without a window manager, nobody else gives the focus back.
+    if (!form->isActiveWindow()) form->activateWindow();
     const QWidget* focus = form->ActiveControl();
-    const bool typing =
-        command == PreviewCommand::AskPage || (focus && findBar->isAncestorOf(focus));
-    if (!typing || findBar->isHidden()) view->setFocus();
+    const bool finding = findBar->isVisible() && focus && findBar->isAncestorOf(focus);
+    const bool asked = command == PreviewCommand::AskPage || command == PreviewCommand::AskZoom;
+    if (!asked && !finding) view->setFocus();
     showPlace();
 }
 
@@ -180,6 +182,8 @@ void Preview::Implementation::run(PreviewCommand command) {
             return view->goToPage(view->currentPage() + 1);
         case LastPage:
             return view->goToPage(pages->count() - 1);
+        case AskZoom:
+            return bar->askZoom();
         case ZoomOut:
             return view->zoomBy(-1);
         case ZoomIn:
@@ -223,6 +227,7 @@ bool Preview::Implementation::allPagesAreThere() {
         QProgressDialog dialog(u"A preparar as páginas…"_s, u"&Cancelar"_s, 0, 0, form);
         dialog.setObjectName(u"Espera"_s);
         dialog.setWindowTitle(form->Caption());
+        dialog.setMinimumWidth(ProgressWidth);
         waiting = &dialog;
         dialog.exec();
     }

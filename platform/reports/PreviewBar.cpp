@@ -90,7 +90,8 @@ void PreviewBar::addPages(QBoxLayout* row, const PreviewHandler& handler) {
 void PreviewBar::addZoom(QBoxLayout* row, const PreviewHandler& handler) {
     zoom_ = new QComboBox;
     zoom_->setObjectName(u"Zoom"_s);
-    zoom_->setToolTip(u"Tamanho: 100 % (Ctrl+0), largura (Ctrl+1), página inteira (Ctrl+2)"_s);
+    zoom_->setToolTip(
+        u"Tamanho (Alt+Z): 100 % (Ctrl+0), largura (Ctrl+1), página inteira (Ctrl+2)"_s);
     zoom_->setEditable(true);
     zoom_->setInsertPolicy(QComboBox::NoInsert);
     zoom_->setCompleter(nullptr);
@@ -141,6 +142,11 @@ void PreviewBar::setOutputEnabled(bool enabled) {
 void PreviewBar::askPage() {
     page_->setFocus(Qt::ShortcutFocusReason);
     page_->selectAll();
+}
+
+void PreviewBar::askZoom() {
+    zoom_->setFocus(Qt::ShortcutFocusReason);
+    zoom_->lineEdit()->selectAll();
 }
 
 void PreviewBar::pageTyped() {

@@ -43,8 +43,9 @@ public:
     std::function<void(double percent)> onPercent;
     std::function<void(PreviewView::Fit fit)> onFit;
 
-    /// Puts the cursor into the field of the page's number.
+    // Put the cursor into the field of the page's number, of the size.
     void askPage();
+    void askZoom();
 
 private:
     void addOutput(QBoxLayout* row, const PreviewHandler& handler);

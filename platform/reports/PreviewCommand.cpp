@@ -21,6 +21,7 @@ constexpr PreviewAction Actions[] = {
     {AskPage, {}, {}, {}, u"Ctrl+G"},
     {NextPage, u"Seguinte", u"›", u"Página seguinte (Ctrl+PgDn)", u"Ctrl+PgDown"},
     {LastPage, u"Ultima", u"»", u"Última página (End)", {}},
+    {AskZoom, {}, {}, {}, u"Alt+Z"},
     {ZoomOut, u"Reduzir", u"−", u"Reduzir (Ctrl+-)", u"Ctrl+-"},
     {ZoomIn, u"Aumentar", u"+", u"Aumentar (Ctrl++)", u"Ctrl++"},
     {ZoomIn, {}, {}, {}, u"Ctrl+="},

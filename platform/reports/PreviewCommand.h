@@ -16,6 +16,7 @@ enum class PreviewCommand {
     AskPage,  ///< the cursor into the page's field
     NextPage,
     LastPage,
+    AskZoom,  ///< the cursor into the size's field
     ZoomOut,
     ZoomIn,
     ActualSize,

@@ -24,6 +24,7 @@ public:
         : dialog_(text, u"&Cancelar"_s, 0, pages, parent) {
         dialog_.setObjectName(u"Progresso"_s);
         dialog_.setWindowTitle(parent->windowTitle());
+        dialog_.setMinimumWidth(ProgressWidth);
         dialog_.setWindowModality(Qt::WindowModal);
         dialog_.setMinimumDuration(400);
         dialog_.setValue(0);
@@ -107,8 +108,8 @@ QString printAsking(QWidget* parent, const Pages& pages, int current) {
     }
     Progress progress(parent, u"A imprimir…"_s, to - from + 1);
     if (!print(pages, printer, from, to, progress.goesOn())) return {};
-    return u"Enviado para a impressora: %1 a %2 de %3 páginas"_s.arg(from + 1).arg(to + 1).arg(
-        pages.count());
+    if (!printer.outputFileName().isEmpty()) return written(printer.outputFileName());
+    return u"Enviado para a impressora «%1»"_s.arg(printer.printerName());
 }
 
 QString savePdfAsking(QWidget* parent, const Pages& pages) {
