@@ -11,8 +11,9 @@ using namespace Qt::StringLiterals;
 
 namespace entry {
 
+using forms::addPair;
+using forms::addRow;
 using forms::displayBox;
-using forms::fieldLabel;
 using forms::pairsIn;
 using forms::textBox;
 using forms::TextBox;
@@ -71,14 +72,8 @@ void frmMovimentos::makeControls() {
 QWidget* frmMovimentos::beneficiaryFrame() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
     QGridLayout* grid = pairsIn(frame, OnePair);
-    grid->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor, u"Label1"_s), 0, 0);
-    grid->addWidget(No_Kor, 0, 1);
-    grid->addWidget(Text2, 0, 2);
-    grid->addWidget(Command1, 0, 3);
-    grid->addWidget(fieldLabel(u"Familiar:"_s, Text3, u"Label3"_s), 1, 0);
-    grid->addWidget(Text3, 1, 1);
-    grid->addWidget(Text4, 1, 2);
-    grid->addWidget(Command2, 1, 3);
+    addRow(grid, 0, u"Número KOR:"_s, {No_Kor, Text2, Command1}, u"Label1"_s);
+    addRow(grid, 1, u"Familiar:"_s, {Text3, Text4, Command2}, u"Label3"_s);
     for (TextBox* code : {No_Kor, Text3}) code->setFixedWidth(widthFor(code, u"0000000000"));
     // 6375 twips, fifteen to the pixel.
     Text2->setMinimumWidth(425);
@@ -90,38 +85,24 @@ QWidget* frmMovimentos::beneficiaryFrame() {
 QWidget* frmMovimentos::documentFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Documento:"_s);
     QGridLayout* grid = pairsIn(frame, ThreePairs);
-    Label19 = fieldLabel(u"Recebido Euros:"_s, Text9, u"Label19"_s);
-    grid->addWidget(fieldLabel(u"Data:"_s, Text1), 0, 0);
-    grid->addWidget(Text1, 0, 1);
-    grid->addWidget(fieldLabel(u"Nº Documento:"_s, Text5), 0, 2);
-    grid->addWidget(Text5, 0, 3);
-    grid->addWidget(fieldLabel(u"Valor Euros:"_s, Text6), 0, 4);
-    grid->addWidget(Text6, 0, 5);
-    grid->addWidget(Label19, 1, 0);
-    grid->addWidget(Text9, 1, 1);
-    grid->addWidget(fieldLabel(u"Taxa IVA:"_s, Text11), 1, 2);
-    grid->addWidget(Text11, 1, 3);
-    grid->addWidget(fieldLabel(u"Imposto IVA:"_s, Text10), 1, 4);
-    grid->addWidget(Text10, 1, 5);
-    grid->addWidget(fieldLabel(u"Entidade:"_s, DataCombo4), 2, 0);
-    grid->addWidget(DataCombo4, 2, 1, 1, 5);
-    grid->addWidget(fieldLabel(u"Observações:"_s, Text12), 3, 0);
-    grid->addWidget(Text12, 3, 1, 1, 5);
+    addPair(grid, 0, 0, u"Data:"_s, Text1);
+    addPair(grid, 0, 1, u"Nº Documento:"_s, Text5);
+    addPair(grid, 0, 2, u"Valor Euros:"_s, Text6);
+    Label19 = addPair(grid, 1, 0, u"Recebido Euros:"_s, Text9, u"Label19"_s);
+    addPair(grid, 1, 1, u"Taxa IVA:"_s, Text11);
+    addPair(grid, 1, 2, u"Imposto IVA:"_s, Text10);
+    addPair(grid, 2, 0, u"Entidade:"_s, DataCombo4, {}, 3);
+    addPair(grid, 3, 0, u"Observações:"_s, Text12, {}, 3);
     return frame;
 }
 
 QWidget* frmMovimentos::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Propriedades do Lançamento:"_s);
     QGridLayout* grid = pairsIn(frame, OnePair);
-    Label18 = fieldLabel(u"Hospital:"_s, DataCombo2, u"Label18"_s);
-    grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
-    grid->addWidget(Text7, 0, 1);
-    grid->addWidget(fieldLabel(u"Rúbrica:"_s, DataCombo1), 0, 2);
-    grid->addWidget(DataCombo1, 0, 3);
-    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 1, 0);
-    grid->addWidget(Text8, 1, 1);
-    grid->addWidget(Label18, 1, 2);
-    grid->addWidget(DataCombo2, 1, 3);
+    addPair(grid, 0, 0, u"Data:"_s, Text7);
+    addPair(grid, 0, 1, u"Rúbrica:"_s, DataCombo1);
+    addPair(grid, 1, 0, u"Tipo:"_s, Text8);
+    Label18 = addPair(grid, 1, 1, u"Hospital:"_s, DataCombo2, u"Label18"_s);
     for (TextBox* box : {Text7, Text8}) box->setFixedWidth(widthFor(box, u"00-00-00000"));
     // The hospital's row keeps its place while it is hidden.
     grid->setColumnMinimumWidth(2, Label18->sizeHint().width());
@@ -141,24 +122,17 @@ QWidget* frmMovimentos::resultFrame() {
         bold.setBold(true);
         outcome->setFont(bold);
     }
+    addPair(grid, 0, 0, u"Incidência:"_s, Incidencia);
+    addPair(grid, 0, 1, u"Comparticipação:"_s, Comparticipacao);
+    Label12 = addPair(grid, 0, 2, u"Plafond:"_s, LimiteAplicavel, u"Label12"_s);
+    addPair(grid, 1, 0, u"Saldo C.Corrente:"_s, SaldoCC);
+    addPair(grid, 1, 1, u"Ilíquido:"_s, Iliquido);
+    addPair(grid, 1, 2, u"Saldo Plafond:"_s, SaldoPlafond);
+    addPair(grid, 2, 0, u"Crédito:"_s, Credito);
+    addPair(grid, 2, 1, u"Débito:"_s, Debito);
+    addPair(grid, 2, 2, u"Líquido:"_s, Liquido);
     const int amountWidth = widthFor(Credito, u"(€ 999.999.999,99)");
-    const auto put = [=](int row, int column, const QString& text, TextBox* field,
-                         const QString& labelName = {}) {
-        QLabel* label = fieldLabel(text, field, labelName);
-        field->setMinimumWidth(amountWidth);
-        grid->addWidget(label, row, 2 * column);
-        grid->addWidget(field, row, 2 * column + 1);
-        return label;
-    };
-    put(0, 0, u"Incidência:"_s, Incidencia);
-    put(0, 1, u"Comparticipação:"_s, Comparticipacao);
-    Label12 = put(0, 2, u"Plafond:"_s, LimiteAplicavel, u"Label12"_s);
-    put(1, 0, u"Saldo C.Corrente:"_s, SaldoCC);
-    put(1, 1, u"Ilíquido:"_s, Iliquido);
-    put(1, 2, u"Saldo Plafond:"_s, SaldoPlafond);
-    put(2, 0, u"Crédito:"_s, Credito);
-    put(2, 1, u"Débito:"_s, Debito);
-    put(2, 2, u"Líquido:"_s, Liquido);
+    for (TextBox* amount : frame->findChildren<TextBox*>()) amount->setMinimumWidth(amountWidth);
     return frame;
 }
 
@@ -166,8 +140,7 @@ void frmMovimentos::layOut() {
     auto* foot = new QWidget;
     QGridLayout* below = pairsIn(foot, OnePair);
     below->setContentsMargins(12, 2, 0, 0);
-    below->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 0, 0);
-    below->addWidget(DataCombo3, 0, 1);
+    addRow(below, 0, u"Modo de Pagamento:"_s, {DataCombo3});
     // Room for the arrow beside the longest entry.
     DataCombo3->setMinimumWidth(widthFor(DataCombo3, u"TRF - Transferência bancária") + 24);
     below->setColumnStretch(2, 1);
@@ -175,23 +148,16 @@ void frmMovimentos::layOut() {
     for (forms::Button* button : {Command6, Command5, Command3, Command4})
         below->addWidget(button, 0, column++);
 
-    auto* all = new QVBoxLayout(this);
-    all->setContentsMargins(0, 0, 0, 0);
-    all->setSpacing(0);
     QWidget* band = forms::headingBand(
         u"Lançamento de Documentos"_s,
         u"Lançamento no Plano de Saúde de documentos na conta corrente do associado."_s,
         u"Label25"_s, u"Label26"_s, u"Image1"_s);
     band->setObjectName(u"Frame5"_s);
-    all->addWidget(band);
-    auto* body = new QVBoxLayout;
-    body->setContentsMargins(12, 10, 12, 12);
-    body->setSpacing(9);
+    QVBoxLayout* body = forms::bodyUnder(band, this);
     for (QWidget* part :
          {beneficiaryFrame(), documentFrame(), propertiesFrame(), resultFrame(), foot})
         body->addWidget(part);
     body->addStretch(1);
-    all->addLayout(body);
 
     // Enter tries the document out, which does no harm; posting wants its own key.
     Command5->setDefault(true);
@@ -200,10 +166,9 @@ void frmMovimentos::layOut() {
 }
 
 void frmMovimentos::setTabOrders() {
-    QWidget* const order[] = {No_Kor,     Command1, Command2,   Text1,    Text5,      Text6,
-                              Text9,      Text11,   DataCombo4, Text12,   DataCombo1, DataCombo2,
-                              DataCombo3, Command5, Command3,   Command6, Command4};
-    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+    forms::tabThrough({No_Kor, Command1, Command2, Text1, Text5, Text6, Text9, Text11, DataCombo4,
+                       Text12, DataCombo1, DataCombo2, DataCombo3, Command5, Command3, Command6,
+                       Command4});
 }
 
 }  // namespace entry

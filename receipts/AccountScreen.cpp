@@ -88,10 +88,7 @@ void AccountScreen::clearMember() {
 void AccountScreen::makeBeneficiaryFrame() {
     beneficiaryFrame_ = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
     beneficiary_ = forms::pairsIn(beneficiaryFrame_, {u"Modo de Pagamento:"});
-    beneficiary_->addWidget(fieldLabel(u"Número KOR:"_s, No_Kor), 0, 0);
-    beneficiary_->addWidget(No_Kor, 0, 1);
-    beneficiary_->addWidget(Text2, 0, 2);
-    beneficiary_->addWidget(Command1, 0, 3);
+    forms::addRow(beneficiary_, 0, u"Número KOR:"_s, {No_Kor, Text2, Command1});
     No_Kor->setFixedWidth(forms::widthFor(No_Kor, u"0000000000"));
     Text2->setMinimumWidth(forms::widthFor(Text2, u"Maria da Conceição de Vasconcelos"));
     beneficiary_->setColumnStretch(2, 1);
@@ -109,14 +106,8 @@ QWidget* AccountScreen::notesFrame() {
 void AccountScreen::layOut(const QString& title, const QString& explanation,
                            std::initializer_list<QWidget*> frames,
                            std::initializer_list<forms::Button*> buttons) {
-    auto* all = new QVBoxLayout(this);
-    all->setContentsMargins(0, 0, 0, 0);
-    all->setSpacing(0);
-    all->addWidget(forms::headingBand(title, explanation, u"Label25"_s, u"Label26"_s, u"Image1"_s));
-    auto* body = new QVBoxLayout;
-    body->setContentsMargins(12, 10, 12, 12);
-    body->setSpacing(9);
-    all->addLayout(body);
+    QVBoxLayout* body = forms::bodyUnder(
+        forms::headingBand(title, explanation, u"Label25"_s, u"Label26"_s, u"Image1"_s), this);
     body->addWidget(beneficiaryFrame_);
     for (QWidget* frame : frames) body->addWidget(frame);
     body->addWidget(notesFrame(), 1);

@@ -18,7 +18,7 @@ using namespace Qt::StringLiterals;
 
 namespace receipts {
 
-using forms::fieldLabel;
+using forms::addPair;
 
 frmRecebimento::frmRecebimento()
     : AccountScreen(u"frmRecebimento"_s),
@@ -34,24 +34,18 @@ frmRecebimento::frmRecebimento()
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
     Command4->onClick = [this] { Unload(); };
-    QWidget* const order[] = {No_Kor, Command1, Text3,    Credito,  DataCombo3,
-                              Text4,  Text1,    Command3, Command2, Command4};
-    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+    forms::tabThrough(
+        {No_Kor, Command1, Text3, Credito, DataCombo3, Text4, Text1, Command3, Command2, Command4});
 }
 
 QWidget* frmRecebimento::receiptFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Recebimento:"_s);
     QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Número do Cheque:"});
-    grid->addWidget(fieldLabel(u"Data:"_s, Text3), 0, 0);
-    grid->addWidget(Text3, 0, 1);
-    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 0, 2);
-    grid->addWidget(Text8, 0, 3);
-    grid->addWidget(fieldLabel(u"Valor a Creditar:"_s, Credito), 1, 0);
-    grid->addWidget(Credito, 1, 1);
-    grid->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 2, 0);
-    grid->addWidget(DataCombo3, 2, 1);
-    grid->addWidget(fieldLabel(u"Número do Cheque:"_s, Text4), 2, 2);
-    grid->addWidget(Text4, 2, 3);
+    addPair(grid, 0, 0, u"Data:"_s, Text3);
+    addPair(grid, 0, 1, u"Tipo:"_s, Text8);
+    addPair(grid, 1, 0, u"Valor a Creditar:"_s, Credito);
+    addPair(grid, 2, 0, u"Modo de Pagamento:"_s, DataCombo3);
+    addPair(grid, 2, 1, u"Número do Cheque:"_s, Text4);
     return frame;
 }
 

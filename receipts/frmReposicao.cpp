@@ -17,8 +17,16 @@ using namespace Qt::StringLiterals;
 
 namespace receipts {
 
-using forms::fieldLabel;
+using forms::addPair;
 namespace format = core::format;
+
+namespace {
+
+/// Fields of all frames stand under each other.
+constexpr std::initializer_list<QStringView> TwoPairs = {u"Modo de Pagamento:",
+                                                         u"Modo de Pagamento:"};
+
+}  // namespace
 
 frmReposicao::frmReposicao()
     : AccountScreen(u"frmReposicao"_s),
@@ -38,9 +46,8 @@ frmReposicao::frmReposicao()
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
     Command4->onClick = [this] { Unload(); };
-    QWidget* const order[] = {No_Kor, Command1, Command2, Text7,    DataCombo1, DataCombo3,
-                              Debito, Credito,  Text1,    Command3, Command4};
-    for (std::size_t at = 1; at < std::size(order); ++at) setTabOrder(order[at - 1], order[at]);
+    forms::tabThrough({No_Kor, Command1, Command2, Text7, DataCombo1, DataCombo3, Debito, Credito,
+                       Text1, Command3, Command4});
 }
 
 void frmReposicao::bindControls() {
@@ -54,25 +61,17 @@ void frmReposicao::bindControls() {
 }
 
 void frmReposicao::addPersonRow() {
-    QGridLayout* grid = beneficiary();
-    grid->addWidget(fieldLabel(u"Familiar:"_s, Text3), 1, 0);
-    grid->addWidget(Text3, 1, 1);
-    grid->addWidget(Text4, 1, 2);
-    grid->addWidget(Command2, 1, 3);
+    forms::addRow(beneficiary(), 1, u"Familiar:"_s, {Text3, Text4, Command2});
     Text3->setFixedWidth(No_Kor->width());
 }
 
 QWidget* frmReposicao::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Propriedades do Lançamento:"_s);
-    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Modo de Pagamento:"});
-    grid->addWidget(fieldLabel(u"Data:"_s, Text7), 0, 0);
-    grid->addWidget(Text7, 0, 1);
-    grid->addWidget(fieldLabel(u"Rúbrica:"_s, DataCombo1), 0, 2);
-    grid->addWidget(DataCombo1, 0, 3);
-    grid->addWidget(fieldLabel(u"Tipo:"_s, Text8), 1, 0);
-    grid->addWidget(Text8, 1, 1);
-    grid->addWidget(fieldLabel(u"Modo de Pagamento:"_s, DataCombo3), 1, 2);
-    grid->addWidget(DataCombo3, 1, 3);
+    QGridLayout* grid = forms::pairsIn(frame, TwoPairs);
+    addPair(grid, 0, 0, u"Data:"_s, Text7);
+    addPair(grid, 0, 1, u"Rúbrica:"_s, DataCombo1);
+    addPair(grid, 1, 0, u"Tipo:"_s, Text8);
+    addPair(grid, 1, 1, u"Modo de Pagamento:"_s, DataCombo3);
     for (forms::TextBox* box : {Text7, Text8})
         box->setFixedWidth(forms::widthFor(box, u"00-00-00000"));
     grid->setColumnStretch(1, 0);
@@ -81,11 +80,9 @@ QWidget* frmReposicao::propertiesFrame() {
 
 QWidget* frmReposicao::resultFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Resultado do Lançamento:"_s);
-    QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Modo de Pagamento:"});
-    grid->addWidget(fieldLabel(u"Débito:"_s, Debito), 0, 0);
-    grid->addWidget(Debito, 0, 1);
-    grid->addWidget(fieldLabel(u"Crédito:"_s, Credito), 0, 2);
-    grid->addWidget(Credito, 0, 3);
+    QGridLayout* grid = forms::pairsIn(frame, TwoPairs);
+    addPair(grid, 0, 0, u"Débito:"_s, Debito);
+    addPair(grid, 0, 1, u"Crédito:"_s, Credito);
     return frame;
 }
 

@@ -2,7 +2,9 @@
 #include "platform/forms/Fields.h"
 
 #include <QGridLayout>
+#include <QLabel>
 
+#include "platform/forms/Form.h"
 #include "platform/forms/TextBox.h"
 
 namespace forms {
@@ -34,6 +36,41 @@ QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLa
         column += 2;
     }
     return grid;
+}
+
+QLabel* addPair(QGridLayout* grid, int row, int pair, const QString& label, QWidget* field,
+                const QString& labelName, int span) {
+    QLabel* made = fieldLabel(label, field, labelName);
+    grid->addWidget(made, row, 2 * pair);
+    grid->addWidget(field, row, 2 * pair + 1, 1, 2 * span - 1);
+    return made;
+}
+
+void addRow(QGridLayout* grid, int row, const QString& label,
+            std::initializer_list<QWidget*> fields, const QString& labelName) {
+    grid->addWidget(fieldLabel(label, *fields.begin(), labelName), row, 0);
+    int column = 0;
+    for (QWidget* field : fields) grid->addWidget(field, row, ++column);
+}
+
+QVBoxLayout* bodyUnder(QWidget* band, QWidget* window) {
+    auto* all = new QVBoxLayout(window);
+    all->setContentsMargins(0, 0, 0, 0);
+    all->setSpacing(0);
+    all->addWidget(band);
+    auto* body = new QVBoxLayout;
+    body->setContentsMargins(12, 10, 12, 12);
+    body->setSpacing(9);
+    all->addLayout(body);
+    return body;
+}
+
+void tabThrough(std::initializer_list<QWidget*> controls) {
+    QWidget* before = nullptr;
+    for (QWidget* control : controls) {
+        if (before) QWidget::setTabOrder(before, control);
+        before = control;
+    }
 }
 
 }  // namespace forms

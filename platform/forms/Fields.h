@@ -4,6 +4,8 @@
 #include <QStringView>
 
 class QGridLayout;
+class QLabel;
+class QVBoxLayout;
 class QWidget;
 
 namespace forms {
@@ -24,5 +26,20 @@ int widthFor(const QWidget* field, QStringView text);
 /// as the texts given, so that the fields of several frames stand under each other; with several
 /// pairs the fields share the width.
 QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLabels);
+
+/// One pair in such a grid: its label, which is given back, and its field.
+/// @param pair  from the left, from 0
+/// @param span  pairs that the field reaches over
+QLabel* addPair(QGridLayout* grid, int row, int pair, const QString& label, QWidget* field,
+                const QString& labelName = {}, int span = 1);
+/// A row of such a grid: a label and fields beside each other.
+void addRow(QGridLayout* grid, int row, const QString& label,
+            std::initializer_list<QWidget*> fields, const QString& labelName = {});
+
+/// The layout below a heading band, which reaches from edge to edge of the window.
+QVBoxLayout* bodyUnder(QWidget* band, QWidget* window);
+
+/// The order in which Tab goes through controls of one window.
+void tabThrough(std::initializer_list<QWidget*> controls);
 
 }  // namespace forms

@@ -27,31 +27,20 @@ public:
 class Annulment : public Desk {
 protected:
     /// A movement with an accumulator that counts it, of an active member or of one who has left.
-    qint64 movement(bool active, const QVariant& hospital_id = {}) {
-        const QString suffix = active ? QString() : u"_Inactivos"_s;
-        book.insert(u"tbSocios_Acumulados"_s + suffix, {{"socio_id", socio},
-                                                        {"codABC", u"B"_s},
-                                                        {"rubrica_id", 7},
-                                                        {"debito_ac", 150},
-                                                        {"credito_ac", 90.5},
-                                                        {"no_docs", 3}});
-        return book.insert(u"tbZelmar_Movimentos"_s + suffix,
-                           {{"movimento_no", 31},
-                            {"socio_id", socio},
-                            {"codABC", u"B"_s},
-                            {"rubrica_id", 7},
-                            {"hospital_id", hospital_id},
-                            {"tipo", hospital_id.isValid() ? u"HOS"_s : u"DOC"_s},
-                            {"modo_pagamento", u"TRF"_s},
-                            {"doc_no", u"FT 9"_s},
-                            {"doc_data", QDate(2026, 2, 1)},
-                            {"doc_valor", 100},
-                            {"incidencia", 100},
-                            {"liquido", 50},
-                            {"credito", 40.25},
-                            {"debito", 100},
-                            {"created_by", u"ana"_s}});
+    qint64 movement(const QString& suffix, const QString& tipo, const QString& hospital_id) {
+        book.exec(
+            u"insert into tbSocios_Acumulados%1 (socio_id, codABC, rubrica_id, debito_ac, "
+            "credito_ac, no_docs) values (%2, 'B', 7, 150, 90.5, 3)"_s.arg(suffix)
+                .arg(socio));
+        book.exec(
+            u"insert into tbZelmar_Movimentos%1 (movimento_no, socio_id, codABC, rubrica_id, "
+            "hospital_id, tipo, modo_pagamento, doc_no, doc_data, doc_valor, incidencia, "
+            "liquido, credito, debito, created_by) values (31, %2, 'B', 7, %3, '%4', 'TRF', "
+            "'FT 9', '2026-02-01 00:00:00', 100, 100, 50, 40.25, 100, 'ana')"_s.arg(
+                suffix, QString::number(socio), hospital_id, tipo));
+        return book.value(u"select movimento_id from tbZelmar_Movimentos"_s + suffix).toLongLong();
     }
+    qint64 document() { return movement({}, u"DOC"_s, u"null"_s); }
     bool annul(qint64 key, core::Answer answer = core::Answer::Yes) {
         const core::HandlerScope handler;
         const auto row = ado::Recordset::create();
@@ -86,15 +75,19 @@ protected:
     Caller caller;
 };
 
-TEST_F(Annulment, MarksTheMovementAddsItsCorrectionAndTakesTheTotalsBack) {
-    const qint64 document = movement(true);
-    const qint64 bill = movement(false, 5);
-    EXPECT_FALSE(annul(document, core::Answer::No));
+TEST_F(Annulment, MarksTheMovementCorrectsItTakesTheTotalsBackAndRaisesTheFranchiseUsed) {
+    const qint64 key = document();
+    const qint64 bill = movement(u"_Inactivos"_s, u"HOS"_s, u"5"_s);
+    const QString franchise = u"select t_iliquido - t_credito from (%1) f"_s.arg(
+        coverage::statements::franchise(socio, 7));
+    EXPECT_FALSE(annul(key, core::Answer::No));
     EXPECT_EQ(totals(), "150|90.5|3");
+    EXPECT_EQ(book.value(franchise).toDouble(), 9.75);
     const std::string before = movements(u"_Inactivos"_s);
 
-    EXPECT_TRUE(annul(document));
-    EXPECT_EQ(caller.key, document);
+    EXPECT_TRUE(annul(key));
+    EXPECT_EQ(caller.key, key);
+    EXPECT_EQ(book.value(franchise).toDouble(), 50) << "more is used, by the credit annulled";
     EXPECT_EQ(movements(),
               "31|ANL|ANL|NULL|B|7|FT 9|2026-02-01 00:00:00|100|NULL|40.25|100|100|50|ana\n"
               "1|COR|NULL|2026-05-15 00:00:00|B|7|FT 9|2026-02-01 00:00:00|100|NULL|-40.25|-100|"
@@ -113,22 +106,13 @@ TEST_F(Annulment, MarksTheMovementAddsItsCorrectionAndTakesTheTotalsBack) {
     EXPECT_EQ(totals(), "50|50.25|2");
 }
 
-TEST_F(Annulment, RaisesTheFranchiseAlreadyUsed) {
-    const qint64 document = movement(true);
-    const QString used = u"select t_iliquido - t_credito from (%1) f"_s.arg(
-        coverage::statements::franchise(socio, 7));
-    EXPECT_EQ(book.value(used).toDouble(), 9.75);
-    EXPECT_TRUE(annul(document));
-    EXPECT_EQ(book.value(used).toDouble(), 50) << "by the credit annulled";
-}
-
 TEST_F(Annulment, OfAMovementThatVanishedOrWasAnnulledMeanwhileGoesOn) {
-    const qint64 document = movement(true);
-    EXPECT_TRUE(annul(document));
-    EXPECT_TRUE(annul(document)) << "another workstation had it on its screen too";
+    const qint64 key = document();
+    EXPECT_TRUE(annul(key));
+    EXPECT_TRUE(annul(key)) << "another workstation had it on its screen too";
     EXPECT_EQ(totals(), "-50|10|1");
     vanishes = true;
-    EXPECT_TRUE(annul(document));
+    EXPECT_TRUE(annul(key));
     EXPECT_EQ(stored("select tipo, credito from tbZelmar_Movimentos"), "COR|-40.25");
     EXPECT_EQ(totals(), "-150|-30.25|0");
 }
@@ -137,14 +121,14 @@ TEST_F(Annulment, LeavesTheTotalsAloneWhenAFailureWasPending) {
     const core::HandlerScope handler;
     core::err().set(core::RowInUse, u"em uso"_s);
     afterwards = u"Erro não especificado, contacte o Administrador do Sistema. em uso"_s;
-    EXPECT_TRUE(annul(movement(true)));
+    EXPECT_TRUE(annul(document()));
     EXPECT_EQ(stored("select count(*) from tbZelmar_Movimentos"), "2");
     EXPECT_EQ(totals(), "150|90.5|3");
 }
 
 // Mark, counter, correcting row and accumulator are four writes.
 TEST_F(Annulment, ThatFailsLeavesWhatWasWrittenBeforeAndShowsTheEnginesText) {
-    const qint64 document = movement(true);
+    const qint64 key = document();
     const std::tuple<const char*, const char*, const char*> failures[] = {
         // refused; the movements' types, the next number; the totals
         {"update on tbZelmar_Movimentos", "1|DOC|NULL", "150|90.5|3"},
@@ -157,13 +141,13 @@ TEST_F(Annulment, ThatFailsLeavesWhatWasWrittenBeforeAndShowsTheEnginesText) {
         "from tbContadores, tbZelmar_Movimentos group by 1";
     for (const auto& [write, rows, sums] : failures) {
         book.refuse(QString::fromLatin1(write), u"disco cheio"_s);
-        EXPECT_TRUE(support::failureOf([&] { annul(document); }).text().contains(u"disco cheio"_s));
+        EXPECT_TRUE(support::failureOf([&] { annul(key); }).text().contains(u"disco cheio"_s));
         book.refuseNoMore();
         EXPECT_EQ(stored(state), rows) << write;
         EXPECT_EQ(totals(), sums) << write;
     }
     book.exec(u"delete from tbSocios_Acumulados"_s);
-    EXPECT_EQ(support::failureOf([&] { annul(document); }).number(), core::NoCurrentRow);
+    EXPECT_EQ(support::failureOf([&] { annul(key); }).number(), core::NoCurrentRow);
     EXPECT_EQ(stored(state), "4|ANL|3");
     EXPECT_EQ(caller.key, 0) << "is not called back";
 }

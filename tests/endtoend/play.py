@@ -5,7 +5,7 @@ import sys
 import tempfile
 from contextlib import ExitStack
 
-from books import Helper, make_sample
+from books import Helper, make_book
 from desktop import Desktop, Failed, surroundings
 
 
@@ -15,8 +15,8 @@ def play(work, programs, engine="sqlite", pictures=None):
         environment = surroundings(own, pictures)
         host = None
         if engine == "postgresql":
-            host = stack.enter_context(Helper(programs, environment, "server")).said
-        book = make_sample(programs, environment, own, host)
+            host = stack.enter_context(Helper(programs, environment, "server")).answer()
+        book = make_book(programs, environment, own, host)
         with Desktop(environment) as desktop:
             try:
                 work(desktop, programs, book)

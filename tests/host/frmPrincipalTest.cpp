@@ -192,11 +192,17 @@ TEST_F(PrincipalWindow, AnAnnulmentAndANewMovementRefreshTheListAndKeepTheOneInH
     EXPECT_EQ(cell(0, 7), u"(€ 87,35)"_s);
     EXPECT_EQ(cell(3, 5), u"ANL"_s);
 
+    // The annulment of a receipt calls nobody back: what was opened is read again.
+    person_.enter();
+    book_.exec(u"update tbZelmar_Movimentos set tipo = 'ANL' where movimento_no = 2"_s);
     post(5, member_, "DOC", 1);
     QEvent back(QEvent::WindowActivate);  // as after a posting
     QCoreApplication::sendEvent(&window_, &back);
     EXPECT_EQ(cell(0, 0), u"5"_s);
     EXPECT_EQ(list->currentIndex().siblingAtColumn(0).data().toString(), u"2"_s);
+    person_.type(u"anl"_s);
+    EXPECT_EQ(rows(), 3);
+    EXPECT_TRUE(list->model()->index(0, 0).data(Qt::FontRole).value<QFont>().strikeOut());
 }
 
 TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
@@ -219,6 +225,14 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
     button->setText(u"&Sair"_s);  // shows a movement: nothing to lose
     window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
     EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
+
+    // A receipt under way keeps its own screen, and no other.
+    entry.setObjectName(u"frmRecebimento"_s);
+    button->setText(u"&OK"_s);
+    person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
+    for (const char* name : {"Recebimento", "Correcao", "Registo"})
+        window_.findChild<QAction*>(QString::fromLatin1(name))->trigger();
+    EXPECT_EQ(Recorder::calls.mid(1), QStringList({u"Correcao"_s, u"Registo %1"_s.arg(last_)}));
 }
 
 TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {

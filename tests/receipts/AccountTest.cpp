@@ -35,18 +35,13 @@ void AccountTest::openView(qint64 key, const QString& screen) {
     person.screen(screen);
 }
 
-qint64 AccountTest::insert(const QString& tipo, bool active) {
-    return book.insert(active ? u"tbZelmar_Movimentos"_s : u"tbZelmar_Movimentos_Inactivos"_s,
-                       {{"movimento_no", 31},
-                        {"socio_id", socio},
-                        {"codABC", u"B"_s},
-                        {"data", QDate(2026, 2, 1)},
-                        {"tipo", tipo},
-                        {"modo_pagamento", u"CHQ"_s},
-                        {"cheque", 77},
-                        {"descrit", u"acerto"_s},
-                        {"credito", 40.25},
-                        {"debito", 3}});
+qint64 AccountTest::insert(const QString& tipo, const QString& suffix) {
+    book.exec(
+        u"insert into tbZelmar_Movimentos%1 (movimento_no, socio_id, codABC, data, tipo, "
+        "modo_pagamento, cheque, descrit, credito, debito) values (31, %2, 'B', "
+        "'2026-02-01 00:00:00', '%3', 'CHQ', 77, 'acerto', 40.25, 3)"_s.arg(
+            suffix, QString::number(socio), tipo));
+    return book.value(u"select movimento_id from tbZelmar_Movimentos"_s + suffix).toLongLong();
 }
 
 void AccountTest::press(QChar letter, const QString& question, const QString& boxTitle,

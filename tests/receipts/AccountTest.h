@@ -34,7 +34,8 @@ protected:
     void open(void (General::*operation)(QString*, QString*), const QString& screen);
     /// Opens a movement read-only and turns to its screen.
     void openView(qint64 key, const QString& screen);
-    qint64 insert(const QString& tipo, bool active = true);
+    /// A movement of the member; the suffix of the tables of those who have left, or none.
+    qint64 insert(const QString& tipo, const QString& suffix = {});
 
     /// Alt and the letter of a button that asks; yes.
     void press(QChar letter, const QString& question, const QString& title,

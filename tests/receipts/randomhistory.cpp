@@ -19,7 +19,7 @@ constexpr int Rubrics = 6;
 /// Another number in the environment variable ZELMARS_STEPS; a run through 10,000 takes a minute.
 const int Steps = qEnvironmentVariableIsSet("ZELMARS_STEPS")
                       ? qEnvironmentVariableIntValue("ZELMARS_STEPS")
-                      : (support::onServer() ? 500 : 2000);
+                      : (support::onServer() ? 500 : 1000);
 
 /// Debits and credits of an account, in ten-thousandths of a euro.
 struct Sums {
