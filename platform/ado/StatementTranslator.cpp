@@ -4,7 +4,7 @@
 #include <QDateTime>
 
 #include "platform/ado/ColumnValue.h"
-#include "platform/ado/Edits.h"
+#include "platform/ado/Translation.h"
 
 namespace ado {
 
@@ -29,90 +29,25 @@ constexpr QLatin1StringView BehindSource[] = {
     "union"_L1, "right"_L1, "full"_L1,    "cross"_L1,     "limit"_L1,   "having"_L1, "except"_L1,
     "using"_L1, "outer"_L1, "natural"_L1, "intersect"_L1, "indexed"_L1, "not"_L1};
 
-/// A table of a FROM or JOIN: its name, and the name by which columns are qualified.
-struct Source {
-    QString table;
-    QString alias;
-};
+template <class Words>
+bool isAny(const Statement& s, int i, const Words& words) {
+    return std::any_of(std::begin(words), std::end(words),
+                       [&](QLatin1StringView word) { return s.is(i, word); });
+}
 
-/// A column as it is written: maybe a qualifier, and a name.
-struct ColumnName {
-    QString qualifier;
-    QString name;
-};
+}  // namespace
 
-class Translation {
-public:
-    Translation(const Statement& statement, Schema& schema, Dialect dialect)
-        : s(statement), schema_(schema), isServer_(dialect == Dialect::Postgres) {
-        survey();
-    }
-
-    QString run(bool withIdentity) {
-        literals();
-        if (has_.plus) joins();
-        if (has_.sum) isServer_ ? floatSums() : amountSums();
-        if (isServer_) numbersBesideTexts();
-        if (order_ >= 0) orderTerms();
-        insertionOrder();
-        if (withIdentity)
-            edits_.insert(s.token(1).at, schema_.identity(sources_.front().table) + u',');
-        if (s.end() < s.text().size()) edits_.replace(s.end(), s.text().size() - s.end(), {});
-        return edits_.applied(s.text());
-    }
-
-private:
-    template <class Words>
-    bool isAny(int i, const Words& words) const {
-        return std::any_of(std::begin(words), std::end(words),
-                           [&](QLatin1StringView word) { return s.is(i, word); });
-    }
-
-    void survey();
-    void noteSource(int i);
-    void noteClause(int i);
-    bool aggregates(int i) const;
-
-    void literals();
-    QString quoted(const QString& name) const;
-    void convert(int i);
-    void joins();
-    int operandBefore(int plus) const;
-    int operandBehind(int plus) const;
-    void amountSums();
-    bool sumsMoney(int open, int behind);
-    void floatSums();
-    bool sumsSingles(int open, int behind);
-    void numbersBesideTexts();
-    void orderTerms();
-    void orderTerm(int first, int behind);
-    void orderNulls(int first, int behind);
-    bool isIdentity(const ColumnName& column);
-    void insertionOrder();
-
-    ColumnName columnAt(int i) const;
-    int columnEnd(int i) const;
-    std::optional<ColumnType> typeOf(const ColumnName& column);
-    bool isText(int first, int behind);
-    int selectItem(int behind) const;
-    int itemOf(const QString& alias, int& behind) const;
-    QString aliasOf(const ColumnName& column) const;
-
-    const Statement& s;
-    Schema& schema_;
-    Edits edits_;
-    bool isServer_;  ///< for PostgreSQL
-    std::vector<Source> sources_;
-    std::size_t outer_ = 0;  ///< the first SELECT's first source
-    int from_ = -1;          ///< FROM of the first SELECT
-    int order_ = -1;         ///< ORDER of the whole statement
-    int limit_ = -1;
-    bool grouped_ = false;  ///< GROUP BY, DISTINCT or an aggregate: rows are no rows of a table
-    bool compound_ = false;
-    struct {
-        bool plus = false, sum = false, literal = false;
-    } has_;
-};
+QString Translation::run(bool withIdentity) {
+    if (has_.literal) literals();
+    if (has_.plus) joins();
+    if (has_.sum) isServer_ ? floatSums() : amountSums();
+    if (has_.arithmetic && !isServer_) amountItems();
+    if (isServer_) numbersBesideTexts();
+    orders();
+    if (withIdentity) edits_.insert(s.token(1).at, schema_.identity(sources_.front().table) + u',');
+    if (s.end() < s.text().size()) edits_.replace(s.end(), s.text().size() - s.end(), {});
+    return edits_.applied(s.text());
+}
 
 // One walk that finds what there is to do, so that a plain statement costs nothing more.
 void Translation::survey() {
@@ -125,13 +60,15 @@ void Translation::survey() {
             if (c == u'(') ++depth;
             if (c == u')' && --depth < inner) inner = 0;
             if (c == u'+') has_.plus = true;
+            if (c == u'-' || c == u'*') has_.arithmetic = true;
         } else if (token.kind == TokenKind::Word) {
             if (s.is(i, "select"_L1) && inner == 0) inner = depth;
             if (inner == 0 && from_ < 0 && aggregates(i)) grouped_ = true;
             if (depth == 0 && from_ < 0 && s.is(i, "from"_L1)) outer_ = sources_.size();
             if (s.is(i, "from"_L1) || s.is(i, "join"_L1)) noteSource(i);
             if (s.is(i, "sum"_L1)) has_.sum = true;
-            if (s.is(i, "convert"_L1) || s.is(i - 1, "."_L1)) has_.literal = true;
+            if (s.is(i, "convert"_L1) || s.is(i - 1, "."_L1) || touchesNumber(i))
+                has_.literal = true;
             if (depth == 0) noteClause(i);
         } else if (token.kind == TokenKind::Date || token.kind == TokenKind::DoubleText ||
                    token.kind == TokenKind::Name) {
@@ -144,13 +81,25 @@ void Translation::noteClause(int i) {
     if (s.is(i, "from"_L1) && from_ < 0) from_ = i;
     if (s.is(i, "order"_L1) && s.is(i + 1, "by"_L1)) order_ = i;
     if (s.is(i, "limit"_L1)) limit_ = i;
+    if (s.is(i, "group"_L1)) group_ = i;
     if (s.is(i, "union"_L1) || s.is(i, "except"_L1) || s.is(i, "intersect"_L1)) compound_ = true;
+    if (s.is(i, "all"_L1)) keepsEqualRows_ = true;
     if (s.is(i, "group"_L1) || s.is(i, "distinct"_L1)) grouped_ = true;
 }
 
 bool Translation::aggregates(int i) const {
     return s.is(i + 1, "("_L1) && (s.is(i, "sum"_L1) || s.is(i, "count"_L1) || s.is(i, "min"_L1) ||
                                    s.is(i, "max"_L1) || s.is(i, "avg"_L1) || s.is(i, "total"_L1));
+}
+
+bool Translation::isKeyword(int i) const {
+    return isAny(s, i, Keywords);
+}
+
+/// True for a word directly behind a number.
+bool Translation::touchesNumber(int i) const {
+    if (i < 1 || s.kind(i - 1) != TokenKind::Number) return false;
+    return s.token(i - 1).at + s.token(i - 1).length == s.token(i).at;
 }
 
 void Translation::noteSource(int i) {
@@ -160,13 +109,12 @@ void Translation::noteSource(int i) {
     Source source{s.name(i), s.name(i)};
     if (s.is(i + 1, "as"_L1))
         source.alias = s.name(i + 2);
-    else if (s.isWord(i + 1) && !isAny(i + 1, BehindSource))
+    else if (s.isWord(i + 1) && !isAny(s, i + 1, BehindSource))
         source.alias = s.name(i + 1);
     sources_.push_back(source);
 }
 
 void Translation::literals() {
-    if (!has_.literal) return;
     for (int i = 0; i < s.count(); ++i) {
         const Token& token = s.token(i);
         if (token.kind == TokenKind::Date) {
@@ -181,7 +129,9 @@ void Translation::literals() {
         } else if (token.kind == TokenKind::Word && s.is(i, "convert"_L1)) {
             convert(i);
         } else if (token.kind == TokenKind::Word && s.is(i - 1, "."_L1)) {
-            if (isAny(i, Keywords)) edits_.replace(token.at, token.length, quoted(s.name(i)));
+            if (isKeyword(i)) edits_.replace(token.at, token.length, quoted(s.name(i)));
+        } else if (token.kind == TokenKind::Word && touchesNumber(i) && isKeyword(i)) {
+            edits_.insert(token.at, u" "_s);
         }
     }
 }
@@ -276,6 +226,47 @@ void Translation::amountSums() {
     }
 }
 
+// The same for what is worked out of amounts by itself. A product has the decimals of its factors.
+void Translation::amountItems() {
+    for (int i = 0; i < s.count(); ++i) {
+        if (!s.is(i, "select"_L1)) continue;
+        int depth = 0;
+        int from = i + 1;
+        for (; from < s.count() && (depth > 0 || !s.is(from, "from"_L1)); ++from) {
+            if (s.is(from, "("_L1)) ++depth;
+            if (s.is(from, ")"_L1)) --depth;
+        }
+        eachTerm(i + 1, from, [&](int first, int behind) {
+            if (s.is(behind - 2, "as"_L1)) behind -= 2;
+            amountItem(first, behind);
+        });
+    }
+}
+
+void Translation::amountItem(int first, int behind) {
+    bool money = false;
+    bool worked = false;
+    qsizetype decimals = 4;
+    for (int i = first; i < behind; ++i) {
+        if (s.isWord(i)) {
+            if (typeOf(columnAt(i)) != ColumnType::Money) return;
+            money = true;
+            i = columnEnd(i) - 1;
+        } else if (s.kind(i) == TokenKind::Number) {
+            const qsizetype point = s.word(i).indexOf(u'.');
+            if (point >= 0) decimals += s.word(i).size() - point - 1;
+        } else if (s.is(i, "+"_L1) || s.is(i, "-"_L1) || s.is(i, "*"_L1)) {
+            worked = true;
+        } else if (!s.is(i, "("_L1) && !s.is(i, ")"_L1)) {
+            return;
+        }
+    }
+    if (!money || !worked) return;
+    const Token& last = s.token(behind - 1);
+    edits_.insert(s.token(first).at, u"ROUND("_s);
+    edits_.insert(last.at + last.length, u",%1)"_s.arg(decimals));
+}
+
 /// True when amounts are among the columns between the brackets and no other kind of number.
 bool Translation::sumsMoney(int open, int behind) {
     bool money = false;
@@ -340,119 +331,6 @@ std::optional<ColumnType> Translation::typeOf(const ColumnName& column) {
     }
     return std::nullopt;
 }
-
-void Translation::orderTerms() {
-    // The engine takes an order of its own kind behind a UNION of groups only from around it.
-    if (compound_) {
-        edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
-        edits_.insert(s.token(order_).at, isServer_ ? u") AS uniao "_s : u") "_s);
-    }
-    const int end = limit_ > order_ ? limit_ : s.count();
-    int depth = 0;
-    int first = order_ + 2;
-    for (int i = first; i <= end; ++i) {
-        if (s.is(i, "("_L1)) ++depth;
-        if (s.is(i, ")"_L1)) --depth;
-        if (i == end || (depth == 0 && s.is(i, ","_L1))) {
-            orderTerm(first, i);
-            first = i + 1;
-        }
-    }
-}
-
-void Translation::orderTerm(int first, int behind) {
-    if (isServer_ && first < behind) orderNulls(first, behind);
-    if (s.is(behind - 1, "asc"_L1) || s.is(behind - 1, "desc"_L1)) --behind;
-    if (first >= behind || !s.isWord(first) || columnEnd(first) != behind) return;
-    const ColumnName column = columnAt(first);
-    const Token& name = s.token(behind - 1);
-    const qsizetype end = name.at + name.length;
-    // Behind a UNION only the columns of the result have names.
-    if (compound_ && !column.qualifier.isEmpty())
-        edits_.replace(s.token(first).at, end - s.token(first).at, aliasOf(column));
-    if (!isServer_ && isText(first, behind))
-        edits_.insert(end, u" COLLATE "_s + QLatin1StringView(Collation));
-}
-
-// Nulls come before all values. A table's identity has none and is found in its order as it is.
-void Translation::orderNulls(int first, int behind) {
-    const bool descends = s.is(behind - 1, "desc"_L1);
-    const int end = descends || s.is(behind - 1, "asc"_L1) ? behind - 1 : behind;
-    if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return;
-    const Token& last = s.token(behind - 1);
-    edits_.insert(last.at + last.length, descends ? u" NULLS LAST"_s : u" NULLS FIRST"_s);
-}
-
-bool Translation::isIdentity(const ColumnName& column) {
-    if (sources_.size() != 1) return false;
-    return schema_.identity(sources_.front().table).compare(column.name, Qt::CaseInsensitive) == 0;
-}
-
-/// True for a column that the book declares as text, and for a joined text of the SELECT list.
-bool Translation::isText(int first, int behind) {
-    const ColumnName column = columnAt(first);
-    if (const auto type = typeOf(column)) return *type == ColumnType::Text;
-    if (!column.qualifier.isEmpty()) return false;
-    int itemEnd = behind;
-    const int item = itemOf(column.name, itemEnd);
-    if (item < 0) return false;
-    if (s.isWord(item) && columnEnd(item) == itemEnd)
-        return typeOf(columnAt(item)) == ColumnType::Text;
-    for (int i = item; i < itemEnd; ++i)
-        if (s.is(i, "+"_L1) &&
-            (s.kind(i - 1) == TokenKind::Text || s.kind(i + 1) == TokenKind::Text))
-            return true;
-    return false;
-}
-
-/// Where the SELECT item begins that ends before `behind`.
-int Translation::selectItem(int behind) const {
-    int depth = 0;
-    int i = behind - 1;
-    for (; i > 0; --i) {
-        if (s.is(i, ")"_L1)) ++depth;
-        if (s.is(i, "("_L1)) --depth;
-        if (depth == 0 && s.is(i, ","_L1)) break;
-    }
-    return i + 1;
-}
-
-/// First token of the SELECT item with that alias, and the token behind it; -1 when there is none.
-int Translation::itemOf(const QString& alias, int& behind) const {
-    for (int i = 2; i < from_; ++i) {
-        if (!s.is(i - 1, "as"_L1) || s.name(i).compare(alias, Qt::CaseInsensitive) != 0) continue;
-        behind = i - 1;
-        return selectItem(behind);
-    }
-    return -1;
-}
-
-/// The result's name of a column of the first SELECT.
-QString Translation::aliasOf(const ColumnName& column) const {
-    for (int i = 1; i + 4 < from_; ++i) {
-        if (!s.isWord(i) || !s.is(i + 1, "."_L1) || !s.is(i + 3, "as"_L1)) continue;
-        const ColumnName item = columnAt(i);
-        if (item.qualifier.compare(column.qualifier, Qt::CaseInsensitive) == 0 &&
-            item.name.compare(column.name, Qt::CaseInsensitive) == 0)
-            return s.word(i + 4).toString();
-    }
-    return column.name;
-}
-
-// Without an order of its own a read of a table gives the rows in the order of their insertion,
-// whatever index finds them.
-void Translation::insertionOrder() {
-    if (order_ >= 0 || compound_ || grouped_ || from_ < 0 || outer_ >= sources_.size()) return;
-    const Source& first = sources_[outer_];
-    // SQLite passes through the first of joins in brackets as it does without them.
-    if (!isServer_ && s.is(from_ + 1, "("_L1)) return;
-    const QString identity = schema_.identity(first.table);
-    if (identity.isEmpty()) return;
-    const QString order = u" ORDER BY %1.%2"_s.arg(quoted(first.alias), identity);
-    edits_.insert(limit_ < 0 ? s.end() : s.token(limit_).at - 1, order);
-}
-
-}  // namespace
 
 QString translate(const Statement& statement, Schema& schema, bool withIdentity, Dialect dialect) {
     return Translation(statement, schema, dialect).run(withIdentity);

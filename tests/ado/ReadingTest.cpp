@@ -22,7 +22,7 @@ TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
     book.exec(
         u"INSERT INTO tbMov(socio, tipo, nome, valor, data, obs) VALUES(5,'REP','5',1.5,"
         "'2001-04-01 00:00:00',NULL), (6,'DOC','x''y',-2,'2001-03-31 00:00:00',''),"
-        "(5,'PAG','5.0',3,NULL,'0');"
+        "(5,'PAG','5.0',3,NULL,'0'), (9,'DOC',NULL,0.4,NULL,NULL), (9,'DOC',NULL,-0.3,NULL,NULL);"
         "INSERT INTO tbSoma(socio) VALUES(3), (1), (2);"
         "UPDATE tbMov SET tipo='AAA' WHERE id=3; UPDATE tbSoma SET docs=1 WHERE socio=3;"
         "INSERT INTO tbHosp(nome, code) VALUES('Zita','01'), ('Évora',NULL), (NULL,NULL),"
@@ -33,7 +33,8 @@ TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
         QString column;
         QString values;
     } table[] = {
-        {where + u"socio > 3"_s, u"id"_s, u"1,2,3"_s},
+        {where + u"socio > 3"_s, u"id"_s, u"1,2,3,4,5"_s},
+        {u"select socio from tbMov group by socio having (sum(valor) > 0.1)"_s, u"socio"_s, u"5"_s},
         {u"select id, tipo from tbMov where socio=5"_s, u"id"_s, u"1,3"_s},
         {where + u"socio = 6"_s, u"id"_s, u"2"_s},
         {where + u"nome = '5'"_s, u"id"_s, u"1"_s},

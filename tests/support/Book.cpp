@@ -39,17 +39,6 @@ Book::~Book() {
     qputenv(RegistryVariable, registryBefore_);
 }
 
-QString Book::connectionString() const {
-    return u"Provider=SQLOLEDB.1;Persist Security Info=True;User ID=%1;Password=;"
-           "Initial Catalog=%2;Data Source=%3;Connect Timeout=15"_s.arg(user(), catalogue(),
-                                                                        dataSource());
-}
-
-QString Book::shapingConnectionString() const {
-    return connectionString().replace(u"Provider=SQLOLEDB.1"_s,
-                                      u"Provider=MSDataShape.1;Data Provider=SQLOLEDB.1"_s);
-}
-
 QString Book::everything() {
     QStringList all;
     for (const QString& table : handle_->tables())

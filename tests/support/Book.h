@@ -78,8 +78,8 @@ public:
     QString user() const { return handle_->user(); }
     QString registryFolder() const { return root_.filePath(QStringLiteral("registry")); }
     /// Of the plain provider, as a login would set it, and of the shaping one.
-    QString connectionString() const;
-    QString shapingConnectionString() const;
+    QString connectionString() const { return handle_->connectionString(); }
+    QString shapingConnectionString() const { return handle_->shapingConnectionString(); }
 
     void exec(const QString& statements) { handle_->rows(statements); }
     /// The first column of the first row as text; invalid for null and for no row.

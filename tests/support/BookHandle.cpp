@@ -4,6 +4,8 @@
 #include "tests/support/PostgresBook.h"
 #include "tests/support/SqliteBook.h"
 
+using namespace Qt::StringLiterals;
+
 namespace support {
 
 bool onServer() {
@@ -14,6 +16,17 @@ bool onServer() {
 std::unique_ptr<BookHandle> BookHandle::make(Content content, const QString& folder) {
     if (onServer()) return std::make_unique<PostgresBook>(content);
     return std::make_unique<SqliteBook>(content, folder);
+}
+
+QString BookHandle::connectionString() const {
+    return u"Provider=SQLOLEDB.1;Persist Security Info=True;User ID=%1;Password=;"
+           "Initial Catalog=%2;Data Source=%3;Connect Timeout=15"_s.arg(user(), catalogue(),
+                                                                        dataSource());
+}
+
+QString BookHandle::shapingConnectionString() const {
+    return connectionString().replace(u"Provider=SQLOLEDB.1"_s,
+                                      u"Provider=MSDataShape.1;Data Provider=SQLOLEDB.1"_s);
 }
 
 QString printed(double number) {

@@ -24,6 +24,9 @@ public:
     virtual QString dataSource() const = 0;
     virtual QString catalogue() const = 0;
     virtual QString user() const = 0;
+    /// Of the plain provider, as a login sets it.
+    QString connectionString() const;
+    QString shapingConnectionString() const;
 
     /// Runs statements and gives the rows of the last one, a null text for null; values are printed
     /// alike on every engine. Throws std::runtime_error with the engine's text.
