@@ -8,13 +8,13 @@ Usage: two_workstations.py FOLDER_OF_THE_PROGRAMS [FOLDER_FOR_PICTURES]
 
 import os
 import sys
-import tempfile
 import time
 from datetime import date
 
-from books import Helper, make_book, single
-from desktop import Desktop, Failed, surroundings, wait_until
+from books import Helper, single
+from desktop import Failed, wait_until
 from entry import ENTRY, EXIT, choose_member_and_person, fill_in_fields
+from play import play
 
 AMOUNTS = {"P-1": "40", "P-2": "52,75"}
 RUBRIC = "5.02"
@@ -97,19 +97,5 @@ def work(desktop, programs, book):
                     "the row was not held all the time")
 
 
-def main(programs, pictures=None):
-    with tempfile.TemporaryDirectory() as own:
-        environment = surroundings(own, pictures)
-        with Helper(programs, environment, "server") as server:
-            book = make_book(programs, environment, own, server.answer())
-            with Desktop(environment) as desktop:
-                try:
-                    work(desktop, programs, book)
-                except Failed as failure:
-                    desktop.show("falhou")
-                    sys.exit(f"failed: {failure}")
-    print("1 passed, 0 failed")
-
-
 if __name__ == "__main__":
-    main(*sys.argv[1:])
+    play(work, sys.argv[1], "postgresql", *sys.argv[2:])
