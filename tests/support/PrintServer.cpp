@@ -12,41 +12,15 @@ namespace support {
 
 namespace {
 
-const QString Settings =
-    uR"(Listen %1/socket
-Browsing Off
-DefaultAuthType None
-WebInterface No
-<Location />
-  Allow all
-</Location>
-<Policy default>
-  <Limit All>
-    Allow all
-  </Limit>
-</Policy>
-)"_s;
+const QString Settings = u"Listen %1/socket\nBrowsing Off\nWebInterface No\n"_s;
 
 const QString Files =
-    uR"(ServerRoot %1
-ServerBin %1/bin
-CacheDir %1
-StateDir %1
-RequestRoot %1/spool
-TempDir %1/spool
-AccessLog %1/access.log
-ErrorLog %1/error.log
-PageLog %1/page.log
-)"_s;
+    u"ServerRoot %1\nServerBin %1/bin\nCacheDir %1\nStateDir %1\nRequestRoot %1/spool\n"
+    "TempDir %1/spool\nAccessLog %1/access.log\nErrorLog %1/error.log\n"_s;
 
 const QString Printers =
-    uR"(<DefaultPrinter Secretaria>
-DeviceURI keep:%1/printed
-State Idle
-Accepting %2
-ErrorPolicy stop-printer
-</DefaultPrinter>
-)"_s;
+    u"<DefaultPrinter Secretaria>\nDeviceURI keep:%1/printed\nState Idle\nAccepting %2\n"
+    "</DefaultPrinter>\n"_s;
 
 /// Called with job, user, title, copies, options and the file.
 const QString Keeper =
