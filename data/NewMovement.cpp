@@ -24,6 +24,12 @@ bool confirmPosting(const QString& caption) {
                         core::Buttons::YesNo) == core::Answer::Yes;
 }
 
+void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id) {
+    movement.setCollect(u"doc_valor"_s, 0);
+    movement.setCollect(u"socio_id"_s, socio_id);
+    core::err().clear();
+}
+
 void numberAndSave(ado::Recordset& movement) {
     movement.setCollect(u"movimento_no"_s, drawMovementNumber());
     movement.Update();

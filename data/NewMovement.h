@@ -13,6 +13,10 @@ ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL);
 /// Asks whether to finish the entry.
 bool confirmPosting(const QString& caption);
 
+/// Readies a movement that has no document for being saved: it is the member's, its document's
+/// value is 0, and no failure is pending.
+void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id);
+
 /// Draws the movement's number and saves the pending row: two writes, the counter first. A row
 /// whose number cannot be drawn is not saved.
 void numberAndSave(ado::Recordset& movement);

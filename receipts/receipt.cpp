@@ -65,13 +65,10 @@ void takeBack(const ado::Recordset& shown) {
 
 bool postReceipt(const ReceiptEntry& receipt) {
     if (!data::confirmPosting(receipt.caption) || !receiptChecks(receipt)) return false;
-    ado::Recordset& record = *receipt.record;
-    record.setCollect(u"doc_valor"_s, 0);
-    record.setCollect(u"debito"_s, 0);
-    record.setCollect(u"socio_id"_s, receipt.Socio_ID);
-    core::err().clear();
+    receipt.record->setCollect(u"debito"_s, 0);
+    data::readyWithoutDocument(*receipt.record, receipt.Socio_ID);
     // Not passed over, unlike on the other screens: a failure goes up with the engine's text.
-    data::numberAndSave(record);
+    data::numberAndSave(*receipt.record);
     if (!data::savedOrTold(receipt.caption)) return false;
     addToAccount(receipt);
     return true;

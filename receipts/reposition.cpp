@@ -67,11 +67,8 @@ void addToAccumulator(const RepositionEntry& reposition) {
 
 bool postReposition(const RepositionEntry& reposition) {
     if (!data::confirmPosting(reposition.caption) || !repositionChecks(reposition)) return false;
-    ado::Recordset& record = *reposition.record;
-    record.setCollect(u"doc_valor"_s, 0);
-    record.setCollect(u"socio_id"_s, reposition.Socio_ID);
-    core::err().clear();
-    passingOver([&] { data::numberAndSave(record); });
+    data::readyWithoutDocument(*reposition.record, reposition.Socio_ID);
+    passingOver([&] { data::numberAndSave(*reposition.record); });
     if (!data::savedOrTold(reposition.caption)) return false;
     passingOver([&] { addToAccumulator(reposition); });
     return true;

@@ -129,6 +129,7 @@ TEST_F(Receipt, AnnulmentTakesFromTheFirstAccumulatorRowOfTheMember) {
         EXPECT_TRUE(person.find<forms::TextBox>(field)->isReadOnly()) << field.toStdString();
     EXPECT_EQ(shown(u"Text2"_s) + u'|' + shown(u"Credito"_s) + u'|' + shown(u"Text4"_s),
               u"António Manuel Silva Matos|€ 40,25|77"_s);
+    ASSERT_TRUE(general.Login());  // reopens the connections beneath the screen
     annul();
     EXPECT_FALSE(person.isShown(Screen));
     EXPECT_EQ(movements(),
