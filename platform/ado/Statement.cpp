@@ -70,9 +70,11 @@ void Statement::tokenize() {
             push(TokenKind::Name, at, end);
         } else if (c == u'-' && next == u'-') {
             while (end < size && text[end] != u'\n') ++end;
+            hasComment_ = true;
         } else if (c == u'/' && next == u'*') {
             end = text_.indexOf(u"*/"_s, at + 2) + 2;
             if (end < at + 2) refuse(u"A consulta tem um comentário por fechar."_s);
+            hasComment_ = true;
         } else {
             while (c == u'#' && end < size && (isDigit(text[end]) || text[end] == u'/')) ++end;
             const bool date = end > at + 1 && end < size && text[end] == u'#';
@@ -125,6 +127,10 @@ qsizetype Statement::end() const {
 void Statement::requireQuery(bool shapes) const {
     if (!is(0, "select"_L1) && !(shapes && is(0, "shape"_L1)))
         refuse(u"Só são aceites consultas (SELECT); não foi executado: %1"_s.arg(text_.left(80)));
+    // No statement of the system has one; typed in, it would hide the rest of a statement.
+    if (hasComment_)
+        refuse(
+            u"Uma consulta não pode ter comentários; não foi executado: %1"_s.arg(text_.left(80)));
     for (int i = 1; i < count(); ++i)
         if (kind(i) == TokenKind::Symbol && text_[tokens_[i].at] == u';')
             refuse(u"Só é aceite uma consulta de cada vez; não foi executado: %1"_s.arg(

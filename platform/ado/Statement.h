@@ -57,6 +57,7 @@ private:
 
     QString text_;
     QVarLengthArray<Token, 96> tokens_;
+    bool hasComment_ = false;
 };
 
 }  // namespace ado

@@ -5,6 +5,7 @@
 
 #include "platform/ado/ColumnValue.h"
 #include "platform/ado/Translation.h"
+#include "platform/core/Failure.h"
 
 namespace ado {
 
@@ -38,6 +39,7 @@ bool isAny(const Statement& s, int i, const Words& words) {
 }  // namespace
 
 QString Translation::run(bool withIdentity) {
+    if (isServer_) refuseServerFunctions();
     if (has_.literal) literals();
     if (has_.plus) joins();
     if (has_.sum) isServer_ ? floatSums() : amountSums();
@@ -94,6 +96,16 @@ bool Translation::aggregates(int i) const {
 
 bool Translation::isKeyword(int i) const {
     return isAny(s, i, Keywords);
+}
+
+// What a server has besides tables and plain functions waits, locks, stops others, reads files.
+void Translation::refuseServerFunctions() const {
+    for (int i = 0; i < s.count(); ++i)
+        if ((s.isWord(i) || s.kind(i) == TokenKind::Name) &&
+            s.name(i).startsWith("pg_"_L1, Qt::CaseInsensitive))
+            throw core::Failure(
+                core::InvalidCall,
+                u"A consulta usa «%1», que é do servidor, e não foi executada."_s.arg(s.name(i)));
 }
 
 /// True for a word directly behind a number.

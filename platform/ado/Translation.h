@@ -52,6 +52,7 @@ private:
     bool isKeyword(int i) const;
     bool touchesNumber(int i) const;
 
+    void refuseServerFunctions() const;
     void literals();
     QString quoted(const QString& name) const;
     void convert(int i);
