@@ -31,7 +31,7 @@ def newest(book, inactive=False):
 
 
 def confirm(desktop, key, title):
-    desktop.keys(key)
+    desktop.ask(key)
     desktop.at(title)
     desktop.keys("alt+s")
 

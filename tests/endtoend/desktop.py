@@ -103,6 +103,20 @@ class Desktop:
     def type(self, text):
         self.run(["xdotool", "type", "--delay", "15", text])
 
+    def ask(self, key):
+        """Presses a key that brings a box, and waits for it; the box's window. Boxes often bear
+        the title of their screen."""
+        screen = self._active_window()
+        self.keys(key)
+        return wait_until("a box comes", lambda: self._other_window(screen))
+
+    def _active_window(self):
+        return self.run(["xdotool", "getactivewindow"]).strip()
+
+    def _other_window(self, window):
+        active = self._active_window()
+        return active if active != window else None
+
     def show(self, name):
         """Keeps a picture of the display, where pictures are wanted."""
         folder = self.environment.get("PICTURES")

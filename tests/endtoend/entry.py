@@ -34,8 +34,7 @@ def fill_in_fields(desktop, *texts):
 
 
 def post(desktop):
-    desktop.keys("alt+o")
-    desktop.at(ENTRY)  # the question bears the screen's caption
+    desktop.ask("alt+o")
     desktop.keys("alt+s")
 
 

@@ -31,18 +31,11 @@ def up_to_the_question(desktop, programs, document, amount):
     """Keys a document in and leaves it at the question whether to post; gives the program and
     the question's window."""
     program = desktop.start([os.path.join(programs, "zelmars"), "NewMovimento"])
-    entry = desktop.window_of(program, ENTRY)
-    desktop.turn_to(entry)
+    desktop.turn_to(desktop.window_of(program, ENTRY))
     choose_member_and_person(desktop)
     fill_in_fields(desktop, date.today().strftime("%d-%m-%Y"), document, amount, "0", "23", "",
                    "Lentes", RUBRIC, "")
-    desktop.keys("alt+o")
-    return program, wait_until("the question is there", lambda: other_window(desktop, entry))
-
-
-def other_window(desktop, entry):
-    active = desktop.run(["xdotool", "getactivewindow"]).strip()
-    return active if active != entry and desktop.active_title().startswith(ENTRY) else None
+    return program, desktop.ask("alt+o")
 
 
 def post_both(desktop, programs, book):
