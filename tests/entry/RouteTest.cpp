@@ -57,8 +57,7 @@ TEST_F(Route, TheWayOutOffersFourOptions) {
             EXPECT_TRUE(person.find<QRadioButton>(u"Option2"_s)->isChecked());
             EXPECT_EQ(person.find<QRadioButton>(name)->text(), text);
             person.accelerator(key);
-            if (key == u'E')
-                person.onScreen(u"frmExtratos"_s, [this] { person.here()->close(); });
+            if (key == u'E') person.onScreen(u"frmExtratos"_s, [this] { person.here()->close(); });
             person.accelerator(u'O');
         });
         person.accelerator(u'C');
