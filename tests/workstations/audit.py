@@ -25,7 +25,8 @@ class Audit:
             # A statement that the server was given before the kill may still be running.
             wait_until("the server does no more for the dead", lambda: not book.rows(
                 "SELECT 1 FROM pg_stat_activity WHERE datname = current_database() "
-                "AND state = 'active' AND pid <> pg_backend_pid()"))
+                "AND state = 'active' AND wait_event IS DISTINCT FROM 'ClientRead' "
+                "AND pid <> pg_backend_pid()"))
         elif [row for row in book.rows("PRAGMA integrity_check") if "ok" not in row.values()]:
             self.faults.append("the book is broken")
         self.movements = book.rows("SELECT * FROM tbZelmar_Movimentos ORDER BY movimento_no")

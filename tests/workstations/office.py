@@ -215,7 +215,8 @@ def main(programs, engine, *words):
         with ExitStack() as stack:
             office = Office(programs, engine, stack)
             seconds, posted = globals()[task](office, *figures)
-            print(f"  {engine} {task}: {posted} postings in {seconds:.2f} s, "
+            print(f"  {engine} {' '.join(map(str, [task, *figures]))}: "
+                  f"{posted} postings in {seconds:.2f} s, "
                   f"{posted / seconds:.0f} a second, the slowest {office.slowest:.0f} ms")
             for fault in office.faults[:20]:
                 print("  FAULT", fault)
