@@ -239,7 +239,7 @@ void Preview::Implementation::goToPage(int page) {
     if (page >= pages->count() && source.isAtWork())
         message->setText(u"A preparar a página %1…"_s.arg(page + 1));
     else if (page >= pages->count())
-        message->setText(u"O relatório tem %1 páginas."_s.arg(pages->count()));
+        message->setText(u"O relatório acaba na página %1."_s.arg(pages->count()));
     awaitedPage = page;
     timer->setEnabled(true);
     view->setFocus();
