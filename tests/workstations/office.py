@@ -46,7 +46,7 @@ class Workstation:
     def __init__(self, number, program, postings, environment):
         self.number = number
         self.posted = 0
-        self.is_killed = False
+        self.is_ready = self.is_killed = False
         self.rest = b""
         self.process = subprocess.Popen([program, str(number), str(postings)], env=environment,
                                         stdin=subprocess.PIPE, stdout=subprocess.PIPE, bufsize=0)
@@ -82,55 +82,55 @@ class Office:
         self.faults = []
         self.slowest = self.release = 0  # milliseconds
 
-    def start(self, program, postings):
-        made = Workstation(len(self.workstations) + 1, program, postings, self.environment)
-        self.workstations.append(made)
-        self.selector.register(made.process.stdout, selectors.EVENT_READ, made)
-        return made
-
     def run(self, count, postings, kills=0, program="workstation"):
         """So many workstations post at once; each killed one is followed by another. Gives the
         seconds that it took and how many were posted."""
         self.selector = selectors.DefaultSelector()
-        program = os.path.join(self.programs, program)
-        shift = [self.start(program, postings) for _ in range(count)]
-        waiting = set(shift)
-        began = next_kill = None
-        heard = time.monotonic()
+        self.program, self.postings, self.kills = program, postings, kills
+        self.shift, self.began = [], None
+        for _ in range(count):
+            self.start()
+        next_kill = None
         while self.selector.get_map():
             pause = max(0, next_kill - time.monotonic()) if next_kill else PATIENCE
-            for key, _ in self.selector.select(pause):
-                heard = time.monotonic()
-                one = key.data
-                lines = one.lines()
-                if lines is None:
-                    self.end(one, postings)
-                    if one.is_killed and kills > 0:
-                        shift.append(self.start(program, postings))
-                    continue
-                if "ready" in lines and began is None:
-                    waiting.discard(one)
-                    if not waiting:
-                        for each in shift:
-                            each.begin()
-                        began = heard
-                        next_kill = began if kills else None
-                elif "ready" in lines:
-                    one.begin()
-                self.note(one, lines)
-            if next_kill and time.monotonic() >= next_kill:
-                kills -= self.kill_one(shift, count)
-                next_kill = time.monotonic() + random.random() * KILL_WITHIN
-                if kills == 0:
-                    next_kill = None
-                    for one in shift:
-                        if not one.is_killed:
-                            one.kill()
-            if time.monotonic() - heard > PATIENCE:
-                self.faults.append("nobody posted any more")
-                for one in shift:
-                    one.kill()
-        return time.monotonic() - began, sum(one.posted for one in shift)
+            events = self.selector.select(pause)
+            for key, _ in events:
+                self.hear(key.data, count)
+            if not events and not next_kill:
+                self.faults.append("nobody posts any more")
+                self.kill_all()
+            if self.kills and self.began and time.monotonic() >= (next_kill or 0):
+                self.kill_one(count)
+                next_kill = time.monotonic() + random.random() * KILL_WITHIN if self.kills else None
+        return time.monotonic() - self.began, sum(one.posted for one in self.shift)
+
+    def start(self):
+        made = Workstation(len(self.workstations) + 1, os.path.join(self.programs, self.program),
+                           self.postings, self.environment)
+        self.workstations.append(made)
+        self.shift.append(made)
+        self.selector.register(made.process.stdout, selectors.EVENT_READ, made)
+
+    def hear(self, one, count):
+        lines = one.lines()
+        if lines is None:
+            self.end(one)
+            if one.is_killed and self.kills:
+                self.start()
+            return
+        if "ready" in lines:
+            self.admit(one, count)
+        self.note(one, lines)
+
+    def admit(self, one, count):
+        """All begin together; whoever comes later begins at once."""
+        one.is_ready = True
+        if self.began:
+            one.begin()
+        elif sum(each.is_ready for each in self.shift) == count:
+            self.began = time.monotonic()
+            for each in self.shift:
+                each.begin()
 
     def note(self, one, lines):
         for line in lines:
@@ -143,27 +143,33 @@ class Office:
             elif word != "ready":
                 self.faults.append(f"workstation {one.number}: {line}")
 
-    def end(self, one, postings):
+    def end(self, one):
         self.selector.unregister(one.process.stdout)
         code = one.process.wait()
         one.process.stdin.close()
         one.process.stdout.close()
-        if not one.is_killed and (code != 0 or one.posted != postings):
+        if not one.is_killed and (code != 0 or one.posted != self.postings):
             self.faults.append(f"workstation {one.number} ended with {code} after {one.posted}")
 
-    def kill_one(self, shift, count):
+    def kill_one(self, count):
         """Only while all others but one at least are posting. What the killed one held is free:
         the counter, which everybody needs, can be held."""
-        posting = [one for one in shift if one.posted and one.process.returncode is None
-                   and not one.is_killed]
+        posting = [one for one in self.shift if one.posted and not one.is_killed]
         if len(posting) < count - 1:
-            return 0
+            return
         random.choice(posting).kill()
         began = time.monotonic()
         self.hold(30, "select * from tbContadores")
         self.release = max(self.release, (time.monotonic() - began) * 1000)
         self.hold(30, "select * from tbContadores where zelmars is null")
-        return 1
+        self.kills -= 1
+        if not self.kills:
+            self.kill_all()
+
+    def kill_all(self):
+        for one in self.shift:
+            if one.process.returncode is None and not one.is_killed:
+                one.kill()
 
     def hold(self, seconds, statement):
         answer = self.holder.hold(seconds, statement)
