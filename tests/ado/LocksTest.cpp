@@ -19,17 +19,6 @@ int lookedAt(const ado::RecordsetPtr& rows) {
     return failureOf([&] { rows->value(0); }).number();
 }
 
-/// Runs the action in a process of its own, which ends with it.
-template <class Action>
-pid_t inAnotherProcess(const Action& action) {
-    const pid_t process = fork();
-    if (process == 0) {
-        action();
-        _exit(0);
-    }
-    return process;
-}
-
 class Locks : public SmallBook {
 protected:
     Locks() {
@@ -39,11 +28,12 @@ protected:
     pid_t startHolder() const {
         int ready[2] = {};
         EXPECT_EQ(pipe(ready), 0);
-        const pid_t process = inAnotherProcess([&] {
+        const pid_t process = fork();
+        if (process == 0) {
             const auto rows = open(Counter, connect());
             rows->value(0);
             if (write(ready[1], "x", 1) == 1) pause();
-        });
+        }
         char sign = 0;
         EXPECT_EQ(read(ready[0], &sign, 1), 1);
         return process;
@@ -120,33 +110,6 @@ TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
     kill(holder, SIGKILL);
     waitpid(holder, nullptr, 0);
     EXPECT_EQ(lookedAt(impatient), 0);
-}
-
-TEST_F(Locks, GiveNoNumberTwice) {
-    std::vector<pid_t> processes;
-    for (int workstation = 0; workstation < 4; ++workstation)
-        processes.push_back(inAnotherProcess([&] {
-            const auto mine = connect(30);
-            for (int draws = 0; draws < 50; ++draws) {
-                const auto counter =
-                    open(Counter, mine, ado::adLockPessimistic, ado::adOpenDynamic);
-                const int number = counter->Collect(u"proximo"_s).toInt();
-                counter->setCollect(u"proximo"_s, number + 1);
-                counter->Update();
-                const auto drawn = open(u"select * from tbMov where id=0"_s, mine);
-                drawn->AddNew();
-                drawn->setCollect(u"socio"_s, number);
-                drawn->Update();
-            }
-        }));
-    for (const pid_t process : processes) {
-        int status = -1;
-        waitpid(process, &status, 0);
-        EXPECT_EQ(status, 0);
-    }
-    EXPECT_EQ(book.text(u"SELECT count(DISTINCT socio), min(socio), max(socio) FROM tbMov"_s),
-              u"200|1|200"_s);
-    EXPECT_EQ(book.text(u"SELECT proximo FROM tbConta"_s), u"201"_s);
 }
 
 }  // namespace

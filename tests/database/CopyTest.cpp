@@ -9,11 +9,11 @@
 #include "database/Book.h"
 #include "database/ServerBook.h"
 #include "platform/core/Failure.h"
-#include "tests/support/PostgresBook.h"
+#include "tests/support/BookHandle.h"
 #include "tests/support/Server.h"
-#include "tests/support/SqliteBook.h"
 
 using namespace Qt::StringLiterals;
+using support::BookHandle;
 using Content = support::BookHandle::Content;
 
 namespace {
@@ -96,8 +96,11 @@ protected:
     }
 
     QTemporaryDir root_;
-    support::SqliteBook file{Content::Sample, root_.path()};
-    support::PostgresBook server{Content::Empty};
+    const std::unique_ptr<BookHandle> madeFile =
+        BookHandle::makeFile(Content::Sample, root_.path());
+    const std::unique_ptr<BookHandle> madeServer = BookHandle::makeOnServer(Content::Empty);
+    BookHandle& file = *madeFile;
+    BookHandle& server = *madeServer;
     const database::BookPlace inFile{root_.path(), {}, u"zelmars"_s};
     const database::BookPlace onServer{{},
                                        {support::Server::instance().folder(),

@@ -3,7 +3,6 @@
 
 #include "coverage/Statements.h"
 #include "tests/support/Book.h"
-#include "tests/support/PostgresBook.h"
 
 using namespace Qt::StringLiterals;
 
@@ -91,7 +90,8 @@ TEST(Schema, DailyStatementsDoNotReadWholeTables) {
         rows(u"select * from tbZelmar_movimentos_historico where no_kor ='100015'"_s),
     };
     support::Book book;
-    support::PostgresBook server(support::BookHandle::Content::Empty);
+    const auto made = support::BookHandle::makeOnServer(support::Book::Content::Empty);
+    support::BookHandle& server = *made;
     server.rows(u"set enable_seqscan = off"_s);  // where a key serves at all, it is taken
     for (QString statement : statements) {
         const QString plan = book.text(u"explain query plan "_s +

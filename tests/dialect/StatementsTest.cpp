@@ -3,16 +3,15 @@
 // engines: columns, order, types, values.
 #include <gtest/gtest.h>
 
-#include <QFile>
 #include <QRegularExpression>
 #include <QTemporaryDir>
 
 #include "platform/ado/Recordset.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Values.h"
+#include "tests/support/BookHandle.h"
 #include "tests/support/Failure.h"
-#include "tests/support/PostgresBook.h"
-#include "tests/support/SqliteBook.h"
+#include "tests/support/Lines.h"
 
 using namespace Qt::StringLiterals;
 using support::BookHandle;
@@ -28,20 +27,17 @@ struct Listed {
 };
 
 QList<Listed> listed() {
-    QFile file(QStringLiteral(STATEMENTS_FILE));
-    if (!file.open(QIODevice::ReadOnly)) return {};
     QList<Listed> all;
-    const QStringList lines = QString::fromUtf8(file.readAll()).split(u'\n');
+    const QStringList lines = support::linesOf(QStringLiteral(STATEMENTS_FILE));
     for (qsizetype at = 0; at + 1 < lines.size(); at += 2)
-        all << Listed{lines[at], lines[at + 1].trimmed(), !lines[at].endsWith(u" (no row)")};
+        all << Listed{lines[at], lines[at + 1], !lines[at].endsWith(u" (no row)")};
     return all;
 }
 
 /// The same book on both engines.
 struct Twins {
     explicit Twins(BookHandle::Content content)
-        : books{std::make_unique<support::SqliteBook>(content, folder.path()),
-                std::make_unique<support::PostgresBook>(content)} {
+        : books{BookHandle::makeFile(content, folder.path()), BookHandle::makeOnServer(content)} {
         for (std::size_t at = 0; at < books.size(); ++at) {
             connections[at] = std::make_shared<ado::Connection>();
             connections[at]->ConnectionString = books[at]->shapingConnectionString();

@@ -6,6 +6,7 @@
 #include "boundary/General.h"
 #include "data/modDlookup.h"
 #include "tests/entry/EntryTest.h"
+#include "tests/support/Lines.h"
 
 using namespace Qt::StringLiterals;
 
@@ -14,30 +15,7 @@ namespace entry {
 namespace {
 
 /// What no statement of the office may do.
-const QStringList Deeds = {
-    u"DELETE FROM tbSocios"_s,
-    u"DELETE/**/FROM tbSocios"_s,
-    u"UPDATE tbContadores SET zelmars = 1"_s,
-    u"INSERT INTO tbCheques VALUES(7)"_s,
-    u"DROP TABLE tbSocios"_s,
-    u"ALTER TABLE tbSocios ADD x integer"_s,
-    u"CREATE TABLE tbX(y integer)"_s,
-    u"CREATE TEMP TABLE tbX(y integer)"_s,
-    u"PRAGMA writable_schema=1"_s,
-    u"ATTACH 'x.db' AS x"_s,
-    u"VACUUM INTO 'x.db'"_s,
-    u"COPY tbSocios TO PROGRAM 'true'"_s,
-    u"TRUNCATE tbSocios"_s,
-    u"GRANT ALL ON tbSocios TO PUBLIC"_s,
-    u"SET default_transaction_read_only = off"_s,
-    u"COMMIT"_s,
-    u"DO $$BEGIN DELETE FROM tbSocios; END$$"_s,
-    u"CALL x()"_s,
-    u"EXEC xp_cmdshell 'x'"_s,
-    u"LOCK TABLE tbSocios"_s,
-    u"NOTIFY x"_s,
-    u"WITH x AS (DELETE FROM tbSocios RETURNING *) SELECT * FROM x"_s,
-    u"SHAPE {DELETE FROM tbSocios} APPEND ({SELECT 1} RELATE a TO b) AS c"_s};
+const QStringList Deeds = support::linesOf(QStringLiteral(DEEDS_FILE));
 
 /// How a text closes the quote that it stands in and brings a deed with it.
 const QStringList Wrappings = {
@@ -46,32 +24,7 @@ const QStringList Wrappings = {
     u"'\u00a0;\u00a0%1 '"_s, u"$$'; %1; --$$"_s,  u"' /* '; %1 -- */ '"_s};
 
 /// Functions that do more than give a value, or that no engine can finish.
-const QStringList Functions = {u"lo_create(0)"_s,
-                               u"lo_unlink(1)"_s,
-                               u"lo_import('/etc/passwd')"_s,
-                               u"lo_export(1, '/tmp/x')"_s,
-                               u"nextval('tbsocios_socio_id_seq')"_s,
-                               u"setval('tbsocios_socio_id_seq', 99)"_s,
-                               u"pg_terminate_backend(pg_backend_pid())"_s,
-                               u"pg_catalog.pg_cancel_backend(1)"_s,
-                               u"[pg_sleep](9)"_s,
-                               u"PG_ADVISORY_LOCK(1)"_s,
-                               u"pg_reload_conf()"_s,
-                               u"pg_read_file('/etc/passwd')"_s,
-                               u"pg_logical_emit_message(true, 'a', 'b')"_s,
-                               u"set_config('default_transaction_read_only', 'off', false)"_s,
-                               u"query_to_xml('delete from tbSocios', true, true, '')"_s,
-                               u"dblink('x', 'delete')"_s,
-                               u"U&\"\\0070g_sleep\"(9)"_s,
-                               u"load_extension('x')"_s,
-                               u"writefile('/tmp/x', 'y')"_s,
-                               u"fts3_tokenizer('x', x'00')"_s,
-                               u"edit('x')"_s,
-                               u"randomblob(99999999999)"_s,
-                               u"repeat('x', 2147483647)"_s,
-                               u"xp_cmdshell('x')"_s,
-                               u"(SELECT 1 INTO tbX)"_s,
-                               u"(DELETE FROM tbSocios RETURNING 1)"_s};
+const QStringList Functions = support::linesOf(QStringLiteral(FUNCTIONS_FILE));
 
 const QStringList Unbalanced = {u"'"_s,
                                 u"''' "_s,

@@ -1,9 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "tests/support/BookHandle.h"
 
-#include "tests/support/PostgresBook.h"
-#include "tests/support/SqliteBook.h"
-
 using namespace Qt::StringLiterals;
 
 namespace support {
@@ -14,8 +11,7 @@ bool onServer() {
 }
 
 std::unique_ptr<BookHandle> BookHandle::make(Content content, const QString& folder) {
-    if (onServer()) return std::make_unique<PostgresBook>(content);
-    return std::make_unique<SqliteBook>(content, folder);
+    return onServer() ? makeOnServer(content) : makeFile(content, folder);
 }
 
 QString BookHandle::connectionString() const {

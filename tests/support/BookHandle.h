@@ -16,8 +16,13 @@ bool onServer();
 class BookHandle {
 public:
     enum class Content { Empty, Sample };
-    /// Makes a book of the run's engine; a file lies in the folder.
+    /// A book of the run's engine; a file lies in the folder.
     static std::unique_ptr<BookHandle> make(Content content, const QString& folder);
+    /// A file, copied from one that the process makes once.
+    static std::unique_ptr<BookHandle> makeFile(Content content, const QString& folder);
+    /// A catalogue of its own on the run's server, copied likewise. The handle is its owner's;
+    /// `user` is an operator, who may do what the screens do and nothing else.
+    static std::unique_ptr<BookHandle> makeOnServer(Content content);
     virtual ~BookHandle() = default;
 
     // The values that name the book.

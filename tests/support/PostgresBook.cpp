@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tests/support/PostgresBook.h"
+#include "tests/support/BookHandle.h"
 
 #include <libpq-fe.h>
 
@@ -87,7 +87,24 @@ QString pattern(BookHandle::Content content) {
     return name;
 }
 
-}  // namespace
+class PostgresBook final : public BookHandle {
+public:
+    explicit PostgresBook(Content content);
+    ~PostgresBook() override;
+
+    QString dataSource() const override;
+    QString catalogue() const override { return catalogue_; }
+    QString user() const override;
+    QList<QStringList> rows(const QString& statements) override;
+    QStringList tables() override;
+    void hold(const QString& table) override;
+    void refuse(const QString& write, const QString& text) override;
+    void refuseNoMore() override;
+
+private:
+    QString catalogue_;
+    pg_conn* handle_ = nullptr;
+};
 
 PostgresBook::PostgresBook(Content content) {
     static int made = 0;
@@ -140,6 +157,12 @@ void PostgresBook::refuse(const QString& write, const QString& text) {
 
 void PostgresBook::refuseNoMore() {
     rows(u"drop function refuses() cascade"_s);
+}
+
+}  // namespace
+
+std::unique_ptr<BookHandle> BookHandle::makeOnServer(Content content) {
+    return std::make_unique<PostgresBook>(content);
 }
 
 }  // namespace support

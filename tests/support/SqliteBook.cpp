@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tests/support/SqliteBook.h"
+#include "tests/support/BookHandle.h"
 
 #include <sqlite3.h>
 
@@ -41,7 +41,24 @@ QString cell(sqlite3_stmt* statement, int column) {
     }
 }
 
-}  // namespace
+class SqliteBook final : public BookHandle {
+public:
+    SqliteBook(Content content, const QString& folder);
+    ~SqliteBook() override;
+
+    QString dataSource() const override { return QStringLiteral("sqlite:") + folder_; }
+    QString catalogue() const override { return QStringLiteral("zelmars"); }
+    QString user() const override { return QStringLiteral("zelmars"); }
+    QList<QStringList> rows(const QString& statements) override;
+    QStringList tables() override;
+    void hold(const QString& table) override;
+    void refuse(const QString& write, const QString& text) override;
+    void refuseNoMore() override;
+
+private:
+    QString folder_;
+    sqlite3* handle_ = nullptr;
+};
 
 SqliteBook::SqliteBook(Content content, const QString& folder) : folder_(folder) {
     const QString file = database::bookFile(folder, catalogue());
@@ -94,6 +111,12 @@ void SqliteBook::refuse(const QString& write, const QString& text) {
 
 void SqliteBook::refuseNoMore() {
     rows(u"drop trigger refuses"_s);
+}
+
+}  // namespace
+
+std::unique_ptr<BookHandle> BookHandle::makeFile(Content content, const QString& folder) {
+    return std::make_unique<SqliteBook>(content, folder);
 }
 
 }  // namespace support
