@@ -9,7 +9,7 @@
 #include "benchmarks/Benches.h"
 #include "platform/ado/Recordset.h"
 #include "platform/ado/RowStore.h"
-#include "platform/core/Values.h"
+#include "platform/core/Money.h"
 
 using namespace Qt::StringLiterals;
 
@@ -78,10 +78,10 @@ Seen pass(const ado::ConnectionPtr& connection, double* most) {
         const ado::RecordsetPtr rows = open(statement, connection);
         for (; !rows->atEnd(); rows->MoveNext()) {
             seen.members += rows->value(Socio).toInt();
-            seen.letters += rows->value(Data).toDateTime().isValid();
+            seen.letters += rows->value(Data).isValid();
             seen.letters += rows->value(Tipo).toString().size();
-            seen.balance += core::toDouble(rows->value(Debito));
-            seen.balance -= core::toDouble(rows->value(Credito));
+            seen.balance += rows->value(Debito).value<core::Money>().toDouble();
+            seen.balance -= rows->value(Credito).value<core::Money>().toDouble();
             if (++seen.rows % 10'000 == 0 && most) *most = std::max(*most, residentMegabytes());
         }
     }
@@ -138,32 +138,6 @@ void compareStretches(Report& report, const QString& name, const std::function<v
     report.ratio(name, 1.5, ourTimes, theirTimes);
 }
 
-/// Passes over a tenth of the table and writes to each tenth row of it.
-void measureUpdates(Report& report, Engine engine) {
-    const QString name = u"pass that updates each tenth row/"_s + nameOf(engine);
-    if (!report.wanted(name)) return;
-    constexpr int Steps = 98'000;
-    const BookCopy copy(largeBook(engine));
-    const ado::RecordsetPtr rows = open(Movements[0], connect(copy.book()), ado::adLockOptimistic);
-    const std::unique_ptr<Bare> engineAlone = bare(copy.book());
-    const std::unique_ptr<BareRows> theirRows = engineAlone->rows(Movements[0].toUtf8());
-    const auto ours = [&] {
-        for (int step = 1; step <= Steps; ++step, rows->MoveNext()) {
-            if (step % 10 != 0) continue;
-            rows->setCollect(u"obs"_s, u"medida"_s);
-            rows->Update();
-        }
-    };
-    const auto theirs = [&] {
-        for (int step = 1; step <= Steps && theirRows->next(); ++step)
-            if (step % 10 == 0)
-                engineAlone->write(
-                    "UPDATE tbZelmar_Movimentos SET obs = $1 WHERE movimento_id = $2",
-                    {"medido", theirRows->integer(Id)});
-    };
-    compareStretches(report, name, ours, theirs);
-}
-
 void fillDocument(ado::Recordset& row, int number) {
     const QDateTime day(QDate(2026, 11, 20), QTime(0, 0), Qt::UTC);
     row.setCollect(u"movimento_no"_s, number);
@@ -191,6 +165,34 @@ void insertBare(Bare& bare, qint64 number) {
         "$10, $11, $12, $13, $14, $15, $16, $17, $18)",
         {number, qint64{17}, "A", qint64{5}, day, "DOC", day, "1234", amount, amount, amount,
          amount, amount, amount, amount, amount, "TRF", "ana"});
+}
+
+/// Passes over a tenth of the table and writes to each tenth row of it.
+void measureUpdates(Report& report, Engine engine) {
+    const QString name = u"pass that updates each tenth row/"_s + nameOf(engine);
+    if (!report.wanted(name)) return;
+    constexpr int Steps = 98'000;
+    const BookCopy copy(largeBook(engine));
+    const std::unique_ptr<Bare> engineAlone = bare(copy.book());
+    // As on a book at work: a pass that begins with an empty journal makes every bare write slower.
+    insertBare(*engineAlone, 1);
+    const ado::RecordsetPtr rows = open(Movements[0], connect(copy.book()), ado::adLockOptimistic);
+    const std::unique_ptr<BareRows> theirRows = engineAlone->rows(Movements[0].toUtf8());
+    const auto ours = [&] {
+        for (int step = 1; step <= Steps; ++step, rows->MoveNext()) {
+            if (step % 10 != 0) continue;
+            rows->setCollect(u"obs"_s, u"medida"_s);
+            rows->Update();
+        }
+    };
+    const auto theirs = [&] {
+        for (int step = 1; step <= Steps && theirRows->next(); ++step)
+            if (step % 10 == 0)
+                engineAlone->write(
+                    "UPDATE tbZelmar_Movimentos SET obs = $1 WHERE movimento_id = $2",
+                    {"medido", theirRows->integer(Id)});
+    };
+    compareStretches(report, name, ours, theirs);
 }
 
 void measureInserts(Report& report, Engine engine) {

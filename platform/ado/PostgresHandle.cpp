@@ -138,7 +138,7 @@ void PostgresHandle::setTimeout(int seconds) {
     // The server's own limits, in milliseconds, end a little before anybody takes it for gone. 0
     // would be no limit at all.
     send("SET lock_timeout = " + QByteArray::number(qMax(1, seconds * 950)));
-    send("SET statement_timeout = " + QByteArray::number(qMax(1, seconds * 975)));
+    send("SET statement_timeout = " + QByteArray::number(qMax(1000, seconds * 975)));
 }
 
 bool PostgresHandle::isLost() {

@@ -3,6 +3,7 @@
 
 #include <QHash>
 #include <algorithm>
+#include <optional>
 #include <unordered_map>
 
 #include "platform/ado/Recordset.h"
@@ -79,6 +80,7 @@ struct Recordset::Implementation {
         int column = -1;
     };
     mutable Name names[32];  ///< names found lately, by the place of their text
+    std::vector<std::optional<ColumnType>> types;  ///< of the columns that were read
 
     // Opening.
     void openRows();
@@ -107,12 +109,23 @@ struct Recordset::Implementation {
     QVariant valueAt(qint64 place, int column);
     RowIdentity identity();
     /// Takes the lock that the current row needs and reads the row afresh where that is called for.
-    void look();
+    void look() {
+        if (!table.isEmpty()) lookAtRow();
+    }
+    void lookAtRow();
+    ColumnType typeOf(int column);
     bool readFresh();
 
     // Writing.
-    void requireOpen() const;
-    void requireRow() const;
+    void requireOpen() const {
+        if (!rows) refuseClosed();
+    }
+    void requireRow() const {
+        requireOpen();
+        if (at == At::Nothing || deleted) refuseNoRow();
+    }
+    [[noreturn]] static void refuseClosed();
+    [[noreturn]] static void refuseNoRow();
     void requireTable() const;
     bool readOnly() const { return lockType == adLockUnspecified || lockType == adLockReadOnly; }
     /// The session to write through; fails when the rows came from another book.

@@ -95,6 +95,7 @@ void Recordset::Implementation::close() {
     added.clear();
     stored.clear();
     gone.clear();
+    types.clear();
     for (Name& name : names) name = {};
     at = At::Nothing;
 }
@@ -108,7 +109,7 @@ void Recordset::Implementation::leaveRow() {
     wantsFresh = settled = deleted = false;
     held.reset();
     // Of a long set only the current row is remembered.
-    if (rows && !rows->inMemory()) stored.clear();
+    if (!stored.empty() && rows && !rows->inMemory()) stored.clear();
 }
 
 void Recordset::Implementation::toFirst() {
@@ -202,13 +203,21 @@ QVariant Recordset::Implementation::value(int column) {
     if (const QVariant* changed = changes.find(column)) return *changed;
     if (at == At::New) return {};
     look();
-    const ColumnType type = rows->columns().column(column).type;
+    const ColumnType type = typeOf(column);
     if (fresh.count() > 0) return toVariant(fresh.cell(0, column), type);
     if (at == At::Added) return {};  // deleted by somebody else since
     if (!stored.empty())
         if (const auto row = stored.find(rows->row()); row != stored.end())
             if (const QVariant* known = row->second.find(column)) return *known;
     return toVariant(rows->cell(column), type);
+}
+
+ColumnType Recordset::Implementation::typeOf(int column) {
+    const Pass& pass = rows->columns();
+    if (types.empty()) types.resize(static_cast<std::size_t>(pass.columnCount()));
+    std::optional<ColumnType>& known = types[static_cast<std::size_t>(column)];
+    if (!known) known = pass.column(column).type;
+    return *known;
 }
 
 QVariant Recordset::Implementation::valueAt(qint64 place, int column) {
@@ -229,8 +238,7 @@ RowIdentity Recordset::Implementation::identity() {
     return at == At::Added ? added[static_cast<std::size_t>(addedAt)] : rows->identity();
 }
 
-void Recordset::Implementation::look() {
-    if (table.isEmpty()) return;
+void Recordset::Implementation::lookAtRow() {
     if (lockType == adLockPessimistic && !held && !settled) {
         fresh.clear();
         held = session()->lock(table, identity(), connection->CommandTimeout, fresh);
@@ -247,14 +255,12 @@ bool Recordset::Implementation::readFresh() {
 
 // --- Requirements
 
-void Recordset::Implementation::requireOpen() const {
-    if (!rows) throw core::Failure(core::ObjectClosed, u"O conjunto de linhas está fechado."_s);
+void Recordset::Implementation::refuseClosed() {
+    throw core::Failure(core::ObjectClosed, u"O conjunto de linhas está fechado."_s);
 }
 
-void Recordset::Implementation::requireRow() const {
-    requireOpen();
-    if (at == At::Nothing || deleted)
-        throw core::Failure(core::NoCurrentRow, u"Não há nenhuma linha corrente."_s);
+void Recordset::Implementation::refuseNoRow() {
+    throw core::Failure(core::NoCurrentRow, u"Não há nenhuma linha corrente."_s);
 }
 
 std::shared_ptr<Session> Recordset::Implementation::session() const {

@@ -75,12 +75,6 @@ bool Rows::toLast() {
     return count_ > 0;
 }
 
-Cell Rows::cell(int column) {
-    if (kept(row_)) return store_->cell(row_, column);
-    if (passRow_ != row_) seek(row_);
-    return pass_->cell(column);
-}
-
 RowIdentity Rows::identity() {
     if (kept(row_)) return store_->identity(row_);
     if (passRow_ != row_) seek(row_);

@@ -26,7 +26,11 @@ public:
     qint64 row() const { return row_; }
 
     // Of the row stood on.
-    Cell cell(int column);
+    Cell cell(int column) {
+        if (kept(row_)) return store_->cell(row_, column);
+        if (passRow_ != row_) seek(row_);
+        return pass_->cell(column);
+    }
     RowIdentity identity();
 
     bool inMemory() const { return complete_; }

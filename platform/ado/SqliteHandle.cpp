@@ -17,6 +17,9 @@ constexpr std::size_t CachedStatements = 64;
 /// Bytes to which the journal shrinks again after a long scan made it grow.
 constexpr auto JournalLimit = "PRAGMA journal_size_limit=16777216";
 
+/// Frames of the journal after which it is written back into the book.
+constexpr int CheckpointFrames = 1000;
+
 /// An enlarged bind that is blank or a comment holds no second statement.
 bool isBlank(const char* text) {
     while (*text == ' ' || *text == '\n' || *text == '\t' || *text == '\r' || *text == ';') ++text;
@@ -32,7 +35,10 @@ SqliteHandle::SqliteHandle(const QString& path, Role role, int timeoutSeconds) {
         setTimeout(timeoutSeconds);
         installCollation(db_);
         execute(role == Role::Reader ? "PRAGMA query_only=1" : "PRAGMA synchronous=FULL");
-        if (role == Role::Writer) execute(JournalLimit);
+        if (role == Role::Writer) {
+            execute(JournalLimit);
+            sqlite3_wal_hook(db_, committed, this);
+        }
     } catch (...) {
         sqlite3_close_v2(db_);
         throw;
@@ -103,6 +109,19 @@ sqlite3_stmt* SqliteHandle::cached(const QByteArray& text) {
     }
     sqlite3_reset(found->get());
     return found->get();
+}
+
+// A long pass keeps the journal from being written back, and every attempt goes through all of it
+// in vain: each one waits until the journal has grown by half since the last.
+int SqliteHandle::committed(void* handle, sqlite3* db, const char* schema, int frames) {
+    int& next = static_cast<SqliteHandle*>(handle)->nextCheckpoint_;
+    if (frames < CheckpointFrames) next = CheckpointFrames;
+    if (frames < next) return SQLITE_OK;
+    int inJournal = 0;
+    int writtenBack = 0;
+    sqlite3_wal_checkpoint_v2(db, schema, SQLITE_CHECKPOINT_PASSIVE, &inJournal, &writtenBack);
+    next = writtenBack == inJournal ? CheckpointFrames : frames + frames / 2;
+    return SQLITE_OK;
 }
 
 void SqliteHandle::execute(const char* text) {

@@ -57,9 +57,11 @@ public:
 
 private:
     static int awaitOthers(void* handle, int tries);
+    static int committed(void* handle, sqlite3* db, const char* schema, int frames);
 
     sqlite3* db_ = nullptr;
     int timeout_ = -1;
+    int nextCheckpoint_ = 0;  ///< frames of the journal at which it is written back into the book
     QElapsedTimer waited_;
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
     std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
