@@ -3,6 +3,8 @@
 
 #include <poll.h>
 
+#include <QRegularExpression>
+
 #include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
 
@@ -28,6 +30,20 @@ QString oneLine(const char* text) {
     return QString::fromUtf8(text).simplified();
 }
 
+struct Said {
+    QString text;
+    QString code;  ///< SQLSTATE; empty when the server never spoke
+};
+
+/// Takes the code and the place in the server's sources out of its verbose text.
+Said withoutCode(const QString& verbose) {
+    static const QRegularExpression form(
+        u": ((?=[A-Z]*[0-9])[0-9A-Z]{5}): (.*?)(?: LOCATION: .*)?$"_s);
+    const QRegularExpressionMatch match = form.match(verbose);
+    if (!match.hasMatch()) return {verbose, {}};
+    return {verbose.left(match.capturedStart()) + u": "_s + match.captured(2), match.captured(1)};
+}
+
 bool isFailure(const PGresult* result) {
     const ExecStatusType status = PQresultStatus(result);
     return status == PGRES_FATAL_ERROR || status == PGRES_BAD_RESPONSE;
@@ -48,29 +64,6 @@ bool await(PGconn* connection, short events, const QDeadlineTimer& deadline) {
 
 }  // namespace
 
-void PostgresAddress::place(const QString& text) {
-    const qsizetype colon = text.lastIndexOf(u':');
-    if (colon > text.lastIndexOf(u']')) {
-        host = text.left(colon);
-        port = text.mid(colon + 1).trimmed();
-        bool isNumber = false;
-        const int number = port.toInt(&isNumber);
-        if (!isNumber || number < 1 || number > 65535)
-            throw core::Failure(
-                core::InvalidCall,
-                u"Não foi possível abrir o livro «%1»: a porta «%2» não existe."_s.arg(shown(),
-                                                                                       port));
-    } else {
-        host = text;
-    }
-    host = host.trimmed();
-    if (host.startsWith(u'[') && host.endsWith(u']')) host = host.mid(1, host.size() - 2);
-}
-
-QString PostgresAddress::shown() const {
-    return u"postgresql:"_s + host + (port.isEmpty() ? QString() : u':' + port) + u'/' + catalog;
-}
-
 PostgresHandle::PostgresHandle(const PostgresAddress& address, Role role)
     : place_(address.shown()) {
     try {
@@ -87,33 +80,58 @@ PostgresHandle::~PostgresHandle() {
 }
 
 void PostgresHandle::connect(const PostgresAddress& address) {
-    const QByteArray values[] = {address.host.toUtf8(), address.port.toUtf8(),
-                                 address.user.toUtf8(), address.password.toUtf8(),
-                                 address.catalog.toUtf8()};
-    const char* const names[] = {
-        "host", "port", "user", "password", "dbname", "client_encoding", "application_name",
-        nullptr};
-    const char* const texts[] = {
-        values[0], values[1], values[2], values[3], values[4], "UTF8", workstation().constData(),
-        nullptr};
-    const auto fail = [&](const QString& why) {
+    const auto fail = [&](const QString& why,
+                          const QString& code = QLatin1StringView(CannotConnect)) {
         return core::Failure(
             core::DatabaseFailure,
             u"Não foi possível abrir o livro «%1» como «%2»: %3"_s.arg(place_, address.user, why),
-            QString::fromLatin1(CannotConnect));
+            code);
     };
-    connection_ = PQconnectStartParams(names, texts, 0);
     const QDeadlineTimer deadline(address.connectSeconds * 1000);
+    const PostgresAddress::Found found = address.lookUp(deadline);
+    const QString silent =
+        u"o servidor não respondeu em %1 segundos."_s.arg(address.connectSeconds);
+    if (!found.error.isEmpty()) throw fail(found.error);
+    if (found.isLate) throw fail(silent);
+    start(address, found);
     for (PostgresPollingStatusType next = PGRES_POLLING_WRITING; next != PGRES_POLLING_OK;
          next = PQconnectPoll(connection_)) {
-        if (next == PGRES_POLLING_FAILED || PQstatus(connection_) == CONNECTION_BAD)
-            throw fail(oneLine(PQerrorMessage(connection_)));
+        if (next == PGRES_POLLING_FAILED || PQstatus(connection_) == CONNECTION_BAD) {
+            const Said said = withoutCode(oneLine(PQerrorMessage(connection_)));
+            throw said.code.isEmpty() ? fail(said.text) : fail(said.text, said.code);
+        }
         if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline))
-            throw fail(u"o servidor não respondeu em %1 segundos."_s.arg(address.connectSeconds));
+            throw fail(silent);
     }
     if (PQserverVersion(connection_) < OldestServer)
         throw fail(u"o servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
             PQserverVersion(connection_) / 10000));
+}
+
+void PostgresHandle::start(const PostgresAddress& address, const PostgresAddress::Found& found) {
+    const QByteArray values[] = {found.hosts,
+                                 found.addresses,
+                                 address.port.toUtf8(),
+                                 address.user.toUtf8(),
+                                 address.password.toUtf8(),
+                                 address.catalog.toUtf8(),
+                                 "UTF8",
+                                 workstation()};
+    const char* const names[] = {"host",
+                                 "hostaddr",
+                                 "port",
+                                 "user",
+                                 "password",
+                                 "dbname",
+                                 "client_encoding",
+                                 "application_name",
+                                 nullptr};
+    std::vector<const char*> texts;
+    for (const QByteArray& value : values) texts.push_back(value.constData());
+    texts.push_back(nullptr);
+    connection_ = PQconnectStartParams(names, texts.data(), 0);
+    // Of a refused connection the code is told nowhere else.
+    PQsetErrorVerbosity(connection_, PQERRORS_VERBOSE);
 }
 
 void PostgresHandle::settle(Role role) {

@@ -26,6 +26,15 @@ struct PostgresAddress {
     void place(const QString& text);
     /// Server and book, as texts of failures name them; never the password.
     QString shown() const;
+
+    /// What a host's name stands for.
+    struct Found {
+        QByteArray hosts;      ///< for each address the name, parted by commas
+        QByteArray addresses;  ///< empty for a local socket
+        QString error;         ///< why there is none
+        bool isLate = false;   ///< the deadline came first
+    };
+    Found lookUp(const QDeadlineTimer& deadline) const;
 };
 
 struct PostgresClear {
@@ -81,6 +90,7 @@ public:
 
 private:
     void connect(const PostgresAddress& address);
+    void start(const PostgresAddress& address, const PostgresAddress::Found& found);
     void settle(Role role);
     /// Both give the number of answers that will come.
     int dispatch(const QByteArray& text);
