@@ -25,6 +25,15 @@ QString percentText(double percent) {
     return u"%1 %"_s.arg(qRound(percent));
 }
 
+QString pageText(int page) {
+    return page < 0 ? QString() : QString::number(page + 1);
+}
+
+/// An equal text keeps its selection, so that the next key replaces it.
+void replaceText(QLineEdit* field, const QString& text) {
+    if (field->text() != text) field->setText(text);
+}
+
 }  // namespace
 
 forms::Button* previewButton(PreviewCommand command, const PreviewHandler& handler) {
@@ -120,7 +129,7 @@ void PreviewBar::addZoom(QBoxLayout* row, const PreviewHandler& handler) {
 void PreviewBar::showPage(int page, int count) {
     shownPage_ = page;
     shownCount_ = count;
-    if (!page_->hasFocus()) page_->setText(page < 0 ? QString() : QString::number(page + 1));
+    if (!page_->hasFocus()) replaceText(page_, pageText(page));
     count_->setText(u"de %1"_s.arg(count));
     for (forms::Button* button : back_) button->setEnabled(page > 0);
     for (forms::Button* button : ahead_) button->setEnabled(page + 1 < count);
@@ -128,7 +137,7 @@ void PreviewBar::showPage(int page, int count) {
 
 void PreviewBar::showZoom(double percent) {
     shownPercent_ = percent;
-    if (!zoom_->lineEdit()->hasFocus()) zoom_->setEditText(percentText(percent));
+    if (!zoom_->lineEdit()->hasFocus()) replaceText(zoom_->lineEdit(), percentText(percent));
 }
 
 void PreviewBar::showContinuous(bool continuous) {
@@ -154,6 +163,7 @@ void PreviewBar::pageTyped() {
     const int page = page_->text().toInt(&isNumber);
     if (isNumber && page > 0) return onPage(page - 1);
     core::MsgBox(u"Indique o número da página."_s, core::Icon::Information);
+    replaceText(page_, pageText(shownPage_));
     page_->selectAll();
 }
 
@@ -166,6 +176,7 @@ void PreviewBar::zoomTyped(const QString& text) {
     core::MsgBox(u"Indique o tamanho em percentagem, de %1 a %2."_s.arg(PreviewView::LeastPercent)
                      .arg(PreviewView::MostPercent),
                  core::Icon::Information);
+    replaceText(zoom_->lineEdit(), percentText(shownPercent_));
     zoom_->lineEdit()->selectAll();
 }
 

@@ -158,8 +158,9 @@ TEST_F(PreviewWindow, ChangesItsSizeAndKeepsThePlace) {
     }
     person.expectBox({.text = u"Indique o tamanho em percentagem, de 10 a 400."_s});
     typeZoom(u"1000"_s);
-    person.tab();
     EXPECT_EQ(zoom(), u"250 %"_s);
+    person.type(u"90"_s), person.enter();  // over the old text
+    EXPECT_EQ(zoom(), u"90 %"_s);
 }
 
 TEST_F(PreviewWindow, FindsTextsWithoutMindingAccentsOrCase) {
