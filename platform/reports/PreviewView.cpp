@@ -105,13 +105,14 @@ void PreviewView::fitPercent() {
 /// Makes a change of size or arrangement, after which the same part of the same page is on top.
 void PreviewView::keepingPlace(const std::function<void()>& change) {
     const int page = current_;
-    const double above = verticalScrollBar()->value() - topOf(std::max(0, page));
-    const double part = above / pageSize().height();
+    const int above = verticalScrollBar()->value() - topOf(std::max(0, page));
+    const double part = above / static_cast<double>(pageSize().height());
     change();
     fitPercent();
     settleRanges();
+    const int now = above < 0 ? above : qRound(part * pageSize().height());
     settling_ = true;
-    if (page >= 0) verticalScrollBar()->setValue(topOf(page) + qRound(part * pageSize().height()));
+    if (page >= 0) verticalScrollBar()->setValue(topOf(page) + now);
     settling_ = false;
     viewport()->update();
     emit moved();
