@@ -62,7 +62,8 @@ void Translation::survey() {
             if (c == u'(') ++depth;
             if (c == u')' && --depth < inner) inner = 0;
             if (c == u'+') has_.plus = true;
-            if (c == u'-' || c == u'*') has_.arithmetic = true;
+            const bool allColumns = s.is(i - 1, "select"_L1) || s.is(i - 1, "."_L1);
+            if (c == u'-' || (c == u'*' && !allColumns)) has_.arithmetic = true;
         } else if (token.kind == TokenKind::Word) {
             if (s.is(i, "select"_L1) && inner == 0) inner = depth;
             if (inner == 0 && from_ < 0 && aggregates(i)) grouped_ = true;
@@ -100,12 +101,14 @@ bool Translation::isKeyword(int i) const {
 
 // What a server has besides tables and plain functions waits, locks, stops others, reads files.
 void Translation::refuseServerFunctions() const {
-    for (int i = 0; i < s.count(); ++i)
-        if ((s.isWord(i) || s.kind(i) == TokenKind::Name) &&
-            s.name(i).startsWith("pg_"_L1, Qt::CaseInsensitive))
+    for (int i = 0; i < s.count(); ++i) {
+        QStringView name = s.word(i);
+        if (s.kind(i) == TokenKind::Name) name = name.mid(1);
+        if (name.startsWith("pg_"_L1, Qt::CaseInsensitive))
             throw core::Failure(
                 core::InvalidCall,
                 u"A consulta usa «%1», que é do servidor, e não foi executada."_s.arg(s.name(i)));
+    }
 }
 
 /// True for a word directly behind a number.
