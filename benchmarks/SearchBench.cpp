@@ -63,15 +63,6 @@ void measureMovementSearch(Report& report, const Book& large) {
                  }));
 }
 
-double residentMegabytes(qint64 process) {
-    QFile status(u"/proc/%1/status"_s.arg(process));
-    if (!status.open(QIODevice::ReadOnly)) return 0;
-    for (const QByteArray& line : status.readAll().split('\n'))
-        if (line.startsWith("VmRSS:"))
-            return line.mid(6).simplified().split(' ')[0].toDouble() / 1024;
-    return 0;
-}
-
 /// The program as people run it, until it has read the whole book.
 void measureHostMemory(Report& report, const Book& large) {
     use(large);
@@ -94,6 +85,15 @@ void measureHostMemory(Report& report, const Book& large) {
 }
 
 }  // namespace
+
+double residentMegabytes(qint64 process) {
+    QFile status(u"/proc/%1/status"_s.arg(process));
+    if (!status.open(QIODevice::ReadOnly)) return 0;
+    for (const QByteArray& line : status.readAll().split('\n'))
+        if (line.startsWith("VmRSS:"))
+            return line.mid(6).simplified().split(' ')[0].toDouble() / 1024;
+    return 0;
+}
 
 void measureSearches(Report& report) {
     if (report.wanted(u"filter keystroke"_s)) {

@@ -30,6 +30,7 @@ int main(int argc, char** argv) {
         benchmarks::measureCoverage(report);
         benchmarks::measureAccounts(report);
         benchmarks::measureEngines(report);
+        benchmarks::measurePrinting(report);
         benchmarks::measureScreens(report);
         benchmarks::measureSearches(report);
         benchmarks::measureWorkstations(report);

@@ -32,11 +32,15 @@ QRectF inUnits(const QRectF& rect) {
 
 /// The painter's unit is 1/1200 inch.
 void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces) {
-    for (const Box& box : page.boxes) {
-        painter.setPen(box.framed ? penOf(FrameWidth) : QPen(Qt::NoPen));
-        painter.setBrush(box.shaded ? QColor(0xe4, 0xe4, 0xe4) : QColor(Qt::transparent));
-        painter.drawRect(inUnits(box.rect));
-    }
+    // All shades, then all frames: no shade covers a frame, and a PDF is smaller.
+    painter.setPen(Qt::NoPen);
+    painter.setBrush(QColor(0xe4, 0xe4, 0xe4));
+    for (const Box& box : page.boxes)
+        if (box.shaded) painter.drawRect(inUnits(box.rect));
+    painter.setPen(penOf(FrameWidth));
+    painter.setBrush(Qt::NoBrush);
+    for (const Box& box : page.boxes)
+        if (box.framed) painter.drawRect(inUnits(box.rect));
     for (const Line& line : page.lines) {
         painter.setPen(penOf(line.width));
         painter.drawLine(inUnits(line.line.p1()), inUnits(line.line.p2()));

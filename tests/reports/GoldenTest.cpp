@@ -2,6 +2,7 @@
 // Whole pages against lists that somebody has looked at: text, place and style of everything on
 // them. ZELMARS_WRITE_GOLDEN=1 writes the lists anew; look at what changed.
 #include <QFile>
+#include <QTextStream>
 
 #include "reports/StatementReports.h"
 #include "tests/reports/Ledger.h"
@@ -10,36 +11,28 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-QString number(double millimetres) {
-    return QString::number(millimetres, 'f', 1);
-}
-
-QString describe(const reports::Style& style) {
-    return u"[%1%2%3%4]"_s.arg(style.points)
-        .arg(style.bold ? u"b"_s : QString(), style.italic ? u"i"_s : QString())
-        .arg(u"lcr"_s.at(static_cast<int>(style.align)));
-}
-
 QString describe(const reports::Pages& pages) {
-    QStringList lines;
+    QString shown;
+    QTextStream out(&shown);
+    out.setRealNumberNotation(QTextStream::FixedNotation);
+    out.setRealNumberPrecision(1);
     for (int at = 0; at < pages.count(); ++at) {
-        lines << u"page %1 of %2"_s.arg(at + 1).arg(pages.count());
+        out << "page " << at + 1 << " of " << pages.count() << '\n';
         const reports::Page page = pages.at(at);
-        for (const reports::Box& box : page.boxes)
-            lines << u"box %1 %2 %3 %4%5%6"_s.arg(
-                number(box.rect.left()), number(box.rect.top()), number(box.rect.width()),
-                number(box.rect.height()), box.shaded ? u" shaded"_s : QString(),
-                box.framed ? u" framed"_s : QString());
-        for (const reports::Line& line : page.lines)
-            lines << u"line %1 %2 %3 %4"_s.arg(number(line.line.x1()), number(line.line.y1()),
-                                               number(line.line.x2()), number(line.line.y2()));
+        for (const auto& [rect, shaded, framed] : page.boxes)
+            out << "box " << rect.left() << ' ' << rect.top() << ' ' << rect.width() << ' '
+                << rect.height() << (shaded ? " shaded" : "") << (framed ? " framed\n" : "\n");
+        for (const auto& [line, width] : page.lines)
+            out << "line " << line.x1() << ' ' << line.y1() << ' ' << line.x2() << ' ' << line.y2()
+                << " width " << width << '\n';
         for (const reports::TextRun& each : page.texts) {
-            const reports::TextRun run = pages.resolved(each);
-            lines << u"%1 %2 %3 %4"_s.arg(number(run.baseline.x()), number(run.baseline.y()),
-                                          describe(run.style), run.text);
+            const auto& [place, width, text, style, open] = pages.resolved(each);
+            out << place.x() << ' ' << place.y() << " [" << style.points << (style.bold ? "b" : "")
+                << (style.italic ? "i" : "") << "lcr"[static_cast<int>(style.align)] << "] " << text
+                << '\n';
         }
     }
-    return lines.join(u'\n') + u'\n';
+    return shown;
 }
 
 /// What the file holds; what it ought to hold is written there when that is asked for.

@@ -1,0 +1,162 @@
+// SPDX-License-Identifier: MIT
+// Reports: pages as PDF against a bare PDF writer that draws the same texts at the same places;
+// memory of a long one, and how soon its first page is seen.
+#include <malloc.h>
+
+#include <QAbstractScrollArea>
+#include <QElapsedTimer>
+#include <QLabel>
+#include <QPainter>
+#include <QPdfWriter>
+#include <QTemporaryDir>
+
+#include "benchmarks/Bare.h"
+#include "benchmarks/Benches.h"
+#include "boundary/environment/dtZelmars.h"
+#include "platform/reports/Layout.h"
+#include "platform/reports/Output.h"
+#include "platform/reports/Preview.h"
+#include "platform/reports/Typesetting.h"
+#include "reports/StatementReports.h"
+
+using namespace Qt::StringLiterals;
+
+namespace benchmarks {
+
+namespace {
+
+constexpr int Movements = 100'000;
+constexpr int ManyPages = 5'000;
+
+/// The first so many movements, as the statements of a member select them.
+ado::RecordsetPtr movements(int count) {
+    const double last = bare(largeBook())
+                            ->run(
+                                "SELECT movimento_id FROM tbZelmar_Movimentos WHERE tipo = 'DOC' "
+                                "ORDER BY movimento_id "
+                                "LIMIT 1 OFFSET " +
+                                QByteArray::number(count - 1));
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->setClientSide(true);
+    rows->Open(
+        u"SELECT tbZelmar_Movimentos.*, debito - credito AS saldo, debito*(200.482) AS euros, "
+        "tbZelmar_Plafonds.descrit AS rubrica, tbSocios_Familias.nome AS Familiar FROM "
+        "((tbZelmar_Movimentos LEFT OUTER JOIN tbZelmar_Plafonds ON "
+        "tbZelmar_Movimentos.rubrica_id = tbZelmar_Plafonds.rubrica_id) LEFT OUTER JOIN "
+        "tbSocios_Familias ON ((tbZelmar_Movimentos.socio_id = tbSocios_Familias.socio_id) AND "
+        "(tbZelmar_Movimentos.codABC = tbSocios_Familias.codABC))) WHERE "
+        "(tbZelmar_Movimentos.tipo = 'DOC') AND (tbZelmar_Movimentos.movimento_id <= %1) ORDER BY "
+        "movimento_id"_s.arg(last, 0, 'f', 0),
+        environment::dtZelmars::instance().SqlServer());
+    return rows;
+}
+
+double milliseconds(const QElapsedTimer& clock) {
+    return static_cast<double>(clock.nsecsElapsed()) / 1e6;
+}
+
+/// The texts of laid-out pages; only the drawing counts.
+double drawBare(const reports::Pages& pages, const QString& file) {
+    QElapsedTimer clock;
+    clock.start();
+    QPdfWriter writer(file);
+    writer.setResolution(1200);
+    writer.setPageSize(QPageSize(QPageSize::A4));
+    writer.setPageMargins({});
+    QPainter painter(&writer);
+    reports::Faces faces;
+    double spent = milliseconds(clock);
+    for (int at = 0; at < pages.count(); ++at) {
+        const reports::Page page = pages.at(at);
+        clock.restart();
+        if (at > 0) writer.newPage();
+        reports::Style style{.points = 0};
+        for (const reports::TextRun& run : page.texts) {
+            if (style != run.style) painter.setFont(faces.of(style = run.style).font);
+            painter.drawText(run.baseline * reports::UnitsPerMillimetre, run.text);
+        }
+        spent += milliseconds(clock);
+    }
+    clock.restart();
+    painter.end();
+    return spent + milliseconds(clock);
+}
+
+const QString Memory = u"report of 5,000 pages, memory"_s;
+const QString FirstPage = u"report of 5,000 pages, first page shown"_s;
+
+QString pdfOf(const reports::Report& design) {
+    return design.name + u" to PDF"_s;
+}
+
+void measurePdf(Report& report, const reports::Report& design, int rounds) {
+    const QTemporaryDir folder;
+    const QString file = folder.filePath(u"pages.pdf"_s);
+    const ado::RecordsetPtr rows = movements(Movements);
+    std::vector<double> ours, theirs;
+    double pages = 0, bytes = 0;
+    for (int round = 0; round < rounds; ++round) {
+        QElapsedTimer clock;
+        clock.start();
+        reports::Layout layout(design, rows);
+        layout.go(-1);
+        reports::writePdf(*layout.pages(), file);
+        pages = layout.pages()->count();
+        ours.push_back(milliseconds(clock) / pages);
+        bytes = static_cast<double>(QFileInfo(file).size());
+        theirs.push_back(drawBare(*layout.pages(), file) / pages);
+    }
+    report.ratio(pdfOf(design), 1.3, ours, theirs);
+    report.value(pdfOf(design) + u", size of a page"_s, u"KB"_s, 4, bytes / pages / 1024);
+}
+
+/// Rows and pages together, from nothing to the last page.
+void measureMemory(Report& report) {
+    // Nothing that earlier measures left behind is counted, and nothing is put into its place.
+    malloc_trim(0);
+    mallopt(M_MMAP_THRESHOLD, 128 * 1024);
+    const double before = residentMegabytes(QCoreApplication::applicationPid());
+    const ado::RecordsetPtr rows = movements(ManyPages * 56);
+    reports::Layout layout(reports::rptExtrato2(), rows);
+    layout.go(-1);
+    const bool enough = layout.pages()->count() >= ManyPages;
+    // A shorter report was not what was asked for, and must not pass.
+    report.value(Memory, u"MB"_s, 150,
+                 enough ? residentMegabytes(QCoreApplication::applicationPid()) - before : 1e9);
+}
+
+void measureFirstPage(Report& report) {
+    const ado::RecordsetPtr rows = movements(ManyPages * 56);
+    const double shown = report.medianOf(3, [&] {
+        QElapsedTimer clock;
+        clock.start();
+        reports::Preview preview(reports::rptExtrato2(), rows);
+        preview.Show();
+        const auto* place = preview.findChild<QLabel*>(u"Estado"_s);
+        while (!place->text().startsWith(u"Página 1 "_s)) QCoreApplication::processEvents();
+        preview.findChild<QAbstractScrollArea*>(u"Folhas"_s)->viewport()->repaint();
+        const double spent = milliseconds(clock);
+        preview.Unload();
+        return spent;
+    });
+    report.value(FirstPage, u"ms"_s, 300, shown);
+}
+
+}  // namespace
+
+void measurePrinting(Report& report) {
+    const auto measure = [&](const QString& name, const std::function<void()>& work) {
+        if (!report.wanted(name)) return;
+        use(largeBook());
+        work();
+    };
+    const reports::Report summary = reports::rptExtrato2();
+    const reports::Report detailed = reports::prtExtrato1();
+    measure(pdfOf(summary), [&] { measurePdf(report, summary, 3); });
+    // Six times as many pages.
+    measure(pdfOf(detailed), [&] { measurePdf(report, detailed, 1); });
+    measure(Memory, [&] { measureMemory(report); });
+    measure(FirstPage, [&] { measureFirstPage(report); });
+}
+
+}  // namespace benchmarks
