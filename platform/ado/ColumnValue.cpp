@@ -279,7 +279,19 @@ QVariant toColumn(const QVariant& value, const Column& column) {
 }
 
 QString storedForm(const QDateTime& moment) {
-    return moment.toString(u"yyyy-MM-dd HH:mm:ss"_s);
+    const QDate day = moment.date();
+    const QTime time = moment.time();
+    QString text = u"0000-00-00 00:00:00"_s;
+    const auto write = [&text](qsizetype last, int number) {
+        for (; number > 0; number /= 10, --last) text[last] = QChar(u'0' + number % 10);
+    };
+    write(3, day.year());
+    write(6, day.month());
+    write(9, day.day());
+    write(12, time.hour());
+    write(15, time.minute());
+    write(18, time.second());
+    return text;
 }
 
 QDateTime parseMoment(QStringView text) {

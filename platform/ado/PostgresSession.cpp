@@ -29,7 +29,9 @@ constexpr auto ColumnsOf =
 
 /// Names that stand unquoted in a statement are lower case on the server.
 QByteArray quoted(QStringView name) {
-    return '"' + name.toString().toLower().toUtf8().replace('"', "\"\"") + '"';
+    QByteArray text = name.toString().toLower().toUtf8();
+    if (text.contains('"')) text.replace('"', "\"\"");
+    return '"' + text + '"';
 }
 
 PostgresValues parametersOf(const std::vector<QVariant>& values) {
@@ -166,14 +168,16 @@ RowIdentity PostgresSession::insert(const QString& table, const QStringList& col
     if (columns.isEmpty()) {
         text += " DEFAULT VALUES";
     } else {
-        QByteArray names;
         QByteArray marks;
+        text.reserve(text.size() + columns.size() * 24);
         std::size_t number = 0;
         for (const QString& column : columns) {
-            names += (names.isEmpty() ? "(" : ",") + quoted(column);
-            marks += (marks.isEmpty() ? "" : ",") + parameter(++number);
+            text += number == 0 ? '(' : ',';
+            text += quoted(column);
+            marks += number == 0 ? "$" : ",$";
+            marks += QByteArray::number(static_cast<qulonglong>(++number));
         }
-        text += names + ") VALUES(" + marks + ')';
+        text += ") VALUES(" + marks + ')';
     }
     text += " RETURNING " + quoted(identity(table));
     const PostgresResult written = writer().run(text, parametersOf(values));

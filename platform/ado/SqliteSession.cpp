@@ -19,7 +19,9 @@ namespace {
 constexpr std::size_t IdleReaders = 4;
 
 QByteArray quoted(QStringView name) {
-    return '"' + name.toUtf8().replace('"', "\"\"") + '"';
+    QByteArray text = name.toUtf8();
+    if (text.contains('"')) text.replace('"', "\"\"");
+    return '"' + text + '"';
 }
 
 }  // namespace
@@ -158,13 +160,14 @@ RowIdentity SqliteSession::insert(const QString& table, const QStringList& colum
     if (columns.isEmpty()) {
         text += " DEFAULT VALUES";
     } else {
-        QByteArray names;
         QByteArray marks;
+        text.reserve(text.size() + columns.size() * 24);
         for (const QString& column : columns) {
-            names += (names.isEmpty() ? "(" : ",") + quoted(column);
+            text += marks.isEmpty() ? '(' : ',';
+            text += quoted(column);
             marks += marks.isEmpty() ? "?" : ",?";
         }
-        text += names + ") VALUES(" + marks + ')';
+        text += ") VALUES(" + marks + ')';
     }
     write(text, values);
     return sqlite3_last_insert_rowid(writer().get());
