@@ -1,11 +1,10 @@
 // SPDX-License-Identifier: MIT
-#include <QSaveFile>
 #include <algorithm>
 
-#include "platform/core/Failure.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
 #include "platform/reports/Output.h"
+#include "platform/reports/SavedFile.h"
 #include "platform/reports/Sections.h"
 
 using namespace Qt::StringLiterals;
@@ -44,19 +43,15 @@ QString cell(const QVariant& value) {
 class CsvFile {
 public:
     explicit CsvFile(const QString& name) : file_(name) {
-        if (!file_.open(QIODevice::WriteOnly)) fail();
+        if (!file_.open(QIODevice::WriteOnly)) failToWrite(file_);
         file_.write("\xEF\xBB\xBF");
     }
     void line(const QStringList& cells) { file_.write(cells.join(u';').toUtf8() + "\r\n"); }
     void close() {
-        if (!file_.commit()) fail();
+        if (!file_.commit()) failToWrite(file_);
     }
 
 private:
-    [[noreturn]] void fail() {
-        throw core::Failure(core::InvalidCall, u"Não foi possível escrever «%1»: %2"_s.arg(
-                                                   file_.fileName(), file_.errorString()));
-    }
     QSaveFile file_;
 };
 

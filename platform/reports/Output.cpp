@@ -4,9 +4,8 @@
 #include <QPageSize>
 #include <QPainter>
 #include <QPdfWriter>
-#include <QSaveFile>
 
-#include "platform/core/Failure.h"
+#include "platform/reports/SavedFile.h"
 #include "platform/reports/Typesetting.h"
 
 using namespace Qt::StringLiterals;
@@ -88,9 +87,7 @@ bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn) {
         }
         painter.end();
     }
-    if (!done || !out.commit())
-        throw core::Failure(core::InvalidCall,
-                            u"Não foi possível escrever «%1»: %2"_s.arg(file, out.errorString()));
+    if (!done || !out.commit()) failToWrite(out);
     return true;
 }
 

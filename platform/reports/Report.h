@@ -34,7 +34,9 @@ struct Label {
     int lines = 1;  ///< most lines; a longer text is wrapped, then cut with an ellipsis
 };
 
-/// A column of the current row, null being empty.
+/// A column of the current row, null being empty: of the row that is printed or, around a page's
+/// rows, of the one about to be. A text too long for its box ends in an ellipsis; a number is set
+/// smaller.
 struct Field {
     QString column;
     QRectF box;
