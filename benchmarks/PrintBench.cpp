@@ -60,7 +60,7 @@ double drawBare(const reports::Pages& pages, const QString& file) {
     QElapsedTimer clock;
     clock.start();
     QPdfWriter writer(file);
-    writer.setResolution(1200);
+    writer.setResolution(reports::UnitsPerInch);
     writer.setPageSize(QPageSize(QPageSize::A4));
     writer.setPageMargins({});
     QPainter painter(&writer);

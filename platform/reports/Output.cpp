@@ -20,7 +20,7 @@ QPen penOf(double millimetres) {
     return {Qt::black, millimetres * UnitsPerMillimetre, Qt::SolidLine, Qt::FlatCap, Qt::MiterJoin};
 }
 
-/// Whole units: nobody sees a hundredth of a millimetre, and a PDF is a third smaller.
+/// Whole units: no office printer has finer dots, and a PDF is smaller.
 QPointF inUnits(const QPointF& point) {
     return (point * UnitsPerMillimetre).toPoint();
 }
@@ -29,7 +29,7 @@ QRectF inUnits(const QRectF& rect) {
     return {inUnits(rect.topLeft()), inUnits(rect.bottomRight())};
 }
 
-/// The painter's unit is 1/1200 inch.
+/// The painter's unit is 1/600 inch.
 void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces) {
     // All shades, then all frames: no shade covers a frame, and a PDF is smaller.
     painter.setPen(Qt::NoPen);
@@ -72,7 +72,7 @@ bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn) {
     bool done = out.open(QIODevice::WriteOnly);
     if (done) {
         QPdfWriter writer(&out);
-        writer.setResolution(1200);
+        writer.setResolution(UnitsPerInch);
         writer.setPageSize(QPageSize(QPageSize::A4));
         writer.setPageMargins({});
         writer.setTitle(pages.caption);

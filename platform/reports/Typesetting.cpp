@@ -16,7 +16,7 @@ namespace {
 
 QFont fontOf(const Style& style) {
     QFont font(u"Arial"_s);
-    font.setPixelSize(static_cast<int>(std::lround(style.points * 1200 / 72)));
+    font.setPixelSize(static_cast<int>(std::lround(style.points * UnitsPerInch / 72)));
     font.setBold(style.bold);
     font.setItalic(style.italic);
     font.setHintingPreference(QFont::PreferNoHinting);

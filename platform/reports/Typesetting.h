@@ -12,11 +12,12 @@
 
 class QPainter;
 
-/// Texts set into boxes. Everything is measured with unhinted fonts in units of 1/1200 inch,
+/// Texts set into boxes. Everything is measured with unhinted fonts in units of 1/600 inch,
 /// whatever the screen is, so that a page is the same wherever it is laid out and painted.
 namespace reports {
 
-inline constexpr double UnitsPerMillimetre = 1200 / 25.4;
+inline constexpr int UnitsPerInch = 600;
+inline constexpr double UnitsPerMillimetre = UnitsPerInch / 25.4;
 
 /// A style's font, its size in those units. Letters are whole units wide and not kerned: a text is
 /// as wide as its letters together, and a PDF is a tenth smaller.
