@@ -35,11 +35,11 @@ Cents cents(const QVariant& value) {
     return {number < 0, plain.chopped(3), plain.right(2)};
 }
 
-QString shown(const Cents& cents, bool grouped, int wholeDigits) {
-    QString whole = cents.whole.rightJustified(wholeDigits, u'0');
-    if (grouped)
-        for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, thousandsMark());
-    return whole + decimalMark() + cents.part;
+QString shown(const Cents& cents, const QLocale& locale) {
+    QString whole = cents.whole;
+    const QChar mark = thousandsMark(locale);
+    for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, mark);
+    return whole + decimalMark(locale) + cents.part;
 }
 
 bool isNumber(const QVariant& value) {
@@ -55,21 +55,22 @@ bool isNumber(const QVariant& value) {
     }
 }
 
-QString formattedNumber(const QVariant& value, QStringView format) {
+QString formattedNumber(const QVariant& value, QStringView format, const QLocale& locale) {
     const bool isAmount = format.startsWith(format::Amount);
     if (format != format::Money && !isAmount && format != format::Rate)
-        return toText(value).replace(u'.', decimalMark());
+        return toText(value).replace(u'.', decimalMark(locale));
     const Cents rounded = cents(value);
     // What shows as nothing has no sign.
     const bool negative = rounded.negative && !rounded.isZero();
     if (format == format::Money) {
-        const QString amount = QStringLiteral("€ ") + shown(rounded, true, 1);
+        const QString amount = QStringLiteral("€ ") + shown(rounded, locale);
         return negative ? u'(' + amount + u')' : amount;
     }
     const QString sign = negative ? QStringLiteral("-") : QString();
-    if (!isAmount) return sign + shown(rounded, false, 2);
+    if (!isAmount)
+        return sign + rounded.whole.rightJustified(2, u'0') + decimalMark(locale) + rounded.part;
     const QStringView unit = format.sliced(format::Amount.size());
-    return sign + shown(rounded, true, 1) + unit.toString();
+    return sign + shown(rounded, locale) + unit.toString();
 }
 
 /// Takes the currency sign, brackets and sign off; false when they do not pair.
@@ -105,25 +106,29 @@ bool onlyDigits(QStringView text) {
 
 }  // namespace
 
+const QLocale& portugueseLocale() {
+    static const QLocale locale(QLocale::Portuguese, QLocale::Portugal);
+    return locale;
+}
+
 QLocale userLocale() {
     const QLocale system = QLocale::system();
-    return system.language() == QLocale::C ? QLocale(QLocale::Portuguese, QLocale::Portugal)
-                                           : system;
+    return system.language() == QLocale::C ? portugueseLocale() : system;
 }
 
-QChar decimalMark() {
-    return userLocale().decimalPoint() == QStringLiteral(".") ? u'.' : u',';
+QChar decimalMark(const QLocale& locale) {
+    return locale.decimalPoint() == QStringLiteral(".") ? u'.' : u',';
 }
 
-QChar thousandsMark() {
-    return decimalMark() == u',' ? u'.' : u',';
+QChar thousandsMark(const QLocale& locale) {
+    return decimalMark(locale) == u',' ? u'.' : u',';
 }
 
-QString formatted(const QVariant& value, QStringView format) {
+QString formatted(const QVariant& value, QStringView format, const QLocale& locale) {
     if (isNull(value)) return {};
     if (value.typeId() == QMetaType::QDateTime || value.typeId() == QMetaType::QDate)
         return toDate(value).toString(QStringLiteral("dd-MM-yyyy"));
-    if (isNumber(value)) return formattedNumber(value, format);
+    if (isNumber(value)) return formattedNumber(value, format, locale);
     return toText(value);
 }
 

@@ -18,18 +18,20 @@ inline constexpr QStringView Date = u"dd-MM-yyyy";
 inline constexpr QStringView Number = u"@@@@@.@";
 }  // namespace format
 
+/// The locale of what leaves the house on paper or in files, whoever makes it: Portugal's.
+const QLocale& portugueseLocale();
 /// The locale in which people type and read: the user's; where the system has none (C, POSIX) the
-/// Portuguese one of Portugal.
+/// Portuguese one.
 QLocale userLocale();
-/// The decimal separator of that locale, and the mark between thousands: a point beside a decimal
+/// The decimal separator of a locale, and the mark between thousands: a point beside a decimal
 /// comma, a comma beside a decimal point.
-QChar decimalMark();
-QChar thousandsMark();
+QChar decimalMark(const QLocale& locale = userLocale());
+QChar thousandsMark(const QLocale& locale = userLocale());
 
 /// Shows a value in a display format; null gives empty text. An empty format, "@@@@@.@" and a value
 /// that the format does not fit (a text in a money format) give the plain text of the value,
 /// numbers with the locale's decimal mark.
-QString formatted(const QVariant& value, QStringView format);
+QString formatted(const QVariant& value, QStringView format, const QLocale& locale = userLocale());
 
 /// Reads a number as a person types it or as formatted() shows it: optional currency sign, sign or
 /// brackets, thousands marks only where they belong, one decimal mark. Exponents, letters and marks

@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include <QRegularExpression>
 #include <algorithm>
 
 #include "platform/core/Format.h"
@@ -23,17 +24,18 @@ QStringList columnsOf(const Section& section) {
     return columns;
 }
 
-/// A text that a spreadsheet would run as a formula is kept a text by a leading apostrophe. A
-/// number that happens to be kept as text stays a number.
+/// A text that a spreadsheet would run as a formula or read as a date or as a number that has lost
+/// digits ("00123", a bank number, "1E5") is kept a text by a leading apostrophe, the one mark that
+/// none of them runs or reads on. A number that stays as it is needs none.
 QString harmless(const QString& text) {
-    if (text.isEmpty() || !u"=+-@\t\r"_s.contains(text.front())) return text;
-    bool isNumber = false;
-    QString(text).replace(u',', u'.').toDouble(&isNumber);
-    return isNumber ? text : u'\'' + text;
+    static const QRegularExpression risky(uR"(^[=+\-@\t\r]|^[\d.,][\d.,:/ Ee+\-]*$)"_s);
+    static const QRegularExpression sameNumber(uR"(^-?(0|[1-9]\d{0,9})(,\d{0,3}[1-9])?$)"_s);
+    return risky.match(text).hasMatch() && !sameNumber.match(text).hasMatch() ? u'\'' + text : text;
 }
 
 QString cell(const QVariant& value) {
-    if (value.typeId() != QMetaType::QString) return core::formatted(value, u"");
+    if (value.typeId() != QMetaType::QString)
+        return core::formatted(value, {}, core::portugueseLocale());
     const QString text = harmless(value.toString());
     if (std::none_of(text.begin(), text.end(), [](QChar c) { return u";\"\n\r"_s.contains(c); }))
         return text;

@@ -4,6 +4,7 @@
 #include <QPageSize>
 #include <QPainter>
 #include <QPdfWriter>
+#include <algorithm>
 
 #include "platform/reports/SavedFile.h"
 #include "platform/reports/Typesetting.h"
@@ -57,6 +58,13 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
     }
 }
 
+/// Smaller paper takes the page smaller.
+double sizeOn(const QPageSize& paper) {
+    const QSizeF size = paper.size(QPageSize::Millimeter);
+    const double fit = std::min(size.width() / page::Width, size.height() / page::Height);
+    return fit > 0.99 ? 1 : fit;
+}
+
 }  // namespace
 
 void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMillimetre) {
@@ -68,22 +76,27 @@ void paint(QPainter& painter, const Pages& pages, int page, double unitsPerMilli
 }
 
 bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn) {
+    return writePdf(pages, {0, pages.count() - 1, QPageSize(QPageSize::A4)}, file, goesOn);
+}
+
+bool writePdf(const Pages& pages, const Sheets& sheets, const QString& file, const GoesOn& goesOn) {
     QSaveFile out(file);
     bool done = out.open(QIODevice::WriteOnly);
     if (done) {
         QPdfWriter writer(&out);
         writer.setResolution(UnitsPerInch);
-        writer.setPageSize(QPageSize(QPageSize::A4));
+        writer.setPageSize(sheets.paper);
         writer.setPageMargins({});
         writer.setTitle(pages.caption);
         writer.setCreator(u"Zelmars"_s);
         QPainter painter;
         Faces faces;
         done = painter.begin(&writer);
-        for (int page = 0; done && page < pages.count(); ++page) {
-            if (page > 0) writer.newPage();
+        if (const double size = sizeOn(sheets.paper); size != 1) painter.scale(size, size);
+        for (int page = sheets.from; done && page <= sheets.to; ++page) {
+            if (page > sheets.from) done = writer.newPage();
             paint(painter, pages, pages.at(page), faces);
-            if (goesOn && !goesOn(page + 1)) return false;
+            if (goesOn && !goesOn(page - sheets.from + 1)) return false;
         }
         painter.end();
     }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QPageSize>
 #include <QString>
 #include <functional>
 
@@ -22,13 +23,25 @@ QString fileName(const QString& caption);
 /// Told of each page that is done, counted from 1. False gives up: nothing is written or printed.
 using GoesOn = std::function<bool(int done)>;
 
-/// Writes complete pages as PDF, fonts embedded; false when given up. Fails, leaving no half file,
-/// when the file cannot be written.
-bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn = {});
+/// Pages `from`..`to`, counted from 0, on upright paper; what is smaller than A4 takes them
+/// smaller.
+struct Sheets {
+    int from = 0;
+    int to = 0;
+    QPageSize paper;
+};
 
-/// Prints pages `from`..`to` (counted from 0) on a printer that is set up; paper smaller than A4
-/// takes them smaller. False when given up. Fails when the printer does not take the job.
-bool print(const Pages& pages, QPrinter& printer, int from, int to, const GoesOn& goesOn = {});
+/// Writes complete pages as PDF, fonts embedded: all of them on A4, or some. False when given up.
+/// Fails, leaving no half file, when the file cannot be written.
+bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn = {});
+bool writePdf(const Pages& pages, const Sheets& sheets, const QString& file,
+              const GoesOn& goesOn = {});
+
+/// Prints pages `from`..`to`, counted from 0, on a printer that is set up. The job is made whole
+/// before the printer hears of it. False when given up. Fails when the job cannot be made or the
+/// printer does not take it.
+bool print(const Pages& pages, const QPrinter& printer, int from, int to,
+           const GoesOn& goesOn = {});
 
 /// Sends complete pages to the default printer, the report's caption as the job's title. Without
 /// one, or when it does not take the job, writes a PDF into the person's documents folder (or,
@@ -38,8 +51,9 @@ void printUnasked(const Pages& pages);
 
 /// The rows as a text that spreadsheets open: semicolons, decimal comma, UTF-8 with a mark. One
 /// line with the columns that the report shows, one for each detail row; of a report with groups
-/// the group's columns stand first. A text that a spreadsheet would run as a formula gets a leading
-/// apostrophe. Fails, leaving no half file, when the file cannot be written.
+/// the group's columns stand first. A text that a spreadsheet would run as a formula, or read as a
+/// date or as a number with fewer digits, gets a leading apostrophe. Fails, leaving no half file,
+/// when the file cannot be written.
 void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file);
 
 }  // namespace reports

@@ -2,10 +2,11 @@
 #include <QDir>
 #include <QLibrary>
 #include <QPageSize>
-#include <QPainter>
+#include <QPrintEngine>
 #include <QPrinter>
 #include <QPrinterInfo>
 #include <QStandardPaths>
+#include <QTemporaryDir>
 
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
@@ -18,29 +19,73 @@ namespace reports {
 
 namespace {
 
-/// What the print server had against the job that this thread handed over last; empty when it took
-/// it. The toolkit does not ask.
-QString refusal() {
-    static const auto status =
-        reinterpret_cast<int (*)()>(QLibrary::resolve(u"cups"_s, 2, "cupsLastError"));
-    static const auto text =
-        reinterpret_cast<const char* (*)()>(QLibrary::resolve(u"cups"_s, 2, "cupsLastErrorString"));
-    if (!status || !text) return {};
-    const bool taken = status() >= 0 && status() < 0x100;
-    return taken ? QString() : QString::fromUtf8(text());
-}
-
-[[noreturn]] void fail(const QPrinter& printer, const QString& why) {
+[[noreturn]] void fail(const QString& printer, const QString& why) {
     throw core::Failure(core::InvalidCall,
-                        u"Não foi possível imprimir em «%1».%2"_s.arg(
-                            printer.printerName(), why.isEmpty() ? QString() : u"\n"_s + why));
+                        u"Não foi possível imprimir em «%1».\n%2"_s.arg(printer, why));
 }
 
-/// Paper of another size takes the page as large as it fits.
-double unitsPerMillimetre(const QPrinter& printer) {
-    const QSizeF paper = printer.pageLayout().fullRect(QPageLayout::Millimeter).size();
-    const double fit = std::min(paper.width() / page::Width, paper.height() / page::Height);
-    return printer.resolution() / 25.4 * (fit > 0.99 ? 1 : fit);
+/// The calls of the print server's client library, which comes with the toolkit's printers. The
+/// toolkit's own way of printing hands over also what is given up half-way, and does not ask
+/// whether the server took it.
+struct PrintClient {
+    template <class Function>
+    static Function resolved(const char* name) {
+        return reinterpret_cast<Function>(QLibrary::resolve(u"cups"_s, 2, name));
+    }
+    int (*print)(const char* printer, const char* file, const char* title, int count,
+                 void* options) = resolved<decltype(print)>("cupsPrintFile");
+    int (*add)(const char* name, const char* value, int count,
+               void** options) = resolved<decltype(add)>("cupsAddOption");
+    void (*free)(int count, void* options) = resolved<decltype(free)>("cupsFreeOptions");
+    const char* (*error)() = resolved<decltype(error)>("cupsLastErrorString");
+
+    bool isThere() const { return print && add && free && error; }
+};
+
+using PrintOptions = std::vector<std::pair<QString, QString>>;
+
+QString sidesOf(const QPrinter& printer) {
+    switch (printer.duplex()) {
+        case QPrinter::DuplexNone:
+            return u"one-sided"_s;
+        case QPrinter::DuplexShortSide:
+            return u"two-sided-short-edge"_s;
+        default:
+            return u"two-sided-long-edge"_s;
+    }
+}
+
+/// What was chosen for the printer, in the words of the print server.
+PrintOptions optionsOf(const QPrinter& printer) {
+    PrintOptions options{{u"media"_s, printer.pageLayout().pageSize().key()},
+                         {u"sides"_s, sidesOf(printer)},
+                         {u"copies"_s, QString::number(printer.copyCount())}};
+    if (printer.copyCount() > 1 && printer.collateCopies())
+        options.emplace_back(u"Collate"_s, u"True"_s);
+    if (printer.pageOrder() == QPrinter::LastPageFirst)
+        options.emplace_back(u"outputorder"_s, u"reverse"_s);
+    // What the dialog asks on the server's behalf (pages on a sheet, odd pages, when to print): the
+    // toolkit keeps names and values in turn under this number, which has no public name.
+    constexpr auto ServerOptions = QPrintEngine::PrintEnginePropertyKey(0xfe00);
+    const QStringList more = printer.printEngine()->property(ServerOptions).toStringList();
+    for (qsizetype at = 0; at + 1 < more.size(); at += 2)
+        options.emplace_back(more[at], more[at + 1]);
+    return options;
+}
+
+/// Gives a whole file to the print server. Fails with the server's words when it does not take it.
+void handOver(const QString& file, const QPrinter& printer) {
+    static const PrintClient client;
+    const QString name = printer.printerName().section(u'/', 0, 0);  // without a saved variant
+    if (!client.isThere()) fail(name, u"Falta a biblioteca do serviço de impressão."_s);
+    void* options = nullptr;
+    int count = 0;
+    for (const auto& [option, value] : optionsOf(printer))
+        count = client.add(qPrintable(option), qPrintable(value), count, &options);
+    const int job = client.print(name.toUtf8().constData(), QFile::encodeName(file).constData(),
+                                 printer.docName().toUtf8().constData(), count, options);
+    client.free(count, options);
+    if (job == 0) fail(name, QString::fromUtf8(client.error()));
 }
 
 /// A file of that name that did not exist before; the folder is made where it is missing. Empty
@@ -86,26 +131,15 @@ QString fileName(const QString& caption) {
     return name.isEmpty() ? u"Mapa"_s : name;
 }
 
-bool print(const Pages& pages, QPrinter& printer, int from, int to, const GoesOn& goesOn) {
-    printer.setFullPage(true);
-    QPainter painter;
-    bool going = painter.begin(&printer);
-    for (int page = from; going && page <= to; ++page) {
-        if (page > from) going = printer.newPage();
-        if (going) paint(painter, pages, page, unitsPerMillimetre(printer));
-        if (going && goesOn && !goesOn(page - from + 1)) {
-            printer.abort();
-            return false;
-        }
-    }
-    if (!going) {
-        printer.abort();
-        fail(printer, {});
-    }
-    // Hands the job over.
-    if (!painter.end()) fail(printer, {});
-    const bool toServer = printer.outputFileName().isEmpty();
-    if (const QString why = toServer ? refusal() : QString(); !why.isEmpty()) fail(printer, why);
+bool print(const Pages& pages, const QPrinter& printer, int from, int to, const GoesOn& goesOn) {
+    const Sheets sheets{from, to, printer.pageLayout().pageSize()};
+    if (const QString file = printer.outputFileName(); !file.isEmpty())
+        return writePdf(pages, sheets, file, goesOn);
+    const QTemporaryDir folder;
+    if (!folder.isValid()) fail(printer.printerName(), folder.errorString());
+    const QString job = folder.filePath(u"job.pdf"_s);
+    if (!writePdf(pages, sheets, job, goesOn)) return false;
+    handOver(job, printer);
     return true;
 }
 

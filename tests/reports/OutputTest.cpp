@@ -3,6 +3,8 @@
 #include "platform/reports/Output.h"
 
 #include <QDir>
+#include <QPrinter>
+#include <QPrinterInfo>
 #include <QProcess>
 
 #include "platform/reports/DataReport.h"
@@ -62,8 +64,10 @@ protected:
 };
 
 TEST_F(ReportOutput, WritesPdfsOrSaysWhyNot) {
-    const auto pages = laidOut(report.design(), movements());
     const QString file = folder.filePath(u"extracto.pdf"_s);
+    writePdf(*laidOut(reports::prtExtrato1(), movements()), file);
+    EXPECT_TRUE(textOfPdf(file).contains(u"Total a Receber: € 824,00 Escudos: 165.197,17 Esc"_s));
+    const auto pages = laidOut(report.design(), movements());
     writePdf(*pages, file);
     expectStatement(file);
     const QString nowhere = folder.filePath(u"não há/extracto.pdf"_s);
@@ -77,6 +81,21 @@ TEST_F(ReportOutput, PrintsOnTheDefaultPrinterWithoutAsking) {
     report.PrintReport(movements());
     EXPECT_EQ(server.titles(1), QStringList{u"Extracto de Lançamentos"_s});
     expectStatement(server.file(1));
+}
+
+TEST_F(ReportOutput, PrintsWholeJobsOrNone) {
+    support::PrintServer server;
+    const auto pages = laidOut(report.design(), movements());
+    const QPrinter printer(QPrinterInfo::defaultPrinter());
+    EXPECT_FALSE(print(*pages, printer, 0, 1, [](int done) { return done < 2; }));
+    qputenv("TMPDIR", "/proc");
+    EXPECT_TRUE(failureOf([&] { print(*pages, printer, 0, 1); })
+                    .text()
+                    .startsWith(u"Não foi possível imprimir em «Secretaria»."_s));
+    qunsetenv("TMPDIR");
+    report.PrintReport(movements());
+    EXPECT_EQ(server.titles(1).size(), 1);
+    expectStatement(server.file(1));  // the first job that the server got
 }
 
 TEST_F(ReportOutput, LosesNothingWithoutAPrinter) {
@@ -107,11 +126,22 @@ TEST_F(ReportOutput, LosesNothingWithoutAPrinter) {
 }
 
 TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
-    book.exec(
-        u"update tbZelmar_Movimentos set doc_no = '=1+1', debito = -1234.5 where movimento_no = 1;"
-        "update tbZelmar_Movimentos set doc_no = 'a;\"b\"' where movimento_no = 2;"
-        "update tbZelmar_Movimentos set doc_no = '-12,5' where movimento_no = 3;"
-        "delete from tbZelmar_Movimentos where movimento_no > 3"_s);
+    const std::pair<QString, QString> texts[] = {{u"=1+1"_s, u"'=1+1"_s},
+                                                 {u"a;\"b\""_s, u"\"a;\"\"b\"\"\""_s},
+                                                 {u"-12,5"_s, u"-12,5"_s},
+                                                 {u"100015"_s, u"100015"_s},
+                                                 {u"00123"_s, u"'00123"_s},
+                                                 {u"1E5"_s, u"'1E5"_s},
+                                                 {u"2026/3"_s, u"'2026/3"_s},
+                                                 {u"1.20"_s, u"'1.20"_s},
+                                                 {u"12345678901234567"_s, u"'12345678901234567"_s}};
+    int number = 0;
+    for (const auto& [text, cell] : texts)
+        book.exec(
+            u"update tbZelmar_Movimentos set doc_no = '%1', debito = -1234.5 where "
+            "movimento_no = %2"_s.arg(text)
+                .arg(++number));
+    book.exec(u"delete from tbZelmar_Movimentos where movimento_no > %1"_s.arg(number));
     const QString file = folder.filePath(u"linhas.csv"_s);
     const auto written = [&](const reports::Report& design, const ado::RecordsetPtr& rows) {
         writeCsv(design, rows, file);
@@ -119,15 +149,23 @@ TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
         EXPECT_TRUE(csv.open(QIODevice::ReadOnly));
         return csv.readAll().toStdString();
     };
-    EXPECT_EQ(written(report.design(), movements()),
-              "\ufeffmovimento_no;data;codABC;tipo;rubrica;doc_no;doc_valor;modo_pagamento;"
-              "credito;debito\r\n"
-              "1;02-01-2026;A;DOC;Consultas de especialidade;'=1+1;1,25;TRF;0,1;-1234,5\r\n"
-              "2;03-01-2026;A;DOC;Consultas de especialidade;\"a;\"\"b\"\"\";2,25;TRF;1,1;2,1\r\n"
-              "3;04-01-2026;A;DOC;Consultas de especialidade;-12,5;3,25;TRF;2,1;3,1\r\n");
+    QString expected =
+        u"\ufeffmovimento_no;data;codABC;tipo;rubrica;doc_no;doc_valor;modo_pagamento;credito;debito\r\n"_s;
+    number = 0;
+    for (const auto& [text, cell] : texts) {
+        ++number;
+        expected +=
+            u"%1;%2-01-2026;A;DOC;Consultas de especialidade;%3;%1,25;TRF;%4,1;-1234,5\r\n"_s
+                .arg(number)
+                .arg(number + 1, 2, 10, QChar(u'0'))
+                .arg(cell)
+                .arg(number - 1);
+    }
+    EXPECT_EQ(written(report.design(), movements()), expected.toStdString());
+    book.exec(u"delete from tbZelmar_Movimentos where movimento_no > 2"_s);
     book.hospital(u"1"_s, u"Hospital A"_s);
     EXPECT_EQ(written(twoLevels(), open(TwoLevelStatement)),
-              "\ufeffhospital;movimento_no;divida\r\nHospital A;2;1\r\n");
+              "\ufeffhospital;movimento_no;divida\r\nHospital A;2;-1235,6\r\n");
 }
 
 }  // namespace
