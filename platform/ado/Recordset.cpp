@@ -167,12 +167,13 @@ void Recordset::setValue(int column, const QVariant& value) {
 }
 
 RecordsetPtr Recordset::Chapter(const QString& name) const {
-    d->requireRow();
+    d->requireOpen();
     if (!d->chapter || d->chapter->name.compare(name, Qt::CaseInsensitive) != 0)
         throw core::Failure(core::NoSuchItem, u"O capítulo «%1» não existe."_s.arg(name));
     const ChapterRows& chapter = *d->chapter;
-    const QString key = core::toText(d->value(chapter.parentColumn));
-    auto store = chapter.byKey.value(key);
+    std::shared_ptr<RowStore> store;
+    if (d->rowsInMemory() > 0)
+        store = chapter.byKey.value(core::toText(d->value(chapter.parentColumn)));
     if (!store) store = std::make_shared<RowStore>();
     RecordsetPtr children = create();
     children->d->source = d->source;

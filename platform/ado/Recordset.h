@@ -105,7 +105,8 @@ public:
     QVariant value(int column) const;
     void setValue(int column, const QVariant& value);
 
-    /// The child set of the current row of a SHAPE statement, by the name of its chapter.
+    /// The child set of the current row of a SHAPE statement, by the name of its chapter. Of a set
+    /// without rows it is an empty one that knows its columns.
     RecordsetPtr Chapter(const QString& name) const;
 
     // For lists, which show many rows without moving the current one. Only sets that are held in

@@ -97,8 +97,8 @@ Layout::Implementation::Implementation(const Report& design, ado::RecordsetPtr f
     if (!grouped) {
         children = rows;
         childCount = rowCount;
-    } else if (rowCount > 0) {
-        rows->MoveTo(0);
+    } else {
+        if (rowCount > 0) rows->MoveTo(0);
         detailRow.lookUp(*rows->Chapter(chapter));
     }
 }
@@ -178,6 +178,7 @@ void Layout::Implementation::endPage() {
 }
 
 void Layout::Implementation::print(const PreparedSection& section, double more) {
+    if (section.height() <= 0) return;  // opens no page either
     const double top = page::Margin + pageHeader.height() +
                        (inGroup && repeatsGroupHeader ? groupHeader.height() : 0);
     const double room = bodyBottom - top;

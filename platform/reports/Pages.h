@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QByteArray>
+#include <QLineF>
 #include <QRectF>
 #include <QString>
 #include <vector>

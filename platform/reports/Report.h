@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QLineF>
 #include <QRectF>
 #include <QString>
 #include <variant>
@@ -49,7 +50,7 @@ struct Field {
 struct Total {
     enum class Of { Sum, Count };
     Of of;
-    QString column;  ///< nulls count as nothing
+    QString column;  ///< a sum passes nulls over; a count takes every row
     QRectF box;
     QString format;
     Style style;

@@ -12,10 +12,14 @@ namespace reports {
 
 namespace {
 
-/// The day as a letter states it. The reports are Portuguese wherever they are printed.
+/// The day as a letter states it.
 QString longDate(QDate day) {
-    return QLocale(QLocale::Portuguese, QLocale::Portugal)
-        .toString(day, u"d 'de' MMMM 'de' yyyy"_s);
+    return core::portugueseLocale().toString(day, u"d 'de' MMMM 'de' yyyy"_s);
+}
+
+/// The reports are Portuguese wherever they are printed.
+QString formatted(const QVariant& value, const QString& format) {
+    return core::formatted(value, format, core::portugueseLocale());
 }
 
 struct Filled {
@@ -27,7 +31,8 @@ struct Filled {
 Filled filled(const QString& caption, int page) {
     Filled result;
     for (qsizetype at = 0; at < caption.size(); ++at) {
-        const QChar next = caption[at] == u'%' ? caption.mid(at + 1, 1).front() : QChar();
+        const bool isMark = caption[at] == u'%' && at + 1 < caption.size();
+        const QChar next = isMark ? caption[at + 1] : QChar();
         switch (next.unicode()) {
             case u'D':
                 result.text += longDate(core::today());
@@ -132,16 +137,19 @@ void PreparedSection::add(Runs& texts, const Label& label, int number) const {
 void PreparedSection::add(Runs& texts, const FieldOfRow& of, int) const {
     const QVariant& value = row_.values()[of.place];
     const bool isText = value.typeId() == QMetaType::QString;
-    set(texts, faces_, core::formatted(value, of.field.format), of.field.box, of.field.style,
+    set(texts, faces_, formatted(value, of.field.format), of.field.box, of.field.style,
         of.field.lines, isText ? Overlong::Cut : Overlong::Shrink);
 }
 
 void PreparedSection::add(Runs& texts, const TotalSoFar& of, int) const {
     const Tallies::Tally& tally =
         over_ == Over::Group ? tallies_.ofGroup(of.place) : tallies_.ofReport(of.place);
-    const QVariant value =
-        of.total.of == Total::Of::Sum ? QVariant::fromValue(tally.sum) : QVariant(tally.count);
-    set(texts, faces_, core::formatted(value, of.total.format), of.total.box, of.total.style, 1,
+    // Rounded once, to what is shown: display formats show cents, the plain one all that money has.
+    const int decimals = of.total.format.isEmpty() ? 4 : 2;
+    const QVariant value = of.total.of == Total::Of::Sum
+                               ? QVariant::fromValue(tally.sum.rounded(decimals))
+                               : QVariant(tally.count);
+    set(texts, faces_, formatted(value, of.total.format), of.total.box, of.total.style, 1,
         Overlong::Shrink);
 }
 

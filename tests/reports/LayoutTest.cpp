@@ -4,6 +4,7 @@
 #include "platform/core/Money.h"
 #include "platform/reports/DataReport.h"
 #include "platform/reports/Output.h"
+#include "platform/reports/Tallies.h"
 #include "platform/reports/Typesetting.h"
 #include "reports/Furniture.h"
 #include "tests/reports/Ledger.h"
@@ -69,8 +70,8 @@ TEST_F(Ledger, FillsInDatePageNumbersAndCaptionsLetterForLetter) {
                            .height = 5,
                            .items = {reports::Label{u"nome"_s, QRectF(0, 0, 90, 5), u"?"_s, {}},
                                      reports::label(90, 0, 60, u"%D, 100%% %p/%P %"_s)}};
-    // One document a page: the detail is as high as the page.
-    design.detail = {.height = reports::page::InnerHeight - 10,
+    // One document a page, and a little higher than that: what is not there opens no page more.
+    design.detail = {.height = reports::page::InnerHeight - 9,
                      .items = {reports::field(0, 0, 50, u"doc_no"_s)}};
     design.pageFooter = {.height = 10, .items = {reports::label(0, 0, 186, u"%p de %P"_s, Right)}};
     reports::DataReport report(design);
@@ -100,9 +101,32 @@ TEST_F(Ledger, KeepsTotalsExactAndBesideTheirLastRow) {
                                             "tbZelmar_Movimentos ORDER BY movimento_no"_s));
     ASSERT_EQ(pages->count(), 2);
     const QString sum = core::formatted(QVariant::fromValue(core::Money::fromUnits(perPage * 1000)),
-                                        core::format::Money);
-    EXPECT_EQ(textsOf(*pages, 1),
-              u"%1|Soma:|%2|Linhas:|%3"_s.arg(perPage).arg(sum).arg(perPage - perPage / 7));
+                                        core::format::Money, core::portugueseLocale());
+    EXPECT_EQ(textsOf(*pages, 1), u"%1|Soma:|%2|Linhas:|%1"_s.arg(perPage).arg(sum));
+}
+
+TEST(Totals, AreRoundedOnceWhenTheyAreShown) {
+    const struct {
+        QVariant value;
+        int times;
+        int decimals;
+        QString total;
+    } rows[] = {
+        {0.02 * 200.482, 40, 2, u"160.3900"_s},
+        {-0.02 * 200.482, 40, 4, u"-160.3856"_s},
+        {0.0049996, 1, 2, u"0.0000"_s},
+        {QVariant::fromValue(core::Money::fromUnits(-50)), 1, 2, u"-0.0100"_s},
+        {87.35f, 1000, 4, u"87350.0000"_s},
+    };
+    for (const auto& row : rows) {
+        reports::Sum sum;
+        for (int time = 0; time < row.times; ++time) sum.add(row.value);
+        EXPECT_EQ(sum.rounded(row.decimals).toPlainText(), row.total);
+    }
+    reports::Sum sum;
+    for (int time = 0; time < 2; ++time)
+        sum.add(QVariant::fromValue(core::Money::fromUnits(std::numeric_limits<qint64>::max())));
+    EXPECT_EQ(failureOf([&] { (void)sum.rounded(2); }).number(), core::Overflow);
 }
 
 TEST_F(Ledger, NamesWhatTheRowsDoNotHave) {
@@ -110,11 +134,20 @@ TEST_F(Ledger, NamesWhatTheRowsDoNotHave) {
     addValues(design.detail, {{u""_s, u"inventada"_s, 20}});
     fill(1);
     EXPECT_TRUE(failureOf([&] { laidOut(design, movements()); }).text().contains(u"«inventada»"_s));
-    reports::Report groups = twoLevels();
-    groups.chapter = u"outro"_s;
-    book.hospital();
-    EXPECT_TRUE(
-        failureOf([&] { laidOut(groups, open(TwoLevelStatement)); }).text().contains(u"«outro»"_s));
+    // With groups, and with no group to look at.
+    for (const bool hasGroups : {false, true}) {
+        if (hasGroups) book.hospital();
+        reports::Report groups = twoLevels();
+        const auto said = [&](const QString& name) {
+            return failureOf([&] { laidOut(groups, open(TwoLevelStatement)); })
+                .text()
+                .contains(name);
+        };
+        addValues(groups.detail, {{u""_s, u"inventada"_s, 20}});
+        EXPECT_TRUE(said(u"«inventada»"_s));
+        groups.chapter = u"outro"_s;
+        EXPECT_TRUE(said(u"«outro»"_s));
+    }
 
     // Rows that somebody closes under way stop it too.
     fill(500);

@@ -6,12 +6,15 @@
 #include <QApplication>
 #include <QTemporaryDir>
 
+using namespace Qt::StringLiterals;
+
 namespace {
 
 void settleSurroundings(const QTemporaryDir& folder) {
     const QByteArray path = folder.path().toUtf8();  // readable by its owner only
     if (!qEnvironmentVariableIsSet("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
-    qputenv("LC_ALL", "C.UTF-8");
+    // What does not depend on it is tested in another one too.
+    qputenv("LC_ALL", qEnvironmentVariable("ZELMARS_TEST_LOCALE", u"C.UTF-8"_s).toUtf8());
     qputenv("TZ", "Europe/Lisbon");
     qputenv("HOME", path);
     qputenv("CUPS_SERVER", path + "/printing/socket");
