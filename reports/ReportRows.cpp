@@ -6,11 +6,16 @@
 namespace reports {
 
 ado::RecordsetPtr openReportRows(const QString& name) {
+    return openReportRows(name, environment::dtZelmars::instance().Commands(name).CommandText);
+}
+
+ado::RecordsetPtr openReportRows(const QString& name, const QString& text) {
     environment::dtZelmars& environment = environment::dtZelmars::instance();
     ado::RecordsetPtr rows = environment.Recordsets(name);
     // A preview that nobody waited for leaves it open.
     if (rows->State() != ado::adStateClosed) rows->Close();
-    rows->Open(environment.Commands(name).CommandText, environment.SqlServer());
+    environment.Commands(name).CommandText = text;
+    rows->Open(text, environment.SqlServer());
     rows->Requery();
     return rows;
 }

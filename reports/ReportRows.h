@@ -9,4 +9,7 @@ namespace reports {
 /// its command holds. The caller closes it after a modal showing. Fails as opening a row set does.
 ado::RecordsetPtr openReportRows(const QString& name);
 
+/// The same on another text, which the command keeps.
+ado::RecordsetPtr openReportRows(const QString& name, const QString& text);
+
 }  // namespace reports

@@ -5,7 +5,6 @@
 #include <QLabel>
 #include <QScopeGuard>
 
-#include "boundary/environment/dtZelmars.h"
 #include "data/MemberSearch.h"
 #include "data/Members.h"
 #include "platform/core/Clock.h"
@@ -207,19 +206,24 @@ void frmExtratos::Imprimir_Click() {
     }
     Command4->setFocus();
     Imprimir->setEnabled(false);
-    const auto again = qScopeGuard([this] { Imprimir->setEnabled(true); });
+    // A failure leaves the dialog ready for the next try, and Enter must not close it.
+    auto again = qScopeGuard([this] {
+        Imprimir->setEnabled(true);
+        Imprimir->setFocus();
+    });
     // Who has left the file of active members gets no statement, and nobody is told.
     const ado::RecordsetPtr member = data::openMemberById(socio_id_);
     if (!member->atEnd()) print(*member);
     member->Close();
+    again.dismiss();
+    Imprimir->setEnabled(true);
     Unload();
 }
 
 void frmExtratos::print(const ado::Recordset& member) {
     DataReport report(Check2->Value() ? prtExtrato1() : rptExtrato2());
-    const QString& name = report.design().dataMember;
-    environment::dtZelmars::instance().Commands(name).CommandText = statementOf(selection());
-    const ado::RecordsetPtr rows = openReportRows(name);
+    const ado::RecordsetPtr rows =
+        openReportRows(report.design().dataMember, statementOf(selection()));
 
     const auto text = [&member](const QString& column) {
         return core::toText(member.Collect(column));

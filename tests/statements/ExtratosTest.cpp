@@ -5,6 +5,7 @@
 
 #include "boundary/General.h"
 #include "boundary/environment/dtZelmars.h"
+#include "reports/ReportRows.h"
 #include "reports/frmExtratos.h"
 #include "tests/entry/EntryTest.h"
 #include "tests/support/PrintServer.h"
@@ -53,6 +54,7 @@ protected:
         QProcess reader;
         reader.start(u"pdftotext"_s, {u"-layout"_s, printer.file(job), u"-"_s});
         EXPECT_TRUE(reader.waitForFinished() && reader.exitCode() == 0);
+        EXPECT_EQ(reader.readAllStandardError().toStdString(), "");
         return QString::fromUtf8(reader.readAllStandardOutput()).simplified();
     }
 };
@@ -157,7 +159,7 @@ TEST_F(Extratos, OddTextsAndNullsPrintOrAreRefusedWithAText) {
             person.expectBox({.icon = Icon::Critical, .partly = true});
             person.accelerator(u'I');
             EXPECT_EQ(person.find<forms::TextBox>(u"Text1"_s)->Text(), hostile);
-            EXPECT_TRUE(person.find(u"Imprimir"_s)->isEnabled());
+            EXPECT_TRUE(person.find(u"Imprimir"_s)->hasFocus());
         }
         person.put(u"Text1"_s, u"D/7"_s);
         person.accelerator(u'I');
@@ -185,8 +187,10 @@ TEST_F(Extratos, PreviewIsWaitedForAndItsRowsAreClosed) {
         person.fill(u"No_Kor"_s, u"100015"_s);
         choose(u"Check1"_s, false);
         choose(u"Check2"_s, false);
+        openReportRows(u"Print_Extrato1"_s, u"SELECT 1 AS outra"_s);  // somebody's preview
         person.onScreen(u"rptExtrato2"_s, [&] {
             EXPECT_EQ(rows->State(), ado::adStateOpen);
+            EXPECT_TRUE(rows->hasColumn(u"saldo"_s));
             person.escape();
         });
         person.accelerator(u'I');
