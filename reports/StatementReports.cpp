@@ -116,15 +116,15 @@ Report prtExtrato1() {
 Report rptExtrato2() {
     const std::vector<Column> columns{
         {u"No."_s, u"movimento_no"_s, 13, Align::Right},
-        {u"Data"_s, u"data"_s, 18.5, Align::Left, Date},
+        {u"Data"_s, u"data"_s, 17.5, Align::Left, Date},
         {u"F."_s, u"codABC"_s, 7},
         {u"Tipo"_s, u"tipo"_s, 9.5},
-        {u"Rúbrica"_s, u"rubrica"_s, 43.5},
-        {u"Documento"_s, u"doc_no"_s, 24},
-        {u"Valor"_s, u"doc_valor"_s, 20.5, Align::Right, Money},
-        {{}, u"modo_pagamento"_s, 9},
-        {u"Crédito"_s, u"credito"_s, 20.5, Align::Right, Money},
-        {u"Recebido"_s, u"debito"_s, 20.5, Align::Right, Money},
+        {u"Rúbrica"_s, u"rubrica"_s, 50.5},
+        {u"Documento"_s, u"doc_no"_s, 22},
+        {u"Valor"_s, u"doc_valor"_s, 19, Align::Right, Money},
+        {{}, u"modo_pagamento"_s, 9.5},
+        {u"Crédito"_s, u"credito"_s, 19, Align::Right, Money},
+        {u"Recebido"_s, u"debito"_s, 19, Align::Right, Money},
     };
     Report report = statement(u"rptExtrato2"_s);
     addTitles(report.reportHeader, columns);
