@@ -53,7 +53,7 @@ BenchServer::BenchServer()
     }
     // One that a run left behind which was cut short is as good.
     run({program(u"pg_ctl"_s), u"-D"_s, folder_, u"-w"_s, u"-s"_s, u"-o"_s,
-         u"-k %1 -c listen_addresses="_s.arg(folder_), u"restart"_s});
+         u"-k %1 -c listen_addresses= -c fsync=off"_s.arg(folder_), u"restart"_s});
 }
 
 BenchServer::~BenchServer() {

@@ -5,8 +5,9 @@
 
 namespace benchmarks {
 
-/// A PostgreSQL server with the settings of a fresh installation, whose books stay for the next
-/// run. It is reached by the socket in its folder and ends with the program.
+/// A PostgreSQL server with the settings of a fresh installation, except that it waits for no disk,
+/// as copies in memory do not. Its books stay for the next run; after a power cut they are to be
+/// made anew. It is reached by the socket in its folder and ends with the program.
 class BenchServer {
 public:
     static const BenchServer& instance();

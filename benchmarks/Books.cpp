@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "benchmarks/Books.h"
 
+#include <QCoreApplication>
 #include <QDir>
 #include <QFileInfo>
+#include <QStorageInfo>
 #include <cstdio>
 
 #include "benchmarks/Bare.h"
@@ -17,6 +19,9 @@ namespace benchmarks {
 namespace {
 
 const QString Catalogue = u"zelmars"_s;
+
+/// Where the system keeps files in memory.
+const QString Memory = u"/dev/shm"_s;
 
 /// One fixed day, so that a book made earlier and one made today hold the same.
 const QDate AsOf(2026, 11, 20);
@@ -119,8 +124,20 @@ Book largeBook(Engine engine) {
     return book(engine, u"large"_s, largeSizes());
 }
 
+bool copiesInMemory() {
+    constexpr qint64 Enough = qint64{2} << 30;  // bytes: the large book and its journal
+    static const bool enough = [] {
+        const QStorageInfo memory(Memory);
+        return memory.isValid() && memory.fileSystemType() == "tmpfs" && !memory.isReadOnly() &&
+               memory.bytesAvailable() > Enough;
+    }();
+    return enough;
+}
+
 BookCopy::BookCopy(const Book& original) : book_(original) {
     if (book_.engine == Engine::Sqlite) {
+        if (copiesInMemory())
+            book_.folder = Memory + u"/zelmars-bench-%1"_s.arg(QCoreApplication::applicationPid());
         book_.folder += u"-copy"_s;
         QDir(book_.folder).removeRecursively();
         QDir().mkpath(book_.folder);

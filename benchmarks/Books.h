@@ -30,6 +30,11 @@ Book sampleBook(Engine engine = Engine::Sqlite);
 /// 100,000 members, 1,000,000 movements, 1,000,000 accumulator rows.
 Book largeBook(Engine engine = Engine::Sqlite);
 
+/// Whether copies lie in memory. Waiting for a disk hides what a layer adds to its engine, and on a
+/// slow one a hundred thousand commits take minutes: the figures are those without it, on both
+/// sides alike. Where the system has no such memory, copies lie beside the books.
+bool copiesInMemory();
+
 /// A copy of a book for measurements that write much; gone with this.
 class BookCopy {
 public:

@@ -4,6 +4,7 @@
 #include <cstdio>
 
 #include "benchmarks/Benches.h"
+#include "benchmarks/Books.h"
 #include "platform/com/Component.h"
 
 namespace {
@@ -25,6 +26,9 @@ int main(int argc, char** argv) {
     const QApplication application(argc, argv);
     com::registerRunning(QStringLiteral("Vorlane.General"), [] { return new NoProgress; });
 
+    std::printf("Books that are written much lie %s; the server waits for no disk.\n",
+                benchmarks::copiesInMemory() ? "in memory" : "on the disk");
+    std::fflush(stdout);
     benchmarks::Report report(application.arguments().mid(1));
     try {
         benchmarks::measureCoverage(report);

@@ -79,7 +79,7 @@ struct Recordset::Implementation {
         QString text;
         int column = -1;
     };
-    mutable Name names[32];  ///< names found lately, by the place of their text
+    mutable Name names[64];  ///< names found lately, by the place of their text
     std::vector<std::optional<ColumnType>> types;  ///< of the columns that were read
 
     // Opening.

@@ -24,6 +24,18 @@ QByteArray quoted(QStringView name) {
     return '"' + text + '"';
 }
 
+QByteArray insertText(const QString& table, const QStringList& columns) {
+    const QByteArray into = "INSERT INTO " + quoted(table);
+    if (columns.isEmpty()) return into + " DEFAULT VALUES";
+    QByteArray names;
+    QByteArray marks;
+    for (const QString& column : columns) {
+        names += (names.isEmpty() ? "" : ",") + quoted(column);
+        marks += marks.isEmpty() ? "?" : ",?";
+    }
+    return into + '(' + names + ") VALUES(" + marks + ')';
+}
+
 }  // namespace
 
 SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds)
@@ -156,20 +168,10 @@ bool SqliteSession::read(const QString& table, RowIdentity row, RowStore& into) 
 
 RowIdentity SqliteSession::insert(const QString& table, const QStringList& columns,
                                   const std::vector<QVariant>& values) {
-    QByteArray text = "INSERT INTO " + quoted(table);
-    if (columns.isEmpty()) {
-        text += " DEFAULT VALUES";
-    } else {
-        QByteArray marks;
-        text.reserve(text.size() + columns.size() * 24);
-        for (const QString& column : columns) {
-            text += marks.isEmpty() ? '(' : ',';
-            text += quoted(column);
-            marks += marks.isEmpty() ? "?" : ",?";
-        }
-        text += ") VALUES(" + marks + ')';
-    }
-    write(text, values);
+    // Many rows that are added one after the other have the same columns.
+    if (inserted_.text.isEmpty() || inserted_.table != table || inserted_.columns != columns)
+        inserted_ = {table, columns, insertText(table, columns)};
+    write(inserted_.text, values);
     return sqlite3_last_insert_rowid(writer().get());
 }
 

@@ -52,6 +52,14 @@ private:
     std::vector<std::shared_ptr<SqliteHandle>> readers_;  ///< idle ones
     std::unique_ptr<SqliteHandle> writer_;                ///< opened by the first write
     SqliteLocks locks_;
+
+    /// The insert that was made last.
+    struct Insert {
+        QString table;
+        QStringList columns;
+        QByteArray text;
+    };
+    Insert inserted_;
 };
 
 }  // namespace ado
