@@ -89,7 +89,8 @@ CommandLine CommandLine::parsed(const QStringList& words) {
 }
 
 bool CommandLine::needsScreen() const {
-    return task == Task::Window || task == Task::Operation || task == Task::Tour;
+    const bool onlyLogsIn = task == Task::Operation && call.operation == "Login"_L1;
+    return task == Task::Window || task == Task::Tour || (task == Task::Operation && !onlyLogsIn);
 }
 
 QString helpText() {

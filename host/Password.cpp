@@ -5,26 +5,38 @@
 #include <unistd.h>
 
 #include <QTextStream>
+#include <csignal>
 
 namespace host {
 
 namespace {
 
+termios before{};  ///< the terminal as it was, also for who gives up with Ctrl+C
+
+void showAgain() {
+    tcsetattr(STDIN_FILENO, TCSAFLUSH, &before);
+}
+
 /// Keeps the terminal from showing what is typed.
 class Hidden {
 public:
     Hidden() {
-        tcgetattr(STDIN_FILENO, &before_);
-        termios quiet = before_;
+        tcgetattr(STDIN_FILENO, &before);
+        std::signal(SIGINT, [](int signal) {
+            showAgain();
+            std::signal(signal, SIG_DFL);
+            std::raise(signal);
+        });
+        termios quiet = before;
         quiet.c_lflag &= ~static_cast<tcflag_t>(ECHO);
         tcsetattr(STDIN_FILENO, TCSAFLUSH, &quiet);
     }
-    ~Hidden() { tcsetattr(STDIN_FILENO, TCSAFLUSH, &before_); }
+    ~Hidden() {
+        showAgain();
+        std::signal(SIGINT, SIG_DFL);
+    }
     Hidden(const Hidden&) = delete;
     Hidden& operator=(const Hidden&) = delete;
-
-private:
-    termios before_{};
 };
 
 }  // namespace
