@@ -103,7 +103,9 @@ TEST_P(Statements, GiveTheSameOnBothEngines) {
         for (qsizetype at = 0; at < qMin(file.size(), server.size()); ++at)
             ASSERT_EQ(file[at], server[at]) << "line " << at;
         EXPECT_EQ(file.size(), server.size());
-        if (twins == &sample) EXPECT_EQ(file.size() > 1, GetParam().hasRows);
+        if (twins == &sample) {
+            EXPECT_EQ(file.size() > 1, GetParam().hasRows);
+        }
     }
 }
 
