@@ -264,36 +264,53 @@ void measureOpening(Report& report, Engine engine) {
 
 /// What the caller waits for: a row is held, read as it is then, and let go. On a server that is
 /// held against the same statements in one round trip.
+class LockPairs {
+public:
+    explicit LockPairs(const Book& book) : session_(connect(book)->session()), bare_(bare(book)) {}
+
+    void run(int pairs, std::vector<double>& ours, std::vector<double>& theirs) {
+        const auto own = [&] { session_->lock(Table, 1, 30, fresh_); };
+        const auto other = [&] {
+            bare_->touch("1", "SELECT zelmars FROM tbContadores WHERE _linha = 1");
+        };
+        own();
+        other();
+        for (int pair = 0; pair < pairs; ++pair) {
+            // The order changes, so that neither always runs behind the other.
+            if (pair % 2 != 0) ours.push_back(settled(own));
+            theirs.push_back(settled(other));
+            if (pair % 2 == 0) ours.push_back(settled(own));
+        }
+    }
+
+private:
+    /// What the server still does for either of them, the other one does not wait for.
+    double settled(const std::function<void()>& work) {
+        const double time = milliseconds(work);
+        fresh_.clear();
+        session_->read(Table, 1, fresh_);
+        return time;
+    }
+
+    static inline const QString Table = u"tbContadores"_s;
+    std::shared_ptr<ado::Session> session_;
+    std::unique_ptr<Bare> bare_;
+    ado::RowStore fresh_;
+};
+
 void measureLock(Report& report, Engine engine) {
     const QString name = u"lock taken and released/"_s + nameOf(engine);
     if (!report.wanted(name)) return;
-    constexpr int Pairs = 1000;
-    const QString table = u"tbContadores"_s;
-    const Book sample = sampleBook(engine);
-    const auto session = connect(sample)->session();
-    const std::unique_ptr<Bare> engineAlone = bare(sample);
-    ado::RowStore fresh;
-    const auto ours = [&] { session->lock(table, 1, 30, fresh); };
-    const auto theirs = [&] {
-        engineAlone->touch("1", "SELECT zelmars FROM tbContadores WHERE _linha = 1");
-    };
-    // What the server still does for either of them, the other one does not wait for.
-    const auto settled = [&](const auto& work) {
-        const double time = milliseconds(work);
-        fresh.clear();
-        session->read(table, 1, fresh);
-        return time;
-    };
-    ours();
-    theirs();
-    std::vector<double> ourTimes, theirTimes;
-    for (int pair = 0; pair < Pairs; ++pair) {
-        ourTimes.push_back(settled(ours));
-        theirTimes.push_back(settled(theirs));
-    }
-    if (engine == Engine::Postgres) return report.ratio(name, 1.5, ourTimes, theirTimes);
-    std::sort(ourTimes.begin(), ourTimes.end());
-    report.value(name, u"µs"_s, 20, ourTimes[Pairs / 2] * 1000);
+    // New connections again and again: where the system lets the server's process run decides more
+    // than what it does.
+    constexpr int Connections = 20;
+    constexpr int Pairs = 50;
+    std::vector<double> ours, theirs;
+    for (int each = 0; each < Connections; ++each)
+        LockPairs(sampleBook(engine)).run(Pairs, ours, theirs);
+    if (engine == Engine::Postgres) return report.ratio(name, 1.5, ours, theirs);
+    std::sort(ours.begin(), ours.end());
+    report.value(name, u"µs"_s, 20, ours[ours.size() / 2] * 1000);
 }
 
 }  // namespace

@@ -112,7 +112,14 @@ Cell cellOf(const PGresult* result, int row, int column, ColumnType type) {
             cell.kind = Cell::Integer;
             std::from_chars(text, text + length, cell.integer);
             break;
-        case ColumnType::Single:
+        case ColumnType::Single: {
+            // Rounded once: by way of a 64-bit float it could come to a neighbour.
+            float single = 0;
+            cell.kind = Cell::Real;
+            std::from_chars(text, text + length, single);
+            cell.real = single;
+            break;
+        }
         case ColumnType::Double:
             cell.kind = Cell::Real;
             std::from_chars(text, text + length, cell.real);

@@ -3,6 +3,7 @@
 #include <limits>
 
 #include "platform/ado/ColumnValue.h"
+#include "platform/ado/MissingPart.h"
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/ado/Statement.h"
 #include "platform/core/Failure.h"
@@ -35,10 +36,14 @@ void Recordset::Implementation::openRows() {
     const Statement statement(source);
     statement.requireQuery(connection->shapes());
     book = engine->book();
-    if (ShapeStatement::isShape(statement)) {
-        openShape(statement);
-    } else {
-        openStatement(statement);
+    try {
+        if (ShapeStatement::isShape(statement)) {
+            openShape(statement);
+        } else {
+            openStatement(statement);
+        }
+    } catch (const core::Failure& failure) {
+        throw explained(failure, source);
     }
     at = rows->toFirst() ? At::Row : At::Nothing;
 }

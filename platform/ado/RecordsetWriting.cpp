@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Writing of row sets.
 #include "platform/ado/ColumnValue.h"
+#include "platform/ado/MissingPart.h"
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/core/Failure.h"
 
@@ -39,13 +40,14 @@ void Recordset::Implementation::addNew() {
 
 void Recordset::Implementation::update() {
     requireRow();
-    if (at == At::New) {
-        insertNew();
-    } else {
+    try {
+        if (at == At::New) return insertNew();
         if (!changes.isEmpty()) updateCurrent();
-        held.reset();
-        settled = true;
+    } catch (const core::Failure& failure) {
+        throw explained(failure, (at == At::New ? u"INSERT INTO "_s : u"UPDATE "_s) + table);
     }
+    held.reset();
+    settled = true;
 }
 
 void Recordset::Implementation::insertNew() {

@@ -59,6 +59,29 @@ TEST_F(Columns, KeepWhatTheirTypeHoldsAndReadBackTheSame) {
     }
 }
 
+TEST_F(Columns, KeepTheLargestAndTheSmallestNumbersToTheLastBit) {
+    using Single = std::numeric_limits<float>;
+    using Double = std::numeric_limits<double>;
+    const std::pair<float, double> table[] = {{Single::max(), Double::max()},
+                                              {Single::lowest(), Double::lowest()},
+                                              {Single::denorm_min(), Double::denorm_min()},
+                                              {-Single::min(), -Double::min()},
+                                              {16777215.0F, 9007199254740991.0},
+                                              {7.0385307e-26F, 0.1}};
+    for (const auto& [single, number] : table) {
+        rows->AddNew();
+        rows->setCollect(u"simples"_s, single);
+        rows->setCollect(u"taxa"_s, number);
+        rows->Update();
+        const auto stored =
+            open(u"select * from tbMov order by id desc"_s, connection, ado::adLockReadOnly);
+        for (const ado::RecordsetPtr& each : {rows, stored}) {
+            EXPECT_EQ(each->Collect(u"simples"_s), QVariant(single)) << single;
+            EXPECT_EQ(each->Collect(u"taxa"_s), QVariant(number)) << number;
+        }
+    }
+}
+
 TEST_F(Columns, RefuseTheRestAndKeepWhatWasThere) {
     const struct {
         QString column;

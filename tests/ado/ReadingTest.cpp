@@ -108,8 +108,11 @@ TEST_F(Reading, KnowsTablesMadeLaterAndAltered) {
 
 TEST_F(Reading, OfAStatementThatTheEngineRefusesBringsItsText) {
     const core::Failure failure = failureOf([&] { open(u"select nada from tbMov"_s, connection); });
-    EXPECT_EQ(failure.text(), support::onServer() ? u"column \"nada\" does not exist"_s
-                                                  : u"no such column: nada"_s);
+    EXPECT_EQ(failure.text(),
+              u"Ao livro falta uma tabela ou uma coluna. Tentou-se «select nada from tbMov». "
+              "A base de dados respondeu: «%1»."_s.arg(support::onServer()
+                                                           ? u"column \"nada\" does not exist"_s
+                                                           : u"no such column: nada"_s));
     EXPECT_EQ(failure.code(), support::onServer() ? u"42703"_s : u"1"_s);
 }
 
