@@ -37,13 +37,14 @@ bool skip(QStringView text, qsizetype& at, QChar mark) {
 
 QDate parseDay(QStringView text, qsizetype& at) {
     const int first = digits(text, at);
+    const bool isYear = at == 4;
     const QChar mark = at < text.size() ? text[at] : QChar();
     if (mark != u'-' && mark != u'/') return {};
     ++at;
     const int second = digits(text, at);
     if (!skip(text, at, mark)) return {};
     const int third = digits(text, at);
-    if (mark == u'-') return QDate(first, second, third);
+    if (mark == u'-') return isYear ? QDate(first, second, third) : QDate();
     return third < 100 ? QDate() : QDate(third, first, second);
 }
 

@@ -62,7 +62,9 @@ void PostgresAddress::place(const QString& text) {
 }
 
 QString PostgresAddress::shown() const {
-    return u"postgresql:"_s + host + (port.isEmpty() ? QString() : u':' + port) + u'/' + catalog;
+    const bool isNumeric = host.contains(u':') && host[0] != u'/' && host[0] != u'[';
+    const QString place = isNumeric ? u'[' + host + u']' : host;
+    return u"postgresql:"_s + place + (port.isEmpty() ? QString() : u':' + port) + u'/' + catalog;
 }
 
 PostgresAddress::Found PostgresAddress::lookUp(const QDeadlineTimer& deadline) const {

@@ -70,9 +70,13 @@ void RowStore::add(const Cell& cell) {
 }
 
 Cell RowStore::cell(qint64 row, int column) const {
-    const char* at = bytes_.data() + starts_[static_cast<std::size_t>(row)];
-    for (; column > 0; --column) at += packedSize(at);
+    const auto place = static_cast<std::size_t>(row);
+    const char* at = bytes_.data() + starts_[place];
+    const char* const end =
+        bytes_.data() + (place + 1 < starts_.size() ? starts_[place + 1] : bytes_.size());
+    for (; column > 0 && at < end; --column) at += packedSize(at);
     Cell cell;
+    if (at >= end) return cell;
     cell.kind = static_cast<Cell::Kind>(*at++);
     switch (cell.kind) {
         case Cell::Null:

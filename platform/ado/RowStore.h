@@ -13,6 +13,8 @@ class RowStore {
 public:
     qint64 count() const { return static_cast<qint64>(starts_.size()); }
     void clear();
+    /// True when both keep the same rows with the same values.
+    bool operator==(const RowStore&) const = default;
 
     /// Appends the row that the pass stands on.
     void append(const Pass& pass);
@@ -20,6 +22,7 @@ public:
     void beginRow(RowIdentity identity);
     void add(const Cell& cell);
 
+    /// Null for a column that the row does not have: the table was altered since.
     Cell cell(qint64 row, int column) const;
     RowIdentity identity(qint64 row) const { return identities_[static_cast<std::size_t>(row)]; }
 

@@ -20,6 +20,9 @@ constexpr auto JournalLimit = "PRAGMA journal_size_limit=16777216";
 /// Frames of the journal after which it is written back into the book.
 constexpr int CheckpointFrames = 1000;
 
+/// Steps of the engine between two looks at the clock; a millisecond or so.
+constexpr int StepsUnwatched = 50'000;
+
 /// An enlarged bind that is blank or a comment holds no second statement.
 bool isBlank(const char* text) {
     while (*text == ' ' || *text == '\n' || *text == '\t' || *text == '\r' || *text == ';') ++text;
@@ -56,6 +59,15 @@ void SqliteHandle::setTimeout(int seconds) {
     if (seconds == timeout_) return;
     timeout_ = seconds;
     sqlite3_busy_handler(db_, awaitOthers, this);
+    sqlite3_progress_handler(db_, StepsUnwatched, endLate, this);
+}
+
+/// Ends work that takes longer than the time-out, which is a second at the least.
+int SqliteHandle::endLate(void* handle) {
+    auto* const self = static_cast<SqliteHandle*>(handle);
+    if (!self->isWorking_) self->works_.start();
+    self->isWorking_ = true;
+    return self->works_.elapsed() >= qint64{qMax(1, self->timeout_)} * 1000;
 }
 
 /// Waits while another program writes; 0 when the time is over. The engine's own waiting lengthens
@@ -108,6 +120,7 @@ sqlite3_stmt* SqliteHandle::cached(const QByteArray& text) {
         found = cache_.insert(text, std::shared_ptr<sqlite3_stmt>(statement, sqlite3_finalize));
     }
     sqlite3_reset(found->get());
+    beginWork();
     return found->get();
 }
 
@@ -130,17 +143,26 @@ void SqliteHandle::execute(const char* text) {
 
 void SqliteHandle::run(sqlite3_stmt* statement) {
     const int result = sqlite3_step(statement);
-    if (result != SQLITE_DONE && result != SQLITE_ROW) {
-        const QString text = QString::fromUtf8(sqlite3_errmsg(db_));
+    if (result == SQLITE_DONE || result == SQLITE_ROW) {
         sqlite3_reset(statement);
-        throw core::Failure(core::DatabaseFailure, text, QString::number(result));
+        return;
     }
-    sqlite3_reset(statement);
+    try {
+        fail();
+    } catch (...) {
+        sqlite3_reset(statement);
+        throw;
+    }
 }
 
 void SqliteHandle::fail() {
-    throw core::Failure(core::DatabaseFailure, QString::fromUtf8(sqlite3_errmsg(db_)),
-                        QString::number(sqlite3_extended_errcode(db_)));
+    const int code = sqlite3_extended_errcode(db_);
+    const QString text =
+        code == SQLITE_INTERRUPT
+            ? u"A base de dados não acabou em %1 segundos; o pedido foi interrompido."_s.arg(
+                  qMax(1, timeout_))
+            : QString::fromUtf8(sqlite3_errmsg(db_));
+    throw core::Failure(core::DatabaseFailure, text, QString::number(code));
 }
 
 }  // namespace ado

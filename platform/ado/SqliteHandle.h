@@ -53,9 +53,13 @@ public:
     void execute(const char* text);
     /// Runs a cached statement that gives no row.
     void run(sqlite3_stmt* statement);
+    /// The engine is asked for something: from now on it has the time-out for it. A pass that is
+    /// read slowly is asked again for each row.
+    void beginWork() { isWorking_ = false; }
     [[noreturn]] void fail();
 
 private:
+    static int endLate(void* handle);
     static int awaitOthers(void* handle, int tries);
     static int committed(void* handle, sqlite3* db, const char* schema, int frames);
 
@@ -63,6 +67,8 @@ private:
     int timeout_ = -1;
     int nextCheckpoint_ = 0;  ///< frames of the journal at which it is written back into the book
     QElapsedTimer waited_;
+    bool isWorking_ = false;  ///< for longer than a moment, since works_ was started
+    QElapsedTimer works_;
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
     std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
 };

@@ -59,7 +59,7 @@ void Statement::tokenize() {
         if (startsWord(c)) {
             while (end < size && continuesWord(text[end])) ++end;
             push(TokenKind::Word, at, end);
-        } else if (isDigit(c)) {
+        } else if (isDigit(c) || (c == u'.' && isDigit(next) && !endsAt(at))) {
             while (end < size && (isDigit(text[end]) || text[end] == u'.')) ++end;
             push(TokenKind::Number, at, end);
         } else if (c == u'\'' || c == u'"') {
@@ -84,6 +84,13 @@ void Statement::tokenize() {
         }
         at = end;
     }
+}
+
+/// True when a name or a number ends there, so that a point behind it parts names.
+bool Statement::endsAt(qsizetype at) const {
+    if (tokens_.isEmpty()) return false;
+    const Token& last = tokens_.last();
+    return last.at + last.length == at && last.kind != TokenKind::Symbol;
 }
 
 QStringView Statement::word(int i) const {

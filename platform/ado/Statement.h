@@ -54,6 +54,7 @@ private:
     void tokenize();
     void push(TokenKind kind, qsizetype at, qsizetype end) { tokens_.append({kind, at, end - at}); }
     qsizetype quoted(qsizetype at, QChar close) const;
+    bool endsAt(qsizetype at) const;
 
     QString text_;
     QVarLengthArray<Token, 96> tokens_;

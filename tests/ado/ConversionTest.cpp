@@ -93,6 +93,7 @@ TEST_F(Columns, RefuseTheRestAndKeepWhatWasThere) {
         {u"simples"_s, 1e39, core::Overflow},
         {u"taxa"_s, std::numeric_limits<double>::quiet_NaN(), core::TypeMismatch},
         {u"data"_s, u"31/12/1999"_s, core::TypeMismatch},
+        {u"data"_s, u"12-11-10"_s, core::TypeMismatch},
         {u"nome"_s, u"onze letras"_s, core::Overflow},
         {u"nome"_s, QString(u"a"_s + QChar(u'\0') + u"b"_s), core::TypeMismatch},
     };

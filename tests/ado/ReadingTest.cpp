@@ -34,6 +34,7 @@ TEST_F(Reading, GivesTheRowsThatTheStatementAsksForInTheirOrder) {
         QString values;
     } table[] = {
         {where + u"socio > 3"_s, u"id"_s, u"1,2,3,4,5"_s},
+        {where + u"socio*.5 > 1.5"_s, u"id"_s, u"1,2,3,4,5"_s},
         {u"select socio from tbMov group by socio having (sum(valor) > 0.1)"_s, u"socio"_s, u"5"_s},
         {u"select id, tipo from tbMov where socio=5"_s, u"id"_s, u"1,3"_s},
         {where + u"socio = 6"_s, u"id"_s, u"2"_s},
@@ -104,6 +105,42 @@ TEST_F(Reading, KnowsTablesMadeLaterAndAltered) {
     book.exec(u"ALTER TABLE tbMov ADD COLUMN nota VARCHAR(7) DEFAULT 'n'"_s);
     fill(1);
     EXPECT_EQ(open(Movements, connection)->Collect(u"nota"_s), u"n"_s);
+}
+
+TEST_F(Reading, AndWritingGoOnWithATableThatWasMadeAnew) {
+    const auto add = [&] {
+        const auto rows = open(u"select * from tbUnico"_s, connection, ado::adLockPessimistic);
+        if (!rows->atEnd()) {
+            // The row is read afresh behind its lock.
+            EXPECT_EQ(rows->value(rows->columnCount() - 1),
+                      rows->columnCount() > 1 ? u"n"_s : u"a"_s);
+        }
+        rows->AddNew();
+        rows->setCollect(u"code"_s, u"z"_s);
+        rows->Update();
+        EXPECT_EQ(rows->Collect(u"code"_s), u"z"_s);
+        rows->Delete();
+    };
+    book.exec(u"INSERT INTO tbUnico (code) VALUES ('a')"_s);
+    add();
+    book.exec(u"ALTER TABLE tbUnico ADD COLUMN nota VARCHAR(7) DEFAULT 'n'"_s);
+    add();
+    book.exec(u"DROP TABLE tbUnico"_s);
+    EXPECT_NE(failureOf(add).text(), QString());
+    book.exec(u"CREATE TABLE tbUnico (chave INTEGER PRIMARY KEY DEFAULT 7, code VARCHAR(3))"_s);
+    EXPECT_EQ(failureOf(add).text(), QString());
+}
+
+TEST_F(Reading, EndsAStatementThatNeverEnds) {
+    const auto brief = connect(1);
+    const core::Failure failure = failureOf([&] {
+        open(
+            u"select count(*) from (with recursive n(i) as (select 1 union all select i + 1 from n "
+            "where i > 0) select i from n) as x"_s,
+            brief);
+    });
+    EXPECT_EQ(failure.code(), support::onServer() ? u"57014"_s : u"9"_s) << failure.what();
+    EXPECT_TRUE(open(Movements, brief, ado::adLockReadOnly)->atEnd());
 }
 
 TEST_F(Reading, OfAStatementThatTheEngineRefusesBringsItsText) {
