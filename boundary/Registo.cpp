@@ -4,6 +4,7 @@
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
 #include "entry/EntryRoute.h"
+#include "platform/core/Failure.h"
 #include "platform/core/Values.h"
 #include "receipts/ReceiptRoute.h"
 
@@ -12,6 +13,16 @@ using namespace Qt::StringLiterals;
 namespace boundary {
 
 namespace tipo = data::tipo;
+
+namespace {
+
+/// True while something is being typed that the view of a movement would take away.
+bool isUnderWay(const QString& type) {
+    return entry::isEntryUnderWay() || (type == tipo::Receipt && receipts::isReceiptUnderWay()) ||
+           (type == tipo::Reposition && receipts::isRepositionUnderWay());
+}
+
+}  // namespace
 
 void openRegisto(const QVariant& Pkey, QObject* Caller) {
     // A key that is no number fails here; as a number it is not used.
@@ -25,6 +36,11 @@ void openRegisto(const QVariant& Pkey, QObject* Caller) {
     const QString type = core::toText(rows->Collect(u"tipo"_s));
     const bool isDocument = type == tipo::Document || type == tipo::Hospital;
     if (!isDocument && type != tipo::Receipt && type != tipo::Reposition) return;
+    // Asked before another view makes room.
+    if (isUnderWay(type))
+        throw core::Failure(core::InvalidCall,
+                            u"Há um lançamento por terminar. Termine-o ou cancele-o antes de ver "
+                            "outro movimento."_s);
     // Of every type: the hidden entry screen keeps the row as well as the screen that shows it.
     entry::attachMovement(rows, Caller);
     if (isDocument)

@@ -17,17 +17,23 @@ namespace coverage {
 
 namespace {
 
+/// An amount of the movement shown, in single precision; a null is left out.
+void take(const ado::Recordset& shown, ado::Recordset& correcting, const QString& column,
+          float factor) {
+    const QVariant amount = shown.Collect(column);
+    if (!core::isNull(amount)) correcting.setCollect(column, factor * core::toSingle(amount));
+}
+
 /// Neither `liquido` nor `created_by` nor a mode is set: an annulled document therefore raises the
 /// franchise already used. It is meant so.
 void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
     for (const QString& column : {u"codABC"_s, u"rubrica_id"_s, u"doc_no"_s, u"doc_data"_s})
         correcting.setCollect(column, shown.Collect(column));
-    // The document's value keeps its sign.
-    correcting.setCollect(u"doc_valor"_s, core::toSingle(shown.Collect(u"doc_valor"_s)));
+    take(shown, correcting, u"doc_valor"_s, 1);  // keeps its sign
+    take(shown, correcting, u"credito"_s, -1);
+    take(shown, correcting, u"debito"_s, -1);
     const QVariant hospital_id = shown.Collect(u"hospital_id"_s);
     if (!core::isNull(hospital_id)) correcting.setCollect(u"hospital_id"_s, hospital_id);
-    correcting.setCollect(u"credito"_s, -core::toSingle(shown.Collect(u"credito"_s)));
-    correcting.setCollect(u"debito"_s, -core::toSingle(shown.Collect(u"debito"_s)));
 }
 
 /// The first row found; a missing one fails.
@@ -51,12 +57,12 @@ bool annul(const Annulment& annulment) {
                 [&](ado::Recordset& correcting) { setCorrection(shown, correcting); });
     // Failures above go up: only what an earlier procedure left pending is found here, and then
     // the accumulators are left alone.
-    if (core::err().number() == 0)
-        takeBack(shown);
-    else
+    if (core::err().number() != 0)
         core::MsgBox(u"Erro não especificado, contacte o Administrador do Sistema. "_s +
                          core::err().description(),
                      core::Icon::Critical, annulment.caption);
+    else if (!data::accumulatedOrTold([&] { takeBack(shown); }))
+        return true;
     if (annulment.CallbackClass)
         core::passingOver([&] {
             com::call(annulment.CallbackClass, u"RemoteKey"_s, {shown.Collect(u"movimento_id"_s)});

@@ -16,10 +16,11 @@ struct Annulment {
 };
 
 /// Asks, marks the movement, writes its correcting row, takes the accumulators back and calls the
-/// caller back. True when it was done and the screen may go; false when the operator said no.
+/// caller back. True when the screen may go; false when the operator said no.
 ///
 /// Mark, counter, correcting row and accumulator are four writes with no transaction around them. A
-/// failing one goes up, and what was written before it stays.
+/// failure of the first three goes up, and annulling again completes them; one of the last is told,
+/// and nobody is called back.
 bool annul(const Annulment& annulment);
 
 }  // namespace coverage

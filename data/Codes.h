@@ -21,6 +21,8 @@ namespace modo {
 inline constexpr QStringView Cheque = u"CHQ";
 inline constexpr QStringView Transfer = u"TRF";
 inline constexpr QStringView Annulled = u"ANL";
+/// The longest entry of the list, as the screens show it.
+inline constexpr QStringView Widest = u"VEN - Desconto no vencimento";
 }  // namespace modo
 
 /// `ficheiro` of a movement in force; any other value means the tables of those who have left.

@@ -4,7 +4,6 @@
 #include "data/NewMovement.h"
 #include "entry/frmMovimentos.h"
 #include "entry/frmMovimentosF.h"
-#include "platform/core/Failure.h"
 #include "reports/frmExtratos.h"
 
 using namespace Qt::StringLiterals;
@@ -123,12 +122,12 @@ void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
     }
 }
 
+bool isEntryUnderWay() {
+    return Entry::isLoaded() && !Entry::get().bShowing;
+}
+
 void attachMovement(const ado::RecordsetPtr& rows, QObject* Caller) {
     forms::closeView<frmMovimentos>();
-    if (Entry::isLoaded())
-        throw core::Failure(core::InvalidCall,
-                            u"Há um lançamento por terminar. Termine-o ou cancele-o antes de ver "
-                            "outro movimento."_s);
     frmMovimentos& screen = Entry::get();
     screen.bShowing = true;
     screen.Adodc1->setRecordset(rows);

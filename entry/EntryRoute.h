@@ -15,8 +15,11 @@ namespace entry {
 /// does.
 void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL);
 
+/// True while the entry screen holds a new row, shown or not.
+bool isEntryUnderWay();
+
 /// Gives an existing movement to the entry screen, which stays hidden: an existing movement of any
-/// type stays attached there. Fails while an entry is under way, which would lose its row.
+/// type stays attached there. Not while an entry is under way, which would lose its row.
 /// @param Caller  told of an annulment through its member RemoteKey; may be null
 void attachMovement(const ado::RecordsetPtr& rows, QObject* Caller);
 

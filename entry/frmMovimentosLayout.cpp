@@ -3,6 +3,7 @@
 #include <QGridLayout>
 #include <QLabel>
 
+#include "data/Codes.h"
 #include "entry/frmMovimentos.h"
 #include "platform/core/Format.h"
 #include "platform/forms/Fields.h"
@@ -141,8 +142,7 @@ void frmMovimentos::layOut() {
     QGridLayout* below = pairsIn(foot, OnePair);
     below->setContentsMargins(12, 2, 0, 0);
     addRow(below, 0, u"Modo de Pagamento:"_s, {DataCombo3});
-    // Room for the arrow beside the longest entry.
-    DataCombo3->setMinimumWidth(widthFor(DataCombo3, u"TRF - Transferência bancária") + 24);
+    DataCombo3->setMinimumWidth(widthFor(DataCombo3, data::modo::Widest));
     below->setColumnStretch(2, 1);
     int column = 3;
     for (forms::Button* button : {Command6, Command5, Command3, Command4})

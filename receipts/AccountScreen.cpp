@@ -5,6 +5,7 @@
 #include <QLabel>
 
 #include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
 #include "data/Members.h"
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
@@ -29,6 +30,7 @@ AccountScreen::AccountScreen(const QString& name)
       Text1(new forms::MultiLineBox(u"Text1"_s)),
       Command1(new forms::Button(u"Command1"_s, u"Procurar Sócio"_s)) {
     Command1->setKey(u"Alt+P"_s);
+    DataCombo3->setMinimumWidth(forms::widthFor(DataCombo3, data::modo::Widest));
     makeBeneficiaryFrame();
     bindControls();
     No_Kor->onValidate = [this](bool& cancel) { No_Kor_Validate(cancel); };
@@ -71,13 +73,15 @@ void AccountScreen::No_Kor_Validate(bool& cancel) {
         cancel = true;
         return;
     }
-    takeMember(core::toLong(found));
+    const qint32 id = core::toLong(found);
+    takeMember(id, core::toText(data::ofMember(id, u"nome"_s)));
 }
 
-void AccountScreen::takeMember(qint32 socio_id) {
-    Socio_ID = socio_id;
-    Text2->setText(core::toText(data::ofMember(socio_id, u"nome"_s)));
+/// The key comes last: whoever it stands for is on the screen by then.
+void AccountScreen::takeMember(qint32 socio_id, const QString& nome) {
+    Text2->setText(nome);
     Text2->setBackColor(BackColor::Window);
+    Socio_ID = socio_id;
 }
 
 void AccountScreen::clearMember() {

@@ -32,7 +32,7 @@ protected:
     explicit AccountScreen(const QString& name);
 
     /// A member was found: his name is shown.
-    virtual void takeMember(qint32 socio_id);
+    virtual void takeMember(qint32 socio_id, const QString& nome);
     /// Nobody is chosen any more.
     virtual void clearMember();
     /// The number was wiped.

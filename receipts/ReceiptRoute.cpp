@@ -2,11 +2,8 @@
 #include "receipts/ReceiptRoute.h"
 
 #include "data/NewMovement.h"
-#include "platform/core/Failure.h"
 #include "receipts/frmRecebimento.h"
 #include "receipts/frmReposicao.h"
-
-using namespace Qt::StringLiterals;
 
 namespace receipts {
 
@@ -23,12 +20,14 @@ template <class Screen>
 void showExisting(const ado::RecordsetPtr& rows) {
     forms::closeView<Screen>();
     Screen& screen = forms::DefaultInstance<Screen>::get();
-    if (screen.isUnderWay())
-        throw core::Failure(core::InvalidCall,
-                            u"Há um registo por terminar. Termine-o ou cancele-o antes de ver "
-                            "outro movimento."_s);
     screen.showReadOnly(rows);
     screen.Show();
+}
+
+template <class Screen>
+bool isUnderWay() {
+    return forms::DefaultInstance<Screen>::isLoaded() &&
+           forms::DefaultInstance<Screen>::get().isUnderWay();
 }
 
 }  // namespace
@@ -39,6 +38,14 @@ void openNewReceipt(QString& strConMember, QString& strSQL) {
 
 void openNewReposition(QString& strConMember, QString& strSQL) {
     openNew<frmReposicao>(strConMember, strSQL);
+}
+
+bool isReceiptUnderWay() {
+    return isUnderWay<frmRecebimento>();
+}
+
+bool isRepositionUnderWay() {
+    return isUnderWay<frmReposicao>();
 }
 
 void showReceipt(const ado::RecordsetPtr& rows) {

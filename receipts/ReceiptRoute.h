@@ -12,8 +12,11 @@ namespace receipts {
 void openNewReceipt(QString& strConMember, QString& strSQL);
 void openNewReposition(QString& strConMember, QString& strSQL);
 
-/// Show the current row read-only. Fail while a new row of that kind is being typed, which would be
-/// lost.
+/// True while a person is at work on a new one.
+bool isReceiptUnderWay();
+bool isRepositionUnderWay();
+
+/// Show the current row read-only. Not while a new one is under way, which would be lost.
 void showReceipt(const ado::RecordsetPtr& rows);
 void showReposition(const ado::RecordsetPtr& rows);
 

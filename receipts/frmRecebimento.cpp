@@ -46,6 +46,7 @@ QWidget* frmRecebimento::receiptFrame() {
     addPair(grid, 1, 0, u"Valor a Creditar:"_s, Credito);
     addPair(grid, 2, 0, u"Modo de Pagamento:"_s, DataCombo3);
     addPair(grid, 2, 1, u"Número do Cheque:"_s, Text4);
+    Text4->setMinimumWidth(forms::widthFor(Text4, u"0000000000"));
     return frame;
 }
 
@@ -72,8 +73,9 @@ void frmRecebimento::Command1_Click() {
         const qint32 id = data::chooseMember(data::openSearch());
         if (id == 0) return;
         if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
-            takeMember(id);
+            const QString nome = core::toText(member->Collect(u"nome"_s));
             No_Kor->setText(core::toText(member->Collect(u"no_kor"_s)));
+            takeMember(id, nome);
         } else {
             No_Kor->Clear();
             clearMember();

@@ -8,6 +8,7 @@
 #include "data/Codes.h"
 #include "data/Members.h"
 #include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Fields.h"
@@ -42,6 +43,7 @@ frmReposicao::frmReposicao()
     layOut(u"Correcção"_s, u"Correcção da conta corrente do associado, sem cálculo."_s,
            {propertiesFrame(), resultFrame()}, {Command3, Command4});
     bindControls();
+    DataCombo1->onLostFocus = [this] { DataCombo1_LostFocus(); };
     Debito->onGotFocus = [this] { Debito->SelectAll(); };
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
@@ -53,7 +55,6 @@ frmReposicao::frmReposicao()
 void frmReposicao::bindControls() {
     DataCombo1->setList(environment::dtZelmars::instance().Recordsets(u"msRubricas"_s),
                         u"completo"_s, u"rubrica_id"_s);
-    DataCombo1->setWipedValue(0);
     DataCombo1->bind(Adodc1, u"rubrica_id"_s);
     Text3->bind(Adodc1, u"codABC"_s);
     Text7->bind(Adodc1, u"data"_s);
@@ -99,8 +100,8 @@ void frmReposicao::setDefaults() {
     Text8->setText(data::tipo::Reposition.toString());
 }
 
-void frmReposicao::takeMember(qint32 socio_id) {
-    AccountScreen::takeMember(socio_id);
+void frmReposicao::takeMember(qint32 socio_id, const QString& nome) {
+    AccountScreen::takeMember(socio_id, nome);
     forms::setBackColor({Text3, Text4}, forms::BackColor::Window);
     Command2->setEnabled(true);
 }
@@ -123,10 +124,14 @@ com::Object frmReposicao::openMemberFile() {
 /// number and the name of the former one still shown. It is meant so.
 void frmReposicao::Command1_Click() {
     forms::handlePlainly([this] {
-        Socio_ID = core::toLong(openMemberFile().call(u"FindSocios"_s));
-        if (Socio_ID == 0) return;
-        No_Kor->setText(core::toText(data::ofMember(Socio_ID, u"no_kor"_s)));
-        takeMember(Socio_ID);
+        const qint32 id = core::toLong(openMemberFile().call(u"FindSocios"_s));
+        if (id == 0) {
+            Socio_ID = 0;
+            return;
+        }
+        const QString nome = core::toText(data::ofMember(id, u"nome"_s));
+        No_Kor->setText(core::toText(data::ofMember(id, u"no_kor"_s)));
+        takeMember(id, nome);
     });
 }
 
@@ -138,6 +143,12 @@ void frmReposicao::Command2_Click() {
         const QVariant value = data::ofPerson(Familia_ID, column);
         if (!core::isNull(value)) box->setText(core::toText(value));
     }
+}
+
+/// Without a rubric the row holds 0, also when nothing was wiped.
+void frmReposicao::DataCombo1_LostFocus() {
+    if (bShowing || !DataCombo1->Text().isEmpty()) return;
+    core::passingOver([this] { DataCombo1->setBoundText(0); });
 }
 
 void frmReposicao::post() {

@@ -28,7 +28,7 @@ public:
 protected:
     void setDefaults() override;
     void post() override;
-    void takeMember(qint32 socio_id) override;
+    void takeMember(qint32 socio_id, const QString& nome) override;
     void clearMember() override;
 
 private:
@@ -39,6 +39,7 @@ private:
     static com::Object openMemberFile();
     void Command1_Click();
     void Command2_Click();
+    void DataCombo1_LostFocus();
 };
 
 }  // namespace receipts

@@ -70,7 +70,7 @@ bool postReceipt(const ReceiptEntry& receipt) {
     // Not passed over, unlike on the other screens: a failure goes up with the engine's text.
     data::numberAndSave(*receipt.record);
     if (!data::savedOrTold(receipt.caption)) return false;
-    addToAccount(receipt);
+    data::accumulatedOrTold([&] { addToAccount(receipt); });
     return true;
 }
 
@@ -83,7 +83,7 @@ bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption) {
     });
     // Finds only what an earlier procedure left pending; the accumulators are then left alone.
     if (core::err().number() == 0)
-        takeBack(*shown);
+        data::accumulatedOrTold([&] { takeBack(*shown); });
     else
         MsgBox(u"Erro inesperado, contacte o Administrador do Sistema"_s, Icon::Critical, caption);
     return true;

@@ -19,14 +19,16 @@ struct ReceiptEntry {
 /// accumulator. True when it was posted; false when it was refused (the operator was told) and the
 /// screen stays.
 ///
-/// Counter, movement and accumulator are three writes with no transaction around them. A failing
-/// one goes up, and what was written before it stays.
+/// Counter, movement and accumulator are three writes with no transaction around them. A failure of
+/// the first two goes up, and a number drawn is lost; one of the last is told, and counts as
+/// posted.
 bool postReceipt(const ReceiptEntry& receipt);
 
 /// Asks, marks the receipt, writes its correcting row and takes the amount back from an
 /// accumulator. True when the screen may go; false when the operator said no.
 ///
-/// Mark, counter, correcting row and accumulator are four writes, as above.
+/// Mark, counter, correcting row and accumulator are four writes, as above: a failure of the first
+/// three goes up, and annulling again completes them.
 /// @param shown  its current row is the receipt, with `ficheiro`
 bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption);
 

@@ -54,8 +54,8 @@ protected:
     QVariant rowValue() const;
     /// Only while hasRow(); fails as Recordset::setCollect does.
     void writeRow(const QVariant& value);
-    /// Runs the step that writes what a person has entered. In a row that cannot be written the
-    /// change goes nowhere: the control shows the row's value again. False when the step fails
+    /// Runs the step that writes what a person has entered. In a row set that is open to read only
+    /// the change goes nowhere: the control shows the row's value again. False when the step fails
     /// otherwise, with a box that says why.
     bool writeEntered(const std::function<void()>& step);
 

@@ -41,7 +41,7 @@ public:
     std::function<void()> onLostFocus;
 
     /// Takes the entry that was typed and writes it. Refuses only when the row cannot take it, with
-    /// a box that says why; in a row that cannot be written a change goes nowhere.
+    /// a box that says why; in a row set that is open to read only a change goes nowhere.
     bool leave() override;
 
 protected:

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/forms/Fields.h"
 
+#include <QComboBox>
 #include <QGridLayout>
 #include <QLabel>
 
@@ -23,7 +24,8 @@ TextBox* displayBox(const QString& name, QStringView format) {
 
 int widthFor(const QWidget* field, QStringView text) {
     const int frame = field->fontMetrics().height();
-    return field->fontMetrics().horizontalAdvance(text.toString()) + frame;
+    const int arrow = qobject_cast<const QComboBox*>(field) ? 24 : 0;
+    return field->fontMetrics().horizontalAdvance(text.toString()) + frame + arrow;
 }
 
 QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLabels) {

@@ -19,7 +19,7 @@ TextBox* textBox(const QString& name, QStringView format = {});
 /// A box that only shows.
 TextBox* displayBox(const QString& name, QStringView format = {});
 
-/// Width in pixels at which a field shows `text` whole, whatever the font.
+/// Width in pixels at which a field shows `text` whole, whatever the font; a list beside its arrow.
 int widthFor(const QWidget* field, QStringView text);
 
 /// A grid for pairs of label and field, side by side, on a frame. The labels' columns are as wide

@@ -18,8 +18,9 @@ enum class BackColor { Menu, Window };
 /// the focus. Leaving it runs, in this order: the validation handler, which may refuse; then, if a
 /// person has changed the text, the conversion to the column's type and the write to the column. A
 /// text that the column does not take is refused with a box that says so, and the focus stays. So
-/// does a handler that fails. An empty text is written as null to a column that is no text. In a
-/// row that cannot be written a change goes nowhere: the box shows the row's value again.
+/// does a handler that fails. An empty text is written as null to a column that is no text. A row
+/// set that is open to read only takes no change: the box shows the row's value again. One that is
+/// open to write keeps the change as pending, also where the rows of a view can never be updated.
 ///
 /// In a box with a number format the decimal key of the numeric pad types the locale's mark.
 class TextBox : public QLineEdit, public Bound, public Validating {
