@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementBook.h"
 
+#include <QSet>
 #include <QStringList>
 
 #include "platform/ado/Recordset.h"
@@ -25,6 +26,8 @@ const QString NamedKeys =
 const QString NewestFirst = u"order by data desc, movimento_id desc"_s;
 // What was posted since, in one of the two tables behind the view.
 const QString Since = u"where ficheiro = '%1' and movimento_id > %2 "_s;
+// What was annulled of one member's.
+const QString AnnulledOf = u"where socio_id = %1 and tipo = 'ANL'"_s;
 // One row is one movement as the list shows it; the columns of MovementRow in its order.
 const QString Rows =
     u"select movimento_id, movimento_no, data, no_kor, nome, familiar, tipo, doc_no, doc_valor, "
@@ -103,6 +106,7 @@ std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
 
 int MovementBook::takeNewer(MovementSearch& search) const {
     int taken = 0;
+    QSet<qint32> corrected;
     const auto row = ado::Recordset::create();
     for (const bool activo : {false, true}) {
         std::vector<MovementKey> newer;
@@ -112,18 +116,21 @@ int MovementBook::takeNewer(MovementSearch& search) const {
         for (; !row->atEnd(); row->MoveNext()) {
             newer.push_back(keyOf(*row));
             takeNames(*row, newer.back(), search);
+            if (newer.back().tipo == "COR"_L1) corrected.insert(newer.back().socio_id);
         }
         row->Close();
         search.prepend(newer);
         taken += int(newer.size());
     }
+    for (const qint32 socio_id : corrected) takeAnnulled(search, socio_id);
     return taken;
 }
 
-void MovementBook::takeAgain(MovementSearch& search, qint32 movimento_id) const {
+/// A correcting row is its annulled movement's only trace since; it names the member alone.
+void MovementBook::takeAnnulled(MovementSearch& search, qint32 socio_id) const {
     const auto row = ado::Recordset::create();
-    row->Open(Keys + u"where movimento_id = %1"_s.arg(movimento_id), connection_);
-    if (!row->atEnd()) search.correct(keyOf(*row));
+    row->Open(Keys + AnnulledOf.arg(socio_id), connection_);
+    for (; !row->atEnd(); row->MoveNext()) search.correct(keyOf(*row));
     row->Close();
 }
 

@@ -41,15 +41,15 @@ public:
     std::shared_ptr<MovementSearch> newest(int count) const;
     /// All movements and the names of all persons; null when it was stopped.
     std::shared_ptr<MovementSearch> all(std::stop_token stop) const;
-    /// Takes in what was posted since; returns how many movements that was.
+    /// Takes in what was posted since, and what those rows correct; returns how many movements were
+    /// posted.
     int takeNewer(MovementSearch& search) const;
-    /// Takes one movement in anew.
-    void takeAgain(MovementSearch& search, qint32 movimento_id) const;
 
     /// What the list shows of some movements, in any order; missing ones are left out.
     std::vector<MovementRow> rows(const std::vector<qint32>& keys) const;
 
 private:
+    void takeAnnulled(MovementSearch& search, qint32 socio_id) const;
     ado::ConnectionPtr connection_;
 };
 

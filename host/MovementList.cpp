@@ -72,17 +72,8 @@ void MovementList::setFilter(const QString& filter) {
     refilter();
 }
 
-void MovementList::takeNewer(qint32 opened) {
+void MovementList::takeNewer() {
     if (!book_ || !search_ || book_->takeNewer(*search_) == 0) return forgetRows();
-    // An annulment always brings a correcting row along.
-    if (opened != 0) book_->takeAgain(*search_, opened);
-    refilter();
-}
-
-void MovementList::takeAgain(qint32 movimento_id) {
-    if (!book_ || !search_) return;
-    book_->takeAgain(*search_, movimento_id);
-    book_->takeNewer(*search_);
     refilter();
 }
 

@@ -21,12 +21,9 @@ public:
     void setBook(std::shared_ptr<MovementBook> book, std::shared_ptr<MovementSearch> search);
     void setFilter(const QString& filter);
     const QString& filter() const { return filter_; }
-    /// Takes in what was posted since and reads the shown rows afresh. Fails as reading does.
-    /// @param opened  a movement that may have been annulled since, which calls back only for
-    ///                documents; 0 for none
-    void takeNewer(qint32 opened);
-    /// Takes in one movement that was written again, and what was posted since. Fails likewise.
-    void takeAgain(qint32 movimento_id);
+    /// Takes in what was posted or annulled since and reads the shown rows afresh. Fails as reading
+    /// does.
+    void takeNewer();
     /// Reads the shown rows afresh the next time they are looked at.
     void forgetRows();
 

@@ -155,12 +155,7 @@ void MovementsView::changeList(Change&& change) {
 }
 
 void MovementsView::takeNewer() {
-    changeList([this] { movements_->takeNewer(opened_); });
-}
-
-void MovementsView::takeAgain(qint32 movimento_id) {
-    changeList([&] { movements_->takeAgain(movimento_id); });
-    if (book_ && loader_->isReading()) loader_->start(settings_);  // it read the old state
+    changeList([this] { movements_->takeNewer(); });
 }
 
 void MovementsView::takeLoaded(const std::shared_ptr<MovementSearch>& search) {
@@ -229,8 +224,7 @@ bool MovementsView::keyInList(const QKeyEvent& key) {
 void MovementsView::chooseCurrent() {
     const QModelIndex current = list_->currentIndex();
     if (!current.isValid() || stack_->currentIndex() != 0) return;
-    opened_ = movements_->movimento_id(current.row());
-    emit chosen(opened_);
+    emit chosen(movements_->movimento_id(current.row()));
 }
 
 void MovementsView::filterChanged(const QString& text) {

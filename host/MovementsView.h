@@ -22,10 +22,8 @@ public:
 
     /// Shows the newest movements of a book at once and reads the others beside it.
     void open(const BookSettings& settings);
-    /// Shows what was posted since.
+    /// Shows what was posted or annulled since, here or at another workstation.
     void takeNewer();
-    /// Shows one movement that was written again, and what was posted since.
-    void takeAgain(qint32 movimento_id);
 
     void focusFilter();
     void focusList();
@@ -63,7 +61,6 @@ private:
     std::shared_ptr<MovementBook> book_;
     MovementList* movements_;
     MovementLoader* loader_;
-    qint32 opened_ = 0;  ///< the movement chosen last; 0 for none
     QLineEdit* filter_;
     QTableView* list_;
     QLabel* notice_;

@@ -179,8 +179,8 @@ void frmPrincipal::login() {
                      core::Icon::Critical);
 }
 
-void frmPrincipal::RemoteKey(const QVariant& movimento_id) {
-    movements_->takeAgain(movimento_id.toInt());
+void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {
+    movements_->takeNewer();
 }
 
 void frmPrincipal::reload() {

@@ -21,7 +21,7 @@ public:
     frmPrincipal();
     ~frmPrincipal() override;
 
-    /// Called by the component after a movement was annulled.
+    /// Called by the component after a movement was annulled: its correcting row tells which.
     Q_INVOKABLE void RemoteKey(const QVariant& movimento_id);
 
     /// Reads the settings and the book afresh.
