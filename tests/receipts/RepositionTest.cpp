@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Corrections of an account typed by hand: at the screen, to the stored rows.
+#include "entry/frmMovimentos.h"
 #include "receipts/frmReposicao.h"
 #include "tests/receipts/AccountTest.h"
 
@@ -45,8 +46,11 @@ TEST_F(Reposition, WithRubricAndPersonFindsOrAddsTheirRow) {
 TEST_F(Reposition, WithoutRubricAddsARowEachTime) {
     for (int time = 0; time < 2; ++time) {
         typeReposition(u"-1"_s, u"0"_s);
+        if (time > 0) person.fill(u"DataCombo1"_s, {});  // left as empty as it was
         postAnd();
     }
+    EXPECT_EQ(stored("select rubrica_id from tbZelmar_Movimentos order by movimento_no"),
+              "NULL\n0");
     EXPECT_EQ(totals(), "3|1|NULL|0|NULL|-1|0|NULL\n3|1|NULL|0|NULL|-1|0|NULL");
 }
 
@@ -84,14 +88,17 @@ TEST_F(Reposition, SearchGivenUpLeavesNoMemberWithTheOldNameShown) {
     FakeSearch::member = socio;
     person.accelerator(u'P');
     EXPECT_EQ(shown(u"No_Kor"_s), u"100015"_s);
-    FakeSearch::failure = u"sem ficha"_s;
-    expectBox(u"sem ficha"_s);
+    const auto& screen = forms::DefaultInstance<receipts::frmReposicao>::get();
+    const qint64 other = book.member({.no_kor = u"100023"_s});
+    FakeSearch::member = other;
+    book.exec(u"alter table tbSocios rename nome to apelido"_s);
+    person.expectBox({.text = u"nome"_s, .icon = Icon::None, .partly = true});
     person.accelerator(u'P');
-    FakeSearch::failure.clear();
+    EXPECT_EQ(screen.Socio_ID, socio) << "a search that fails changes nothing";
     FakeSearch::member = 0;
     person.accelerator(u'P');
-    EXPECT_EQ(shown(u"Text2"_s), u"António Manuel Silva Matos"_s);
-    EXPECT_EQ(forms::DefaultInstance<receipts::frmReposicao>::get().Socio_ID, 0);
+    EXPECT_EQ(shown(u"No_Kor"_s) + shown(u"Text2"_s), u"100015António Manuel Silva Matos"_s);
+    EXPECT_EQ(screen.Socio_ID, 0);
 }
 
 // Counter, movement and accumulator are three writes.
@@ -124,8 +131,11 @@ TEST_F(Reposition, ViewShowsItAndMakesRoomForTheNextButNotForWhatIsTyped) {
         EXPECT_FALSE(person.peek(hidden)->isVisible());
     person.fill(u"Debito"_s, u"9"_s);
     typeReposition(u"1"_s, u"2"_s);  // in place of the view
-    person.expectBox({.text = u"Há um registo por terminar."_s, .partly = true});
+    const auto& entry = forms::DefaultInstance<entry::frmMovimentos>::get();
+    const ado::RecordsetPtr attached = entry.Adodc1->Recordset();
+    person.expectBox({.text = u"Há um lançamento por terminar."_s, .partly = true});
     general.Registo({}, key);
+    EXPECT_EQ(entry.Adodc1->Recordset(), attached) << "nothing makes room for a view refused";
     EXPECT_EQ(shown(u"Credito"_s), u"€ 2,00"_s);
     person.accelerator(u'C');
     openView(key, Screen);
