@@ -138,10 +138,21 @@ void Statement::requireQuery(bool shapes) const {
     if (hasComment_)
         refuse(
             u"Uma consulta não pode ter comentários; não foi executado: %1"_s.arg(text_.left(80)));
-    for (int i = 1; i < count(); ++i)
-        if (kind(i) == TokenKind::Symbol && text_[tokens_[i].at] == u';')
-            refuse(u"Só é aceite uma consulta de cada vez; não foi executado: %1"_s.arg(
-                text_.mid(tokens_[i].at, 80)));
+    for (int i = 1; i < count(); ++i) {
+        const auto refuseFrom = [&](const QString& why) {
+            refuse(why + u"; não foi executado: "_s + text_.mid(tokens_[i].at, 80));
+        };
+        if (is(i, ";"_L1)) refuseFrom(u"Só é aceite uma consulta de cada vez"_s);
+        if (is(i, "$"_L1) || isMarkedText(i))
+            refuseFrom(u"Uma consulta não pode ter «$» nem uma letra colada a um texto"_s);
+    }
+}
+
+// $$…$$, E'…' and U&'…' end elsewhere for a server than for the tokens.
+bool Statement::isMarkedText(int i) const {
+    if (kind(i) != TokenKind::Text && kind(i) != TokenKind::DoubleText) return false;
+    const Token& before = tokens_[i - 1];
+    return before.at + before.length == tokens_[i].at && (isWord(i - 1) || is(i - 1, "&"_L1));
 }
 
 QString Statement::singleTable() const {

@@ -53,6 +53,7 @@ public:
 private:
     void tokenize();
     void push(TokenKind kind, qsizetype at, qsizetype end) { tokens_.append({kind, at, end - at}); }
+    bool isMarkedText(int i) const;
     qsizetype quoted(qsizetype at, QChar close) const;
     bool endsAt(qsizetype at) const;
 

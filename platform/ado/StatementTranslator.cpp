@@ -153,7 +153,8 @@ void Translation::literals() {
 
 /// A name in quotes; the server's unquoted names are lower case.
 QString Translation::quoted(const QString& name) const {
-    return u"\"%1\""_s.arg(isServer_ ? name.toLower() : name);
+    const QString text = isServer_ ? name.toLower() : name;
+    return u'"' + QString(text).replace(u"\""_s, u"\"\""_s) + u'"';
 }
 
 // CONVERT(DATETIME, 'text'[, style]): whatever the style says, the text is month/day/year.
