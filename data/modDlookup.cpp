@@ -15,7 +15,8 @@ QVariant DLookup(const QString& strSQL, const QString& /*strConnection*/, const 
                ado::adLockPessimistic, ado::adCmdUnknown);
     if (rows->atEnd()) return u""_s;
     rows->MoveFirst();
-    const QVariant value = rows->Collect(strField);
+    // A row that somebody holds may be read all the same.
+    const QVariant value = rows->readValue(strField);
     rows->Close();
     return value;
 }

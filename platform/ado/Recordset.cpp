@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/Recordset.h"
 
+#include "platform/ado/ColumnValue.h"
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Values.h"
@@ -152,6 +153,12 @@ bool Recordset::hasColumn(const QString& name) const {
 
 QVariant Recordset::Collect(const QString& name) const {
     return d->value(d->columnOf(name));
+}
+
+QVariant Recordset::readValue(const QString& name) const {
+    const int column = d->columnOf(name);
+    d->requireRow();
+    return d->at == At::Row ? toVariant(d->rows->cell(column), d->typeOf(column)) : QVariant();
 }
 
 void Recordset::setCollect(const QString& name, const QVariant& value) {

@@ -75,7 +75,7 @@ public:
     void MoveFirst();
     void MoveLast();
     void MoveNext();
-    /// Rows of the set, exact for a static set and after MoveLast; -1 when it is not known yet.
+    /// Rows of the set; -1 as long as nobody has come to the end of a long one, as MoveLast does.
     qint64 RecordCount() const;
 
     /// Starts a new row and makes it current. Columns not written read as null and take the
@@ -102,6 +102,9 @@ public:
     /// column keeps. Fails with TypeMismatch, Overflow (past the column's range or length),
     /// NotUpdatable (read-only set) or NoCurrentRow.
     void setCollect(const QString& name, const QVariant& value);
+    /// The value as the statement read it, for a mere lookup: the row is not held for it and nobody
+    /// is waited for. Of a row that this set added, null.
+    QVariant readValue(const QString& name) const;
     QVariant value(int column) const;
     void setValue(int column, const QVariant& value);
 

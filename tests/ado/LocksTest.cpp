@@ -105,6 +105,7 @@ TEST_F(Locks, NameTheHolderAfterTheTimeoutAndAreFreeOnceItIsKilled) {
     EXPECT_LT(waited.elapsed(), 4000);
     EXPECT_TRUE(text.contains(u"tbConta"_s) && text.contains(u'@')) << qPrintable(text);
     EXPECT_EQ(open(Counter, connection, ado::adLockReadOnly)->value(0), QVariant(1));
+    EXPECT_EQ(rows->readValue(u"proximo"_s), QVariant(1));  // a mere lookup
     const auto impatient = open(Counter, connect(0));
     EXPECT_EQ(lookedAt(impatient), core::RowInUse);
     kill(holder, SIGKILL);
