@@ -4,6 +4,7 @@
 #include <poll.h>
 
 #include <QRegularExpression>
+#include <utility>
 
 #include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
@@ -141,6 +142,10 @@ void PostgresHandle::settle(Role role) {
         connection_, [](void*, const char*) {}, nullptr);
     send("SET datestyle = ISO, MDY");
     send("SET standard_conforming_strings = on");
+    // What a book's administrator may have set otherwise: the read behind a lock must see what the
+    // row's last holder stored, and a number must come with all its digits.
+    send("SET default_transaction_isolation = 'read committed'");
+    send("SET extra_float_digits = 1");
     // Compiling pays for statements of seconds; those of the daily work take milliseconds.
     send("SET jit = off");
     // A set may stay open over lunch.
@@ -180,6 +185,29 @@ PostgresResult PostgresHandle::run(const std::vector<PostgresCall>& calls) {
     }
 }
 
+PostgresResult PostgresHandle::runThenCommit(const PostgresCall& call) {
+    requireConnection();
+    const int count = dispatch(call);
+    flush();
+    drain(0);
+    PostgresResult result = answers(count);
+    const bool isDone = !isFailure(result.get());
+    synchronise();
+    try {
+        const PostgresResult refusal = drain(0);
+        if (isDone && refusal) refuse(refusal.get());
+    } catch (const core::Failure& failure) {
+        if (!isDone || !lost_) throw;
+        throw core::Failure(
+            failure.number(),
+            failure.text() + u" A linha pode ter ficado gravada: procure-a antes de repetir."_s,
+            failure.code());
+    }
+    if (isDone) return result;
+    forget(call.text);
+    refuse(result.get());
+}
+
 PostgresResult PostgresHandle::runOnce(const QByteArray& text) {
     requireConnection();
     return committed(dispatch(text));
@@ -208,8 +236,7 @@ void PostgresHandle::ask(const std::vector<QByteArray>& texts) {
     if (asked_ > 0) answer();
     requireConnection();
     for (const QByteArray& text : texts) asked_ += dispatch(text);
-    PQsendFlushRequest(connection_);
-    PQflush(connection_);
+    flush();
 }
 
 PostgresResult PostgresHandle::answer() {
@@ -255,6 +282,11 @@ void PostgresHandle::forget(const QByteArray& text) {
     if (!name.isEmpty()) send("DEALLOCATE " + name);
 }
 
+void PostgresHandle::flush() {
+    PQsendFlushRequest(connection_);
+    PQflush(connection_);
+}
+
 void PostgresHandle::synchronise() {
     PQpipelineSync(connection_);
     PQflush(connection_);
@@ -266,14 +298,18 @@ void PostgresHandle::requireConnection() {
     if (lost_) lose(u"a ligação foi fechada."_s);
 }
 
-/// Reads what earlier statements still answer, up to the last so many synchronisations.
-void PostgresHandle::drain(int but) {
+/// Reads what earlier statements still answer, up to the last so many synchronisations. Gives the
+/// first failure among the answers, if any.
+PostgresResult PostgresHandle::drain(int but) {
     requireConnection();
     deadline_.setRemainingTime(patience() * 1000);
+    PostgresResult failure;
     while (unread_ > but) {
-        const PostgresResult result(take());
+        PostgresResult result(take());
         if (PQresultStatus(result.get()) == PGRES_PIPELINE_SYNC) --unread_;
+        if (!failure && result && isFailure(result.get())) failure = std::move(result);
     }
+    return failure;
 }
 
 /// Seconds after which a silent server counts as gone.
@@ -305,8 +341,10 @@ void PostgresHandle::wait() {
     if (sending < 0) lose(oneLine(PQerrorMessage(connection_)));
     if (!await(connection_, static_cast<short>(sending > 0 ? POLLIN | POLLOUT : POLLIN),
                deadline_)) {
-        // Nobody knows what a silent server still does: the connection is given up.
+        // Nobody knows what a silent server still does: the connection is given up, at once, so
+        // that it lets go of everything when it wakes up.
         lost_ = true;
+        PQfinish(std::exchange(connection_, nullptr));
         throw core::Failure(
             core::DatabaseFailure,
             u"O servidor de «%1» não respondeu em %2 segundos; a ligação foi fechada."_s.arg(place_)

@@ -75,6 +75,10 @@ public:
     PostgresResult run(const QByteArray& text, const PostgresValues& values = {}) {
         return run(std::vector<PostgresCall>{{text, values}});
     }
+    /// Runs one statement and, once it is answered, commits it: a server that wakes up late finds
+    /// nobody to commit, so that a row added again after a failure stands once. Where only the
+    /// answer to the commit is lost, the failure's text says so.
+    PostgresResult runThenCommit(const PostgresCall& call);
     /// Runs one statement that will hardly come again, and commits it.
     PostgresResult runOnce(const QByteArray& text);
     /// Sends a statement and commits it, without waiting for the answer, which nobody sees.
@@ -96,8 +100,9 @@ private:
     int dispatch(const QByteArray& text);
     int dispatch(const PostgresCall& call);
     void forget(const QByteArray& text);
+    void flush();
     void synchronise();
-    void drain(int but);
+    PostgresResult drain(int but);
     PGresult* take();
     void wait();
     int patience() const;

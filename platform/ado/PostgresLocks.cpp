@@ -39,6 +39,8 @@ public:
     AdvisoryLock(const AdvisoryLock&) = delete;
     AdvisoryLock& operator=(const AdvisoryLock&) = delete;
 
+    bool isUnbroken() const override { return session_->isHeld(key_); }
+
     bool heldByThisThread() const { return here_.isTaken(); }
     void taken() {
         taken_ = true;
@@ -84,27 +86,25 @@ QString PostgresSession::holderOf(const QByteArray& key) {
 }
 
 void PostgresSession::unlock(const QByteArray& key) noexcept {
-    locked_.remove(key);
+    broken_.remove(key);
     try {
-        if (writer_ && !writer_->isLost()) writer_->send({LetGo, {key}});
+        if (locked_.remove(key) && writer_ && !writer_->isLost()) writer_->send({LetGo, {key}});
     } catch (const std::exception&) {
         // Without the connection the server has let go already.
     }
 }
 
-/// The rows held went with the connection that was lost: they are taken again before anything else
-/// happens on the new one. Where somebody else was quicker, nothing is written.
-void PostgresSession::lockAgain() {
-    try {
-        writer_->setTimeout(timeout_);
-        for (const QByteArray& key : locked_) writer_->run(Take, {key});
-    } catch (const core::Failure& failure) {
-        writer_.reset();
-        if (failure.code() != LockNotAvailable) throw;
+bool PostgresSession::isHeld(const QByteArray& key) const {
+    return locked_.contains(key) && writer_ && !writer_->isLost();
+}
+
+PostgresHandle& PostgresSession::writerOf(const QString& table, RowIdentity row) {
+    PostgresHandle& handle = writer();
+    if (broken_.contains(keyOf(table, row)))
         throw core::Failure(core::RowInUse,
-                            u"A ligação a «%1» perdeu-se e uma linha que estava a ser alterada foi "
-                            u"entretanto tomada por outro posto."_s.arg(book_));
-    }
+                            u"A ligação a «%1» perdeu-se enquanto a linha era gravada; nada foi "
+                            u"gravado. Tente de novo."_s.arg(book_));
+    return handle;
 }
 
 }  // namespace ado

@@ -47,6 +47,9 @@ QByteArray parameter(std::size_t number) {
 // Classes of SQLSTATE.
 constexpr auto WrongStatement = "42"_L1;
 constexpr auto WrongValue = "22"_L1;
+// Codes of their own.
+constexpr auto MissingTable = "42P01"_L1;
+constexpr auto MissingColumn = "42703"_L1;
 constexpr auto NotSupported = "0A"_L1;  // among others, columns of another type than before
 
 /// True when the server may take a statement whole that it refused with parameters in it.
@@ -78,17 +81,26 @@ void PostgresSession::giveBack(std::shared_ptr<PostgresHandle> reader) {
 }
 
 PostgresHandle& PostgresSession::writer() {
-    if (writer_ && writer_->isLost()) writer_.reset();
-    if (!writer_) {
-        writer_ = std::make_unique<PostgresHandle>(address_, PostgresHandle::Role::Writer);
-        lockAgain();
+    if (writer_ && writer_->isLost()) {
+        broken_.unite(locked_);
+        locked_.clear();
+        writer_.reset();
     }
+    if (!writer_)
+        writer_ = std::make_unique<PostgresHandle>(address_, PostgresHandle::Role::Writer);
     writer_->setTimeout(timeout_);
     return *writer_;
 }
 
 std::shared_ptr<Pass> PostgresSession::open(const Statement& statement, const QString& table) {
-    return std::make_shared<PostgresPass>(shared_from_this(), statement, !table.isEmpty());
+    try {
+        auto pass = std::make_shared<PostgresPass>(shared_from_this(), statement, !table.isEmpty());
+        if (!table.isEmpty()) compare(table, *pass);
+        return pass;
+    } catch (const core::Failure& failure) {
+        notice(failure);
+        throw;
+    }
 }
 
 PostgresResult PostgresSession::firstRows(PostgresHandle& reader, const Statement& statement,
@@ -143,11 +155,33 @@ std::optional<ColumnType> PostgresSession::columnType(QStringView name, QStringV
     return type == table->types.constEnd() ? std::nullopt : std::optional(*type);
 }
 
+void PostgresSession::compare(const QString& name, const Pass& pass) {
+    const Table* table = find(name);
+    bool isSame = table && table->types.size() == pass.columnCount();
+    for (int column = 0; isSame && column < pass.columnCount(); ++column)
+        isSame = table->types.contains(pass.column(column).name);
+    if (!isSame) tables_.remove(name.toLower());
+}
+
+void PostgresSession::notice(const core::Failure& failure) {
+    if (failure.code() == MissingTable || failure.code() == MissingColumn) tables_.clear();
+}
+
 // --- Rows
 
 PostgresCall PostgresSession::selectRow(const QString& table, RowIdentity row) {
     const Table* known = find(table);
     return {known ? known->select : QByteArray(), {QByteArray::number(row)}};
+}
+
+template <class Work>
+PostgresResult PostgresSession::noticing(const Work& work) {
+    try {
+        return work();
+    } catch (const core::Failure& failure) {
+        notice(failure);
+        throw;
+    }
 }
 
 bool PostgresSession::append(const PGresult* found, RowIdentity row, RowStore& into) {
@@ -158,7 +192,8 @@ bool PostgresSession::append(const PGresult* found, RowIdentity row, RowStore& i
 }
 
 bool PostgresSession::read(const QString& table, RowIdentity row, RowStore& into) {
-    const PostgresResult found = writer().run({selectRow(table, row)});
+    const PostgresCall select = selectRow(table, row);
+    const PostgresResult found = noticing([&] { return writer().run({select}); });
     return append(found.get(), row, into);
 }
 
@@ -180,7 +215,10 @@ RowIdentity PostgresSession::insert(const QString& table, const QStringList& col
         text += ") VALUES(" + marks + ')';
     }
     text += " RETURNING " + quoted(identity(table));
-    const PostgresResult written = writer().run(text, parametersOf(values));
+    PostgresHandle& handle = writerOf(table, NoRow);
+    const PostgresResult written = noticing([&] {
+        return handle.runThenCommit({text, parametersOf(values)});
+    });
     return cellOf(written.get(), 0, 0).integer;
 }
 
@@ -192,17 +230,19 @@ bool PostgresSession::update(const QString& table, RowIdentity row, const QStrin
         changes += (changes.isEmpty() ? "" : ",") + quoted(column) + '=' + parameter(++number);
     PostgresValues parameters = parametersOf(values);
     parameters.push_back(QByteArray::number(row));
-    const PostgresResult written =
-        writer().run("UPDATE " + quoted(table) + " SET " + changes + " WHERE " +
-                         quoted(identity(table)) + '=' + parameter(++number),
-                     parameters);
+    const QByteArray text = "UPDATE " + quoted(table) + " SET " + changes + " WHERE " +
+                            quoted(identity(table)) + '=' + parameter(++number);
+    PostgresHandle& handle = writerOf(table, row);
+    const PostgresResult written = noticing([&] { return handle.run(text, parameters); });
     return std::atoi(PQcmdTuples(written.get())) > 0;
 }
 
 bool PostgresSession::remove(const QString& table, RowIdentity row) {
+    const QByteArray text =
+        "DELETE FROM " + quoted(table) + " WHERE " + quoted(identity(table)) + "=$1";
+    PostgresHandle& handle = writerOf(table, row);
     const PostgresResult written =
-        writer().run("DELETE FROM " + quoted(table) + " WHERE " + quoted(identity(table)) + "=$1",
-                     {QByteArray::number(row)});
+        noticing([&] { return handle.run(text, {QByteArray::number(row)}); });
     return std::atoi(PQcmdTuples(written.get())) > 0;
 }
 

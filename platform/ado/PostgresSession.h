@@ -7,6 +7,10 @@
 #include "platform/ado/PostgresTexts.h"
 #include "platform/ado/Session.h"
 
+namespace core {
+class Failure;
+}
+
 namespace ado {
 
 /// A book on a PostgreSQL server. Passes read on connections of their own, taken from a small pool;
@@ -49,8 +53,9 @@ public:
     /// The first rows of a statement, `limit` being what says how many.
     PostgresResult firstRows(PostgresHandle& reader, const Statement& statement, bool withIdentity,
                              const QByteArray& limit);
-    /// For the locks: lets go of a row; never fails.
+    // For the locks. Letting go of a row never fails.
     void unlock(const QByteArray& key) noexcept;
+    bool isHeld(const QByteArray& key) const;
 
 private:
     /// What the server's catalogue says about a table or view.
@@ -62,11 +67,19 @@ private:
     /// Null when there is none of that name.
     const Table* find(QStringView name);
     PostgresHandle& writer();
+    /// To write the row with; fails with RowInUse when its lock went with a connection.
+    PostgresHandle& writerOf(const QString& table, RowIdentity row);
+    /// Forgets what was read of the catalogue when the pass over a table shows another one.
+    void compare(const QString& table, const Pass& pass);
+    /// Forgets it when a failure tells of a missing table or column.
+    void notice(const core::Failure& failure);
+    /// Does something with the server that the catalogue has to do with.
+    template <class Work>
+    PostgresResult noticing(const Work& work);
     PostgresCall selectRow(const QString& table, RowIdentity row);
     /// Appends the one row that was found, if any; false when there is none.
     static bool append(const PGresult* found, RowIdentity row, RowStore& into);
     QString holderOf(const QByteArray& key);
-    void lockAgain();
 
     PostgresAddress address_;
     QString book_;
@@ -76,6 +89,7 @@ private:
     std::vector<std::shared_ptr<PostgresHandle>> readers_;  ///< idle ones
     std::unique_ptr<PostgresHandle> writer_;                ///< made by its first use
     QSet<QByteArray> locked_;                               ///< keys of the rows held
+    QSet<QByteArray> broken_;  ///< of those that went with a connection
 };
 
 }  // namespace ado

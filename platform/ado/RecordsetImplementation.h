@@ -68,11 +68,13 @@ struct Recordset::Implementation {
     RowStore fresh;   ///< the current row, read afresh from the table
     bool wantsFresh = false;
     std::unique_ptr<RowLock> held;
+    bool wasHeld = false;  ///< `fresh` was read under a lock, which may be gone by now
     std::unique_ptr<RowLock> heldPlace;  ///< of the first row of a table that has none
     bool settled =
         false;  ///< the current row was stored; until it is changed again nobody holds it
     bool deleted = false;                        ///< the current row was deleted here
-    std::unordered_map<qint64, Changes> stored;  ///< by row: what this set stored there
+    std::unordered_map<qint64, Changes> stored;  ///< by row in memory: what this set stored there
+    std::vector<bool> storedFar;                 ///< rows of a long set that this set stored
     std::vector<qint64> gone;                    ///< rows that this set deleted, ascending
 
     struct Name {
@@ -96,6 +98,15 @@ struct Recordset::Implementation {
     void toRow(qint64 row);
     /// Settles on a row of the statement, or passes it when it is gone.
     void arrive(bool found);
+    bool isStoredFar(qint64 row) const {
+        const auto place = static_cast<std::size_t>(row);
+        return place < storedFar.size() && storedFar[place];
+    }
+    /// True for a row of the statement that may be another by now.
+    bool isOutdated(qint64 row) const {
+        return (cursor == adOpenDynamic && !table.isEmpty()) || isStoredFar(row);
+    }
+    void noteStored();
     bool isGone(qint64 row) const { return std::binary_search(gone.begin(), gone.end(), row); }
     qint64 recordCount() const;
     qint64 rowsInMemory() const;
@@ -113,6 +124,10 @@ struct Recordset::Implementation {
         if (!table.isEmpty()) lookAtRow();
     }
     void lookAtRow();
+    bool isHeld() const { return held && held->isUnbroken(); }
+    /// Takes a lock again that went with its connection; fails with RowInUse when the row is not
+    /// any more as it was read.
+    void holdStill();
     ColumnType typeOf(int column);
     bool readFresh();
 

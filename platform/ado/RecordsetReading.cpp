@@ -99,6 +99,7 @@ void Recordset::Implementation::close() {
     book.clear();
     added.clear();
     stored.clear();
+    storedFar.clear();
     gone.clear();
     types.clear();
     for (Name& name : names) name = {};
@@ -111,10 +112,8 @@ void Recordset::Implementation::leaveRow() {
     if (at == At::New) at = before;
     changes.clear();
     fresh.clear();
-    wantsFresh = settled = deleted = false;
+    wantsFresh = settled = deleted = wasHeld = false;
     held.reset();
-    // Of a long set only the current row is remembered.
-    if (!stored.empty() && rows && !rows->inMemory()) stored.clear();
 }
 
 void Recordset::Implementation::toFirst() {
@@ -136,6 +135,7 @@ void Recordset::Implementation::arrive(bool found) {
     for (; found; found = rows->toNext()) {
         if (isGone(rows->row())) continue;
         at = At::Row;
+        wantsFresh = isOutdated(rows->row());
         if (cursor != adOpenDynamic || table.isEmpty() || readFresh()) return;
     }
     addedAt = 0;
@@ -156,7 +156,7 @@ void Recordset::Implementation::toLast() {
     while (found && isGone(row)) found = --row >= 0;
     if (found) rows->toRow(row);
     at = found ? At::Row : At::Nothing;
-    wantsFresh = found && cursor == adOpenDynamic && !table.isEmpty();
+    wantsFresh = found && isOutdated(row);
 }
 
 void Recordset::Implementation::toRow(qint64 place) {
@@ -169,7 +169,7 @@ void Recordset::Implementation::toRow(qint64 place) {
         rows->toRow(row);
     else
         addedAt = row - rows->count();
-    wantsFresh = at == At::Added || (cursor == adOpenDynamic && !table.isEmpty());
+    wantsFresh = at == At::Added || isOutdated(row);
 }
 
 qint64 Recordset::Implementation::recordCount() const {
@@ -229,9 +229,11 @@ ColumnType Recordset::Implementation::typeOf(int column) {
 QVariant Recordset::Implementation::valueAt(qint64 place, int column) {
     const qint64 row = shown(place);
     const ColumnType type = rows->columns().column(column).type;
-    if (row >= rows->count()) {
+    if (row >= rows->count() || isStoredFar(row)) {
         RowStore store;
-        const RowIdentity which = added[static_cast<std::size_t>(row - rows->count())];
+        const RowIdentity which = row < rows->count()
+                                      ? rows->identityAt(row)
+                                      : added[static_cast<std::size_t>(row - rows->count())];
         if (!session()->read(table, which, store)) return {};
         return toVariant(store.cell(0, column), type);
     }
@@ -245,12 +247,26 @@ RowIdentity Recordset::Implementation::identity() {
 }
 
 void Recordset::Implementation::lookAtRow() {
-    if (lockType == adLockPessimistic && !held && !settled) {
+    if (lockType == adLockPessimistic && !wasHeld && !settled) {
         fresh.clear();
         held = session()->lock(table, identity(), connection->CommandTimeout, fresh);
+        wasHeld = true;
         wantsFresh = false;
     }
     if (wantsFresh) readFresh();
+}
+
+void Recordset::Implementation::holdStill() {
+    if (!wasHeld || isHeld()) return;
+    held.reset();
+    RowStore now;
+    std::unique_ptr<RowLock> again =
+        session()->lock(table, identity(), connection->CommandTimeout, now);
+    if (now != fresh)
+        throw core::Failure(core::RowInUse,
+                            u"A ligação a «%1» perdeu-se e a linha foi entretanto alterada por "
+                            u"outro posto; nada foi gravado. Leia-a de novo."_s.arg(book));
+    held = std::move(again);
 }
 
 bool Recordset::Implementation::readFresh() {

@@ -24,7 +24,9 @@ bool Recordset::Implementation::setValue(int column, const QVariant& value) {
     if (at != At::New) {
         settled = false;
         look();
-        if (!changes.find(column) && this->value(column) == kept) return false;
+        holdStill();
+        // Only a row that is held still is what it was read as.
+        if (wasHeld && !changes.find(column) && this->value(column) == kept) return false;
     }
     changes.set(column, kept);
     return true;
@@ -47,11 +49,17 @@ void Recordset::Implementation::update() {
         throw explained(failure, (at == At::New ? u"INSERT INTO "_s : u"UPDATE "_s) + table);
     }
     held.reset();
+    wasHeld = false;
     settled = true;
 }
 
 void Recordset::Implementation::insertNew() {
     requireTable();
+    if (heldPlace && !heldPlace->isUnbroken())
+        throw core::Failure(
+            core::RowInUse,
+            u"A ligação a «%1» perdeu-se e outro posto pode ter entretanto criado a "
+            u"linha; nada foi gravado. Tente de novo."_s.arg(book));
     QStringList columns;
     std::vector<QVariant> values;
     for (const auto& [column, value] : changes.values()) {
@@ -69,6 +77,7 @@ void Recordset::Implementation::insertNew() {
 
 void Recordset::Implementation::updateCurrent() {
     requireTable();
+    holdStill();
     QStringList columns;
     std::vector<QVariant> values;
     for (const auto& [column, value] : changes.values()) {
@@ -78,16 +87,33 @@ void Recordset::Implementation::updateCurrent() {
     if (!session()->update(table, identity(), columns, values))
         throw core::Failure(core::DatabaseFailure,
                             u"A linha foi entretanto apagada por outro posto; não foi gravada."_s);
-    if (at == At::Row)
-        for (const auto& [column, value] : changes.values()) stored[rows->row()].set(column, value);
     wantsFresh = at == At::Added || fresh.count() > 0;
+    if (at == At::Row) noteStored();
     fresh.clear();
     changes.clear();
+}
+
+// Few rows keep what was stored there. A mark for each of many is all that a long pass may cost;
+// such a row is read afresh.
+void Recordset::Implementation::noteStored() {
+    const qint64 row = rows->row();
+    if (rows->inMemory()) {
+        for (const auto& [column, value] : changes.values()) stored[row].set(column, value);
+        return;
+    }
+    const auto place = static_cast<std::size_t>(row);
+    if (place >= storedFar.size()) storedFar.resize(place + 1);
+    storedFar[place] = true;
+    wantsFresh = true;
 }
 
 void Recordset::Implementation::cancel() {
     requireOpen();
     changes.clear();
+    if (wasHeld && !isHeld()) {  // the row is read anew when it is looked at
+        held.reset();
+        wasHeld = false;
+    }
     if (at != At::New) return;
     at = before;
     wantsFresh = at == At::Added;
@@ -98,6 +124,7 @@ void Recordset::Implementation::remove() {
     requireTable();
     if (at == At::New) return cancel();
     look();
+    holdStill();
     if (!session()->remove(table, identity()))
         throw core::Failure(core::DatabaseFailure,
                             u"A linha já tinha sido apagada por outro posto."_s);
@@ -109,6 +136,7 @@ void Recordset::Implementation::remove() {
     }
     changes.clear();
     held.reset();
+    wasHeld = false;
     deleted = true;
 }
 

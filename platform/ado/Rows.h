@@ -37,6 +37,7 @@ public:
     /// Takes in all rows; the place stays.
     void takeAll();
     void toRow(qint64 row) { row_ = row; }
+    RowIdentity identityAt(qint64 row) const { return store_->identity(row); }
     Cell cellAt(qint64 row, int column) const { return store_->cell(row, column); }
 
 private:

@@ -58,6 +58,8 @@ public:
 class RowLock {
 public:
     virtual ~RowLock() = default;
+    /// False once the connection that held the row is lost: somebody else may have it by now.
+    virtual bool isUnbroken() const { return true; }
 };
 
 class Session {
@@ -75,7 +77,8 @@ public:
     /// when it is gone.
     virtual bool read(const QString& table, RowIdentity row, RowStore& into) = 0;
 
-    // One statement, one commit each. `columns` names what is written, `values` runs beside it.
+    // One statement, one commit each. `columns` names what is written, `values` runs beside it. A
+    // row whose lock was lost with its connection is not written: RowInUse.
     virtual RowIdentity insert(const QString& table, const QStringList& columns,
                                const std::vector<QVariant>& values) = 0;
     /// False when the row is gone.

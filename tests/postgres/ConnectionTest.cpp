@@ -5,6 +5,7 @@
 
 #include <QElapsedTimer>
 #include <csignal>
+#include <thread>
 
 #include "tests/ado/SmallBook.h"
 #include "tests/support/Server.h"
@@ -69,6 +70,7 @@ TEST_F(Connections, SayWhatWasTriedAndNeverThePassword) {
         {at(u"postgresql:"_s + host + u":5999"_s), u".s.PGSQL.5999"_s},
         {at(u"postgresql:"_s + host + u":99999"_s), u"a porta «99999» não existe"_s},
         {at(u"postgresql:localhost:1"_s), u"Connection refused"_s},
+        {at(u"postgresql:[::1]:1"_s), u"«postgresql:[::1]:1/"_s},
         {at(u"postgresql:"_s), u"«postgresql:SERVIDOR[:PORTA]»"_s},
     };
     for (const auto& row : cases) {
@@ -79,6 +81,29 @@ TEST_F(Connections, SayWhatWasTriedAndNeverThePassword) {
     }
     EXPECT_TRUE(failureOfOpening(elsewhere).text().contains(
         u"«postgresql:%1/nada» como «%2»"_s.arg(host, book.user())));
+}
+
+TEST_F(Connections, AskForTheSettingsThatTheyRelyOn) {
+    for (const auto& setting :
+         {u"extra_float_digits = 0"_s, u"default_transaction_isolation = 'repeatable read'"_s})
+        book.exec(u"ALTER DATABASE \"%1\" SET %2"_s.arg(book.catalogue(), setting));
+    book.exec(u"INSERT INTO tbMov(simples) VALUES (12345.67); INSERT INTO tbConta VALUES (1)"_s);
+    const auto own = connect();
+    EXPECT_EQ(open(u"select * from tbMov"_s, own)->Collect(u"simples"_s), QVariant(12345.67F));
+    // Whoever waited for a row reads what was stored meanwhile.
+    const auto held = open(u"select * from tbConta"_s, own, ado::adLockPessimistic);
+    EXPECT_EQ(held->value(0), 1);
+    std::thread waiting([&] {
+        const auto rows = open(u"select * from tbConta"_s, connect(30), ado::adLockPessimistic);
+        EXPECT_EQ(rows->value(0), 2);
+    });
+    const auto isWaited = [&] {
+        return book.text(u"SELECT count(*) FROM pg_locks WHERE NOT granted"_s) != u"0"_s;
+    };
+    while (!isWaited()) std::this_thread::yield();
+    held->setValue(0, 2);
+    held->Update();
+    waiting.join();
 }
 
 TEST_F(Connections, GiveUpOnAServerThatNeverAnswers) {
@@ -135,19 +160,92 @@ TEST_F(Connections, StopAStatementThatTakesTooLong) {
     EXPECT_EQ(open(u"select 1 as um"_s, own)->value(0), QVariant(1));
 }
 
-// A lock goes with its connection. The next operation takes it again or writes nothing.
+// A lock goes with its connection. What was worked out from the row is written only when the row is
+// still what it was.
 TEST_F(Connections, ThatAreMadeAnewTakeTheirLocksAgain) {
-    book.exec(u"INSERT INTO tbConta VALUES(1)"_s);
-    const auto rows = open(u"select * from tbConta"_s, connect(1));
+    book.exec(u"INSERT INTO tbConta VALUES(1); INSERT INTO tbHosp(code) VALUES('a')"_s);
+    const auto own = connect(1);
+    const auto rows = open(u"select * from tbConta"_s, own);
+    const auto counter = [&] { return book.text(u"SELECT proximo FROM tbConta"_s); };
     rows->setCollect(u"proximo"_s, 2);
     cut();
     rows->Update();
     rows->setCollect(u"proximo"_s, 3);
     cut();
     book.exec(u"SELECT pg_advisory_lock(hashtextextended('tbconta:1', 0))"_s);
+    // Somebody else has the row; all others are free.
+    EXPECT_EQ(open(u"select * from tbHosp"_s, own)->Collect(u"code"_s), u"a"_s);
     EXPECT_EQ(failureOf([&] { rows->Update(); }).number(), core::RowInUse);
-    EXPECT_EQ(book.text(u"SELECT proximo FROM tbConta"_s), u"2"_s);
+    EXPECT_EQ(counter(), u"2"_s);
     book.exec(u"SELECT pg_advisory_unlock_all()"_s);
     rows->Update();
-    EXPECT_EQ(book.text(u"SELECT proximo FROM tbConta"_s), u"3"_s);
+    EXPECT_EQ(counter(), u"3"_s);
+
+    rows->setCollect(u"proximo"_s, 4);
+    for (const bool logsIn : {false, true}) {
+        cut();
+        if (logsIn) {
+            own->Close();
+            own->Open();
+        }
+        book.exec(u"UPDATE tbConta SET proximo = proximo + 5"_s);
+        const core::Failure failure = failureOf([&] { rows->Update(); });
+        EXPECT_EQ(failure.number(), core::RowInUse);
+        EXPECT_TRUE(failure.text().contains(u"entretanto alterada"_s)) << failure.what();
+        EXPECT_EQ(failureOf([&] { rows->Delete(); }).number(), core::RowInUse);
+    }
+    EXPECT_EQ(counter(), u"13"_s);
+    rows->CancelUpdate();
+    EXPECT_EQ(rows->Collect(u"proximo"_s), QVariant(13));
+    cut();
+    book.exec(u"UPDATE tbConta SET proximo = 20"_s);
+    EXPECT_EQ(failureOf([&] { rows->setCollect(u"proximo"_s, 14); }).number(), core::RowInUse);
+}
+
+TEST_F(Connections, ThatAreCutDoNotLetTwoAddTheFirstRow) {
+    const auto rows =
+        open(u"select * from tbConta"_s, connection, ado::adLockPessimistic, ado::adOpenDynamic);
+    rows->AddNew();
+    cut();
+    EXPECT_EQ(failureOf([&] { rows->Update(); }).number(), core::RowInUse);
+    EXPECT_EQ(book.count(u"tbConta"_s), 0);
+}
+
+TEST_F(Connections, ThatSleptStoreNothingLate) {
+    const auto rows = open(u"select * from tbMov where id = 0"_s, connect(1));
+    const auto add = [&] {
+        rows->AddNew();
+        rows->setCollect(u"nome"_s, u"a"_s);
+        rows->Update();
+    };
+    add();
+    signalBackends(SIGSTOP);
+    EXPECT_TRUE(failureOf(add).text().contains(u"não respondeu"_s));
+    wake();
+    const QString late = u"pid IN (%1) AND query LIKE 'INSERT%'"_s.arg(stopped.join(u','));
+    while (book.count(u"pg_stat_activity"_s, late) > 0) {
+    }
+    rows->Update();
+    EXPECT_EQ(book.count(u"tbMov"_s), 2);
+}
+
+TEST_F(Connections, SayWhatTheCommitCameTo) {
+    book.exec(
+        u"CREATE FUNCTION fim() RETURNS trigger LANGUAGE plpgsql SECURITY DEFINER AS $$ BEGIN"
+        "  IF NEW.nome = 'cai' THEN PERFORM pg_terminate_backend(pg_backend_pid()), pg_sleep(1); "
+        "END IF;"
+        "  IF NEW.nome = 'recusa' THEN RAISE 'recusado'; END IF; RETURN NULL; END $$;"
+        "CREATE CONSTRAINT TRIGGER fim AFTER INSERT ON tbMov DEFERRABLE INITIALLY DEFERRED"
+        "  FOR EACH ROW EXECUTE FUNCTION fim()"_s);
+    const auto rows = open(u"select * from tbMov where id = 0"_s, connection);
+    rows->AddNew();
+    const auto textOfAdding = [&](const QString& name) {
+        rows->setCollect(u"nome"_s, name);
+        return failureOf([&] { rows->Update(); }).text();
+    };
+    const QString cut = textOfAdding(u"cai"_s);
+    EXPECT_TRUE(cut.contains(u"procure-a antes de repetir"_s)) << qPrintable(cut);
+    EXPECT_EQ(textOfAdding(u"recusa"_s), u"recusado"_s);
+    EXPECT_EQ(textOfAdding(u"passa"_s), QString());
+    EXPECT_EQ(book.count(u"tbMov"_s), 1);
 }
