@@ -142,7 +142,7 @@ def corrections(desktop, book, counter):
     without = posted(desktop, book, counter + 1)
     expect("corrections", [(row["tipo"], row["codabc"], row["rubrica_id"], row["debito"],
                             row["credito"]) for row in (with_rubric, without)],
-           [("REP", "A", rubric, 12.5, 0), ("REP", None, None, 0, 7.75)])
+           [("REP", "A", rubric, 12.5, 0), ("REP", None, 0, 0, 7.75)])
     expect("totals", book.rows(
         "SELECT codABC, rubrica_id, debito_ac, credito_ac FROM tbSocios_Acumulados "
         "WHERE socio_id = ? AND rubrica_id IS NOT NULL ORDER BY rubrica_id DESC",

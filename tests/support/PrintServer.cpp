@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "tests/support/PrintServer.h"
 
+#include <sys/socket.h>
+#include <sys/un.h>
+#include <unistd.h>
+
 #include <QDir>
 #include <QFile>
 #include <QTest>
@@ -30,6 +34,18 @@ to=${DEVICE_URI#keep:}/$1
 cat "$6" >"$to.pdf" && printf %s "$3" >"$to.new" && mv "$to.new" "$to.title"
 )"_s;
 
+/// Its file stands a moment before anybody listens there.
+bool isListening(const QString& socket) {
+    sockaddr_un address{};
+    address.sun_family = AF_UNIX;
+    qstrncpy(address.sun_path, QFile::encodeName(socket).constData(), sizeof address.sun_path);
+    const int asking = ::socket(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0);
+    const bool answers =
+        connect(asking, reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0;
+    close(asking);
+    return answers;
+}
+
 }  // namespace
 
 PrintServer::PrintServer(Printer printer) {
@@ -48,7 +64,7 @@ PrintServer::PrintServer(Printer printer) {
     server_.start(u"/usr/sbin/cupsd"_s,
                   {u"-f"_s, u"-c"_s, path(u"cupsd.conf"_s), u"-s"_s, path(u"cups-files.conf"_s)});
     const bool up = server_.waitForStarted() &&
-                    QTest::qWaitFor([this] { return QFile::exists(path(u"socket"_s)); }, 10000);
+                    QTest::qWaitFor([this] { return isListening(path(u"socket"_s)); }, 10000);
     if (!up)
         throw std::runtime_error("no print server: set-up/packages run test installs it\n" +
                                  server_.readAllStandardError().toStdString());
