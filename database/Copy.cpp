@@ -12,6 +12,7 @@
 #include "database/SqliteBookReader.h"
 #include "database/SqliteBookWriter.h"
 #include "platform/ado/PostgresHandle.h"
+#include "platform/ado/SqliteFile.h"
 #include "platform/core/Failure.h"
 
 namespace database {
@@ -157,6 +158,7 @@ void withSource(const BookPlace& place, const std::function<void(BookReader&)>& 
     }
     const QString file = bookFile(place.folder, place.name);
     if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
+    ado::SqliteFile(file).refuseForeignJournal();
     sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
     book.run("BEGIN");
     SqliteBookReader reader(book);

@@ -2,17 +2,16 @@
 #include "platform/ado/SqliteLocks.h"
 
 #include <fcntl.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
 #include <QElapsedTimer>
-#include <QFile>
 #include <QThread>
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
 
 #include "platform/ado/RowHolders.h"
+#include "platform/ado/SqliteSideFile.h"
 #include "platform/core/Failure.h"
 
 namespace ado {
@@ -21,7 +20,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-// The file's first part has a record for each of these many slots; rows are locked far behind it.
+// The first part of the side file has a record for each of these many slots; rows are locked far
+// behind it.
 constexpr quint64 Slots = 4096;
 constexpr std::size_t OwnerLength = 120;  // bytes, zero-filled
 constexpr quint64 FirstRow = quint64{1} << 40;
@@ -51,22 +51,8 @@ off_t slotOf(quint64 offset) {
 
 class OfdLock final : public RowLock {
 public:
-    OfdLock(const QString& path, quint64 offset)
-        : path_(path), offset_(offset), here_(path, QString::number(offset)) {
-        const QByteArray name = QFile::encodeName(path);
-        // Not inherited by a program that this one starts: it would keep the row.
-        file_ = ::open(name.constData(), O_RDWR | O_CLOEXEC);
-        if (file_ < 0 && errno == ENOENT) file_ = makeLike(name);
-        if (file_ < 0)
-            throw core::Failure(core::DatabaseFailure,
-                                u"Não foi possível abrir o ficheiro de bloqueios «%1»: %2"_s.arg(
-                                    path, qt_error_string(errno)));
-    }
-    ~OfdLock() override {
-        if (file_ >= 0) ::close(file_);
-    }
-    OfdLock(const OfdLock&) = delete;
-    OfdLock& operator=(const OfdLock&) = delete;
+    OfdLock(const QString& book, quint64 offset)
+        : file_(book), offset_(offset), here_(book, QString::number(offset)) {}
 
     bool heldByThisThread() const { return here_.isTaken(); }
 
@@ -76,7 +62,7 @@ public:
         range.l_whence = SEEK_SET;
         range.l_start = static_cast<off_t>(offset_);
         range.l_len = 1;
-        if (::fcntl(file_, F_OFD_SETLK, &range) != 0) {
+        if (::fcntl(file_.descriptor(), F_OFD_SETLK, &range) != 0) {
             if (errno == EAGAIN || errno == EACCES || errno == EINTR) return false;
             throw core::Failure(
                 core::DatabaseFailure,
@@ -90,7 +76,7 @@ public:
             qMin<std::size_t>(OwnerLength - 1, static_cast<std::size_t>(workstation().size())));
         // Only for the text of a refusal: without it the lock holds all the same.
         [[maybe_unused]] const ssize_t written =
-            ::pwrite(file_, &record, sizeof record, slotOf(offset_));
+            ::pwrite(file_.descriptor(), &record, sizeof record, slotOf(offset_));
         return true;
     }
 
@@ -98,34 +84,23 @@ public:
     QString holder() const {
         Record record;
         const bool known =
-            ::pread(file_, &record, sizeof record, slotOf(offset_)) == sizeof record &&
+            ::pread(file_.descriptor(), &record, sizeof record, slotOf(offset_)) == sizeof record &&
             record.offset == offset_;
         record.owner[OwnerLength - 1] = '\0';
         return known ? QString::fromUtf8(record.owner) : OtherWorkstation;
     }
 
 private:
-    /// Makes the file with the book's own mode, so that whoever may write the book may lock.
-    static int makeLike(const QByteArray& name) {
-        struct stat book {};
-        ::stat(name.chopped(static_cast<qsizetype>(std::strlen("-locks"))).constData(), &book);
-        const mode_t mode = book.st_mode & 0666;
-        const int file = ::open(name.constData(), O_RDWR | O_CREAT | O_CLOEXEC, mode);
-        if (file >= 0) ::fchmod(file, mode);
-        return file;
-    }
-
-    QString path_;
+    SqliteSideFile file_;
     quint64 offset_;
     HeldHere here_;
-    int file_ = -1;
 };
 
 }  // namespace
 
 std::unique_ptr<RowLock> SqliteLocks::lock(const QString& table, RowIdentity row,
                                            int timeoutSeconds) const {
-    auto lock = std::make_unique<OfdLock>(path_, offsetOf(table, row));
+    auto lock = std::make_unique<OfdLock>(book_, offsetOf(table, row));
     if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
     QElapsedTimer waited;
     waited.start();

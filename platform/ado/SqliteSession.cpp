@@ -39,19 +39,23 @@ QByteArray insertText(const QString& table, const QStringList& columns) {
 }  // namespace
 
 SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds)
-    : path_(QDir(folder).absoluteFilePath(catalog + u".db"_s)),
+    : file_(QDir(folder).absoluteFilePath(catalog + u".db"_s)),
       timeout_(timeoutSeconds),
-      locks_(path_) {
+      locks_(file_.path()) {
+    file_.refuseForeignJournal();
     try {
-        SqliteHandle& handle = reader();
+        readers_.push_back(
+            std::make_shared<SqliteHandle>(book(), SqliteHandle::Role::Reader, timeout_));
+        SqliteHandle& handle = *readers_.back();
         // The first read tells a book from a file that is none.
         handle.run(handle.cached("SELECT count(*) FROM sqlite_schema"));
         // A book that cannot be written is still readable as it is.
         sqlite3_exec(handle.get(), "PRAGMA journal_mode=WAL", nullptr, nullptr, nullptr);
+        file_.remember(handle.get());
     } catch (const core::Failure& failure) {
         throw core::Failure(failure.number(),
                             u"Não foi possível abrir o livro «%1»: %2"_s.arg(
-                                QDir::toNativeSeparators(path_), failure.text()),
+                                QDir::toNativeSeparators(book()), failure.text()),
                             failure.code());
     }
 }
@@ -67,17 +71,21 @@ void SqliteSession::giveBack(std::shared_ptr<SqliteHandle> reader) {
     if (readers_.size() < IdleReaders) readers_.push_back(std::move(reader));
 }
 
+/// A further handle on the file that the first one opened.
+std::unique_ptr<SqliteHandle> SqliteSession::opened(SqliteHandle::Role role) const {
+    auto handle = std::make_unique<SqliteHandle>(book(), role, timeout_);
+    file_.refuseChanged(handle->get());
+    return handle;
+}
+
 SqliteHandle& SqliteSession::reader() {
-    if (readers_.empty())
-        readers_.push_back(
-            std::make_shared<SqliteHandle>(path_, SqliteHandle::Role::Reader, timeout_));
+    if (readers_.empty()) readers_.push_back(opened(SqliteHandle::Role::Reader));
     readers_.back()->setTimeout(timeout_);
     return *readers_.back();
 }
 
 SqliteHandle& SqliteSession::writer() {
-    if (!writer_)
-        writer_ = std::make_unique<SqliteHandle>(path_, SqliteHandle::Role::Writer, timeout_);
+    if (!writer_) writer_ = opened(SqliteHandle::Role::Writer);
     writer_->setTimeout(timeout_);
     return *writer_;
 }
@@ -87,6 +95,7 @@ void SqliteSession::setTimeout(int seconds) {
 }
 
 std::shared_ptr<Pass> SqliteSession::open(const Statement& statement, const QString& table) {
+    file_.refuseChanged();
     const bool withIdentity = !table.isEmpty();
     return std::make_shared<SqlitePass>(shared_from_this(), statement, withIdentity);
 }
@@ -150,6 +159,7 @@ std::optional<ColumnType> SqliteSession::viewColumnType(QStringView view, QStrin
 }
 
 bool SqliteSession::read(const QString& table, RowIdentity row, RowStore& into) {
+    file_.refuseChanged();
     SqliteHandle& handle = reader();
     sqlite3_stmt* statement = handle.cached("SELECT * FROM " + quoted(table) + " WHERE _rowid_=?1");
     sqlite3_bind_int64(statement, 1, row);
@@ -190,6 +200,7 @@ bool SqliteSession::remove(const QString& table, RowIdentity row) {
 }
 
 int SqliteSession::write(const QByteArray& text, const std::vector<QVariant>& values) {
+    file_.refuseChanged();
     SqliteHandle& handle = writer();
     sqlite3_stmt* statement = handle.cached(text);
     int parameter = 0;

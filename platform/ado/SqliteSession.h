@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "platform/ado/SqliteFile.h"
 #include "platform/ado/SqliteHandle.h"
 #include "platform/ado/SqliteLocks.h"
 #include "platform/ado/StatementTranslator.h"
@@ -28,7 +29,7 @@ public:
     std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                   RowStore& into) override;
     void setTimeout(int seconds) override;
-    const QString& book() const override { return path_; }
+    const QString& book() const override { return file_.path(); }
 
     std::optional<ColumnType> columnType(QStringView table, QStringView column) override;
 
@@ -42,12 +43,13 @@ public:
 private:
     SqliteHandle& reader();
     SqliteHandle& writer();
+    std::unique_ptr<SqliteHandle> opened(SqliteHandle::Role role) const;
     /// Runs a write with its values; gives the number of rows that it touched.
     int write(const QByteArray& text, const std::vector<QVariant>& values);
     /// Declared type of a view's column.
     std::optional<ColumnType> viewColumnType(QStringView view, QStringView column);
 
-    QString path_;
+    SqliteFile file_;
     int timeout_;
     std::vector<std::shared_ptr<SqliteHandle>> readers_;  ///< idle ones
     std::unique_ptr<SqliteHandle> writer_;                ///< opened by the first write
