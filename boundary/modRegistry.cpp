@@ -9,9 +9,6 @@ namespace boundary {
 
 namespace {
 
-/// Characters of the buffer that takes a value, the closing zero included.
-constexpr qsizetype BufferLength = 255;
-
 /// The hive of the last path that could be split; a path that cannot goes on with it.
 thread_local registry::Hive currentHive = registry::Hive::None;
 
@@ -31,7 +28,7 @@ QVariant GetRegistryValue(QString& strKeyPath, const QString& strValueName) {
     const auto key = registry::Key::open(currentHive, strKeyPath);
     if (!key) return {};
     const std::optional<QString> stored = key->value(strValueName);
-    if (!stored || stored->size() + 1 > BufferLength) return {};
+    if (!stored || stored->size() > registry::LongestValue) return {};
     return trimmedUpToTheZero(*stored);
 }
 

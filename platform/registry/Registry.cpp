@@ -1,15 +1,15 @@
 // SPDX-License-Identifier: MIT
 #include "platform/registry/Registry.h"
 
-#include <QDir>
 #include <QFileInfo>
-#include <QSettings>
+#include <QLockFile>
 #include <QStandardPaths>
-#include <QStringList>
 #include <algorithm>
 #include <array>
 
 #include "platform/core/Failure.h"
+#include "platform/core/PrivateFiles.h"
+#include "platform/registry/SettingsFile.h"
 
 using namespace Qt::StringLiterals;
 
@@ -46,53 +46,41 @@ QString entryName(QString path, const QString& name) {
     return name.isEmpty() ? path : path + u'/' + name;
 }
 
-/// True for the entry itself and for all that lies under it; for an empty name for everything.
-bool liesUnder(const QString& entry, const QString& name) {
-    return name.isEmpty() || entry.compare(name, Qt::CaseInsensitive) == 0 ||
-           entry.startsWith(name + u'/', Qt::CaseInsensitive);
-}
-
-/// The entry of that name as the file spells it: names are found without regard to case.
-QString spelling(const QSettings& file, const QString& name) {
-    for (const QString& entry : file.allKeys())
-        if (entry.compare(name, Qt::CaseInsensitive) == 0) return entry;
-    return {};
-}
-
-/// A text with commas that somebody typed into the file without quotes arrives as a list.
-QString text(const QVariant& stored) {
-    return stored.typeId() == QMetaType::QStringList ? stored.toStringList().join(u',')
-                                                     : stored.toString();
-}
-
 [[noreturn]] void refuseToWrite(const QString& file, const QString& why) {
     throw core::Failure(core::InvalidCall,
                         u"Não foi possível guardar o valor no ficheiro %1: %2"_s.arg(file, why));
 }
 
-/// Makes the file, readable by its owner only, before anything is written to it.
-void prepareForSecrets(const QString& name) {
-    QFile file(name);
-    constexpr QFile::Permissions ownerOnly = QFile::ReadOwner | QFile::WriteOwner;
-    if (!file.exists()) {
-        QDir().mkpath(QFileInfo(name).path());
-        if (!file.open(QFile::WriteOnly | QFile::NewOnly, ownerOnly))
-            refuseToWrite(name, file.errorString());
-        return;
-    }
-    constexpr QFile::Permissions others = QFile::ReadGroup | QFile::WriteGroup | QFile::ExeGroup |
-                                          QFile::ReadOther | QFile::WriteOther | QFile::ExeOther;
-    if (file.permissions() & others)
-        refuseToWrite(name,
-                      u"outros utilizadores têm acesso a ele, e pode conter uma palavra "
-                      "passe. Corrija-o com o comando: chmod 600 '%1'"_s.arg(name));
-}
+/// How long another program is given to write the same file, in milliseconds.
+constexpr int LockWait = 10'000;
 
-void writeOut(QSettings& file) {
-    file.sync();
-    if (file.status() != QSettings::NoError)
-        refuseToWrite(file.fileName(), u"o ficheiro não pôde ser escrito."_s);
-}
+/// A settings file that is about to be changed. Meanwhile nobody else changes it.
+class ChangedFile {
+public:
+    explicit ChangedFile(const QString& name) : lock_(prepared(name) + u".lock"_s) {
+        if (!lock_.tryLock(LockWait))
+            refuseToWrite(name,
+                          u"a pasta não se deixa escrever, ou outro programa está a "
+                          "escrevê-lo."_s);
+        file.emplace(name);
+    }
+
+    std::optional<SettingsFile> file;
+
+private:
+    /// In a folder that is there, and before a password could land in a file that others read.
+    static const QString& prepared(const QString& name) {
+        if (!core::makePrivateFolder(QFileInfo(name).path()))
+            refuseToWrite(name, u"a pasta não pôde ser criada."_s);
+        if (QFile::exists(name) && !core::isPrivate(name))
+            refuseToWrite(name,
+                          u"outros utilizadores têm acesso a ele, e pode conter uma palavra "
+                          "passe. Corrija-o com o comando: chmod 600 '%1'"_s.arg(name));
+        return name;
+    }
+
+    QLockFile lock_;
+};
 
 }  // namespace
 
@@ -119,7 +107,7 @@ std::optional<Key> Key::open(Hive hive, const QString& path) {
     const QString name = entryName(path, {});
     if (name.isEmpty()) return Key(hive, path);
     for (const QString& folder : readFolders()) {
-        const QStringList entries = QSettings(fileOf(folder, hive), QSettings::IniFormat).allKeys();
+        const QStringList entries = SettingsFile(fileOf(folder, hive)).entries();
         if (std::any_of(entries.begin(), entries.end(),
                         [&](const QString& entry) { return liesUnder(entry, name); }))
             return Key(hive, path);
@@ -130,30 +118,27 @@ std::optional<Key> Key::open(Hive hive, const QString& path) {
 std::optional<QString> Key::value(const QString& name) const {
     const QString wanted = entryName(path_, name);
     for (const QString& folder : readFolders()) {
-        const QSettings file(fileOf(folder, hive_), QSettings::IniFormat);
-        const QString entry = spelling(file, wanted);
-        if (!entry.isEmpty()) return text(file.value(entry));
+        if (const auto text = SettingsFile(fileOf(folder, hive_)).value(wanted)) return text;
     }
     return std::nullopt;
 }
 
+void writeValues(Hive hive, const QString& path, const Values& values) {
+    ChangedFile changed(fileOf(writableFolder(), hive));
+    for (const auto& [name, value] : values) changed.file->set(entryName(path, name), value);
+    changed.file->write();
+}
+
 void writeValue(Hive hive, const QString& path, const QString& name, const QString& value) {
-    const QString fileName = fileOf(writableFolder(), hive);
-    prepareForSecrets(fileName);
-    QSettings file(fileName, QSettings::IniFormat);
-    const QString wanted = entryName(path, name);
-    const QString entry = spelling(file, wanted);
-    file.setValue(entry.isEmpty() ? wanted : entry, value);
-    writeOut(file);
+    writeValues(hive, path, {{name, value}});
 }
 
 void removeKey(Hive hive, const QString& path) {
-    const QString fileName = fileOf(writableFolder(), hive);
-    if (!QFile::exists(fileName)) return;
-    QSettings file(fileName, QSettings::IniFormat);
-    for (const QString& entry : file.allKeys())
-        if (liesUnder(entry, entryName(path, {}))) file.remove(entry);
-    writeOut(file);
+    const QString name = fileOf(writableFolder(), hive);
+    if (!QFile::exists(name)) return;
+    ChangedFile changed(name);
+    changed.file->remove(entryName(path, {}));
+    changed.file->write();
 }
 
 }  // namespace registry

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QList>
 #include <QString>
 #include <optional>
+#include <utility>
 
 /// Hives of named text values, kept in files: `HKEY_LOCAL_MACHINE.ini` and its companions, one INI
 /// file a hive, a key's path as the group. Where they lie:
@@ -10,7 +12,9 @@
 ///   set;
 ///   - otherwise $XDG_CONFIG_HOME/zelmars/registry/ of the user, and below it, for what is missing
 ///     there, /etc/zelmars/registry/ of the machine.
-/// A missing value and an empty one stay apart.
+/// A missing value and an empty one stay apart. A file that cannot be understood, or that holds a
+/// password and is open to others, is refused with a core::Failure that names it. SettingsFile.h
+/// tells how a file is written.
 namespace registry {
 
 /// The handles of the hives; 0 is none.
@@ -46,9 +50,17 @@ private:
     QString path_;
 };
 
-/// Writes a value into the folder that belongs to the user (or to ZELMARS_REGISTRY). The file is
-/// made readable by its owner only. A file that others can read is refused with a Failure whose
-/// text names it and the command that mends it, so that a password never lands in an open file.
+/// Characters of the longest value that a login reads; a longer one counts as missing.
+inline constexpr int LongestValue = 254;
+
+/// Names of values and what they hold.
+using Values = QList<std::pair<QString, QString>>;
+
+/// Writes values into the folder that belongs to the user (or to ZELMARS_REGISTRY): all of them or,
+/// when it fails or the program ends meanwhile, none. The file is readable by its owner only. A
+/// file that others can read is refused with a Failure whose text names it and the command that
+/// mends it, so that a password never lands in an open file.
+void writeValues(Hive hive, const QString& path, const Values& values);
 void writeValue(Hive hive, const QString& path, const QString& name, const QString& value);
 
 /// Removes a key with all that lies under it. Missing is fine.

@@ -5,8 +5,9 @@
 
 #include <QFile>
 #include <QTemporaryDir>
+#include <thread>
 
-#include "platform/core/Failure.h"
+#include "tests/support/Failure.h"
 
 using namespace Qt::StringLiterals;
 using registry::Hive;
@@ -26,15 +27,19 @@ protected:
         QFile out(file());
         ASSERT_TRUE(out.open(QFile::WriteOnly));
         out.write(text);
+        out.setPermissions(QFile::ReadOwner | QFile::WriteOwner);
     }
-    /// The text with which writing a value fails; empty when it passes.
+    QByteArray fileText() const {
+        QFile in(file());
+        return in.open(QFile::ReadOnly) ? in.readAll() : QByteArray();
+    }
     static QString failureOfWriting() {
-        try {
-            registry::writeValue(Hive::LocalMachine, KeyPath, u"dtUser"_s, u"ana"_s);
-        } catch (const core::Failure& failure) {
-            return failure.text();
-        }
-        return {};
+        return support::failureOf(
+                   [] { registry::writeValue(Hive::LocalMachine, KeyPath, u"dtUser"_s, u"ana"_s); })
+            .text();
+    }
+    static QString failureOfReading() {
+        return support::failureOf([] { read(KeyPath, u"dtUser"_s); }).text();
     }
     static std::optional<QString> read(const QString& path, const QString& name) {
         const auto key = Key::open(Hive::LocalMachine, path);
@@ -65,10 +70,63 @@ TEST_F(Registry, MissingAndEmptyStayApart) {
     EXPECT_FALSE(Key::open(Hive::CurrentUser, KeyPath));
 }
 
-TEST_F(Registry, AFileWrittenByHandIsReadWithoutRegardToCase) {
-    writeFile("[SOFTWARE]\nNorvanta\\Corvenda\\dtPassword=a,b\nNorvanta\\Corvenda\\dtUser=\n");
-    EXPECT_EQ(read(KeyPath.toLower(), u"DtPassword"_s), u"a,b"_s);
-    EXPECT_EQ(read(KeyPath, u"dtUser"_s), u""_s);
+TEST_F(Registry, AFileWrittenByHandMeansWhatStandsThere) {
+    const std::pair<const char*, QString> cases[] = {
+        {"", u""_s},
+        {"\"\"", u""_s},
+        {"a,b", u"a,b"_s},
+        {"sqlite:/casa/a;b", u"sqlite:/casa/a;b"_s},
+        {"100%, #1 = 50%25", u"100%, #1 = 50%25"_s},
+        {"@Variant(\\0)", {}},  // a backslash without quotes
+        {"@Variant(x)", u"@Variant(x)"_s},
+        {"@ByteArray(abc)", u"@ByteArray(abc)"_s},
+        {"@@x", u"@@x"_s},
+        {"sqlite:/casa\\temp", {}},
+        {"\"sqlite:/casa\\\\temp\"", u"sqlite:/casa\\temp"_s},
+        {"  à volta\t ", u"à volta"_s},
+        {"\"  à volta \\t\"", u"  à volta \t"_s},
+        {"\"\\x20ac\"", u"€"_s},
+        {"x\"y\"", u"x\"y\""_s},
+        {"\"x\" y", {}},
+        {"\"x", {}},
+        {"\"\\q\"", {}},
+        {"\xE9", {}},  // not UTF-8
+    };
+    for (const auto& [written, read] : cases) {
+        writeFile(QByteArray("; nota\n[software]\r\n\nNorvanta\\Corvenda\\DTUSER = ") + written +
+                  "\r\n");
+        if (read.isNull())
+            EXPECT_TRUE(failureOfReading().contains(file() + u", linha 4:"_s)) << written;
+        else
+            EXPECT_EQ(this->read(KeyPath.toLower(), u"dtUser"_s), read) << written;
+    }
+    for (const char* line : {"dtUser", "=x", "[SOFTWARE"}) {
+        writeFile(QByteArray("[A]\n") + line);
+        EXPECT_TRUE(failureOfReading().contains(u", linha 2:"_s)) << line;
+    }
+}
+
+TEST_F(Registry, WritingKeepsTheOtherLinesOfAFile) {
+    writeFile("; nota\n[SOFTWARE]\n# outra\nNorvanta\\Corvenda\\DtUser=rui\n\n[Z]\nz=1\n");
+    registry::writeValues(Hive::LocalMachine, KeyPath,
+                          {{u"dtUser"_s, u"a\\b"_s}, {u"dtPassword"_s, u"x"_s}});
+    registry::writeValue(Hive::LocalMachine, u"General\\ç"_s, u"nome"_s, u"1"_s);
+    EXPECT_EQ(fileText(),
+              "; nota\n[SOFTWARE]\n# outra\nNorvanta\\Corvenda\\DtUser=\"a\\\\b\"\n"
+              "Norvanta\\Corvenda\\dtPassword=x\n\n[Z]\nz=1\n[%General]\n%E7\\nome=1\n");
+    EXPECT_EQ(read(u"General\\ç"_s, u"nome"_s), u"1"_s);
+}
+
+TEST_F(Registry, ProgramsThatWriteAtOnceLoseNothing) {
+    std::vector<std::thread> writers;
+    for (int writer = 0; writer < 4; ++writer)
+        writers.emplace_back([writer] {
+            for (int each = 0; each < 10; ++each)
+                registry::writeValue(Hive::LocalMachine, KeyPath, u"v%1%2"_s.arg(writer).arg(each),
+                                     u"x"_s);
+        });
+    for (std::thread& writer : writers) writer.join();
+    EXPECT_EQ(fileText().count("=x\n"), 40);
 }
 
 TEST_F(Registry, AKeyKeepsAValueWithoutAName) {
@@ -84,11 +142,18 @@ TEST_F(Registry, AKeyKeepsAValueWithoutAName) {
     EXPECT_NO_THROW(registry::removeKey(Hive::Users, u"nada"_s));
 }
 
-TEST_F(Registry, AFileOpenToOthersGetsNoValue) {
-    writeFile("[SOFTWARE]\n");
-    QFile::setPermissions(file(), QFile::ReadOwner | QFile::WriteOwner | QFile::ReadGroup);
-    EXPECT_TRUE(failureOfWriting().contains(u"chmod 600 '%1'"_s.arg(file())));
-    EXPECT_EQ(read(KeyPath, u"dtUser"_s), std::nullopt);
+TEST_F(Registry, AFileOpenToOthersGetsNoValueAndGivesNoPassword) {
+    const auto open = [&] {
+        QFile::setPermissions(file(), QFile::ReadOwner | QFile::WriteOwner | QFile::ReadGroup);
+    };
+    writeFile("[SOFTWARE]\nNorvanta\\Corvenda\\dtPassword=\nNorvanta\\Corvenda\\dtUser=ana\n");
+    open();
+    const QString command = u"chmod 600 '%1'"_s.arg(file());
+    EXPECT_TRUE(failureOfWriting().contains(command));
+    EXPECT_EQ(read(KeyPath, u"dtUser"_s), u"ana"_s);
+    writeFile("[SOFTWARE]\nNorvanta\\Corvenda\\dtPassword=x\n");
+    open();
+    EXPECT_TRUE(failureOfReading().contains(command));
 }
 
 TEST_F(Registry, AFolderThatCannotBeMadeIsTold) {

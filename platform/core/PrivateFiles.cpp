@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: MIT
+#include "platform/core/PrivateFiles.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+
+namespace core {
+
+bool isPrivate(const QString& file) {
+    constexpr QFile::Permissions others = QFile::ReadGroup | QFile::WriteGroup | QFile::ExeGroup |
+                                          QFile::ReadOther | QFile::WriteOther | QFile::ExeOther;
+    return !(QFile::permissions(file) & others);
+}
+
+bool makePrivateFolder(const QString& folder) {
+    const QFileInfo wanted(QDir::cleanPath(folder));
+    if (wanted.exists() || wanted.isSymLink()) return wanted.isDir();
+    return makePrivateFolder(wanted.absolutePath()) &&
+           QDir().mkdir(wanted.filePath(), OwnerOnly | QFileDevice::ExeOwner);
+}
+
+}  // namespace core
