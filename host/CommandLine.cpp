@@ -1,74 +1,131 @@
 // SPDX-License-Identifier: MIT
 #include "host/CommandLine.h"
 
+#include <QFile>
+
 using namespace Qt::StringLiterals;
+
+// A static library's resource is linked in only when it is asked for, and that from outside any
+// namespace.
+static void loadHelp() {
+    Q_INIT_RESOURCE(help);
+}
 
 namespace host {
 
 namespace {
 
-/// Takes a switch out of the words; false when it is not among them.
-bool take(QStringList& words, const QString& name) {
-    return words.removeAll(name) > 0;
-}
-
-/// Takes a switch and its value out of the words; false when it stands there without one.
-bool take(QStringList& words, const QString& name, QString& value) {
-    const qsizetype at = words.indexOf(name);
-    if (at < 0) return true;
-    if (at + 1 == words.size() || words[at + 1].isEmpty() || words[at + 1].startsWith('-'_L1))
-        return false;
-    value = words[at + 1];
-    words.remove(at, 2);
-    return true;
-}
-
 const QString Administrator = u"postgres"_s;
 
-CommandLine serverLine(QStringList words) {
+CommandLine wrong(const QString& why) {
+    return {.task = CommandLine::Task::Wrong, .wrong = why};
+}
+
+bool isSwitch(const QString& word) {
+    return word.startsWith(u'-');
+}
+
+/// The words behind a command, which are taken out one after the other.
+class Words {
+public:
+    explicit Words(const QStringList& line) : command_(line.first()), rest_(line.mid(1)) {}
+
+    /// Takes a switch out; false when it is not there.
+    bool flag(const QString& name) { return rest_.removeAll(name) > 0; }
+    /// Takes a switch out and the word behind it; without the switch the text stays as it is.
+    void value(const QString& name, QString& text) {
+        const qsizetype at = rest_.indexOf(name);
+        if (at < 0) return;
+        const QString word = rest_.value(at + 1);
+        if (word.isEmpty() || isSwitch(word))
+            note(u"a «%1» falta o que vem a seguir."_s.arg(name));
+        else
+            text = word;
+        rest_.remove(at, qMin(qsizetype{2}, rest_.size() - at));
+    }
+    /// Takes the next word, which has to be there.
+    QString next(const QString& meaning) {
+        for (qsizetype at = 0; at < rest_.size(); ++at)
+            if (!isSwitch(rest_[at]) && !rest_[at].isEmpty()) return rest_.takeAt(at);
+        note(u"falta %1."_s.arg(meaning));
+        return {};
+    }
+    /// The line, unless something lacks in it or is left over.
+    CommandLine ended(const CommandLine& line) {
+        // A switch that is not known may be why something else lacks.
+        for (const QString& word : rest_)
+            if (isSwitch(word)) return refused(u"não há a opção «%1»."_s.arg(word));
+        if (!wrong_.isEmpty()) return refused(wrong_);
+        if (!rest_.isEmpty()) return refused(u"«%1» está a mais."_s.arg(rest_.first()));
+        return line;
+    }
+
+private:
+    /// What lacks first is told.
+    void note(const QString& why) {
+        if (wrong_.isEmpty()) wrong_ = why;
+    }
+    CommandLine refused(const QString& why) const { return wrong(command_ + u": "_s + why); }
+
+    QString command_;
+    QStringList rest_;
+    QString wrong_;
+};
+
+CommandLine serverLine(Words words) {
     CommandLine line{
         .task = CommandLine::Task::InitServer, .user = u"zelmars"_s, .admin = Administrator};
-    line.sample = take(words, u"--sample"_s);
-    const bool isRight =
-        take(words, u"--server"_s, line.server) && take(words, u"--catalog"_s, line.catalogue) &&
-        take(words, u"--user"_s, line.user) && take(words, u"--admin"_s, line.admin);
-    if (!isRight || line.catalogue.isEmpty() || !words.isEmpty())
-        return {.task = CommandLine::Task::Wrong};
-    return line;
+    line.sample = words.flag(u"--sample"_s);
+    words.value(u"--server"_s, line.server);
+    words.value(u"--catalog"_s, line.catalogue);
+    words.value(u"--user"_s, line.user);
+    words.value(u"--admin"_s, line.admin);
+    const CommandLine read = words.ended(line);
+    if (read.task != CommandLine::Task::Wrong && line.catalogue.isEmpty())
+        return wrong(u"init: falta «--catalog NOME»."_s);
+    return read;
 }
 
-CommandLine initLine(QStringList words) {
-    if (words.contains(u"--server"_s)) return serverLine(words);
+CommandLine initLine(const QStringList& all) {
+    Words words(all);
+    if (all.contains(u"--server"_s)) return serverLine(words);
     CommandLine line{.task = CommandLine::Task::Init};
-    line.sample = take(words, u"--sample"_s);
-    line.ifNeeded = take(words, u"--if-needed"_s);
-    if (words.size() != 1 || words.first().isEmpty() || words.first().startsWith('-'_L1))
-        return {.task = CommandLine::Task::Wrong};
-    line.folder = words.first();
-    return line;
+    line.sample = words.flag(u"--sample"_s);
+    line.ifNeeded = words.flag(u"--if-needed"_s);
+    words.value(u"--group"_s, line.group);
+    line.folder = words.next(u"a pasta do livro"_s);
+    return words.ended(line);
 }
 
-CommandLine copyLine(QStringList words) {
+CommandLine copyLine(const QStringList& all) {
+    Words words(all);
     CommandLine line{.task = CommandLine::Task::Copy, .admin = Administrator};
-    if (!take(words, u"--admin"_s, line.admin) || words.size() != 2 ||
-        words[0].startsWith('-'_L1) || words[1].startsWith('-'_L1))
-        return {.task = CommandLine::Task::Wrong};
-    line.from = words[0];
-    line.into = words[1];
-    return line;
+    words.value(u"--admin"_s, line.admin);
+    line.from = words.next(u"o livro de onde se copia"_s);
+    line.into = words.next(u"o livro para onde se copia"_s);
+    return words.ended(line);
 }
 
-CommandLine registerLine(QStringList words) {
+CommandLine registerLine(const QStringList& all) {
+    Words words(all);
     CommandLine line{.task = CommandLine::Task::Register};
-    line.undo = take(words, u"--undo"_s);
-    if (!words.isEmpty()) return {.task = CommandLine::Task::Wrong};
-    return line;
+    line.undo = words.flag(u"--undo"_s);
+    return words.ended(line);
 }
 
-CommandLine tourLine(const QStringList& words) {
-    if (words.size() != 1 || words.first().startsWith('-'_L1))
-        return {.task = CommandLine::Task::Wrong};
-    return {.task = CommandLine::Task::Tour, .folder = words.first()};
+CommandLine tourLine(const QStringList& all) {
+    Words words(all);
+    return words.ended(
+        {.task = CommandLine::Task::Tour, .folder = words.next(u"a pasta das imagens"_s)});
+}
+
+CommandLine operationLine(const QStringList& words) {
+    if (const auto call = Operations::parsed(words))
+        return {.task = CommandLine::Task::Operation, .call = *call};
+    if (!Operations::names().contains(words.first(), Qt::CaseInsensitive))
+        return wrong(u"«%1» não é um comando nem uma operação."_s.arg(words.first()));
+    if (words.size() == 1) return wrong(u"a «%1» falta um argumento."_s.arg(words.first()));
+    return wrong(u"«%1» não se chama com «%2»."_s.arg(words.first(), words.mid(1).join(u' ')));
 }
 
 }  // namespace
@@ -76,16 +133,13 @@ CommandLine tourLine(const QStringList& words) {
 CommandLine CommandLine::parsed(const QStringList& words) {
     if (words.isEmpty()) return {};
     const QString& first = words.first();
-    if (first == "init"_L1) return initLine(words.mid(1));
-    if (first == "copy"_L1) return copyLine(words.mid(1));
-    if (first == "register"_L1) return registerLine(words.mid(1));
-    if (first == "tour"_L1) return tourLine(words.mid(1));
-    if (words.size() == 1 && (first == "--help"_L1 || first == "-h"_L1))
-        return {.task = Task::Help};
-    if (words == QStringList{u"--version"_s}) return {.task = Task::Version};
-    if (const auto call = Operations::parsed(words))
-        return {.task = Task::Operation, .call = *call};
-    return {.task = Task::Wrong};
+    if (first == "init"_L1) return initLine(words);
+    if (first == "copy"_L1) return copyLine(words);
+    if (first == "register"_L1) return registerLine(words);
+    if (first == "tour"_L1) return tourLine(words);
+    if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
+    if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});
+    return operationLine(words);
 }
 
 bool CommandLine::needsScreen() const {
@@ -94,40 +148,9 @@ bool CommandLine::needsScreen() const {
 }
 
 QString helpText() {
-    return u"Utilização:\n"
-           "  zelmars                            abre a janela com os movimentos em vigor\n"
-           "  zelmars OPERAÇÃO [ARGUMENTO…]      abre uma operação directamente\n"
-           "  zelmars init [--sample] PASTA      faz um livro novo (com dados de exemplo) e passa\n"
-           "                                     a usá-lo; --if-needed: só se não houver outro\n"
-           "  zelmars init --server postgresql:SERVIDOR[:PORTA] --catalog NOME [--sample]\n"
-           "               [--user OPERADOR] [--admin ADMINISTRADOR]\n"
-           "                                     o mesmo num servidor; o operador (zelmars, se "
-           "não\n"
-           "                                     se disser outro) é criado, se ainda não existir\n"
-           "  zelmars copy [--admin ADMINISTRADOR] DE PARA\n"
-           "                                     copia um livro inteiro; DE e PARA são\n"
-           "                                     sqlite:PASTA/NOME ou\n"
-           "                                     postgresql:SERVIDOR[:PORTA]/NOME\n"
-           "  zelmars register [--undo]          regista (ou retira) os componentes\n"
-           "  zelmars tour PASTA                 percorre o lançamento de um documento num livro\n"
-           "                                     de exemplo e deixa as imagens na pasta\n"
-           "  zelmars --help | --version\n"
-           "\n"
-           "As palavras-passe pedem-se no terminal, ou lêem-se das variáveis de ambiente\n"
-           "ZELMARS_ADMIN_PASSWORD (do administrador do servidor, que é postgres se não se disser\n"
-           "outro) e ZELMARS_USER_PASSWORD (do operador). Nunca se escrevem na linha de comando.\n"
-           "\n"
-           "Operações (maiúsculas e minúsculas não contam):\n"
-           "  NewMovimento [false|true]          novo documento; true: documento de hospital\n"
-           "  Registo CHAVE                      abre o movimento com essa chave\n"
-           "  Recebimento, Correcao              recebimento, correcção\n"
-           "  Extratos, LPagamentos              extratos, listagens de pagamentos\n"
-           "  Ldividas, Lcartasdividas           listagem e cartas de dívidas\n"
-           "  Lhospitais                         listagem de hospitais\n"
-           "  CallPlafonds, CallHospitais        tabelas de rúbricas e de hospitais\n"
-           "  CallIRS, CallManutencaoDados       declarações para IRS, manutenção de dados\n"
-           "  CallFechoAno                       fecho do ano\n"
-           "  Login                              diz se a ligação ao livro se faz\n"_s;
+    loadHelp();
+    QFile file(u":/zelmars/help.txt"_s);
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll()) : QString();
 }
 
 }  // namespace host

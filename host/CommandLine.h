@@ -22,8 +22,10 @@ struct CommandLine {
         Wrong
     };
     Task task = Task::Window;
+    QString wrong = {};       ///< of Wrong: the word that is wrong or lacks, in a sentence
     OperationCall call = {};  ///< of Operation
     QString folder = {};      ///< of Init and Tour
+    QString group = {};       ///< of Init: whose members share the book; empty for nobody
     QString server = {};      ///< of InitServer: "postgresql:HOST[:PORT]"
     QString catalogue = {};   ///< of InitServer
     QString user = {};        ///< of InitServer: the operator
@@ -41,7 +43,7 @@ struct CommandLine {
     bool needsScreen() const;
 };
 
-/// The text of --help.
+/// The text of --help, which the script that brings the program up prints before it is built.
 QString helpText();
 
 }  // namespace host

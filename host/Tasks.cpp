@@ -94,7 +94,7 @@ int performUntrapped(const CommandLine& line) {
         case Task::Tour:
             return playTour(line.folder);
         case Task::Help:
-            say(helpText());
+            say(helpText().trimmed());
             return Done;
         case Task::Version:
             say(u"zelmars "_s + QCoreApplication::applicationVersion());
@@ -102,7 +102,7 @@ int performUntrapped(const CommandLine& line) {
         case Task::Wrong:
             break;
     }
-    complain(helpText());
+    complain(line.wrong + u"\n\n"_s + helpText().trimmed());
     return WrongUse;
 }
 

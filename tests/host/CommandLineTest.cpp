@@ -21,33 +21,46 @@ TEST(CommandLine, NamesOneTask) {
         {u"tour out"_s, Task::Tour},
         {u"register"_s, Task::Register},
         {u"init pasta"_s, Task::Init},
-        {u"init --sample --if-needed pasta"_s, Task::Init},
+        {u"init --sample --if-needed --group saude pasta"_s, Task::Init},
         {u"init --server postgresql:srv --catalog livro --sample"_s, Task::InitServer},
         {u"init --server postgresql:srv --catalog livro --admin ana --user rui"_s,
          Task::InitServer},
         {u"copy sqlite:pasta/livro postgresql:srv/livro"_s, Task::Copy},
         {u"copy --admin ana postgresql:srv/livro sqlite:pasta/livro"_s, Task::Copy},
         {u"callplafonds MSAccess x"_s, Task::Operation},
-        // Refused, so that nothing is done that was not meant.
-        {u"--hlep"_s, Task::Wrong},
-        {u"init"_s, Task::Wrong},
-        {u"init --sampel pasta"_s, Task::Wrong},
-        {u"init --server postgresql:srv"_s, Task::Wrong},
-        {u"init --server --catalog livro"_s, Task::Wrong},
-        {u"init --server postgresql:srv --catalog livro pasta"_s, Task::Wrong},
-        {u"init --catalog livro pasta"_s, Task::Wrong},
-        {u"copy sqlite:pasta/livro"_s, Task::Wrong},
-        {u"copy --force sqlite:pasta/livro"_s, Task::Wrong},
-        {u"tour --sample"_s, Task::Wrong},
-        {u"Despesas"_s, Task::Wrong},
-        {u"NewMovimento talvez"_s, Task::Wrong},
-        {u"Registo"_s, Task::Wrong},
-        {u"Registo abc"_s, Task::Wrong},
-        {u"Registo 99999999999"_s, Task::Wrong},
-        {u"Ldividas x"_s, Task::Wrong},
     };
     for (const auto& [words, task] : cases)
         EXPECT_EQ(parsed(words).task, task) << words.toStdString();
+}
+
+TEST(CommandLine, NamesTheWordThatIsWrongAndDoesNothing) {
+    const std::pair<QString, QString> cases[] = {
+        {u"--hlep"_s, u"«--hlep»"_s},
+        {u"--help agora"_s, u"«agora»"_s},
+        {u"init"_s, u"init: falta a pasta"_s},
+        {u"init --sampel pasta"_s, u"«--sampel»"_s},
+        {u"init --sampel"_s, u"«--sampel»"_s},
+        {u"init --group"_s, u"«--group»"_s},
+        {u"init uma outra"_s, u"«outra»"_s},
+        {u"init --server postgresql:srv"_s, u"«--catalog NOME»"_s},
+        {u"init --server --catalog livro"_s, u"«--server»"_s},
+        {u"init --server postgresql:srv --catalog livro pasta"_s, u"«pasta»"_s},
+        {u"init --catalog livro pasta"_s, u"«--catalog»"_s},
+        {u"copy sqlite:pasta/livro"_s, u"para onde se copia"_s},
+        {u"copy --force sqlite:pasta/livro"_s, u"«--force»"_s},
+        {u"tour --sample"_s, u"«--sample»"_s},
+        {u"Despesas"_s, u"«Despesas»"_s},
+        {u"NewMovimento talvez"_s, u"«talvez»"_s},
+        {u"Registo"_s, u"«Registo»"_s},
+        {u"Registo abc"_s, u"«abc»"_s},
+        {u"Registo 99999999999"_s, u"«99999999999»"_s},
+        {u"Ldividas x"_s, u"«x»"_s},
+    };
+    for (const auto& [words, told] : cases) {
+        const host::CommandLine line = parsed(words);
+        EXPECT_EQ(line.task, Task::Wrong) << words.toStdString();
+        EXPECT_TRUE(line.wrong.contains(told)) << line.wrong.toStdString();
+    }
 }
 
 TEST(CommandLine, KnowsWhoEntersAServer) {
