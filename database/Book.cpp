@@ -1,14 +1,22 @@
 // SPDX-License-Identifier: MIT
 #include "database/Book.h"
 
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
 #include <QDir>
 #include <QFile>
 #include <QScopeGuard>
+#include <algorithm>
+#include <cerrno>
 
 #include "database/SchemaText.h"
 #include "database/Sqlite.h"
 #include "database/SqliteBookWriter.h"
 #include "database/sample/SampleBook.h"
+#include "platform/ado/ConnectionSettings.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
@@ -19,27 +27,111 @@ namespace database {
 
 namespace {
 
+core::Failure refusal(const QString& text) {
+    return {core::InvalidCall, text};
+}
+
+QString dataSource(const QString& folder) {
+    return u"sqlite:"_s + QDir(folder).absolutePath();
+}
+
+/// Where a book is made before it gets its name.
+QString stagedFile(const QString& file) {
+    return file + u".novo"_s;
+}
+
 void removeBook(const QString& file) {
     for (const QString& suffix : {u""_s, u"-wal"_s, u"-shm"_s, u"-journal"_s})
         QFile::remove(file + suffix);
 }
 
-/// Makes the book under a name of its own first; the book's name appears when all of it stands.
-void makeStaged(const QString& file, const std::function<void(sqlite::Database&)>& fill) {
-    const QString staged = file + u".novo"_s;
+/// A book that has its name while the one that it was made under is still there: whoever made it
+/// did not come to the settings.
+bool isUnfinished(const QString& file) {
+    struct stat made {};
+    struct stat staged {};
+    return ::stat(QFile::encodeName(file).constData(), &made) == 0 &&
+           ::stat(QFile::encodeName(stagedFile(file)).constData(), &staged) == 0 &&
+           made.st_dev == staged.st_dev && made.st_ino == staged.st_ino;
+}
+
+/// Keeps everybody else from making a book in the folder.
+class FolderHold {
+public:
+    explicit FolderHold(const QString& folder)
+        : folder_(
+              ::open(QFile::encodeName(folder).constData(), O_RDONLY | O_DIRECTORY | O_CLOEXEC)) {
+        if (::flock(folder_, LOCK_EX | LOCK_NB) == 0 || errno != EWOULDBLOCK) return;
+        ::close(folder_);
+        throw refusal(
+            u"Outro programa está a fazer um livro na pasta «%1». Espere que acabe."_s.arg(folder));
+    }
+    ~FolderHold() { ::close(folder_); }
+    FolderHold(const FolderHold&) = delete;
+    FolderHold& operator=(const FolderHold&) = delete;
+
+    /// The names that were given in the folder survive a power cut.
+    void sync() const { ::fsync(folder_); }
+
+private:
+    int folder_;
+};
+
+/// Makes the book under a name of its own first; the book's name appears when all of it stands. The
+/// other name stays.
+void makeStaged(const QString& file, const BookOwners& owners,
+                const std::function<void(sqlite::Database&)>& fill) {
+    const QString staged = stagedFile(file);
     removeBook(staged);
     auto cleanup = qScopeGuard([&] { removeBook(staged); });
+    owners.makeFile(staged);
     {
-        sqlite::Database book(staged, sqlite::Database::Mode::CreateNew);
+        sqlite::Database book(staged, sqlite::Database::Mode::OpenExisting);
         book.run("PRAGMA journal_mode=WAL; PRAGMA synchronous=FULL; BEGIN");
         book.run(schemaText(u"sqlite.sql"_s));
         book.run(schemaText(u"codes.sql"_s));
         book.run("COMMIT");
         if (fill) fill(book);
     }
-    if (!QFile::rename(staged, file))  // never over an existing file
-        throw core::Failure(core::InvalidCall, u"Não foi possível criar o livro «%1»."_s.arg(file));
+    // Neither way goes over an existing file. Not every file system knows a second name.
+    const bool isNamed =
+        ::link(QFile::encodeName(staged).constData(), QFile::encodeName(file).constData()) == 0 ||
+        QFile::rename(staged, file);
+    if (!isNamed) throw refusal(u"Não foi possível criar o livro «%1»."_s.arg(file));
     cleanup.dismiss();
+}
+
+void refuseExisting(const QString& file) {
+    if (QFile::exists(file) || QFileInfo(file).isSymLink())
+        throw refusal(u"Já existe o livro «%1». Não foi alterado."_s.arg(file));
+}
+
+/// A folder that the settings, or the connection string that is made of them, would not give back
+/// as it is.
+void refuseUnnameable(const QString& folder) {
+    const QString source = dataSource(folder);
+    const QString carried =
+        ado::ConnectionSettings(u"Data Source="_s + source).value(u"Data Source"_s).trimmed();
+    const bool isText = std::none_of(source.begin(), source.end(), [](QChar c) {
+        return c.category() == QChar::Other_Control || c == QChar::ReplacementCharacter;
+    });
+    if (carried == source && isText && source.size() <= registry::LongestValue) return;
+    throw refusal(
+        u"A pasta «%1» não pode ser a de um livro, porque as definições não a saberiam dizer: o "
+        "caminho não pode ter «;», caracteres de controlo nem espaços no fim, nem mais de %2 "
+        "letras. Nada foi feito."_s.arg(folder)
+            .arg(registry::LongestValue - (source.size() - QDir(folder).absolutePath().size())));
+}
+
+void writeSample(sqlite::Database& book, const BookSizes& sizes, QDate asOf) {
+    SqliteBookWriter writer(book);
+    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
+    writer.commit();
+}
+
+bool hasMembers(const QString& file) {
+    sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
+    return book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)");
 }
 
 }  // namespace
@@ -51,34 +143,33 @@ QString bookFile(const QString& folder, const QString& catalogue) {
 void createBook(const QString& folder, const QString& catalogue,
                 const std::function<void(sqlite::Database&)>& fill) {
     const QString file = bookFile(folder, catalogue);
-    if (QFile::exists(file) || QFileInfo(file).isSymLink())
-        throw core::Failure(core::InvalidCall,
-                            u"Já existe o livro «%1». Não foi alterado."_s.arg(file));
-    const bool madeFolder = !QDir(folder).exists();
-    if (!QDir().mkpath(folder))
-        throw core::Failure(core::InvalidCall,
-                            u"Não foi possível criar a pasta «%1»."_s.arg(folder));
+    refuseExisting(file);
+    const BookOwners owners;
+    const bool madeFolder = owners.makeFolder(folder);
     auto cleanup = qScopeGuard([&] {
         if (madeFolder) QDir().rmdir(folder);
     });
-    makeStaged(file, fill);
+    const FolderHold hold(folder);
+    makeStaged(file, owners, fill);
+    QFile::remove(stagedFile(file));
+    hold.sync();
     cleanup.dismiss();
 }
 
 void writeSettings(const LoginValues& values) {
-    const QString key = u"SOFTWARE\\Norvanta\\Corvenda"_s;
-    const auto write = [&](const QString& name, const QString& value) {
-        registry::writeValue(registry::Hive::LocalMachine, key, name, value);
-    };
-    write(u"dtSecurityInfo"_s, u"True"_s);
-    write(u"dtUser"_s, values.user);
-    write(u"dtPassword"_s, values.password);
-    write(u"dtInitialCatalog"_s, values.catalogue);
-    write(u"dtDataSource"_s, values.dataSource);
+    registry::writeValues(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s,
+                          {{u"dtSecurityInfo"_s, u"True"_s},
+                           {u"dtUser"_s, values.user},
+                           {u"dtPassword"_s, values.password},
+                           {u"dtInitialCatalog"_s, values.catalogue},
+                           {u"dtDataSource"_s, values.dataSource}});
 }
 
 void writeSettings(const QString& folder, const QString& catalogue) {
-    writeSettings({u"zelmars"_s, {}, catalogue, u"sqlite:"_s + QDir(folder).absolutePath()});
+    refuseUnnameable(folder);
+    writeSettings({u"zelmars"_s, {}, catalogue, dataSource(folder)});
+    const QString file = bookFile(folder, catalogue);
+    if (isUnfinished(file)) QFile::remove(stagedFile(file));
 }
 
 void fillSample(const QString& folder, const QString& catalogue, const BookSizes& sizes,
@@ -86,24 +177,36 @@ void fillSample(const QString& folder, const QString& catalogue, const BookSizes
     sqlite::Database book(bookFile(folder, catalogue), sqlite::Database::Mode::OpenExisting);
     if (book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)"
                     " OR EXISTS (SELECT 1 FROM tbZelmar_Movimentos)") != 0)
-        throw core::Failure(
-            core::InvalidCall,
+        throw refusal(
             u"O livro «%1» já tem associados ou movimentos."_s.arg(bookFile(folder, catalogue)));
-    SqliteBookWriter writer(book);
-    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
-    writer.commit();
+    writeSample(book, sizes, asOf);
 }
 
-void initBook(const QString& folder, bool sample) {
+void initBook(const QString& folder, bool sample, const BookOwners& owners) {
     const QString catalogue = u"zelmars"_s;
-    const bool madeFolder = !QDir(folder).exists();
-    createBook(folder, catalogue);
+    const QString file = bookFile(folder, catalogue);
+    refuseUnnameable(folder);
+    if (!isUnfinished(file)) refuseExisting(file);
+    const bool madeFolder = owners.makeFolder(folder);
     auto cleanup = qScopeGuard([&] {
-        removeBook(bookFile(folder, catalogue));
         if (madeFolder) QDir().rmdir(folder);
     });
-    if (sample) fillSample(folder, catalogue);
+    const FolderHold hold(folder);
+    const bool isCutOff = isUnfinished(file) && hasMembers(file) == sample;
+    if (!isCutOff) {
+        refuseExisting(file);
+        makeStaged(file, owners, [&](sqlite::Database& book) {
+            if (sample) writeSample(book, {}, {});
+        });
+    }
+    auto undo = qScopeGuard([&] {
+        if (isCutOff) return;
+        removeBook(file);
+        removeBook(stagedFile(file));
+    });
+    hold.sync();
     writeSettings(folder, catalogue);
+    undo.dismiss();
     cleanup.dismiss();
 }
 

@@ -5,6 +5,8 @@
 #include <QString>
 #include <functional>
 
+#include "database/BookOwners.h"
+
 /// Makes books: schema, code lists, the sample content, and the settings that name a book.
 ///
 /// Every failure is a core::Failure with a Portuguese text (or the engine's own). Nothing half-made
@@ -68,11 +70,13 @@ struct LoginValues {
 };
 /// Writes the five values.
 void writeSettings(const LoginValues& values);
-/// Writes the five values so that they name this book.
+/// Writes the five values so that they name this book. Fails when they cannot carry the folder.
 void writeSettings(const QString& folder, const QString& catalogue);
 
 /// `zelmars init [--sample] FOLDER`: makes the book "zelmars" in the folder, with or without the
-/// sample content, and writes the five values.
-void initBook(const QString& folder, bool sample);
+/// sample content, and writes the five values. One that was cut off before the settings is ended;
+/// what it left half made is made anew. Fails before it makes anything when the settings cannot
+/// carry the folder.
+void initBook(const QString& folder, bool sample, const BookOwners& owners = {});
 
 }  // namespace database

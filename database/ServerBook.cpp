@@ -50,12 +50,20 @@ public:
 
     void run(bool sample) {
         refuseUnfit();
-        auto undo = qScopeGuard([this] { takeBack(); });
-        makeCatalogue();
-        makeBook(sample);
+        mark_ = u"por acabar: operador %1, %2"_s.arg(worker_.user,
+                                                     sample ? u"com exemplo"_s : u"sem exemplo"_s);
+        const bool wasCutOff = isCutOff();
+        auto undo = qScopeGuard([&] {
+            if (!wasCutOff) takeBack();
+        });
+        if (!wasCutOff) {
+            makeCatalogue();
+            makeBook(sample);
+        }
         enterAsOperator();
         writeSettings({worker_.user, worker_.password, catalogue_.name, dataSource()});
         undo.dismiss();
+        postgres::Database(catalogue_).run("COMMENT ON TABLE public.tbcontadores IS NULL");
     }
 
 private:
@@ -89,6 +97,16 @@ private:
         makesOperator_ = !hasRole(worker_.user);
     }
 
+    /// True when the same call made the whole book, which is one transaction, and did not come to
+    /// the settings.
+    bool isCutOff() const {
+        if (makesCatalogue_) return false;
+        postgres::Database book(catalogue_);
+        return book.number(
+            "SELECT obj_description(to_regclass('public.tbcontadores'), 'pg_class') = " +
+            book.literal(mark_));
+    }
+
     void makeCatalogue() {
         if (!makesCatalogue_) return;
         // Texts sort by the collation of their columns, whatever the catalogue's own.
@@ -107,6 +125,7 @@ private:
         book.run("RESET ROLE");
         book.run(rights(book));
         if (sample) writeSample(book, {}, {});
+        book.run("COMMENT ON TABLE public.tbcontadores IS " + book.literal(mark_));
         transaction.commit();
         madeBook_ = true;
     }
@@ -176,6 +195,7 @@ private:
     ServerCatalogue catalogue_;
     ServerOperator worker_;
     postgres::Database server_;
+    QString mark_;
     bool makesCatalogue_ = false;
     bool makesOwner_ = false;
     bool makesOperator_ = false;

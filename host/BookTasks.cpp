@@ -77,7 +77,9 @@ void makeBook(const CommandLine& line) {
         database::writeSettings(folder, catalogue);
         return;
     }
-    database::initBook(folder, line.sample);
+    const database::BookOwners owners =
+        line.group.isEmpty() ? database::BookOwners() : database::BookOwners(line.group);
+    database::initBook(folder, line.sample, owners);
     say(u"Livro feito em %1"_s.arg(database::bookFile(folder, catalogue)));
 }
 

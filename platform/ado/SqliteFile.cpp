@@ -6,6 +6,7 @@
 #include <unistd.h>
 
 #include <QFile>
+#include <QFileInfo>
 #include <cerrno>
 #include <optional>
 
@@ -84,6 +85,20 @@ bool hasMoved(sqlite3* handle) {
 }
 
 }  // namespace
+
+QString noRightText(const QString& book) {
+    return u"Não tem direito de escrever no livro «%1» ou na pasta dele. Peça a quem o fez, ou ao "
+           "administrador, que o junte ao grupo do livro. Um livro para os membros de um grupo "
+           "faz-se com: zelmars init --group GRUPO PASTA"_s.arg(book);
+}
+
+bool SqliteFile::isOpenToUser() const {
+    const QByteArray book = QFile::encodeName(path_);
+    const QByteArray folder = QFile::encodeName(QFileInfo(path_).path());
+    return (::euidaccess(book.constData(), R_OK | W_OK) == 0 &&
+            ::euidaccess(folder.constData(), W_OK | X_OK) == 0) ||
+           (errno != EACCES && errno != EROFS);
+}
 
 void SqliteFile::refuseForeignJournal() const {
     const auto book = factsOf(path_);

@@ -25,6 +25,9 @@ public:
 
     const QString& path() const { return path_; }
 
+    /// False when the rights of the system keep this user from writing the book or its folder, which
+    /// also holds the journal.
+    bool isOpenToUser() const;
     /// To be asked before anything of the book is read, which would bring the journal's pages into
     /// it. Fails when there is a journal that was written for another file than the one that lies
     /// there now. A journal that a crash left beside its own book passes.
@@ -42,5 +45,8 @@ private:
     FileIdentity book_;
     FileIdentity journal_;
 };
+
+/// What whoever lacks the right to write a book is told.
+QString noRightText(const QString& book);
 
 }  // namespace ado

@@ -4,6 +4,7 @@
 #include <QThread>
 
 #include "platform/ado/SqliteCollation.h"
+#include "platform/ado/SqliteFile.h"
 #include "platform/core/Failure.h"
 
 namespace ado {
@@ -161,6 +162,8 @@ void SqliteHandle::fail() {
         code == SQLITE_INTERRUPT
             ? u"A base de dados não acabou em %1 segundos; o pedido foi interrompido."_s.arg(
                   qMax(1, timeout_))
+        : (code & 0xFF) == SQLITE_READONLY
+            ? noRightText(QString::fromUtf8(sqlite3_db_filename(db_, "main")))
             : QString::fromUtf8(sqlite3_errmsg(db_));
     throw core::Failure(core::DatabaseFailure, text, QString::number(code));
 }

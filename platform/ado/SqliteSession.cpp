@@ -53,6 +53,8 @@ SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int 
         sqlite3_exec(handle.get(), "PRAGMA journal_mode=WAL", nullptr, nullptr, nullptr);
         file_.remember(handle.get());
     } catch (const core::Failure& failure) {
+        if (!file_.isOpenToUser())
+            throw core::Failure(failure.number(), noRightText(book()), failure.code());
         throw core::Failure(failure.number(),
                             u"Não foi possível abrir o livro «%1»: %2"_s.arg(
                                 QDir::toNativeSeparators(book()), failure.text()),

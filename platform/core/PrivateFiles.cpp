@@ -16,8 +16,9 @@ bool isPrivate(const QString& file) {
 bool makePrivateFolder(const QString& folder) {
     const QFileInfo wanted(QDir::cleanPath(folder));
     if (wanted.exists() || wanted.isSymLink()) return wanted.isDir();
-    return makePrivateFolder(wanted.absolutePath()) &&
-           QDir().mkdir(wanted.filePath(), OwnerOnly | QFileDevice::ExeOwner);
+    constexpr QFile::Permissions mode = OwnerOnly | QFile::ExeOwner;
+    return makePrivateFolder(wanted.absolutePath()) && QDir().mkdir(wanted.filePath(), mode) &&
+           QFile::setPermissions(wanted.filePath(), mode);
 }
 
 }  // namespace core
