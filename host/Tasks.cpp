@@ -7,6 +7,7 @@
 #include "host/BookTasks.h"
 #include "host/Tour.h"
 #include "host/frmPrincipal.h"
+#include "platform/com/Place.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/MsgBoxes.h"
@@ -111,7 +112,9 @@ int performUntrapped(const CommandLine& line) {
 void registerComponents(bool undo) {
     const char* entry = undo ? "DllUnregisterServer" : "DllRegisterServer";
     for (const QString& name : {u"Zelmars"_s, u"Lumbra"_s, u"Tiqueta"_s, u"Vorlane"_s}) {
-        QLibrary library(QCoreApplication::applicationDirPath() + u"/lib%1.so"_s.arg(name));
+        const QString file = QCoreApplication::applicationDirPath() + u"/lib%1.so"_s.arg(name);
+        com::refuseOpenPlace(file);
+        QLibrary library(file);
         const auto run = reinterpret_cast<com::Status (*)()>(library.resolve(entry));
         if (!run) throw core::Failure(core::CannotCreateObject, library.errorString());
         if (run() != com::Ok)

@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "platform/com/Component.h"
 
+#include <QFileInfo>
 #include <QHash>
 #include <QLibrary>
 #include <QUuid>
 
+#include "platform/com/Place.h"
 #include "platform/com/Server.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
@@ -53,7 +55,12 @@ GetClassObject serverOf(const Guid& clsid, const QString& progId) {
     const QString file = classesRootValue(u"CLSID\\"_s + guidText(clsid) + u"\\InprocServer32"_s);
     if (file.isEmpty())
         cannotCreate(progId, u"a classe %1 não tem servidor registado."_s.arg(guidText(clsid)));
-    QLibrary library(file);
+    // Without links on its way, so that the file that is loaded is the one that was looked at.
+    const QString actual = QFileInfo(file).canonicalFilePath();
+    if (QFileInfo(file).isRelative() || actual.isEmpty())
+        cannotCreate(progId, u"não existe o ficheiro %1."_s.arg(file));
+    refuseOpenPlace(actual);
+    QLibrary library(actual);
     if (!library.load())
         cannotCreate(progId, u"o ficheiro %1 não pôde ser carregado (%2)."_s.arg(
                                  file, library.errorString()));

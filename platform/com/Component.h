@@ -48,7 +48,8 @@ private:
 
 /// Makes a component by its programmatic name ("Lumbra.General"): looks first at the classes that
 /// this process registered itself, then in the registry, and loads the shared object found there.
-/// Fails with CannotCreateObject and a text that names the component and what was missing.
+/// Fails with CannotCreateObject and a text that names the component and what was missing, or,
+/// before anything is loaded, the place that others could write (Place.h).
 Object createObject(const QString& progId);
 
 /// Registers (or, with an empty maker, withdraws) a class of this process under a programmatic

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
+#include <QDir>
 #include <QFile>
 #include <QLibrary>
 #include <QTemporaryDir>
@@ -63,6 +66,33 @@ TEST_F(Components, ARegisteredClassIsMadeByItsNameUntilRegistrationIsUndone) {
     EXPECT_FALSE(registry::Key::open(registry::Hive::ClassesRoot, clsid));
     EXPECT_EQ(failureOf(ProgId),
               u"Não foi possível criar o componente «Amostra.General»: não está registado."_s);
+}
+
+/// A shared object that somebody else could have changed is not even opened.
+TEST_F(Components, NothingIsLoadedFromWhereOthersMayWrite) {
+    ASSERT_EQ(entry("DllRegisterServer"), com::Ok);
+    QTemporaryDir root;
+    const QString folder = root.filePath(u"fora/dentro"_s);
+    ASSERT_TRUE(QDir().mkpath(folder));
+    const QString file = folder + u"/libSampleComponent.so"_s;
+    ASSERT_TRUE(QFile::copy(server_.fileName(), file));
+    registry::writeValue(registry::Hive::ClassesRoot,
+                         u"CLSID\\%1\\InprocServer32"_s.arg(com::guidText(SampleClass)), {}, file);
+    const auto chmod = [](const QString& path, mode_t mode) {
+        ASSERT_EQ(::chmod(QFile::encodeName(path).constData(), mode), 0);
+    };
+    for (const QString& place : {file, folder, root.filePath(u"fora"_s)}) {
+        chmod(place, 0757);
+        EXPECT_TRUE(failureOf(ProgId).contains(u"chmod go-w '%1'"_s.arg(place)))
+            << qPrintable(place);
+        chmod(place, 0755);
+    }
+    chmod(folder, 01777);  // each may only touch what is his own
+    EXPECT_EQ(failureOf(ProgId), u"(made)"_s);
+    chmod(folder, 0755);
+    if (::geteuid() != 0) return;
+    ASSERT_EQ(::chown(QFile::encodeName(folder).constData(), 60017, 0), 0);
+    EXPECT_TRUE(failureOf(ProgId).contains(u"«%1» pertence a outro"_s.arg(folder)));
 }
 
 }  // namespace
