@@ -33,19 +33,28 @@ QString harmless(const QString& text) {
     return risky.match(text).hasMatch() && !sameNumber.match(text).hasMatch() ? u'\'' + text : text;
 }
 
+/// Of a text, whatever it holds, so that no reader takes a sign in it for the end of the cell.
+QString quoted(const QString& text) {
+    return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
+}
+
+/// The names of columns as cells.
+QStringList heading(const QStringList& names) {
+    QStringList cells;
+    for (const QString& name : names) cells << quoted(name);
+    return cells;
+}
+
 QString cell(const QVariant& value) {
     if (value.typeId() != QMetaType::QString)
         return core::formatted(value, {}, core::portugueseLocale());
-    const QString text = harmless(value.toString());
-    if (std::none_of(text.begin(), text.end(), [](QChar c) { return u";\"\n\r"_s.contains(c); }))
-        return text;
-    return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
+    return quoted(harmless(value.toString()));
 }
 
 class CsvFile {
 public:
     explicit CsvFile(const QString& name) : file_(name) {
-        if (!file_.open(QIODevice::WriteOnly)) failToWrite(file_);
+        if (!openPrivately(file_)) failToWrite(file_);
         file_.write("\xEF\xBB\xBF");
     }
     void line(const QStringList& cells) { file_.write(cells.join(u';').toUtf8() + "\r\n"); }
@@ -94,10 +103,10 @@ void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString
     CsvFile out(file);
     const QStringList columns = columnsOf(report.detail);
     if (!report.chapter.isEmpty()) {
-        out.line(columnsOf(report.groupHeader) + columns);
+        out.line(heading(columnsOf(report.groupHeader) + columns));
         writeGroups(out, report, *rows);
     } else {
-        out.line(columns);
+        out.line(heading(columns));
         Cells detail(columns, *rows);
         for (qint64 row = 0; row < rows->rowsInMemory(); ++row) out.line(detail.of(*rows, row));
     }

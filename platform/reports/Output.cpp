@@ -81,7 +81,7 @@ bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn) {
 
 bool writePdf(const Pages& pages, const Sheets& sheets, const QString& file, const GoesOn& goesOn) {
     QSaveFile out(file);
-    bool done = out.open(QIODevice::WriteOnly);
+    bool done = openPrivately(out);
     if (done) {
         QPdfWriter writer(&out);
         writer.setResolution(UnitsPerInch);

@@ -11,7 +11,8 @@
 class QPainter;
 class QPrinter;
 
-/// The ways out of laid-out pages. Failures are core::Failure with a Portuguese text.
+/// The ways out of laid-out pages. Failures are core::Failure with a Portuguese text. Files that
+/// are written can be read by their owner only.
 namespace reports {
 
 /// Paints a page, `unitsPerMillimetre` being the painter's; the page's corner is the origin.
@@ -49,11 +50,11 @@ bool print(const Pages& pages, const QPrinter& printer, int from, int to,
 /// there already, and says so in a box that names the file.
 void printUnasked(const Pages& pages);
 
-/// The rows as a text that spreadsheets open: semicolons, decimal comma, UTF-8 with a mark. One
-/// line with the columns that the report shows, one for each detail row; of a report with groups
-/// the group's columns stand first. A text that a spreadsheet would run as a formula, or read as a
-/// date or as a number with fewer digits, gets a leading apostrophe. Fails, leaving no half file,
-/// when the file cannot be written.
+/// The rows as a text that spreadsheets open: semicolons, decimal comma, texts in quotes, UTF-8
+/// with a mark. One line with the columns that the report shows, one for each detail row; of a
+/// report with groups the group's columns stand first. A text that a spreadsheet would run as a
+/// formula, or read as a date or as a number with fewer digits, gets a leading apostrophe. Fails,
+/// leaving no half file, when the file cannot be written.
 void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file);
 
 }  // namespace reports

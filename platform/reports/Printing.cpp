@@ -11,6 +11,7 @@
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
+#include "platform/core/PrivateFiles.h"
 #include "platform/reports/Output.h"
 
 using namespace Qt::StringLiterals;
@@ -95,7 +96,7 @@ QString newFile(const QString& folder, const QString& name) {
     for (int number = 1;; ++number) {
         const QString extra = number == 1 ? QString() : u" (%1)"_s.arg(number);
         QFile file(folder + u'/' + name + extra + u".pdf"_s);
-        if (file.open(QIODevice::NewOnly)) return file.fileName();
+        if (file.open(QIODevice::NewOnly, core::OwnerOnly)) return file.fileName();
         if (!file.exists()) return {};
     }
 }

@@ -4,8 +4,15 @@
 #include <QSaveFile>
 
 #include "platform/core/Failure.h"
+#include "platform/core/PrivateFiles.h"
 
 namespace reports {
+
+/// Opens a file for writing that only its owner will read, also when it replaces one that others
+/// could.
+inline bool openPrivately(QSaveFile& file) {
+    return file.open(QIODevice::WriteOnly) && file.setPermissions(core::OwnerOnly);
+}
 
 /// Fails with what kept a file from being written.
 [[noreturn]] inline void failToWrite(const QSaveFile& file) {

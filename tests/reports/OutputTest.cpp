@@ -2,6 +2,8 @@
 // The ways out of pages: PDF, a real print queue, rows for a spreadsheet.
 #include "platform/reports/Output.h"
 
+#include <sys/stat.h>
+
 #include <QDir>
 #include <QPrinter>
 #include <QPrinterInfo>
@@ -76,6 +78,22 @@ TEST_F(ReportOutput, WritesPdfsOrSaysWhyNot) {
                     .startsWith(u"Não foi possível escrever «%1»"_s.arg(nowhere)));
 }
 
+TEST_F(ReportOutput, IsReadByItsOwnerOnlyAlsoInPlaceOfAFileThatAllCouldRead) {
+    const auto pages = laidOut(report.design(), movements());
+    const mode_t before = ::umask(0);
+    for (const QString& name : {u"x.pdf"_s, u"x.csv"_s})
+        for (int round = 0; round < 2; ++round) {
+            const QString file = folder.filePath(name);
+            name.endsWith("pdf"_L1) ? void(writePdf(*pages, file))
+                                    : writeCsv(report.design(), movements(), file);
+            struct stat facts {};
+            ::stat(QFile::encodeName(file).constData(), &facts);
+            EXPECT_EQ(facts.st_mode & 07777, 0600u) << name.toStdString();
+            ::chmod(QFile::encodeName(file).constData(), 0644);
+        }
+    ::umask(before);
+}
+
 TEST_F(ReportOutput, PrintsOnTheDefaultPrinterWithoutAsking) {
     support::PrintServer server;
     report.PrintReport(movements());
@@ -129,7 +147,7 @@ TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
     const QStringList texts =
         u"=1+1|a;\"b\"|-12,5|100015|00123|1E5|2026/3|1.20|12345678901234567"_s.split(u'|');
     const QStringList cells =
-        u"'=1+1|\"a;\"\"b\"\"\"|-12,5|100015|'00123|'1E5|'2026/3|'1.20|'12345678901234567"_s.split(
+        u"'=1+1|a;\"\"b\"\"|-12,5|100015|'00123|'1E5|'2026/3|'1.20|'12345678901234567"_s.split(
             u'|');
     for (int row = 1; row <= texts.size(); ++row)
         book.exec(
@@ -145,14 +163,15 @@ TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
     };
     const QByteArray lines = written(report.design(), movements());
     EXPECT_TRUE(lines.startsWith(
-        "\ufeffmovimento_no;data;codABC;tipo;rubrica;doc_no;doc_valor;modo_pagamento;credito;"
-        "debito\r\n1;02-01-2026;A;DOC;Consultas de especialidade;'=1+1;1,25;TRF;0,1;-1234,5\r\n"));
+        "\ufeff\"movimento_no\";\"data\";\"codABC\";\"tipo\";\"rubrica\";\"doc_no\";\"doc_valor\";"
+        "\"modo_pagamento\";\"credito\";\"debito\"\r\n1;02-01-2026;\"A\";\"DOC\";"
+        "\"Consultas de especialidade\";\"'=1+1\";1,25;\"TRF\";0,1;-1234,5\r\n"));
     for (int row = 1; row <= texts.size(); ++row)
-        EXPECT_TRUE(lines.contains(u";%1;%2,25;"_s.arg(cells[row - 1]).arg(row).toUtf8()));
+        EXPECT_TRUE(lines.contains(u";\"%1\";%2,25;"_s.arg(cells[row - 1]).arg(row).toUtf8()));
     book.exec(u"delete from tbZelmar_Movimentos where movimento_no > 2"_s);
     book.hospital(u"1"_s, u"Hospital A"_s);
     EXPECT_EQ(written(twoLevels(), open(TwoLevelStatement)).toStdString(),
-              "\ufeffhospital;movimento_no;divida\r\nHospital A;2;-1235,6\r\n");
+              "\ufeff\"hospital\";\"movimento_no\";\"divida\"\r\n\"Hospital A\";2;-1235,6\r\n");
 }
 
 }  // namespace
