@@ -2,6 +2,7 @@
 #include "boundary/General.h"
 
 #include <QApplication>
+#include <QThread>
 
 #include "boundary/Login.h"
 #include "boundary/Registo.h"
@@ -17,6 +18,24 @@
 using namespace Qt::StringLiterals;
 
 namespace {
+
+/// All screens, the connections and the login state belong to the application's thread.
+void requireThread() {
+    const QCoreApplication* const application = QCoreApplication::instance();
+    if (application && QThread::currentThread() != application->thread())
+        throw core::Failure(core::InvalidCall,
+                            u"Esta operação só pode ser chamada na linha de execução principal do "
+                            "programa, a das janelas."_s);
+}
+
+/// The run of an operation.
+class Operation {
+public:
+    Operation() { requireThread(); }
+
+private:
+    core::HandlerScope scope_;
+};
 
 QString notYetText(const QString& operation) {
     return u"A operação %1 ainda não está disponível nesta versão."_s.arg(operation);
@@ -55,7 +74,7 @@ void requireApplication() {
 /// caller's variables receive.
 void openNew(QString* strConMember, QString* strSQL,
              const std::function<void(QString&, QString&)>& open) {
-    const core::HandlerScope scope;
+    const Operation running;
     if (!loggedInOrRefused()) return;
     requireApplication();
     QString leftOut[2];
@@ -65,7 +84,7 @@ void openNew(QString* strConMember, QString* strSQL,
 /// A screen that the operation waits for.
 template <class Screen>
 void showModal() {
-    const core::HandlerScope scope;
+    const Operation running;
     if (!loggedInOrRefused()) return;
     requireApplication();
     forms::DefaultInstance<Screen>::get().ShowModal();
@@ -73,14 +92,14 @@ void showModal() {
 
 /// An operation whose screen is still to come.
 void openLater(const QString& operation) {
-    const core::HandlerScope scope;
+    const Operation running;
     if (loggedInOrRefused()) notYet(operation);
 }
 
 /// One of the operations whose failures say nothing and give false. That its screen is still to
 /// come is said in a box, as nobody would hear of it otherwise.
 bool openLaterInSilence(const QString& operation) {
-    const core::HandlerScope scope;
+    const Operation running;
     try {
         openingPreamble();
         core::MsgBox(notYetText(operation), core::Icon::Critical);
@@ -93,6 +112,7 @@ bool openLaterInSilence(const QString& operation) {
 }  // namespace
 
 General::General() {
+    requireThread();
     forms::install();
 }
 
@@ -117,12 +137,12 @@ void General::CallFechoAno() {
 }
 
 bool General::Login(QString*, QString*, QString*, QString*, QString*) {
-    const core::HandlerScope scope;
+    const Operation running;
     return boundary::Login();
 }
 
 void General::Registo(const QVariant&, const QVariant& Pkey, QString*, QString*, QObject* Caller) {
-    const core::HandlerScope scope;
+    const Operation running;
     try {
         openingPreamble();
         requireApplication();

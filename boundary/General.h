@@ -10,7 +10,8 @@
 /// The operations stand in the order of their interface slots. Texts are by reference; null is an
 /// argument left out. It holds no data: all objects share one login state and one data environment.
 ///
-/// A failure goes up to the caller as a core::Failure, except where an operation says otherwise.
+/// A failure goes up to the caller as a core::Failure, except where an operation says otherwise. A
+/// call in another thread than the application's always fails so.
 /// Without a valid login all but the marked operations show the refusal "Bad Login" and return.
 class General : public QObject {
     Q_OBJECT

@@ -1,9 +1,14 @@
 // SPDX-License-Identifier: MIT
 // The component's way out: its object for hosts, its class, and the four entry points.
+#include <QApplication>
+#include <QThread>
+#include <algorithm>
+
 #include "boundary/General.h"
 #include "boundary/IGeneral.h"
 #include "platform/com/Counted.h"
 #include "platform/com/Server.h"
+#include "platform/forms/Form.h"
 
 using namespace Qt::StringLiterals;
 
@@ -99,9 +104,21 @@ com::Dispatch* makeGeneral() {
     return new GeneralComponent;
 }
 
+/// Screens outlive the object whose operation opened them. They can only be looked for in their own
+/// thread; elsewhere there may be one.
+bool isScreenShown() {
+    if (!qobject_cast<QApplication*>(QCoreApplication::instance())) return false;
+    if (QThread::currentThread() != qApp->thread()) return true;
+    const QWidgetList windows = QApplication::topLevelWidgets();
+    return std::any_of(windows.begin(), windows.end(), [](const QWidget* window) {
+        return window->isVisible() && qobject_cast<const forms::Form*>(window);
+    });
+}
+
 const com::ServedClass& servedGeneral() {
     static const com::ServedClass served{ClsidGeneral,   u"Zelmars.General"_s, u"Plano de saúde"_s,
-                                         u"1.00.0002"_s, u"_General"_s,        makeGeneral};
+                                         u"1.00.0002"_s, u"_General"_s,        makeGeneral,
+                                         isScreenShown};
     return served;
 }
 

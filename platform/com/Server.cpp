@@ -98,8 +98,9 @@ Status getClassObject(const ServedClass& served, const Guid& clsid, const Guid& 
     return status;
 }
 
-Status canUnloadNow() {
-    return serverUse() == 0 ? Ok : False;
+Status canUnloadNow(const ServedClass& served) {
+    const bool isInUse = serverUse() != 0 || (served.isInUse && served.isInUse());
+    return isInUse ? False : Ok;
 }
 
 Status registerServer(const ServedClass& served, const void* anyFunctionOfTheServer) {

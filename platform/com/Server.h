@@ -21,6 +21,8 @@ struct ServedClass {
     QString interfaceName;  ///< "_General"
     /// Makes a component with one reference.
     Dispatch* (*make)();
+    /// Whether something else than objects keeps the server loaded; null when nothing does.
+    bool (*isInUse)() = nullptr;
 };
 
 /// A component around a QObject that has no interface of its own: members by name only.
@@ -34,7 +36,7 @@ std::atomic<quint32>& serverUse();
 // DllRegisterServer and DllUnregisterServer with C linkage (the macro below) and answers with
 // these.
 Status getClassObject(const ServedClass& served, const Guid& clsid, const Guid& iid, void** object);
-Status canUnloadNow();
+Status canUnloadNow(const ServedClass& served);
 /// Writes the class into HKEY_CLASSES_ROOT: programmatic name, class id, the path of the shared
 /// object that holds `anyFunctionOfTheServer`, interface and version.
 Status registerServer(const ServedClass& served, const void* anyFunctionOfTheServer);
@@ -52,7 +54,7 @@ QString guidText(const Guid& guid);
         return clsid && iid ? com::getClassObject(served(), *clsid, *iid, object) : com::Pointer; \
     }                                                                                             \
     Q_DECL_EXPORT com::Status DllCanUnloadNow() {                                                 \
-        return com::canUnloadNow();                                                               \
+        return com::canUnloadNow(served());                                                       \
     }                                                                                             \
     Q_DECL_EXPORT com::Status DllRegisterServer() {                                               \
         return com::registerServer(served(), reinterpret_cast<const void*>(&DllRegisterServer));  \

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "boundary/General.h"
 
+#include <QLibrary>
+#include <QThread>
+
 #include "entry/frmMovimentos.h"
 #include "platform/com/Component.h"
 #include "tests/boundary/Configured.h"
@@ -91,6 +94,39 @@ TEST_F(PublicClass, NewMovimentoGivesItsDefaultsBackAndAnotherLoginLeavesItItsRo
     EXPECT_TRUE(row->isNewRow());
     row->Update();
     EXPECT_EQ(book.value(u"select doc_no from tbZelmar_Movimentos"_s), u"FT 17"_s);
+}
+
+TEST_F(PublicClass, AnswersOnlyInTheThreadOfTheWindows) {
+    QList<std::pair<QString, QVariantList>> all(std::begin(Refusing), std::end(Refusing));
+    all += {{u"Login"_s, {}},
+            {u"Registo"_s, {QVariant(), 1}},
+            {u"Ldividas"_s, {}},
+            {u"Lcartasdividas"_s, {}},
+            {u"Lhospitais"_s, {}}};
+    QStringList texts;
+    QScopedPointer<QThread> elsewhere(QThread::create([&] {
+        for (const auto& [operation, arguments] : all)
+            texts << failureOf([&] { com::call(&general, operation, QVariantList(arguments)); });
+        texts << failureOf([] { General(); });
+    }));
+    elsewhere->start();
+    elsewhere->wait();
+    EXPECT_EQ(texts.size(), 16);
+    for (const QString& text : texts)
+        EXPECT_TRUE(text.contains(u"linha de execução principal"_s)) << qPrintable(text);
+    EXPECT_FALSE(environment::loginState().bLoggedIn);
+}
+
+TEST_F(PublicClass, StaysLoadedWhileAScreenIsShown) {
+    QLibrary server(QCoreApplication::applicationDirPath() + u"/libZelmars.so"_s);
+    const auto canUnload = reinterpret_cast<com::Status (*)()>(server.resolve("DllCanUnloadNow"));
+    ASSERT_TRUE(canUnload);
+    EXPECT_EQ(canUnload(), com::Ok);
+    general.NewMovimento(false);
+    ASSERT_TRUE(isEntryShown());
+    EXPECT_EQ(canUnload(), com::False);
+    forms::DefaultInstance<entry::frmMovimentos>::unload();
+    EXPECT_EQ(canUnload(), com::Ok);
 }
 
 TEST_F(PublicClass, RegistoIsSilentAboutWhatItDoesNotShow) {
