@@ -7,10 +7,10 @@
 
 namespace core {
 
-bool isPrivate(const QString& file) {
+bool isPrivate(const QString& file, QFileDevice::Permissions except) {
     constexpr QFile::Permissions others = QFile::ReadGroup | QFile::WriteGroup | QFile::ExeGroup |
                                           QFile::ReadOther | QFile::WriteOther | QFile::ExeOther;
-    return !(QFile::permissions(file) & others);
+    return !(QFile::permissions(file) & others & ~except);
 }
 
 bool makePrivateFolder(const QString& folder) {

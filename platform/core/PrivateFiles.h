@@ -11,8 +11,8 @@ namespace core {
 inline constexpr QFileDevice::Permissions OwnerOnly =
     QFileDevice::ReadOwner | QFileDevice::WriteOwner;
 
-/// True when nobody but the owner has any right to the file.
-bool isPrivate(const QString& file);
+/// True when nobody but the owner has any right to the file, except for those named.
+bool isPrivate(const QString& file, QFileDevice::Permissions except = {});
 
 /// Makes a folder that only its owner enters, and the folders above it that are missing likewise.
 /// One that is there already keeps its mode. False when it cannot be made.

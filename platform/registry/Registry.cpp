@@ -27,15 +27,24 @@ constexpr std::array<std::pair<Hive, QStringView>, 7> HiveNames{{
     {Hive::DynData, u"HKEY_DYN_DATA"},
 }};
 
+/// The administrator's folder, for all users of the machine.
+const QString MachineFolder = u"/etc/zelmars/registry"_s;
+
 /// The folders that are read, the one that overrides the others first.
 QStringList readFolders() {
     const QString own = writableFolder();
     if (!qEnvironmentVariableIsEmpty("ZELMARS_REGISTRY")) return {own};
-    return {own, u"/etc/zelmars/registry"_s};
+    return {own, MachineFolder};
 }
 
 QString fileOf(const QString& folder, Hive hive) {
     return folder + u'/' + hiveName(hive) + u".ini"_s;
+}
+
+SettingsFile fileIn(const QString& folder, Hive hive) {
+    using Readers = SettingsFile::Readers;
+    return SettingsFile(fileOf(folder, hive),
+                        folder == MachineFolder ? Readers::Group : Readers::Owner);
 }
 
 /// A key's path, or a value's, as the settings file spells it. The value without a name stands
@@ -107,7 +116,7 @@ std::optional<Key> Key::open(Hive hive, const QString& path) {
     const QString name = entryName(path, {});
     if (name.isEmpty()) return Key(hive, path);
     for (const QString& folder : readFolders()) {
-        const QStringList entries = SettingsFile(fileOf(folder, hive)).entries();
+        const QStringList entries = fileIn(folder, hive).entries();
         if (std::any_of(entries.begin(), entries.end(),
                         [&](const QString& entry) { return liesUnder(entry, name); }))
             return Key(hive, path);
@@ -118,7 +127,7 @@ std::optional<Key> Key::open(Hive hive, const QString& path) {
 std::optional<QString> Key::value(const QString& name) const {
     const QString wanted = entryName(path_, name);
     for (const QString& folder : readFolders()) {
-        if (const auto text = SettingsFile(fileOf(folder, hive_)).value(wanted)) return text;
+        if (const auto text = fileIn(folder, hive_).value(wanted)) return text;
     }
     return std::nullopt;
 }

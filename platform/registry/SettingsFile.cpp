@@ -150,7 +150,7 @@ bool liesUnder(const QString& entry, const QString& name) {
            entry.startsWith(name + u'/', Qt::CaseInsensitive);
 }
 
-SettingsFile::SettingsFile(const QString& file) : file_(file) {
+SettingsFile::SettingsFile(const QString& file, Readers readers) : file_(file) {
     QFile source(file);
     if (!source.exists()) return;
     if (!source.open(QFile::ReadOnly))
@@ -168,7 +168,7 @@ SettingsFile::SettingsFile(const QString& file) : file_(file) {
             throw refusal(u"%1, linha %2: não é texto em UTF-8."_s.arg(file).arg(number));
         lines_.push_back(understood(text, number, group));
     }
-    refusePassword();
+    refusePassword(readers);
 }
 
 SettingsFile::Line SettingsFile::understood(const QString& text, qsizetype number,
@@ -201,14 +201,16 @@ SettingsFile::Line SettingsFile::understood(const QString& text, qsizetype numbe
     return {text, group, entry, written.isNull() ? u""_s : written};
 }
 
-void SettingsFile::refusePassword() const {
+void SettingsFile::refusePassword(Readers readers) const {
     const bool holdsPassword = std::any_of(lines_.begin(), lines_.end(), [](const Line& line) {
         return line.entry.endsWith("password"_L1, Qt::CaseInsensitive) && !line.value.isEmpty();
     });
-    if (holdsPassword && !core::isPrivate(file_))
+    const bool isShared = readers == Readers::Group;
+    const QFile::Permissions theirs = isShared ? QFile::ReadGroup : QFile::Permissions();
+    if (holdsPassword && !core::isPrivate(file_, theirs))
         throw refusal(
             u"O ficheiro %1 contém uma palavra-passe e outros utilizadores têm acesso a ele. "
-            "Corrija-o com o comando: chmod 600 '%1'"_s.arg(file_));
+            "Corrija-o com o comando: chmod %2 '%1'"_s.arg(file_, isShared ? u"640"_s : u"600"_s));
 }
 
 const SettingsFile::Line* SettingsFile::find(const QString& entry) const {

@@ -15,10 +15,16 @@ namespace registry {
 /// case; the group "General" is no part of it. Comments and the order of the lines are kept.
 class SettingsFile {
 public:
+    /// Who may read a file that holds a password.
+    enum class Readers {
+        Owner,
+        Group,  ///< of a file that the administrator keeps for several users
+    };
+
     /// Reads the file; a missing one is empty. Fails with the file's name and the number of the
     /// line when a line has no meaning, when the file cannot be read, or when it holds a password
-    /// and somebody else than its owner has access to it.
-    explicit SettingsFile(const QString& file);
+    /// and somebody else has access to it.
+    explicit SettingsFile(const QString& file, Readers readers = Readers::Owner);
 
     QStringList entries() const;
     /// Nothing for a missing entry. Of several with the same name the last one counts.
@@ -39,7 +45,7 @@ private:
     };
     Line understood(const QString& text, qsizetype number, QString& group) const;
     const Line* find(const QString& entry) const;
-    void refusePassword() const;
+    void refusePassword(Readers readers) const;
 
     QString file_;
     std::vector<Line> lines_;

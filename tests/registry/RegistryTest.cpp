@@ -7,6 +7,7 @@
 #include <QTemporaryDir>
 #include <thread>
 
+#include "platform/registry/SettingsFile.h"
 #include "tests/support/Failure.h"
 
 using namespace Qt::StringLiterals;
@@ -154,6 +155,13 @@ TEST_F(Registry, AFileOpenToOthersGetsNoValueAndGivesNoPassword) {
     writeFile("[SOFTWARE]\nNorvanta\\Corvenda\\dtPassword=x\n");
     open();
     EXPECT_TRUE(failureOfReading().contains(command));
+    // The file that the administrator keeps for several users is read by their group.
+    const auto shared = [&] {
+        registry::SettingsFile(file(), registry::SettingsFile::Readers::Group);
+    };
+    EXPECT_NO_THROW(shared());
+    QFile::setPermissions(file(), QFile::ReadOwner | QFile::ReadGroup | QFile::WriteGroup);
+    EXPECT_THROW(shared(), core::Failure);
 }
 
 TEST_F(Registry, AFolderThatCannotBeMadeIsTold) {
