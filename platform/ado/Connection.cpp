@@ -84,6 +84,10 @@ const std::shared_ptr<Session>& Connection::session() const {
     return session_;
 }
 
+bool Connection::hasTable(QStringView name) const {
+    return session()->isTable(name);
+}
+
 bool Connection::shapes() const {
     return shapes_;
 }

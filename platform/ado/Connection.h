@@ -34,6 +34,8 @@ public:
 
     /// The open session, for the row sets. Fails with ObjectClosed when the connection is closed.
     const std::shared_ptr<Session>& session() const;
+    /// True when the book has a table of that name, which books of older programs may lack.
+    bool hasTable(QStringView name) const;
     /// True when the provider of the connection string shapes.
     bool shapes() const;
 

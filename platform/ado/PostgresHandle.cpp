@@ -185,18 +185,21 @@ PostgresResult PostgresHandle::run(const std::vector<PostgresCall>& calls) {
     }
 }
 
-PostgresResult PostgresHandle::runThenCommit(const PostgresCall& call) {
+PostgresResult PostgresHandle::runThenCommit(const PostgresCall& call, const More& more) {
     requireConnection();
     const int count = dispatch(call);
     flush();
     drain(0);
     PostgresResult result = answers(count);
     const bool isDone = !isFailure(result.get());
+    const std::optional<PostgresCall> further = isDone ? more(result.get()) : std::nullopt;
+    if (further) dispatch(*further);
     synchronise();
     try {
         const PostgresResult refusal = drain(0);
         if (isDone && refusal) refuse(refusal.get());
     } catch (const core::Failure& failure) {
+        if (further) forget(further->text);
         if (!isDone || !lost_) throw;
         throw core::Failure(
             failure.number(),

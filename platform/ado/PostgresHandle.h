@@ -7,6 +7,7 @@
 #include <QDeadlineTimer>
 #include <QHash>
 #include <QString>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <vector>
@@ -78,7 +79,9 @@ public:
     /// Runs one statement and, once it is answered, commits it: a server that wakes up late finds
     /// nobody to commit, so that a row added again after a failure stands once. Where only the
     /// answer to the commit is lost, the failure's text says so.
-    PostgresResult runThenCommit(const PostgresCall& call);
+    /// @param more  what goes into the same commit, told by the answer; may be nothing
+    using More = std::function<std::optional<PostgresCall>(const PGresult* answer)>;
+    PostgresResult runThenCommit(const PostgresCall& call, const More& more);
     /// Runs one statement that will hardly come again, and commits it.
     PostgresResult runOnce(const QByteArray& text);
     /// Sends a statement and commits it, without waiting for the answer, which nobody sees.

@@ -44,18 +44,78 @@ QByteArray parameter(std::size_t number) {
     return '$' + QByteArray::number(static_cast<qulonglong>(number));
 }
 
+QByteArray insertText(const QString& table, const QStringList& columns) {
+    const QByteArray into = "INSERT INTO " + quoted(table);
+    if (columns.isEmpty()) return into + " DEFAULT VALUES";
+    QByteArray names;
+    QByteArray marks;
+    std::size_t number = 0;
+    for (const QString& column : columns) {
+        names += (names.isEmpty() ? "(" : ",") + quoted(column);
+        marks += (marks.isEmpty() ? "" : ",") + parameter(++number);
+    }
+    return into + names + ") VALUES(" + marks + ')';
+}
+
+/// "a"=$1 and so on, for each column, the parameters counted on from `before`.
+QByteArray equal(const QStringList& columns, const char* between, std::size_t before = 0) {
+    QByteArray text;
+    for (const QString& column : columns)
+        text += (text.isEmpty() ? "" : between) + quoted(column) + '=' + parameter(++before);
+    return text;
+}
+
+/// The write, failing with DivisionByZero when it does not touch exactly one row: nothing of its
+/// transaction is stored then, and no answer has to be waited for before the commit is sent.
+QByteArray exactlyOne(const QByteArray& write) {
+    return "WITH written AS (" + write +
+           " RETURNING 1) SELECT 1 / (count(*) = 1)::integer FROM written";
+}
+
+/// @param row  the row that is accompanied
+PostgresCall callOf(const Accompanying& with, RowIdentity row) {
+    PostgresValues values = parametersOf(with.values);
+    if (with.kind == Accompanying::Kind::Insert) {
+        QStringList columns = with.columns;
+        if (!with.keyColumn.isEmpty()) {
+            columns += with.keyColumn;
+            values.emplace_back(QByteArray::number(row));
+        }
+        return {insertText(with.table, columns), values};
+    }
+    const QByteArray where = " WHERE " + equal(with.whereColumns, " AND ", values.size());
+    const QByteArray head =
+        with.kind == Accompanying::Kind::Delete
+            ? "DELETE FROM " + quoted(with.table)
+            : "UPDATE " + quoted(with.table) + " SET " + equal(with.columns, ",");
+    for (const auto& value : parametersOf(with.whereValues)) values.push_back(value);
+    return {exactlyOne(head + where), values};
+}
+
 // Classes of SQLSTATE.
 constexpr auto WrongStatement = "42"_L1;
 constexpr auto WrongValue = "22"_L1;
 // Codes of their own.
 constexpr auto MissingTable = "42P01"_L1;
 constexpr auto MissingColumn = "42703"_L1;
+constexpr auto DivisionByZero = "22012"_L1;
 constexpr auto NotSupported = "0A"_L1;  // among others, columns of another type than before
 
 /// True when the server may take a statement whole that it refused with parameters in it.
 bool isAboutTypes(const QString& code) {
     return code.startsWith(WrongStatement) || code.startsWith(WrongValue) ||
            code.startsWith(NotSupported);
+}
+
+/// Runs a write with what accompanies it.
+template <class Work>
+PostgresResult accompanied(const Work& work) {
+    try {
+        return work();
+    } catch (const core::Failure& failure) {
+        if (failure.code() != DivisionByZero) throw;
+        throw core::Failure(core::NotAccompanied, NotAccompaniedText.toString());
+    }
 }
 
 }  // namespace
@@ -198,43 +258,38 @@ bool PostgresSession::read(const QString& table, RowIdentity row, RowStore& into
 }
 
 RowIdentity PostgresSession::insert(const QString& table, const QStringList& columns,
-                                    const std::vector<QVariant>& values) {
-    QByteArray text = "INSERT INTO " + quoted(table);
-    if (columns.isEmpty()) {
-        text += " DEFAULT VALUES";
-    } else {
-        QByteArray marks;
-        text.reserve(text.size() + columns.size() * 24);
-        std::size_t number = 0;
-        for (const QString& column : columns) {
-            text += number == 0 ? '(' : ',';
-            text += quoted(column);
-            marks += number == 0 ? "$" : ",$";
-            marks += QByteArray::number(static_cast<qulonglong>(++number));
-        }
-        text += ") VALUES(" + marks + ')';
-    }
-    text += " RETURNING " + quoted(identity(table));
+                                    const std::vector<QVariant>& values,
+                                    const Accompaniment& with) {
+    const QByteArray text = insertText(table, columns) + " RETURNING " + quoted(identity(table));
     PostgresHandle& handle = writerOf(table, NoRow);
     const PostgresResult written = noticing([&] {
-        return handle.runThenCommit({text, parametersOf(values)});
+        return accompanied([&] {
+            return handle.runThenCommit({text, parametersOf(values)},
+                                        [&](const PGresult* added) -> std::optional<PostgresCall> {
+                                            if (!with) return std::nullopt;
+                                            return callOf(*with, cellOf(added, 0, 0).integer);
+                                        });
+        });
     });
     return cellOf(written.get(), 0, 0).integer;
 }
 
 bool PostgresSession::update(const QString& table, RowIdentity row, const QStringList& columns,
-                             const std::vector<QVariant>& values) {
-    QByteArray changes;
-    std::size_t number = 0;
-    for (const QString& column : columns)
-        changes += (changes.isEmpty() ? "" : ",") + quoted(column) + '=' + parameter(++number);
+                             const std::vector<QVariant>& values, const Accompaniment& with) {
     PostgresValues parameters = parametersOf(values);
     parameters.push_back(QByteArray::number(row));
-    const QByteArray text = "UPDATE " + quoted(table) + " SET " + changes + " WHERE " +
-                            quoted(identity(table)) + '=' + parameter(++number);
+    const QByteArray text = "UPDATE " + quoted(table) + " SET " + equal(columns, ",") + " WHERE " +
+                            quoted(identity(table)) + '=' + parameter(parameters.size());
     PostgresHandle& handle = writerOf(table, row);
-    const PostgresResult written = noticing([&] { return handle.run(text, parameters); });
-    return std::atoi(PQcmdTuples(written.get())) > 0;
+    if (!with) {
+        const PostgresResult written = noticing([&] { return handle.run(text, parameters); });
+        return std::atoi(PQcmdTuples(written.get())) > 0;
+    }
+    std::vector<PostgresCall> calls;
+    if (!columns.isEmpty()) calls.push_back({exactlyOne(text), parameters});
+    calls.push_back(callOf(*with, row));
+    noticing([&] { return accompanied([&] { return handle.run(calls); }); });
+    return true;
 }
 
 bool PostgresSession::remove(const QString& table, RowIdentity row) {

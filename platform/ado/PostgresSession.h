@@ -31,9 +31,9 @@ public:
     bool isTable(QStringView name) override;
     bool read(const QString& table, RowIdentity row, RowStore& into) override;
     RowIdentity insert(const QString& table, const QStringList& columns,
-                       const std::vector<QVariant>& values) override;
+                       const std::vector<QVariant>& values, const Accompaniment& with) override;
     bool update(const QString& table, RowIdentity row, const QStringList& columns,
-                const std::vector<QVariant>& values) override;
+                const std::vector<QVariant>& values, const Accompaniment& with) override;
     bool remove(const QString& table, RowIdentity row) override;
     std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                   RowStore& into) override;

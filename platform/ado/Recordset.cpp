@@ -113,8 +113,8 @@ void Recordset::AddNew() {
     emit currentRowChanged();
 }
 
-void Recordset::Update() {
-    d->update();
+void Recordset::Update(const Accompaniment& with) {
+    d->update(with);
     emit currentRowChanged();
 }
 

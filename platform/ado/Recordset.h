@@ -5,6 +5,7 @@
 #include <QVariant>
 #include <memory>
 
+#include "platform/ado/Accompanying.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/Constants.h"
 
@@ -83,7 +84,9 @@ public:
     void AddNew();
     /// Writes the changed columns of the current row, or the new row, whose generated key and
     /// defaults can be read afterwards. Without a change it does nothing. The lock of the row goes.
-    void Update();
+    /// @param with  written in the same commit, also when the row itself has no change; fails with
+    /// NotAccompanied, and writes nothing, where it does not find its row
+    void Update(const Accompaniment& with = {});
     /// Drops what was written to the current row since it became current, or the pending new row.
     void CancelUpdate();
     void Delete();

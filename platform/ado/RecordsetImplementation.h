@@ -147,9 +147,9 @@ struct Recordset::Implementation {
     std::shared_ptr<Session> session() const;
     bool setValue(int column, const QVariant& value);
     void addNew();
-    void update();
-    void insertNew();
-    void updateCurrent();
+    void update(const Accompaniment& with);
+    void insertNew(const Accompaniment& with);
+    void updateCurrent(const Accompaniment& with);
     void cancel();
     void remove();
 };

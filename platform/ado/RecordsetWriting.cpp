@@ -40,11 +40,11 @@ void Recordset::Implementation::addNew() {
     at = At::New;
 }
 
-void Recordset::Implementation::update() {
+void Recordset::Implementation::update(const Accompaniment& with) {
     requireRow();
     try {
-        if (at == At::New) return insertNew();
-        if (!changes.isEmpty()) updateCurrent();
+        if (at == At::New) return insertNew(with);
+        if (!changes.isEmpty() || with) updateCurrent(with);
     } catch (const core::Failure& failure) {
         throw explained(failure, (at == At::New ? u"INSERT INTO "_s : u"UPDATE "_s) + table);
     }
@@ -53,7 +53,7 @@ void Recordset::Implementation::update() {
     settled = true;
 }
 
-void Recordset::Implementation::insertNew() {
+void Recordset::Implementation::insertNew(const Accompaniment& with) {
     requireTable();
     if (heldPlace && !heldPlace->isUnbroken())
         throw core::Failure(
@@ -66,7 +66,7 @@ void Recordset::Implementation::insertNew() {
         columns += rows->columns().column(column).name;
         values.push_back(value);
     }
-    added.push_back(session()->insert(table, columns, values));
+    added.push_back(session()->insert(table, columns, values, with));
     heldPlace.reset();
     addedAt = static_cast<qint64>(added.size()) - 1;
     at = At::Added;
@@ -75,7 +75,7 @@ void Recordset::Implementation::insertNew() {
     wantsFresh = true;
 }
 
-void Recordset::Implementation::updateCurrent() {
+void Recordset::Implementation::updateCurrent(const Accompaniment& with) {
     requireTable();
     holdStill();
     QStringList columns;
@@ -84,7 +84,7 @@ void Recordset::Implementation::updateCurrent() {
         columns += rows->columns().column(column).name;
         values.push_back(value);
     }
-    if (!session()->update(table, identity(), columns, values))
+    if (!session()->update(table, identity(), columns, values, with))
         throw core::Failure(core::DatabaseFailure,
                             u"A linha foi entretanto apagada por outro posto; não foi gravada."_s);
     wantsFresh = at == At::Added || fresh.count() > 0;

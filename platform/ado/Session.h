@@ -6,6 +6,7 @@
 #include <memory>
 #include <vector>
 
+#include "platform/ado/Accompanying.h"
 #include "platform/ado/Cell.h"
 #include "platform/ado/Recordset.h"
 
@@ -77,13 +78,14 @@ public:
     /// when it is gone.
     virtual bool read(const QString& table, RowIdentity row, RowStore& into) = 0;
 
-    // One statement, one commit each. `columns` names what is written, `values` runs beside it. A
-    // row whose lock was lost with its connection is not written: RowInUse.
+    // One commit each. `columns` names what is written, `values` runs beside it. A row whose lock
+    // was lost with its connection is not written: RowInUse. Where what accompanies the write does
+    // not touch exactly one row, nothing is written: NotAccompanied.
     virtual RowIdentity insert(const QString& table, const QStringList& columns,
-                               const std::vector<QVariant>& values) = 0;
-    /// False when the row is gone.
+                               const std::vector<QVariant>& values, const Accompaniment& with) = 0;
+    /// False when the row is gone. Without columns only what accompanies the row is written.
     virtual bool update(const QString& table, RowIdentity row, const QStringList& columns,
-                        const std::vector<QVariant>& values) = 0;
+                        const std::vector<QVariant>& values, const Accompaniment& with) = 0;
     virtual bool remove(const QString& table, RowIdentity row) = 0;
 
     /// Holds a row, waiting at most `timeoutSeconds`, and reads it afresh as read() does; fails

@@ -36,6 +36,14 @@ QByteArray insertText(const QString& table, const QStringList& columns) {
     return into + '(' + names + ") VALUES(" + marks + ')';
 }
 
+/// "a"=? and so on, for each column.
+QByteArray equal(const QStringList& columns, const char* between) {
+    QByteArray text;
+    for (const QString& column : columns)
+        text += (text.isEmpty() ? "" : between) + quoted(column) + "=?";
+    return text;
+}
+
 }  // namespace
 
 SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds)
@@ -179,22 +187,75 @@ bool SqliteSession::read(const QString& table, RowIdentity row, RowStore& into) 
 }
 
 RowIdentity SqliteSession::insert(const QString& table, const QStringList& columns,
-                                  const std::vector<QVariant>& values) {
+                                  const std::vector<QVariant>& values, const Accompaniment& with) {
     // Many rows that are added one after the other have the same columns.
     if (inserted_.text.isEmpty() || inserted_.table != table || inserted_.columns != columns)
         inserted_ = {table, columns, insertText(table, columns)};
-    write(inserted_.text, values);
-    return sqlite3_last_insert_rowid(writer().get());
+    RowIdentity row = NoRow;
+    const auto add = [&] {
+        write(inserted_.text, values);
+        row = sqlite3_last_insert_rowid(writer().get());
+    };
+    if (!with) {
+        add();
+        return row;
+    }
+    together([&] {
+        add();
+        accompany(*with, row);
+    });
+    return row;
 }
 
 bool SqliteSession::update(const QString& table, RowIdentity row, const QStringList& columns,
-                           const std::vector<QVariant>& values) {
-    QByteArray changes;
-    for (const QString& column : columns)
-        changes += (changes.isEmpty() ? "" : ",") + quoted(column) + "=?";
+                           const std::vector<QVariant>& values, const Accompaniment& with) {
     std::vector<QVariant> bound = values;
     bound.emplace_back(row);
-    return write("UPDATE " + quoted(table) + " SET " + changes + " WHERE _rowid_=?", bound) > 0;
+    const auto change = [&] {
+        return columns.isEmpty() ||
+               write("UPDATE " + quoted(table) + " SET " + equal(columns, ",") + " WHERE _rowid_=?",
+                     bound) > 0;
+    };
+    if (!with) return change();
+    bool isThere = true;
+    together([&] {
+        isThere = change();
+        if (isThere) accompany(*with, row);
+    });
+    return isThere;
+}
+
+template <class Writes>
+void SqliteSession::together(const Writes& writes) {
+    SqliteHandle& handle = writer();
+    handle.run(handle.cached("BEGIN IMMEDIATE"));
+    try {
+        writes();
+        handle.run(handle.cached("COMMIT"));
+    } catch (...) {
+        // Some failures have ended the transaction already.
+        sqlite3_exec(handle.get(), "ROLLBACK", nullptr, nullptr, nullptr);
+        throw;
+    }
+}
+
+void SqliteSession::accompany(const Accompanying& with, RowIdentity row) {
+    QStringList columns = with.columns;
+    std::vector<QVariant> values = with.values;
+    if (with.kind == Accompanying::Kind::Insert) {
+        if (!with.keyColumn.isEmpty()) {
+            columns += with.keyColumn;
+            values.emplace_back(row);
+        }
+        write(insertText(with.table, columns), values);
+        return;
+    }
+    values.insert(values.end(), with.whereValues.begin(), with.whereValues.end());
+    const QByteArray head = with.kind == Accompanying::Kind::Delete
+                                ? "DELETE FROM " + quoted(with.table)
+                                : "UPDATE " + quoted(with.table) + " SET " + equal(columns, ",");
+    if (write(head + " WHERE " + equal(with.whereColumns, " AND "), values) != 1)
+        throw core::Failure(core::NotAccompanied, NotAccompaniedText.toString());
 }
 
 bool SqliteSession::remove(const QString& table, RowIdentity row) {

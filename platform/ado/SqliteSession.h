@@ -22,9 +22,9 @@ public:
     bool isTable(QStringView name) override;
     bool read(const QString& table, RowIdentity row, RowStore& into) override;
     RowIdentity insert(const QString& table, const QStringList& columns,
-                       const std::vector<QVariant>& values) override;
+                       const std::vector<QVariant>& values, const Accompaniment& with) override;
     bool update(const QString& table, RowIdentity row, const QStringList& columns,
-                const std::vector<QVariant>& values) override;
+                const std::vector<QVariant>& values, const Accompaniment& with) override;
     bool remove(const QString& table, RowIdentity row) override;
     std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                   RowStore& into) override;
@@ -46,6 +46,10 @@ private:
     std::unique_ptr<SqliteHandle> opened(SqliteHandle::Role role) const;
     /// Runs a write with its values; gives the number of rows that it touched.
     int write(const QByteArray& text, const std::vector<QVariant>& values);
+    /// Runs writes in one commit; none of them stands when one fails.
+    template <class Writes>
+    void together(const Writes& writes);
+    void accompany(const Accompanying& with, RowIdentity row);
     /// Declared type of a view's column.
     std::optional<ColumnType> viewColumnType(QStringView view, QStringView column);
 

@@ -21,6 +21,7 @@ enum FailureNumber : int {
     ObjectOpen = 3705,
     NotUpdatable = 3251,
     RowInUse = 3260,
+    NotAccompanied = 3261,
     DatabaseFailure = -2147217900,
 };
 
