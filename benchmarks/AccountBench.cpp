@@ -41,7 +41,8 @@ void runReceipt(qint32 socio_id) {
     row->setCollect(u"tipo"_s, u"PAG"_s);
     row->setCollect(u"modo_pagamento"_s, u"CHQ"_s);
     row->setCollect(u"credito"_s, 40);
-    receipts::postReceipt({row, socio_id, u"Medição"_s, u"CHQ"_s, u"1"_s, u"40"_s});
+    data::Operation operation;
+    receipts::postReceipt({row, socio_id, u"Medição"_s, u"CHQ"_s, u"1"_s, u"40"_s}, operation);
 }
 
 /// A row is found, held, read as it is then, written and let go. Its first column as it was.
@@ -112,7 +113,8 @@ void measureOn(Report& report, Engine engine) {
     report.pair(
         annulment, 1.5, 20,
         [&] {
-            coverage::annul({shown, u"Medição"_s});
+            data::Operation operation;
+            coverage::annul({shown, u"Medição"_s}, operation);
         },
         [&] { runBareAnnulment(*alone, *shown); });
 }

@@ -137,7 +137,8 @@ void runPosting(const Case& of) {
     posting.Text7 = posting.Text1 = u"20-11-2026"_s;
     posting.Text5 = u"1234"_s;
     coverage::TryOut run;
-    coverage::post(posting, run);
+    data::Operation operation;
+    coverage::post(posting, run, operation);
 }
 
 /// The same try-outs on both books, in turn, so that the machine's moods fall on both alike. A

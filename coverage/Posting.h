@@ -4,6 +4,7 @@
 #include <functional>
 
 #include "coverage/TryOut.h"
+#include "data/Operations.h"
 
 namespace coverage {
 
@@ -22,11 +23,16 @@ struct PostingEntry {
 };
 
 /// Turns the pending row into a committed movement: asks, tries out once more, checks, draws the
-/// number, saves the row and adds to the accumulators. True when the movement was saved; false when
-/// it was refused or failed (the operator was told) and the screen stays.
+/// number, saves the row and adds to the accumulators. True when all of it is done; false when it
+/// was refused or failed (the operator was told) and the screen stays.
 ///
 /// Counter, movement and accumulator are three writes with no transaction around them: what was
-/// written before a failure stays. A failure of the last one is passed over.
-bool post(const PostingEntry& posting, TryOut& run);
+/// written before a failure stays.
+/// @param operation  of this entry from its first press of "&OK" to its last: on a movement that an
+/// earlier press registered only what is missing is done, and nothing is asked
+bool post(const PostingEntry& posting, TryOut& run, data::Operation& operation);
+
+/// Of documents and hospital bills.
+const data::MovementRules& documentRules();
 
 }  // namespace coverage

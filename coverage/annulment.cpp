@@ -3,7 +3,9 @@
 // accumulators taken back, in the tables in which the member lives now.
 #include "coverage/annulment.h"
 
+#include "coverage/Posting.h"
 #include "coverage/Statements.h"
+#include "coverage/stages.h"
 #include "data/Correction.h"
 #include "data/RowSets.h"
 #include "platform/com/Component.h"
@@ -24,6 +26,8 @@ void take(const ado::Recordset& shown, ado::Recordset& correcting, const QString
     if (!core::isNull(amount)) correcting.setCollect(column, factor * core::toSingle(amount));
 }
 
+}  // namespace
+
 /// Neither `liquido` nor `created_by` nor a mode is set: an annulled document therefore raises the
 /// franchise already used. It is meant so.
 void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
@@ -37,32 +41,34 @@ void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
 }
 
 /// The first row found; a missing one fails.
-void takeBack(const ado::Recordset& shown) {
+void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
     const ado::RecordsetPtr rows = data::openToWrite(statements::accumulator(
         shown.Collect(u"rubrica_id"_s), core::toLong(shown.Collect(u"socio_id"_s)),
         core::toText(shown.Collect(u"codABC"_s)), data::twinsOf(shown).accumulators));
     data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
     data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
     data::subtract(*rows, u"No_Docs"_s, 1);
-    rows->Update();
+    rows->Update(with);
     rows->Close();
 }
 
-}  // namespace
-
-bool annul(const Annulment& annulment) {
+bool annul(const Annulment& annulment, data::Operation& operation) {
     const ado::Recordset& shown = *annulment.shown;
-    if (!data::confirmAnnulment(u"Anular Lançamento"_s)) return false;
-    data::annul(shown, annulment.caption,
-                [&](ado::Recordset& correcting) { setCorrection(shown, correcting); });
-    // Failures above go up: only what an earlier procedure left pending is found here, and then
-    // the accumulators are left alone.
-    if (core::err().number() != 0)
-        core::MsgBox(u"Erro não especificado, contacte o Administrador do Sistema. "_s +
-                         core::err().description(),
-                     core::Icon::Critical, annulment.caption);
-    else if (!data::accumulatedOrTold([&] { takeBack(shown); }))
-        return true;
+    if (!data::isRegistered(operation) && !data::confirmAnnulment(u"Anular Lançamento"_s))
+        return false;
+    const data::Annulled outcome =
+        data::annul(shown, annulment.caption, documentRules(), operation);
+    if (outcome == data::Annulled::Unfinished) return false;
+    if (outcome == data::Annulled::Corrected) {
+        // Failures above do not get here: only what an earlier procedure left pending is found,
+        // and then the accumulators are left alone.
+        if (core::err().number() != 0)
+            core::MsgBox(u"Erro não especificado, contacte o Administrador do Sistema. "_s +
+                             core::err().description(),
+                         core::Icon::Critical, annulment.caption);
+        else if (!data::accumulatedOrTold(operation, shown, documentRules(), annulment.caption))
+            return false;
+    }
     if (annulment.CallbackClass)
         core::passingOver([&] {
             com::call(annulment.CallbackClass, u"RemoteKey"_s, {shown.Collect(u"movimento_id"_s)});

@@ -4,7 +4,7 @@
 #include <QObject>
 #include <QPointer>
 
-#include "platform/ado/Recordset.h"
+#include "data/Operations.h"
 
 namespace coverage {
 
@@ -16,11 +16,13 @@ struct Annulment {
 };
 
 /// Asks, marks the movement, writes its correcting row, takes the accumulators back and calls the
-/// caller back. True when the screen may go; false when the operator said no.
+/// caller back. True when the screen may go, also when somebody else had annulled the movement;
+/// false when the operator said no or something is missing, which he was told.
 ///
 /// Mark, counter, correcting row and accumulator are four writes with no transaction around them. A
-/// failure of the first three goes up, and annulling again completes them; one of the last is told,
-/// and nobody is called back.
-bool annul(const Annulment& annulment);
+/// failure of the first goes up.
+/// @param operation  of this screen from its first press of "Anular" to its last: what an earlier
+/// press did is not done again
+bool annul(const Annulment& annulment, data::Operation& operation);
 
 }  // namespace coverage

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "coverage/Posting.h"
 #include "coverage/Statements.h"
+#include "coverage/stages.h"
 #include "data/Codes.h"
 #include "data/NewMovement.h"
 #include "data/Procedures.h"
@@ -54,34 +55,43 @@ bool bankNumberCheck(qint32 socio_id) {
 
 /// A failing statement is passed over; false when one failed. A movement without a number is not
 /// saved: it would be paid without standing in the accumulators.
-bool save(const PostingEntry& posting) {
+bool save(const PostingEntry& posting, data::Operation& operation) {
     ado::Recordset& record = *posting.entry.record;
     passingOver([&] {
         record.setCollect(u"created_by"_s, data::ObterUtilizador());
-        data::numberAndSave(record);
+        data::numberAndSave(record, operation);
     });
     return data::savedOrTold(posting.entry.caption);
 }
 
-void addToAccumulators(const Entry& entry) {
-    const ado::RecordsetPtr rows =
-        data::openToWrite(statements::accumulator(entry.rubrica_id, entry.Socio_ID, entry.Text3));
+void addToAccumulators(const ado::Recordset& movement, const ado::Accompaniment& with) {
+    const QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
+    const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
+    const ado::RecordsetPtr rows = data::openToWrite(
+        statements::accumulator(rubrica_id, socio_id, core::toText(movement.Collect(u"codABC"_s))));
     if (rows->atEnd()) {
         rows->AddNew();
-        rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
-        rows->setCollect(u"Rubrica_ID"_s, entry.rubrica_id);
+        rows->setCollect(u"Socio_ID"_s, socio_id);
+        rows->setCollect(u"Rubrica_ID"_s, rubrica_id);
     }
-    data::add(*rows, u"credito_ac"_s, entry.record->Collect(u"credito"_s));
-    data::add(*rows, u"debito_ac"_s, entry.record->Collect(u"debito"_s));
+    data::add(*rows, u"credito_ac"_s, movement.Collect(u"credito"_s));
+    data::add(*rows, u"debito_ac"_s, movement.Collect(u"debito"_s));
     data::add(*rows, u"No_Docs"_s, 1);
-    rows->Update();
+    rows->Update(with);
     rows->Close();
 }
 
 }  // namespace
 
-bool post(const PostingEntry& posting, TryOut& run) {
+const data::MovementRules& documentRules() {
+    static const data::MovementRules rules{addToAccumulators, setCorrection, takeBack};
+    return rules;
+}
+
+bool post(const PostingEntry& posting, TryOut& run, data::Operation& operation) {
     const Entry& entry = posting.entry;
+    if (data::isRegistered(operation))
+        return data::finishPosting(operation, documentRules(), *entry.record, entry.caption);
     if (!data::confirmPosting(entry.caption)) return false;
     tryOut(entry, run);
     // Still true after the boxes of the minimum and of the number of documents: the posting then
@@ -92,9 +102,8 @@ bool post(const PostingEntry& posting, TryOut& run) {
     entry.record->setCollect(u"socio_id"_s, entry.Socio_ID);
     core::err().clear();
     if (core::toText(posting.modo_pagamento) == data::modo::Cheque) posting.askCheque(entry.record);
-    if (!save(posting)) return false;
-    passingOver([&] { addToAccumulators(entry); });
-    return true;
+    if (!save(posting, operation)) return false;
+    return data::accumulatedOrTold(operation, *entry.record, documentRules(), entry.caption);
 }
 
 }  // namespace coverage

@@ -4,7 +4,8 @@
 #include "coverage/Progress.h"
 #include "coverage/TryOut.h"
 
-/// The stages of a try-out, in the order in which a document passes through them.
+/// The stages of a try-out, in the order in which a document passes through them, and of its
+/// annulment.
 namespace coverage {
 
 /// Working values that the first stage leaves to the later ones; 32-bit floats, as the whole
@@ -24,5 +25,10 @@ bool applyCeilings(const Entry& entry, const Working& working, Progress& progres
 
 /// Writes balance, gross, net, credit and debit.
 void setAmounts(const Entry& entry, const Working& working, Progress& progress, TryOut& run);
+
+/// Sets what the correcting row of an annulled document keeps of it.
+void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting);
+/// Takes an annulled document back from its accumulators.
+void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with);
 
 }  // namespace coverage

@@ -5,6 +5,7 @@
 #include "data/MovementNumber.h"
 #include "data/RowSets.h"
 #include "platform/core/Clock.h"
+#include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 
@@ -23,27 +24,105 @@ bool confirmAnnulment(const QString& title) {
                         core::Buttons::YesNo) == core::Answer::Yes;
 }
 
-void annul(const ado::Recordset& shown, const QString& caption,
-           const std::function<void(ado::Recordset& correcting)>& setRest) {
-    const ado::RecordsetPtr rows =
-        openToWrite(u"Select * from "_s + twinsOf(shown).movements + u" where movimento_id = "_s +
-                    core::toText(shown.Collect(u"movimento_id"_s)));
-    if (rows->atEnd()) {
+namespace {
+
+ado::RecordsetPtr openMarkable(const ado::Recordset& shown) {
+    return openToWrite(u"Select * from "_s + twinsOf(shown).movements +
+                       u" where movimento_id = "_s +
+                       core::toText(shown.Collect(u"movimento_id"_s)));
+}
+
+void tellAnnulledElsewhere(const Operation& annulment, const QString& caption) {
+    const auto other = journal::annulmentOf(annulment.ficheiro, annulment.movimento_id);
+    QString text = u"O movimento nº %1 já foi anulado"_s.arg(annulment.movimento_no);
+    if (other) {
+        text +=
+            u" por %1, em %2"_s.arg(other->quem, other->quando.toString(u"dd-MM-yyyy, HH:mm"_s));
+        if (other->missing != Step::Nothing) text += u" ("_s + missingText(*other) + u')';
+    }
+    core::MsgBox(text + u". Nada foi gravado."_s, core::Icon::Information, caption);
+}
+
+void beginAnnulment(const ado::Recordset& shown, Operation& annulment) {
+    const auto number = [&](const QString& column) {
+        const QVariant value = shown.Collect(column);
+        return core::isNull(value) ? 0 : core::toLong(value);
+    };
+    begin(annulment, Operation::Kind::Annulment);
+    annulment.ficheiro = core::toText(shown.Collect(u"ficheiro"_s));
+    annulment.movimento_id = number(u"movimento_id"_s);
+    annulment.movimento_no = number(u"movimento_no"_s);
+    annulment.socio_id = number(u"socio_id"_s);
+    annulment.tipo = core::toText(shown.Collect(u"tipo"_s));
+}
+
+/// False when somebody else had annulled the movement.
+bool mark(ado::Recordset& movement, Operation& annulment) {
+    if (core::toText(movement.Collect(u"tipo"_s)) == tipo::Annulled) return false;
+    movement.setCollect(u"tipo"_s, tipo::Annulled.toString());
+    movement.setCollect(u"modo_pagamento"_s, modo::Annulled.toString());
+    annulment.missing = Step::Correction;
+    movement.Update(journal::begun(annulment));
+    annulment.isRegistered = true;
+    return true;
+}
+
+void addCorrection(const ado::Recordset& shown, ado::Recordset& rows, const MovementRules& rules,
+                   Operation& annulment) {
+    rows.AddNew();
+    rows.setCollect(u"data"_s, core::fromDate(core::today()));
+    rows.setCollect(u"tipo"_s, tipo::Correcting.toString());
+    rows.setCollect(u"socio_id"_s, shown.Collect(u"socio_id"_s));
+    rules.setCorrection(shown, rows);
+    Operation done = annulment;
+    done.correcao_no = drawMovementNumber();
+    rows.setCollect(u"movimento_no"_s, done.correcao_no);
+    if (annulment.isRegistered) {
+        rows.Update(journal::corrected(done));
+    } else {
+        done.missing = Step::Accumulator;
+        rows.Update(journal::begun(done));
+    }
+    rows.Close();
+    done.missing = Step::Accumulator;
+    done.isRegistered = true;
+    annulment = done;
+}
+
+}  // namespace
+
+void correct(const ado::Recordset& shown, const MovementRules& rules, Operation& annulment) {
+    addCorrection(shown, *openMarkable(shown), rules, annulment);
+}
+
+Annulled annul(const ado::Recordset& shown, const QString& caption, const MovementRules& rules,
+               Operation& annulment) {
+    const bool isRetry = annulment.isRegistered;
+    if (isRetry && annulment.missing != Step::Correction) return Annulled::Corrected;
+    if (!isRetry) beginAnnulment(shown, annulment);
+    const ado::RecordsetPtr rows = openMarkable(shown);
+    if (isRetry) {
+        // Marked by an earlier press.
+    } else if (rows->atEnd()) {
         // Only told: the correcting row is written all the same.
         core::MsgBox(u"Não foi possível anular este registo"_s, core::Icon::Critical, caption);
-    } else {
-        rows->setCollect(u"tipo"_s, tipo::Annulled.toString());
-        rows->setCollect(u"modo_pagamento"_s, modo::Annulled.toString());
-        rows->Update();
+    } else if (!mark(*rows, annulment)) {
+        rows->Close();
+        tellAnnulledElsewhere(annulment, caption);
+        return Annulled::Elsewhere;
     }
-    rows->AddNew();
-    rows->setCollect(u"data"_s, core::fromDate(core::today()));
-    rows->setCollect(u"tipo"_s, tipo::Correcting.toString());
-    rows->setCollect(u"socio_id"_s, shown.Collect(u"socio_id"_s));
-    setRest(*rows);
-    rows->setCollect(u"movimento_no"_s, drawMovementNumber());
-    rows->Update();
-    rows->Close();
+    try {
+        addCorrection(shown, *rows, rules, annulment);
+    } catch (const core::Failure& failure) {
+        if (!annulment.isRegistered) throw;
+        if (failure.number() == core::NotAccompanied) {
+            catchUp(annulment);
+            if (annulment.missing != Step::Correction) return Annulled::Corrected;
+        }
+        tellUnfinished(annulment, failure.text(), caption);
+        return Annulled::Unfinished;
+    }
+    return Annulled::Corrected;
 }
 
 }  // namespace data

@@ -2,9 +2,11 @@
 #include "data/NewMovement.h"
 
 #include "boundary/environment/dtZelmars.h"
+#include "data/Codes.h"
 #include "data/MovementNumber.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
+#include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
 
@@ -30,9 +32,30 @@ void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id) {
     core::err().clear();
 }
 
-void numberAndSave(ado::Recordset& movement) {
-    movement.setCollect(u"movimento_no"_s, drawMovementNumber());
-    movement.Update();
+void numberAndSave(ado::Recordset& movement, Operation& posting) {
+    begin(posting, Operation::Kind::Posting);
+    posting.ficheiro = ficheiro::Active.toString();
+    posting.socio_id = core::toLong(movement.Collect(u"socio_id"_s));
+    posting.tipo = core::toText(movement.Collect(u"tipo"_s));
+    posting.movimento_no = drawMovementNumber();
+    movement.setCollect(u"movimento_no"_s, posting.movimento_no);
+    posting.missing = Step::Accumulator;
+    movement.Update(journal::begun(posting, u"movimento_id"_s));
+    posting.isRegistered = true;
+}
+
+bool finishPosting(Operation& posting, const MovementRules& rules, ado::Recordset& record,
+                   const QString& caption) {
+    if (posting.missing == Step::Nothing) return true;
+    if (!record.isNewRow()) {
+        record.CancelUpdate();
+        return accumulatedOrTold(posting, record, rules, caption);
+    }
+    // The row was stored, but its answer was lost.
+    const ado::RecordsetPtr movement = openMovement(posting);
+    if (movement) return accumulatedOrTold(posting, *movement, rules, caption);
+    tellUnfinished(posting, u"O movimento já não está nas contas do ano."_s, caption);
+    return false;
 }
 
 bool savedOrTold(const QString& caption) {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "platform/ado/Recordset.h"
+#include "data/Operations.h"
 
 /// What every new movement goes through, whatever its type.
 namespace data {
@@ -18,8 +18,15 @@ bool confirmPosting(const QString& caption);
 void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id);
 
 /// Draws the movement's number and saves the pending row: two writes, the counter first. A row
-/// whose number cannot be drawn is not saved.
-void numberAndSave(ado::Recordset& movement);
+/// whose number cannot be drawn is not saved. From then on `posting` is registered and lacks the
+/// accumulator.
+void numberAndSave(ado::Recordset& movement, Operation& posting);
+
+/// A further "&OK" on a posting that is registered: adds the movement to the accumulators as it
+/// stands in the book, whatever was typed since. True when nothing is missing any more; otherwise
+/// the operator was told, as by accumulatedOrTold().
+bool finishPosting(Operation& posting, const MovementRules& rules, ado::Recordset& record,
+                   const QString& caption);
 
 /// True when no failure is pending. Otherwise shows its text, then says that nothing could be
 /// registered.

@@ -2,8 +2,6 @@
 #include "data/RowSets.h"
 
 #include "boundary/environment/dtZelmars.h"
-#include "platform/core/Failure.h"
-#include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 
 namespace data {
@@ -38,12 +36,6 @@ void add(ado::Recordset& row, const QString& column, const QVariant& amount) {
 
 void subtract(ado::Recordset& row, const QString& column, const QVariant& amount) {
     addTimes(-1, row, column, amount);
-}
-
-bool accumulatedOrTold(const std::function<void()>& write) {
-    if (core::passingOver(write)) return true;
-    core::MsgBox(core::err().description(), core::Icon::Critical);
-    return false;
 }
 
 void nullBecomesZero(ado::Recordset& row, const QString& column) {

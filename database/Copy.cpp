@@ -4,6 +4,7 @@
 #include <QFile>
 #include <QRegularExpression>
 #include <QSet>
+#include <algorithm>
 
 #include "database/Book.h"
 #include "database/PostgresBookReader.h"
@@ -59,18 +60,28 @@ TableShape ordered(const TableShape& shape, const Table& model) {
     return result;
 }
 
-QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes) {
+/// Books of older programs have no journal of operations; nothing is lost without it.
+constexpr auto Journal = "tboperacoes";
+
+bool hasJournal(const std::vector<TableShape>& shapes) {
+    return std::any_of(shapes.begin(), shapes.end(),
+                       [](const TableShape& shape) { return folded(shape.table.name) == Journal; });
+}
+
+QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes, bool withJournal) {
     QSet<QByteArray> names;
     for (const TableShape& shape : shapes)
         for (const QByteArray& column : shape.table.columns)
-            names += folded(shape.table.name + '.' + column);
+            if (withJournal || folded(shape.table.name) != Journal)
+                names += folded(shape.table.name + '.' + column);
     return names;
 }
 
 /// Nothing may be left behind, and nothing made up.
 void refuseDifferences(const std::vector<TableShape>& from, const std::vector<TableShape>& into) {
-    const QSet<QByteArray> source = columnsOf(from);
-    const QSet<QByteArray> target = columnsOf(into);
+    const bool withJournal = hasJournal(from);
+    const QSet<QByteArray> source = columnsOf(from, withJournal);
+    const QSet<QByteArray> target = columnsOf(into, withJournal);
     const auto refuse = [](const QSet<QByteArray>& lacking, const QString& where) {
         if (lacking.isEmpty()) return;
         QList<QByteArray> names = lacking.values();

@@ -226,7 +226,8 @@ void frmMovimentos::post() {
                                          &payments::frmPagamentoCheque::ask};
     coverage::TryOut run;
     run.onShown = [this](const coverage::Results& results) { showResults(results); };
-    if (coverage::post(posting, run)) leaveEntry();
+    if (coverage::post(posting, run, operation_)) return leaveEntry();
+    if (operation_.isRegistered) lockFields();
 }
 
 void frmMovimentos::Command4_Click() {
@@ -234,12 +235,13 @@ void frmMovimentos::Command4_Click() {
 }
 
 void frmMovimentos::leaveEntry() {
+    operation_ = {};
     Hide();
     if (onLeft) onLeft();
 }
 
 void frmMovimentos::Command6_Click() {
-    if (coverage::annul({Adodc1->Recordset(), Caption(), CallbackClass})) Unload();
+    if (coverage::annul({Adodc1->Recordset(), Caption(), CallbackClass}, operation_)) Unload();
 }
 
 void frmMovimentos::showResults(const coverage::Results& results) {

@@ -110,6 +110,7 @@ private:
 
     com::Object search_;  ///< the last search component; keeps its premium statement open
     QString memberNumber_;
+    data::Operation operation_;  ///< the posting or annulment that this screen is for
 };
 
 }  // namespace entry

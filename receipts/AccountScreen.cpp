@@ -51,9 +51,7 @@ void AccountScreen::showReadOnly(const ado::RecordsetPtr& rows) {
     No_Kor->bind(Adodc1, u"no_kor"_s);
     Text2->bind(Adodc1, u"nome"_s);
     Text2->setBackColor(BackColor::Window);
-    for (forms::TextBox* box : findChildren<forms::TextBox*>()) box->setLocked(true);
-    for (forms::DataCombo* combo : findChildren<forms::DataCombo*>()) combo->setLocked(true);
-    Text1->setLocked(true);
+    lockFields();
     Command1->hide();
     showForReading();
 }

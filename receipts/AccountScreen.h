@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "data/Operations.h"
 #include "platform/forms/DataCombo.h"
 #include "platform/forms/MultiLineBox.h"
 #include "platform/forms/RecordScreen.h"
@@ -35,6 +36,8 @@ protected:
     virtual void takeMember(qint32 socio_id, const QString& nome);
     /// Nobody is chosen any more.
     virtual void clearMember();
+    data::Operation operation;  ///< the posting or annulment that this screen is for
+
     /// The number was wiped.
     virtual void numberWiped() { clearMember(); }
 

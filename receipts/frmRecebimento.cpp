@@ -85,12 +85,14 @@ void frmRecebimento::Command1_Click() {
 
 void frmRecebimento::post() {
     if (postReceipt({Adodc1->Recordset(), Socio_ID, Caption(), DataCombo3->Text(), No_Kor->Text(),
-                     Credito->Text()}))
-        Unload();
+                     Credito->Text()},
+                    operation))
+        return Unload();
+    if (operation.isRegistered) lockFields();
 }
 
 void frmRecebimento::Command2_Click() {
-    if (annulReceipt(Adodc1->Recordset(), Caption())) Unload();
+    if (annulReceipt(Adodc1->Recordset(), Caption(), operation)) Unload();
 }
 
 }  // namespace receipts

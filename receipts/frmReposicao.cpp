@@ -152,10 +152,12 @@ void frmReposicao::DataCombo1_LostFocus() {
 }
 
 void frmReposicao::post() {
-    if (postReposition({Adodc1->Recordset(), Socio_ID, Caption(), DataCombo1->Text(),
-                        DataCombo1->BoundText(), Text3->Text(), No_Kor->Text(), Debito->Text(),
-                        Credito->Text()}))
-        Unload();
+    if (postReposition(
+            {Adodc1->Recordset(), Socio_ID, Caption(), DataCombo1->Text(), DataCombo1->BoundText(),
+             Text3->Text(), No_Kor->Text(), Debito->Text(), Credito->Text()},
+            operation))
+        return Unload();
+    if (operation.isRegistered) lockFields();
 }
 
 }  // namespace receipts

@@ -32,60 +32,77 @@ bool receiptChecks(const ReceiptEntry& receipt) {
 }
 
 /// The account-level row alone, and there the credit alone.
-void addToAccount(const ReceiptEntry& receipt) {
+void addToAccount(const ado::Recordset& movement, const ado::Accompaniment& with) {
+    const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
     const ado::RecordsetPtr rows =
         data::openToWrite(u"Select * from tbSocios_Acumulados WHERE (socio_id="_s +
-                          QString::number(receipt.Socio_ID) + u") and (rubrica_id_main=0)"_s);
+                          QString::number(socio_id) + u") and (rubrica_id_main=0)"_s);
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"rubrica_id_main"_s, 0);
     }
-    rows->setCollect(u"Socio_ID"_s, receipt.Socio_ID);
+    rows->setCollect(u"Socio_ID"_s, socio_id);
     data::nullBecomesZero(*rows, u"credito_ac"_s);
     data::nullBecomesZero(*rows, u"debito_ac"_s);
-    data::add(*rows, u"credito_ac"_s, receipt.record->Collect(u"credito"_s));
-    rows->Update();
+    data::add(*rows, u"credito_ac"_s, movement.Collect(u"credito"_s));
+    rows->Update(with);
     rows->Close();
+}
+
+void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
+    const QVariant credito = shown.Collect(u"credito"_s);
+    if (!core::isNull(credito)) correcting.setCollect(u"credito"_s, -core::toDouble(credito));
+    correcting.setCollect(u"debito"_s, 0);
 }
 
 /// Not the account-level row that the posting added to, but the first of the member's rows,
 /// whichever it is. A row that has to be added is nobody's and keeps null sums. It is meant so.
-void takeBack(const ado::Recordset& shown) {
+void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
     const ado::RecordsetPtr rows = data::openToWrite(
         u"Select * from "_s + data::twinsOf(shown).accumulators + u" WHERE (socio_id="_s +
         core::toText(shown.Collect(u"socio_id"_s)) + u")"_s);
     if (rows->atEnd()) rows->AddNew();
     data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
     data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
-    rows->Update();
+    rows->Update(with);
     rows->Close();
 }
 
 }  // namespace
 
-bool postReceipt(const ReceiptEntry& receipt) {
+const data::MovementRules& receiptRules() {
+    static const data::MovementRules rules{addToAccount, setCorrection, takeBack};
+    return rules;
+}
+
+bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation) {
+    if (data::isRegistered(operation))
+        return data::finishPosting(operation, receiptRules(), *receipt.record, receipt.caption);
     if (!data::confirmPosting(receipt.caption) || !receiptChecks(receipt)) return false;
     receipt.record->setCollect(u"debito"_s, 0);
     data::readyWithoutDocument(*receipt.record, receipt.Socio_ID);
     // Not passed over, unlike on the other screens: a failure goes up with the engine's text.
-    data::numberAndSave(*receipt.record);
+    data::numberAndSave(*receipt.record, operation);
     if (!data::savedOrTold(receipt.caption)) return false;
-    data::accumulatedOrTold([&] { addToAccount(receipt); });
-    return true;
+    return data::accumulatedOrTold(operation, *receipt.record, receiptRules(), receipt.caption);
 }
 
-bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption) {
-    if (!data::confirmAnnulment(u"Anular Recebimento"_s)) return false;
-    data::annul(*shown, caption, [&](ado::Recordset& correcting) {
-        const QVariant credito = shown->Collect(u"credito"_s);
-        if (!core::isNull(credito)) correcting.setCollect(u"credito"_s, -core::toDouble(credito));
-        correcting.setCollect(u"debito"_s, 0);
-    });
+bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption,
+                  data::Operation& operation) {
+    if (!data::isRegistered(operation) && !data::confirmAnnulment(u"Anular Recebimento"_s))
+        return false;
+    switch (data::annul(*shown, caption, receiptRules(), operation)) {
+        case data::Annulled::Unfinished:
+            return false;
+        case data::Annulled::Elsewhere:
+            return true;
+        case data::Annulled::Corrected:
+            break;
+    }
     // Finds only what an earlier procedure left pending; the accumulators are then left alone.
     if (core::err().number() == 0)
-        data::accumulatedOrTold([&] { takeBack(*shown); });
-    else
-        MsgBox(u"Erro inesperado, contacte o Administrador do Sistema"_s, Icon::Critical, caption);
+        return data::accumulatedOrTold(operation, *shown, receiptRules(), caption);
+    MsgBox(u"Erro inesperado, contacte o Administrador do Sistema"_s, Icon::Critical, caption);
     return true;
 }
 

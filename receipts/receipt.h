@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "platform/ado/Recordset.h"
+#include "data/Operations.h"
 
 namespace receipts {
 
@@ -16,20 +16,25 @@ struct ReceiptEntry {
 };
 
 /// Asks, checks, draws the number, saves the row and adds to the member's account-level
-/// accumulator. True when it was posted; false when it was refused (the operator was told) and the
-/// screen stays.
+/// accumulator. True when all of it is done; false when it was refused or something is missing (the
+/// operator was told) and the screen stays.
 ///
 /// Counter, movement and accumulator are three writes with no transaction around them. A failure of
-/// the first two goes up, and a number drawn is lost; one of the last is told, and counts as
-/// posted.
-bool postReceipt(const ReceiptEntry& receipt);
+/// the first two goes up, and a number drawn is lost.
+/// @param operation  of this screen from its first press of "&OK" to its last: on a receipt that an
+/// earlier press registered only what is missing is done, and nothing is asked
+bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation);
 
 /// Asks, marks the receipt, writes its correcting row and takes the amount back from an
-/// accumulator. True when the screen may go; false when the operator said no.
+/// accumulator. True when the screen may go, also when somebody else had annulled it; false when
+/// the operator said no or something is missing, which he was told.
 ///
-/// Mark, counter, correcting row and accumulator are four writes, as above: a failure of the first
-/// three goes up, and annulling again completes them.
+/// Mark, counter, correcting row and accumulator are four writes; a failure of the first goes up.
 /// @param shown  its current row is the receipt, with `ficheiro`
-bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption);
+/// @param operation  of this screen, as above
+bool annulReceipt(const ado::RecordsetPtr& shown, const QString& caption,
+                  data::Operation& operation);
+
+const data::MovementRules& receiptRules();
 
 }  // namespace receipts

@@ -34,44 +34,53 @@ bool repositionChecks(const RepositionEntry& reposition) {
 
 /// Accumulators of member, rubric and person; rubric 0 where none was chosen. The comparison with
 /// Null holds for no row, so that every reposition without a rubric adds one. It is meant so.
-QString accumulatorStatement(const RepositionEntry& reposition) {
-    const QString rubric =
-        reposition.DataCombo1.isEmpty()
-            ? u" AND (rubrica_id = 0 )"_s
-            : u" AND (rubrica_id ="_s + core::toText(reposition.rubrica_id) + u")"_s;
-    const QString person = reposition.Text3.isEmpty()
-                               ? u"AND (codABC = Null)"_s
-                               : u"AND (codABC='"_s + reposition.Text3 + u"')"_s;
-    return u"Select * from tbSocios_Acumulados WHERE (socio_id="_s +
-           QString::number(reposition.Socio_ID) + u")"_s + rubric + person;
+QString accumulatorStatement(qint32 socio_id, const QVariant& rubrica_id, const QString& codABC) {
+    const QString rubric = core::isNull(rubrica_id)
+                               ? u" AND (rubrica_id = 0 )"_s
+                               : u" AND (rubrica_id ="_s + core::toText(rubrica_id) + u")"_s;
+    const QString person =
+        codABC.isEmpty() ? u"AND (codABC = Null)"_s : u"AND (codABC='"_s + codABC + u"')"_s;
+    return u"Select * from tbSocios_Acumulados WHERE (socio_id="_s + QString::number(socio_id) +
+           u")"_s + rubric + person;
 }
 
-void addToAccumulator(const RepositionEntry& reposition) {
-    const ado::RecordsetPtr rows = data::openToWrite(accumulatorStatement(reposition));
+void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& with) {
+    const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
+    const QString codABC = core::toText(movement.Collect(u"codABC"_s));
+    QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
+    // A rubric that was wiped is held as 0.
+    if (core::compareNumbers(rubrica_id, 0) == 0) rubrica_id = {};
+    const ado::RecordsetPtr rows =
+        data::openToWrite(accumulatorStatement(socio_id, rubrica_id, codABC));
     if (rows->atEnd()) rows->AddNew();
-    const bool hasRubric = !reposition.DataCombo1.isEmpty();
-    const bool hasPerson = !reposition.Text3.isEmpty();
-    rows->setCollect(u"Socio_ID"_s, reposition.Socio_ID);
-    rows->setCollect(u"Rubrica_ID"_s, hasRubric ? reposition.rubrica_id : QVariant(0));
-    rows->setCollect(u"codABC"_s, hasPerson ? QVariant(reposition.Text3) : QVariant());
+    rows->setCollect(u"Socio_ID"_s, socio_id);
+    rows->setCollect(u"Rubrica_ID"_s, core::isNull(rubrica_id) ? QVariant(0) : rubrica_id);
+    rows->setCollect(u"codABC"_s, codABC.isEmpty() ? QVariant() : QVariant(codABC));
     for (const auto& [sum, amount] :
          {std::pair(u"credito_ac"_s, u"credito"_s), std::pair(u"debito_ac"_s, u"debito"_s)}) {
         data::nullBecomesZero(*rows, sum);
-        data::add(*rows, sum, reposition.record->Collect(amount));
+        data::add(*rows, sum, movement.Collect(amount));
     }
-    rows->Update();
+    rows->Update(with);
     rows->Close();
 }
 
 }  // namespace
 
-bool postReposition(const RepositionEntry& reposition) {
-    if (!data::confirmPosting(reposition.caption) || !repositionChecks(reposition)) return false;
+const data::MovementRules& repositionRules() {
+    static const data::MovementRules rules{addToAccumulator};
+    return rules;
+}
+
+bool postReposition(const RepositionEntry& reposition, data::Operation& operation) {
+    const QString& caption = reposition.caption;
+    if (data::isRegistered(operation))
+        return data::finishPosting(operation, repositionRules(), *reposition.record, caption);
+    if (!data::confirmPosting(caption) || !repositionChecks(reposition)) return false;
     data::readyWithoutDocument(*reposition.record, reposition.Socio_ID);
-    passingOver([&] { data::numberAndSave(*reposition.record); });
-    if (!data::savedOrTold(reposition.caption)) return false;
-    passingOver([&] { addToAccumulator(reposition); });
-    return true;
+    passingOver([&] { data::numberAndSave(*reposition.record, operation); });
+    if (!data::savedOrTold(caption)) return false;
+    return data::accumulatedOrTold(operation, *reposition.record, repositionRules(), caption);
 }
 
 }  // namespace receipts

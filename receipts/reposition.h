@@ -1,9 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QVariant>
-
-#include "platform/ado/Recordset.h"
+#include "data/Operations.h"
 
 namespace receipts {
 
@@ -22,8 +20,12 @@ struct RepositionEntry {
 };
 
 /// Asks, checks, draws the number, saves the row and adds to the accumulator of member, rubric and
-/// person. True when it was posted; false when it was refused or could not be saved (the operator
-/// was told) and the screen stays. A failure with the accumulator is passed over without a word.
-bool postReposition(const RepositionEntry& reposition);
+/// person. True when all of it is done; false when it was refused or something is missing (the
+/// operator was told) and the screen stays.
+/// @param operation  of this screen from its first press of "&OK" to its last: on a reposition that
+/// an earlier press registered only what is missing is done, and nothing is asked
+bool postReposition(const RepositionEntry& reposition, data::Operation& operation);
+
+const data::MovementRules& repositionRules();
 
 }  // namespace receipts

@@ -215,6 +215,28 @@ CREATE TABLE tbCheques (
     _linha bigint GENERATED ALWAYS AS IDENTITY PRIMARY KEY
 );
 
+-- Journal ----------------------------------------------------------------------------------------
+-- Postings and annulments are several writes, one commit each. A row here is written in the commit
+-- of the write that it tells of; it says what is missing of an operation that was cut short. A
+-- posting's row goes with its last write; those of annulments stay, to say by whom.
+
+CREATE TABLE tbOperacoes (
+    operacao_id  varchar(36) COLLATE "pt-PT-x-icu" PRIMARY KEY,  -- chosen by whoever begins it
+    operacao     varchar(3) COLLATE "pt-PT-x-icu",  -- LAN a posting, ANU an annulment
+    -- missing: COR the correcting row and then the accumulator, ACU the accumulator; null nothing
+    passo        varchar(3) COLLATE "pt-PT-x-icu",
+    ficheiro     varchar(8) COLLATE "pt-PT-x-icu",  -- of the movement, as in the view
+    movimento_id integer,
+    movimento_no integer,
+    socio_id     integer,
+    tipo         varchar(3) COLLATE "pt-PT-x-icu",  -- before an annulment
+    correcao_no  integer,  -- number of the correcting row
+    quem         varchar(100) COLLATE "pt-PT-x-icu",  -- user@machine
+    quando       timestamp,  -- begun
+    concluida    timestamp,  -- done
+    _linha bigint GENERATED ALWAYS AS IDENTITY UNIQUE
+);
+
 -- Member file ------------------------------------------------------------------------------------
 
 CREATE TABLE tbSocios (

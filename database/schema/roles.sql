@@ -15,6 +15,8 @@ GRANT INSERT, UPDATE, DELETE ON
     tbSocios_Acumulados, tbSocios_Acumulados_Inactivos,
     tbZelmar_Plafonds, tbHospitais, tbContadores, tbCheques
     TO {operator};
+-- The journal of operations, whose rows ride in the commits of other writes.
+GRANT INSERT, UPDATE, DELETE ON tbOperacoes TO {operator};
 -- The member file changes what it shows; members come and go by other programs.
 GRANT UPDATE ON tbSocios TO {operator};
 

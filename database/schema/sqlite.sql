@@ -207,6 +207,28 @@ CREATE TABLE tbCheques (
     cheque_no BIGINT                                      -- the next cheque number to offer
 );
 
+-- Journal ----------------------------------------------------------------------------------------
+-- Postings and annulments are several writes, one commit each. A row here is written in the commit
+-- of the write that it tells of; it says what is missing of an operation that was cut short. A
+-- posting's row goes with its last write; those of annulments stay, to say by whom.
+
+CREATE TABLE tbOperacoes (
+    operacao_id  VARCHAR(36) PRIMARY KEY,                 -- chosen by whoever begins the operation
+    operacao     VARCHAR(3),                              -- LAN a posting, ANU an annulment
+    passo        VARCHAR(3),                              -- missing: COR the correcting row and
+                                                          -- then the accumulator, ACU the
+                                                          -- accumulator; null: nothing
+    ficheiro     VARCHAR(8),                              -- of the movement, as in the view
+    movimento_id INTEGER,
+    movimento_no INTEGER,
+    socio_id     INTEGER,
+    tipo         VARCHAR(3),                              -- before an annulment
+    correcao_no  INTEGER,                                 -- number of the correcting row
+    quem         VARCHAR(100),                            -- user@machine
+    quando       DATETIME,                                -- begun
+    concluida    DATETIME                                 -- done
+);
+
 -- Member file ------------------------------------------------------------------------------------
 
 CREATE TABLE tbSocios (

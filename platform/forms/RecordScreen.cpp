@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "platform/forms/RecordScreen.h"
 
+#include "platform/forms/DataCombo.h"
+#include "platform/forms/MultiLineBox.h"
+#include "platform/forms/TextBox.h"
+
 using namespace Qt::StringLiterals;
 
 namespace forms {
@@ -32,6 +36,12 @@ void RecordScreen::showForReading() {
     Command3->setDefault(true);
     setCancelButton(Command3);
     Command3->setFocus();
+}
+
+void RecordScreen::lockFields() {
+    for (TextBox* box : findChildren<TextBox*>()) box->setLocked(true);
+    for (DataCombo* combo : findChildren<DataCombo*>()) combo->setLocked(true);
+    for (MultiLineBox* box : findChildren<MultiLineBox*>()) box->setLocked(true);
 }
 
 void RecordScreen::Timer1_Timer() {

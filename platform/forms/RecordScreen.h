@@ -32,6 +32,8 @@ protected:
     /// Turns the screen into the view of an existing row: no defaults, "&Sair" in place of both
     /// buttons.
     void showForReading();
+    /// Locks all fields: what is typed cannot change the row any more.
+    void lockFields();
 
 private:
     void Timer1_Timer();

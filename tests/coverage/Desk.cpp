@@ -85,7 +85,8 @@ bool Desk::post(const coverage::PostingEntry& posting, const QList<support::Oper
                       .icon = core::Icon::Question,
                       .title = caption});
     for (const support::Operator::Box& box : boxes) person.expectBox(box);
-    const bool posted = coverage::post(posting, run);
+    begun = {};
+    const bool posted = coverage::post(posting, run, begun);
     person.expectNoBoxesLeft();
     return posted;
 }

@@ -72,4 +72,5 @@ protected:
     support::Operator person;
     qint32 socio;
     coverage::TryOut run;
+    data::Operation begun;  ///< of the last posting
 };

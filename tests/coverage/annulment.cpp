@@ -54,7 +54,19 @@ protected:
                           .title = u"Anular Lançamento"_s});
         if (vanishes) expectBox(u"Não foi possível anular este registo"_s, Icon::Critical, caption);
         if (!afterwards.text.isEmpty()) person.expectBox(afterwards);
-        return coverage::annul({row, caption, &caller});
+        begun = {};
+        const bool mayGo = coverage::annul({row, caption, &caller}, begun);
+        shown = row;
+        person.expectNoBoxesLeft();
+        return mayGo;
+    }
+    /// A further press of the same button.
+    bool again() {
+        const core::HandlerScope handler;
+        if (!afterwards.text.isEmpty()) person.expectBox(afterwards);
+        const bool mayGo = coverage::annul({shown, caption, &caller}, begun);
+        person.expectNoBoxesLeft();
+        return mayGo;
     }
     std::string movements(const QString& suffix = {}) {
         return book
@@ -70,9 +82,12 @@ protected:
             .toStdString();
     }
 
+    void failStepByStep();
+
     bool vanishes = false;              ///< the movement, after it was read
     support::Operator::Box afterwards;  ///< closes the annulment; without a text none
     Caller caller;
+    ado::RecordsetPtr shown;  ///< by the last annulment
 };
 
 TEST_F(Annulment, MarksTheMovementCorrectsItTakesTheTotalsBackAndRaisesTheFranchiseUsed) {
@@ -106,15 +121,33 @@ TEST_F(Annulment, MarksTheMovementCorrectsItTakesTheTotalsBackAndRaisesTheFranch
     EXPECT_EQ(totals(), "50|50.25|2");
 }
 
-TEST_F(Annulment, OfAMovementThatVanishedOrWasAnnulledMeanwhileGoesOn) {
+TEST_F(Annulment, OfAMovementThatVanishedMeanwhileGoesOn) {
     const qint64 key = document();
-    EXPECT_TRUE(annul(key));
-    EXPECT_TRUE(annul(key)) << "another workstation had it on its screen too";
-    EXPECT_EQ(totals(), "-50|10|1");
     vanishes = true;
     EXPECT_TRUE(annul(key));
     EXPECT_EQ(stored("select tipo, credito from tbZelmar_Movimentos"), "COR|-40.25");
-    EXPECT_EQ(totals(), "-150|-30.25|0");
+    EXPECT_EQ(totals(), "50|50.25|2");
+    EXPECT_EQ(stored("select passo, movimento_no, correcao_no from tbOperacoes"), "NULL|31|1");
+}
+
+TEST_F(Annulment, OfAMovementThatSomebodyAnnulledMeanwhileSaysByWhomAndWritesNothing) {
+    const qint64 key = document();
+    EXPECT_TRUE(annul(key));
+    const std::string before = movements() + totals();
+    book.exec(u"update tbOperacoes set quem = 'ana@posto2', quando = '2026-05-14 10:15:00'"_s);
+    afterwards = {.text =
+                      u"O movimento nº 31 já foi anulado por ana@posto2, em 14-05-2026, 10:15. "
+                      "Nada foi gravado."_s,
+                  .icon = Icon::Information,
+                  .title = caption};
+    caller.key = 0;
+    EXPECT_TRUE(annul(key)) << "the screen may go";
+    EXPECT_EQ(caller.key, key) << "the list is to be read afresh";
+    book.exec(u"update tbOperacoes set passo = 'COR'"_s);
+    afterwards.text.replace(u"10:15"_s,
+                            u"10:15 (falta o movimento de correção e tirar dos acumulados)"_s);
+    EXPECT_TRUE(annul(key));
+    EXPECT_EQ(movements() + totals(), before);
 }
 
 TEST_F(Annulment, LeavesTheTotalsAloneWhenAFailureWasPending) {
@@ -142,32 +175,68 @@ TEST_F(Annulment, OfAMovementWithoutAmountsKeepsThemNull) {
 }
 
 // Mark, counter, correcting row and accumulator are four writes.
-TEST_F(Annulment, ThatFailsIsCompletedByTheNextOneUntilTheCorrectingRowIsSaved) {
+void Annulment::failStepByStep() {
     const qint64 key = document();
     const char* const state =
         "select zelmars, min(tipo), max(case tipo when 'COR' then movimento_no end) "
         "from tbContadores, tbZelmar_Movimentos group by 1";
-    const std::pair<const char*, const char*> failures[] = {
-        {"update on tbZelmar_Movimentos", "1|DOC|NULL"},
-        {"update on tbContadores", "1|ANL|NULL"},
-        {"insert on tbZelmar_Movimentos", "2|ANL|NULL"},
+    book.refuse(u"update on tbZelmar_Movimentos"_s, u"disco cheio"_s);
+    EXPECT_TRUE(support::failureOf([&] { annul(key); }).text().contains(u"disco cheio"_s));
+    EXPECT_EQ(stored(state), "1|DOC|NULL");
+    book.refuseNoMore();
+    const struct {
+        const char* write;
+        QString box;
+        const char* rows;
+    } failures[] = {
+        {"update on tbContadores",
+         u"O movimento nº 31 está marcado como anulado, mas falta o movimento de correção e tirar "
+         "dos acumulados.\n\ndisco cheio"_s,
+         "1|ANL|NULL"},
+        {"insert on tbZelmar_Movimentos", u"O movimento nº 31 está marcado como anulado"_s,
+         "2|ANL|NULL"},
+        {"update on tbSocios_Acumulados",
+         u"O movimento nº 31 está anulado e corrigido com o nº 2, mas falta tirar dos "
+         "acumulados.\n\ndisco cheio"_s,
+         "3|ANL|2"},
     };
-    for (const auto& [write, rows] : failures) {
+    for (const auto& [write, box, rows] : failures) {
         book.refuse(QString::fromLatin1(write), u"disco cheio"_s);
-        EXPECT_TRUE(support::failureOf([&] { annul(key); }).text().contains(u"disco cheio"_s));
+        afterwards = {.text = box, .icon = Icon::Critical, .title = caption, .partly = true};
+        EXPECT_FALSE(begun.isRegistered ? again() : annul(key));
         book.refuseNoMore();
         EXPECT_EQ(stored(state), rows) << write;
+        EXPECT_EQ(totals(), "150|90.5|3");
+        EXPECT_EQ(caller.key, 0) << "is not called back yet";
     }
-    book.refuse(u"update on tbSocios_Acumulados"_s, u"disco cheio"_s);
-    afterwards = {.text = u"disco cheio"_s, .icon = Icon::Critical, .partly = true};
-    EXPECT_TRUE(annul(key)) << "the screen may go";
-    EXPECT_EQ(totals(), "150|90.5|3");
-    book.refuseNoMore();
+    afterwards = {};
+    EXPECT_TRUE(again());
+    EXPECT_EQ(stored(state), "3|ANL|2");
+    EXPECT_EQ(totals(), "50|50.25|2");
+    EXPECT_EQ(caller.key, key);
+}
+
+TEST_F(Annulment, ThatFailsSaysWhatIsMissingAndIsCompletedByTheNextPress) {
+    failStepByStep();
+    EXPECT_EQ(stored("select operacao, passo, correcao_no, tipo, concluida >= quando from "
+                     "tbOperacoes"),
+              "ANU|NULL|2|DOC|1");
+}
+
+TEST_F(Annulment, InABookOfAnOlderProgramIsCompletedWithoutAJournal) {
+    book.exec(u"drop table tbOperacoes"_s);
+    failStepByStep();
+    afterwards.text = u"O movimento nº 31 já foi anulado. Nada foi gravado."_s;
+    EXPECT_TRUE(annul(shown->Collect(u"movimento_id"_s).toLongLong()));
+}
+
+TEST_F(Annulment, OfAMovementThatNoAccumulatorCountsStaysUnfinished) {
+    const qint64 key = document();
     book.exec(u"delete from tbSocios_Acumulados"_s);
-    afterwards.text = u"Não há nenhuma linha corrente."_s;
-    EXPECT_TRUE(annul(key));
-    EXPECT_EQ(stored(state), "4|ANL|3");
-    EXPECT_EQ(caller.key, 0) << "is not called back";
+    afterwards = {
+        .text = u"Não há nenhuma linha corrente."_s, .icon = Icon::Critical, .partly = true};
+    EXPECT_FALSE(annul(key));
+    EXPECT_EQ(caller.key, 0);
 }
 
 }  // namespace

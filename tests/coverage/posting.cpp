@@ -48,7 +48,7 @@ TEST_F(Posting, OnAnEmptyCounterGivesTheNumberOneTwice) {
 }
 
 // Counter, movement and accumulator are three writes.
-TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothingAndTheAccumulatorIsPassedOver) {
+TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothing) {
     const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
     tryOut(entry.entry);
     const auto failToPost = [&](const QString& description) {
@@ -58,6 +58,7 @@ TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothingAndTheAccumulatorIsPassedO
                                    .icon = Icon::Critical,
                                    .title = caption}}));
         expectState("1|NULL|0|0|0");
+        EXPECT_FALSE(begun.isRegistered);
     };
     book.hold(u"tbContadores"_s);
     failToPost(support::onServer() ? u"canceling statement due to lock timeout"_s
@@ -68,9 +69,75 @@ TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothingAndTheAccumulatorIsPassedO
     book.refuseNoMore();
     EXPECT_TRUE(post(entry));
     expectState("2|1|80|80|1");
+}
+
+const char* const Journal =
+    "select operacao, passo, ficheiro, movimento_no, tipo, concluida is null, "
+    "movimento_id = (select max(movimento_id) from tbZelmar_Movimentos), "
+    "quem like '%@%' and quando is not null from tbOperacoes";
+
+TEST_F(Posting, ThatLacksTheAccumulatorIsFinishedByTheNextPressWhichAsksAndStoresNothingTwice) {
+    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    tryOut(entry.entry);
     refuse(u"update on tbSocios_Acumulados"_s);
+    const support::Operator::Box missing{
+        .text =
+            u"O movimento nº 1 está registado, mas falta somar aos acumulados.\n\ndisco cheio"_s,
+        .icon = Icon::Critical,
+        .title = caption,
+        .partly = true};
+    EXPECT_FALSE(post(entry, {missing}));
+    EXPECT_EQ(stored(Journal), "LAN|ACU|ACTIVO|1|DOC|1|1|1");
+    // Neither what is typed since nor another press without success changes anything.
+    entry.entry.record->setCollect(u"credito"_s, 1);
+    person.expectBox(missing);
+    EXPECT_FALSE(coverage::post(entry, run, begun));
+    expectState("2|1|0|0|0");
+    book.refuseNoMore();
+    EXPECT_TRUE(coverage::post(entry, run, begun));
+    expectState("2|1|80|80|1");
+    EXPECT_EQ(stored(Journal), "");
+    EXPECT_TRUE(coverage::post(entry, run, begun)) << "there is nothing left";
+    expectState("2|1|80|80|1");
+}
+
+// The row is written, but the program does not learn it.
+TEST_F(Posting, WhoseAnswerWasLostIsFoundAgainByTheNextPress) {
+    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    refuse(u"update on tbSocios_Acumulados"_s);
+    EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
+    book.refuseNoMore();
+    const coverage::PostingEntry again = posting(enter({.rubrica_id = rubric}));
+    data::Operation unaware;
+    unaware.id = begun.id;
+    EXPECT_TRUE(coverage::post(again, run, unaware));
+    expectState("2|1|80|80|1");
+}
+
+TEST_F(Posting, FinishedBySomebodyElseMeanwhileIsNotAddedTwice) {
+    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    refuse(u"update on tbSocios_Acumulados"_s);
+    EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
+    book.refuseNoMore();
+    for (const char* const elsewhere :
+         {"update tbOperacoes set passo = null", "delete from tbOperacoes"}) {
+        data::Operation mine = begun;
+        book.exec(QString::fromUtf8(elsewhere));
+        EXPECT_TRUE(coverage::post(entry, run, mine));
+        EXPECT_EQ(mine.missing, data::Step::Nothing);
+        expectState("2|1|0|0|0");
+    }
+}
+
+TEST_F(Posting, InABookOfAnOlderProgramWorksWithoutAJournal) {
+    book.exec(u"drop table tbOperacoes"_s);
+    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    refuse(u"update on tbSocios_Acumulados"_s);
+    EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
+    book.refuseNoMore();
+    EXPECT_TRUE(coverage::post(entry, run, begun));
     EXPECT_TRUE(post(enter({.rubrica_id = rubric})));
-    expectState("3|2|80|80|1");
+    expectState("3|2|160|160|2");
 }
 
 }  // namespace

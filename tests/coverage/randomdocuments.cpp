@@ -102,7 +102,8 @@ TEST_F(RandomDocuments, NeverCreditMoreThanTheCeilingsLeaveAndAddUp) {
         socio = members[static_cast<std::size_t>(below(Members))];
         const coverage::Entry entry = enter(document);
         if (i % 3 == 0) expectSecondRunToChangeNothing(entry);
-        ASSERT_TRUE(coverage::post(posting(entry), run));
+        begun = {};
+        ASSERT_TRUE(coverage::post(posting(entry), run, begun));
         expectSoundAmounts(entry);
         EXPECT_EQ(entry.record->Collect(u"movimento_no"_s).toInt(), i + 1);
         if (HasFailure()) return;

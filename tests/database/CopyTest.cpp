@@ -35,6 +35,8 @@ constexpr auto Oddities =
     update tbContadores set zelmars = 2147483647;
     update tbCheques set cheque_no = null;
     delete from tbOutrasInstituicoes;
+    insert into tbOperacoes (operacao_id, passo, quando) values ('b', 'ACU', '2026-05-15 10:00:00'),
+        ('a', null, null);
 )";
 
 class Copy : public testing::Test {
@@ -120,6 +122,12 @@ private:
     QList<Table> tables_;
 };
 
+TEST_F(Copy, OfABookOfAnOlderProgramLeavesTheJournalEmpty) {
+    file.rows(u"drop table tbOperacoes"_s);
+    EXPECT_EQ(failureOf(inFile, onServer), QString());
+    EXPECT_EQ(server.rows(u"select count(*) from tbOperacoes"_s).first().first(), u"0"_s);
+}
+
 TEST_F(Copy, GoesThereAndBackWithEveryRowAndKeyAsItWas) {
     file.rows(QString::fromUtf16(Oddities));
     QString last;
@@ -130,7 +138,7 @@ TEST_F(Copy, GoesThereAndBackWithEveryRowAndKeyAsItWas) {
             rows += progress.isTableDone ? progress.rows : 0;
             EXPECT_LE(progress.allRows, progress.total);
         });
-    EXPECT_EQ(there.tables, 20);
+    EXPECT_EQ(there.tables, 21);
     EXPECT_EQ(there.rows, rows);
     EXPECT_EQ(failureOf(onServer, back), QString());
 

@@ -102,7 +102,7 @@ TEST_F(Reposition, SearchGivenUpLeavesNoMemberWithTheOldNameShown) {
 }
 
 // Counter, movement and accumulator are three writes.
-TEST_F(Reposition, FailingWriteIsToldAndKeptAndThatOfTheAccumulatorIsPassedOver) {
+TEST_F(Reposition, FailingWriteIsToldAndTheNextPressDoesOnlyWhatIsMissing) {
     typeReposition(u"1"_s, u"0"_s);
     for (const QString& write : {u"update on tbContadores"_s, u"insert on tbZelmar_Movimentos"_s}) {
         book.refuse(write, u"disco cheio"_s);
@@ -116,10 +116,20 @@ TEST_F(Reposition, FailingWriteIsToldAndKeptAndThatOfTheAccumulatorIsPassedOver)
         EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
     }
     book.refuse(u"insert on tbSocios_Acumulados"_s, u"disco cheio"_s);
-    postAnd();
-    EXPECT_FALSE(person.isShown(Screen));
+    postAnd({{.text = u"O movimento nº 2 está registado, mas falta somar aos acumulados."_s,
+              .icon = Icon::Critical,
+              .title = title,
+              .partly = true}});
     EXPECT_EQ(stored("select movimento_no from tbZelmar_Movimentos"), "2") << "number 1 is lost";
     EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
+    book.refuseNoMore();
+    person.put(u"Debito"_s, u"9"_s);
+    EXPECT_EQ(shown(u"Debito"_s), u"1"_s) << "is locked";
+    person.accelerator(u'O');
+    EXPECT_FALSE(person.isShown(Screen));
+    EXPECT_EQ(stored("select debito_ac, credito_ac, (select count(*) from tbZelmar_Movimentos) "
+                     "from tbSocios_Acumulados"),
+              "1|0|1");
 }
 
 TEST_F(Reposition, ViewShowsItAndMakesRoomForTheNextButNotForWhatIsTyped) {

@@ -71,7 +71,8 @@ protected:
                                              .hospital = hospital,
                                              .incidencia = value * 3 / 4});
         coverage::TryOut once;
-        ASSERT_TRUE(coverage::post(posting(entry), once));
+        begun = {};
+        ASSERT_TRUE(coverage::post(posting(entry), once, begun));
         count(*entry.record, 1);
     }
     ado::RecordsetPtr newRow(const QString& tipo) {
@@ -83,7 +84,8 @@ protected:
     void postReceipt() {
         const ado::RecordsetPtr row = newRow(u"PAG"_s);
         row->setCollect(u"credito"_s, amount());
-        ASSERT_TRUE(receipts::postReceipt({row, socio, caption, u"CHQ"_s, u"1"_s, u"1"_s}));
+        begun = {};
+        ASSERT_TRUE(receipts::postReceipt({row, socio, caption, u"CHQ"_s, u"1"_s, u"1"_s}, begun));
         count(*row, 1);
     }
     void postReposition() {
@@ -92,10 +94,15 @@ protected:
         const qint64 rubric = anyRubric();
         row->setCollect(u"debito"_s, amount() - 200);
         row->setCollect(u"credito"_s, amount());
-        if (withRubric) row->setCollect(u"rubrica_id"_s, rubric);
+        const QString whom = withRubric ? anyPerson() : QString();
+        if (withRubric) {
+            row->setCollect(u"rubrica_id"_s, rubric);
+            row->setCollect(u"codABC"_s, whom);
+        }
+        begun = {};
         ASSERT_TRUE(receipts::postReposition({row, socio, caption, withRubric ? u"01"_s : QString(),
-                                              rubric, withRubric ? anyPerson() : QString(), u"1"_s,
-                                              u"1"_s, u"1"_s}));
+                                              rubric, whom, u"1"_s, u"1"_s, u"1"_s},
+                                             begun));
         count(*row, 1);
     }
     /// Any movement of the member that may be annulled, if there is one.
@@ -108,11 +115,12 @@ protected:
             ado::adLockOptimistic, ado::adCmdUnknown);
         for (int skip = below(5); skip > 0 && !row->atEnd(); --skip) row->MoveNext();
         if (row->atEnd()) return;
+        begun = {};
         // A receipt's correcting row carries no debit; the receipt has none either.
         if (core::toText(row->Collect(u"tipo"_s)) == u"PAG"_s)
-            ASSERT_TRUE(receipts::annulReceipt(row, caption));
+            ASSERT_TRUE(receipts::annulReceipt(row, caption, begun));
         else
-            ASSERT_TRUE(coverage::annul({row, caption}));
+            ASSERT_TRUE(coverage::annul({row, caption}, begun));
         count(*row, -1);
         ++annulled;
     }

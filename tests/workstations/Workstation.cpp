@@ -90,7 +90,8 @@ bool post(const office::Job& job, const QString& number) {
     posting.modo_pagamento = job.isBill ? u"CHQ"_s : u"TRF"_s;
     posting.askCheque = takeCheque;
     coverage::TryOut run;
-    return coverage::post(posting, run);
+    data::Operation operation;
+    return coverage::post(posting, run, operation);
 }
 
 void work(int workstation, int postings) {
@@ -101,8 +102,6 @@ void work(int workstation, int postings) {
         if (!post(office::jobOf(workstation, number), office::documentNumber(workstation, number)))
             throw core::Failure(core::InvalidCall, u"posting %1 was refused"_s.arg(number));
         say(u"%1 %2"_s.arg(number).arg(clock.nsecsElapsed() / 1000));
-        // The failure of the accumulator is passed over without a box.
-        if (core::err().number() != 0) say(u"box "_s + core::err().description());
     }
 }
 
