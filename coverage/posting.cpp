@@ -3,6 +3,7 @@
 #include "coverage/Statements.h"
 #include "coverage/stages.h"
 #include "data/Codes.h"
+#include "data/Correction.h"
 #include "data/NewMovement.h"
 #include "data/Procedures.h"
 #include "data/RowSets.h"
@@ -68,7 +69,8 @@ void addToAccumulators(const ado::Recordset& movement, const ado::Accompaniment&
     const QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
     const ado::RecordsetPtr rows = data::openToWrite(
-        statements::accumulator(rubrica_id, socio_id, core::toText(movement.Collect(u"codABC"_s))));
+        statements::accumulator(rubrica_id, socio_id, core::toText(movement.Collect(u"codABC"_s)),
+                                data::twinsOf(movement).accumulators));
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"Socio_ID"_s, socio_id);

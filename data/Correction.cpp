@@ -14,7 +14,8 @@ using namespace Qt::StringLiterals;
 namespace data {
 
 Twins twinsOf(const ado::Recordset& shown) {
-    if (core::toText(shown.Collect(u"ficheiro"_s)) == ficheiro::Active)
+    if (!shown.hasColumn(u"ficheiro"_s) ||
+        core::toText(shown.Collect(u"ficheiro"_s)) == ficheiro::Active)
         return {u"tbZelmar_Movimentos"_s, u"tbSocios_Acumulados"_s};
     return {u"tbZelmar_Movimentos_Inactivos"_s, u"tbSocios_Acumulados_Inactivos"_s};
 }

@@ -13,7 +13,7 @@ struct Twins {
 };
 
 /// Those of the active members, or of the members who have left, by `ficheiro` of the movement
-/// shown.
+/// shown; a row without that column is a new one of an active member.
 Twins twinsOf(const ado::Recordset& shown);
 
 /// Asks whether to annul.

@@ -98,10 +98,14 @@ QString missingText(const Operation& operation) {
                : u"falta tirar dos acumulados"_s;
 }
 
+QString named(const Operation& operation) {
+    return (operation.kind == Operation::Kind::Posting ? u"Lançamento nº %1"_s
+                                                       : u"Anulação do nº %1"_s)
+        .arg(operation.movimento_no);
+}
+
 QString described(Operation operation) {
-    const QString what =
-        operation.kind == Operation::Kind::Posting ? u"Lançamento nº %1"_s : u"Anulação do nº %1"_s;
-    return what.arg(operation.movimento_no) + whose(operation) + u": "_s + missingText(operation);
+    return named(operation) + whose(operation) + u": "_s + missingText(operation);
 }
 
 }  // namespace data

@@ -74,6 +74,8 @@ bool accumulatedOrTold(Operation& operation, const ado::Recordset& movement,
 /// Tells what is registered and what is missing, and why.
 void tellUnfinished(const Operation& operation, const QString& why, const QString& caption);
 
+/// What was begun: "Lançamento nº 4001".
+QString named(const Operation& operation);
 /// In words for a person, without a full stop: "Lançamento nº 4001 de 100015, 52,41: falta somar
 /// aos acumulados".
 QString described(Operation operation);

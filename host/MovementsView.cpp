@@ -162,6 +162,7 @@ void MovementsView::takeLoaded(const std::shared_ptr<MovementSearch>& search) {
     if (!book_) return;
     keepingPlace([&] { movements_->setBook(book_, search); });
     takeNewer();
+    emit bookRead();
 }
 
 void MovementsView::focusFilter() {

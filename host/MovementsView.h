@@ -38,6 +38,8 @@ signals:
     void chosen(qint32 movimento_id);
     /// How many movements are shown, for the status line.
     void countChanged(const QString& text);
+    /// The whole book was read afresh.
+    void bookRead();
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;

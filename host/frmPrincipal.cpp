@@ -5,12 +5,14 @@
 #include <QCloseEvent>
 #include <QMenu>
 #include <QMenuBar>
+#include <QScopedValueRollback>
 #include <QSettings>
 #include <QStandardPaths>
 #include <QStatusBar>
 
 #include "host/BookSettings.h"
 #include "host/MovementsView.h"
+#include "host/UnfinishedOperations.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/Form.h"
 
@@ -75,6 +77,8 @@ frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
     connect(movements_, &MovementsView::countChanged, this, &frmPrincipal::showCount);
     connect(movements_, &MovementsView::chosen, this,
             [this](qint32 key) { run(Operations::movement(key, this)); });
+    connect(movements_, &MovementsView::bookRead, this, &frmPrincipal::offerToFinish,
+            Qt::QueuedConnection);
     restoreLook();
     reload();
     movements_->focusFilter();
@@ -189,6 +193,13 @@ void frmPrincipal::reload() {
     user_->setText(u"Utilizador: "_s + settings.user);
     user_->setVisible(!settings.user.isEmpty());
     movements_->open(settings);
+}
+
+/// After the book was read afresh, at the start as well as after a lost connection.
+void frmPrincipal::offerToFinish() {
+    if (isOffering_) return;
+    const QScopedValueRollback offering(isOffering_, true);
+    if (offerToFinishOperations(this, BookSettings::read())) movements_->takeNewer();
 }
 
 void frmPrincipal::showCount(const QString& text) {

@@ -46,10 +46,12 @@ private:
     void addStatusLine();
 
     void login();
+    void offerToFinish();
     void showCount(const QString& text);
     void restoreLook();
     void saveLook() const;
 
+    bool isOffering_ = false;  ///< the question about unfinished operations is open
     Operations operations_;
     MovementsView* movements_;
     QLabel* count_;

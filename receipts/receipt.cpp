@@ -34,9 +34,9 @@ bool receiptChecks(const ReceiptEntry& receipt) {
 /// The account-level row alone, and there the credit alone.
 void addToAccount(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
-    const ado::RecordsetPtr rows =
-        data::openToWrite(u"Select * from tbSocios_Acumulados WHERE (socio_id="_s +
-                          QString::number(socio_id) + u") and (rubrica_id_main=0)"_s);
+    const ado::RecordsetPtr rows = data::openToWrite(
+        u"Select * from "_s + data::twinsOf(movement).accumulators + u" WHERE (socio_id="_s +
+        QString::number(socio_id) + u") and (rubrica_id_main=0)"_s);
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"rubrica_id_main"_s, 0);

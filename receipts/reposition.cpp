@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "receipts/reposition.h"
 
+#include "data/Correction.h"
 #include "data/NewMovement.h"
 #include "data/RowSets.h"
 #include "platform/core/Failure.h"
@@ -34,13 +35,14 @@ bool repositionChecks(const RepositionEntry& reposition) {
 
 /// Accumulators of member, rubric and person; rubric 0 where none was chosen. The comparison with
 /// Null holds for no row, so that every reposition without a rubric adds one. It is meant so.
-QString accumulatorStatement(qint32 socio_id, const QVariant& rubrica_id, const QString& codABC) {
+QString accumulatorStatement(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
+                             const QString& codABC) {
     const QString rubric = core::isNull(rubrica_id)
                                ? u" AND (rubrica_id = 0 )"_s
                                : u" AND (rubrica_id ="_s + core::toText(rubrica_id) + u")"_s;
     const QString person =
         codABC.isEmpty() ? u"AND (codABC = Null)"_s : u"AND (codABC='"_s + codABC + u"')"_s;
-    return u"Select * from tbSocios_Acumulados WHERE (socio_id="_s + QString::number(socio_id) +
+    return u"Select * from "_s + table + u" WHERE (socio_id="_s + QString::number(socio_id) +
            u")"_s + rubric + person;
 }
 
@@ -50,8 +52,8 @@ void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& 
     QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
     // A rubric that was wiped is held as 0.
     if (core::compareNumbers(rubrica_id, 0) == 0) rubrica_id = {};
-    const ado::RecordsetPtr rows =
-        data::openToWrite(accumulatorStatement(socio_id, rubrica_id, codABC));
+    const ado::RecordsetPtr rows = data::openToWrite(
+        accumulatorStatement(data::twinsOf(movement).accumulators, socio_id, rubrica_id, codABC));
     if (rows->atEnd()) rows->AddNew();
     rows->setCollect(u"Socio_ID"_s, socio_id);
     rows->setCollect(u"Rubrica_ID"_s, core::isNull(rubrica_id) ? QVariant(0) : rubrica_id);
