@@ -23,35 +23,25 @@ quint16 positionOf(const std::string& text, std::vector<std::string>& list) {
 
 constexpr std::size_t LongestText = 1000;  // what can be searched for, in bytes
 
-/// A day as somebody types it into a filter; a part that was left out is 0.
-struct TypedDay {
-    int day = 0;
-    int month = 0;
-    int year = 0;
-
-    bool isGiven() const { return month != 0; }
-    bool fits(QDate date) const {
-        return (day == 0 || date.day() == day) && date.month() == month &&
-               (year == 0 || date.year() == year);
+/// The days that somebody means who types a day into a filter, as he would into a field, or a month
+/// of a year ("11-2026").
+struct TypedDays {
+    explicit TypedDays(const QString& word) {
+        if (const std::optional<QDate> day = core::parseDate(word)) {
+            first = last = *day;
+            return;
+        }
+        const QStringList parts =
+            QString(word).replace('/'_L1, '-'_L1).replace('.'_L1, '-'_L1).split('-'_L1);
+        if (parts.size() != 2 || parts[1].size() != 4) return;
+        first = QDate(parts[1].toInt(), parts[0].toInt(), 1);
+        last = first.addMonths(1).addDays(-1);
     }
+    bool fit(QDate day) const { return first.isValid() && day >= first && day <= last; }
+
+    QDate first;
+    QDate last;
 };
-
-TypedDay typedDay(const QString& word) {
-    const QStringList parts = QString(word)
-                                  .replace('/'_L1, '-'_L1)
-                                  .replace('.'_L1, '-'_L1)
-                                  .split('-'_L1, Qt::SkipEmptyParts);
-    if (parts.size() == 3 || (parts.size() == 1 && word.size() == 8)) {
-        const auto date = core::parseDate(word);
-        return date ? TypedDay{date->day(), date->month(), date->year()} : TypedDay{};
-    }
-    if (parts.size() != 2) return {};
-    const int first = parts[0].toInt();
-    const int second = parts[1].toInt();
-    const auto isMonth = [](int month) { return month >= 1 && month <= 12; };
-    if (parts[1].size() == 4) return isMonth(first) ? TypedDay{0, first, second} : TypedDay{};
-    return isMonth(second) && first >= 1 && first <= 31 ? TypedDay{first, second, 0} : TypedDay{};
-}
 
 /// A number without leading zeros; 0 for anything else.
 quint32 wholeNumber(const QString& word) {
@@ -67,7 +57,7 @@ public:
     Word(const MovementSearch& search, const QString& text)
         : search_(search),
           inDocument_(' ' + core::folded(text)),
-          day_(typedDay(text)),
+          days_(text),
           number_(wholeNumber(text)) {
         for (const std::string& type : search.types_)
             fitsType_.push_back(type == core::folded(text) ? 1 : 0);
@@ -107,13 +97,11 @@ private:
         while (rest > number_) rest /= 10;
         return rest == number_;
     }
-    bool fitsDay(qint32 day) const {
-        return day_.isGiven() && day != 0 && day_.fits(QDate::fromJulianDay(day));
-    }
+    bool fitsDay(qint32 day) const { return day != 0 && days_.fit(QDate::fromJulianDay(day)); }
 
     const MovementSearch& search_;
     std::string inDocument_;
-    TypedDay day_;
+    TypedDays days_;
     quint32 number_;  // 0 for none
     std::vector<quint8> fitsType_;
     std::vector<quint8> fitsPerson_;

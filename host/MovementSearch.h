@@ -27,8 +27,8 @@ struct MovementKey {
 ///
 /// A filter is a list of words; a movement fits when every word fits one of: the beginning of its
 /// number, of the staff number, of a word in the member's or relative's name, of a word in the
-/// document's number; its type; its date (day-month-year, day-month or month-year with "-", "/" or
-/// ".", or the eight digits of a day).
+/// document's number; its type; its date (as core::parseDate reads it, or month-year with "-", "/"
+/// or ".").
 class MovementSearch {
 public:
     /// Adds a movement older than all others.

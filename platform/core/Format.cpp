@@ -158,26 +158,66 @@ std::optional<double> parseNumber(const QString& text) {
     return number;
 }
 
+namespace {
+
+/// Years outside this range are typing mistakes, and not every engine stores them.
+std::optional<QDate> dayOf(int year, int month, int day) {
+    const QDate date(year, month, day);
+    return year >= 1753 && date.isValid() ? std::optional(date) : std::nullopt;
+}
+
+/// Two digits mean the hundred years that end twenty years from now.
+int wholeYear(const QString& digits) {
+    const int year = digits.toInt();
+    if (digits.size() > 2) return year;
+    const int newest = today().year() + 20;
+    const int whole = year + newest - newest % 100;
+    return whole > newest ? whole - 100 : whole;
+}
+
+/// The first of the two days that is there and not in the future.
+std::optional<QDate> passed(const QDate& first, const QDate& second) {
+    for (const QDate& day : {first, second})
+        if (day.isValid() && day <= today()) return day;
+    return std::nullopt;
+}
+
+/// Digits without marks between them, parted: "221126", "22112026", "2211".
+QStringList partedDigits(const QString& digits) {
+    switch (digits.size()) {
+        case 4:
+            return {digits.left(2), digits.right(2)};
+        case 6:
+        case 8:
+            return {digits.left(2), digits.mid(2, 2), digits.mid(4)};
+        default:
+            return {digits};
+    }
+}
+
+}  // namespace
+
 std::optional<QDate> parseDate(const QString& typed) {
-    QString text = typed.trimmed();
+    QString text = typed.trimmed().toLower();
+    if (text == QStringLiteral("h") || text == QStringLiteral("hoje")) return today();
     text.replace(u'/', u'-').replace(u'.', u'-');
-    if (!text.contains(u'-') && (text.size() == 6 || text.size() == 8))
-        text = text.left(2) + u'-' + text.mid(2, 2) + u'-' + text.mid(4);
-    const QStringList parts = text.split(u'-');
-    if (parts.size() != 3) return std::nullopt;
+    const QStringList parts = text.contains(u'-') ? text.split(u'-') : partedDigits(text);
     for (const QString& part : parts)
         if (part.isEmpty() || part.size() > 4 || !onlyDigits(part)) return std::nullopt;
-    int year = parts[2].toInt();
-    // Two digits mean the hundred years that end twenty years from now.
-    if (parts[2].size() <= 2) {
-        const int newest = today().year() + 20;
-        year += newest - newest % 100;
-        if (year > newest) year -= 100;
+    const int first = parts[0].toInt();
+    const QDate now = today();
+    if (parts.size() == 3 && parts[0].size() == 4)
+        return dayOf(first, parts[1].toInt(), parts[2].toInt());
+    if (parts.size() == 3) return dayOf(wholeYear(parts[2]), parts[1].toInt(), first);
+    if (parts[0].size() > 2) return std::nullopt;
+    if (parts.size() == 2 && parts[1].size() <= 2) {
+        const int month = parts[1].toInt();
+        return passed(QDate(now.year(), month, first), QDate(now.year() - 1, month, first));
     }
-    // Years outside this range are typing mistakes, and not every engine stores them.
-    if (year < 1753) return std::nullopt;
-    const QDate day(year, parts[1].toInt(), parts[0].toInt());
-    return day.isValid() ? std::optional(day) : std::nullopt;
+    if (parts.size() > 1) return std::nullopt;
+    const QDate before = now.addMonths(-1);
+    return passed(QDate(now.year(), now.month(), first),
+                  QDate(before.year(), before.month(), first));
 }
 
 }  // namespace core

@@ -41,7 +41,10 @@ std::optional<double> parseNumber(const QString& text);
 std::optional<QString> parseDecimal(const QString& text);
 
 /// Reads a date as a person types it: day, month, year with "-", "/", "." or nothing between them,
-/// a year of two or four digits. Nothing when there is no such day.
+/// a year of two or four digits; year, month, day with a year of four digits first; "h" or "hoje".
+/// Without a year ("22-11", "2211") the last such day that is not in the future is meant, of this
+/// year or the last one; without a month ("22") that of this month or the last one. Nothing when
+/// there is no such day.
 std::optional<QDate> parseDate(const QString& text);
 
 }  // namespace core

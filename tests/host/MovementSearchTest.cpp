@@ -5,6 +5,8 @@
 
 #include <QStringList>
 
+#include "platform/core/Clock.h"
+
 using namespace Qt::StringLiterals;
 
 namespace {
@@ -49,6 +51,7 @@ QString found(const host::MovementSearch& search, const QString& filter) {
 }  // namespace
 
 TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
+    core::setToday(QDate(2026, 11, 22));
     const host::MovementSearch search = sampleSearch();
     const std::pair<const char16_t*, const char*> cases[] = {
         {u"", "100 99 98 97 96 95"},
@@ -73,7 +76,11 @@ TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
         // Days.
         {u"21-11-2026", "99 98"},
         {u"21/11/26", "99 98"},
-        {u"21-11", "99 98 96"},
+        {u"21-11", "99 98"},  // of this year; later in the year it would be of the last one
+        {u"2211", "100"},
+        {u"22", "100"},
+        {u"2026-11-21", "99 98"},
+        {u"hoje", "100"},
         {u"11-2026", "100 99 98"},
         {u"2/2026", "97"},
         {u"31-2-2026", ""},
@@ -88,4 +95,5 @@ TEST(MovementSearch, FindsByEveryColumnNewestFirst) {
         const QString filter = QString::fromUtf16(text);
         EXPECT_EQ(found(search, filter).toStdString(), keys) << filter.toStdString();
     }
+    core::setToday({});
 }
