@@ -22,7 +22,7 @@ Twins twinsOf(const ado::Recordset& shown) {
 
 bool confirmAnnulment(const QString& title) {
     return core::MsgBox(u"Deseja anular este registo?"_s, core::Icon::Question, title,
-                        core::Buttons::YesNo) == core::Answer::Yes;
+                        core::Buttons::NoYes) == core::Answer::Yes;
 }
 
 namespace {

@@ -108,7 +108,7 @@ com::Object testPremium(qint32 socio_id) {
     else
         warnOfPremium(*premium);
     if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
-               u"Quotizações"_s, Buttons::YesNo) != Answer::Yes)
+               u"Quotizações"_s, Buttons::NoYes) != Answer::Yes)
         return {};
     const com::Object statement = data::openSearch();
     statement.call(u"appShow"_s, {u"QUO01"_s, 1, QVariant(), u"Activos"_s,

@@ -86,8 +86,9 @@ void follow(Choice choice) {
     }
 }
 
-/// After an entry was posted or given up.
-void askHowToGoOn() {
+/// After an entry was posted or given up, as `outcome` says.
+void askHowToGoOn(const QString& outcome) {
+    Exit::get().tell(outcome);
     Exit::get().onChosen = follow;
     Exit::get().ShowModal();
 }
@@ -95,7 +96,7 @@ void askHowToGoOn() {
 /// On the way back from statements.
 void offerOtherMember() {
     Exit::get().offerOtherMember();
-    askHowToGoOn();
+    askHowToGoOn({});
 }
 
 void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {

@@ -6,6 +6,7 @@
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/annulment.h"
 #include "data/Codes.h"
+#include "data/MovementNote.h"
 #include "entry/DocumentVat.h"
 #include "payments/frmPagamentoCheque.h"
 #include "platform/core/Clock.h"
@@ -74,6 +75,7 @@ void frmMovimentos::connectFieldHandlers() {
     Text9->onGotFocus = [this] { Text9->SelectAll(); };
     Text9->onValidate = [this](bool&) { emptyBecomesNull(Text9); };
     Text11->onValidate = [this](bool& cancel) { Text11_Validate(cancel); };
+    onBoxClosed = [this](const QString& text) { return fieldNamedBy(text); };
     // A rubric or hospital that was wiped is held as 0, not as null.
     for (forms::DataCombo* combo : {DataCombo1, DataCombo2}) combo->setWipedValue(0);
 }
@@ -82,7 +84,7 @@ void frmMovimentos::showAsHospital() {
     if (!Caption().endsWith(u" - Hospital")) setCaption(Caption() + u" - Hospital"_s);
     Label18->show();
     DataCombo2->show();
-    Label19->setText(u"Incidência:"_s);
+    forms::setFieldLabel(Label19, u"Incidênci&a:"_s);
     Text9->bind(Adodc1, u"incidencia"_s);
     DataCombo3->setBoundText(data::modo::Cheque.toString());
 }
@@ -94,7 +96,32 @@ void frmMovimentos::setMember(qint32 id, const QString& number, const QString& n
     Text2->setText(name);
     forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     Command2->setEnabled(true);
-    Command2->setFocus();
+    Command2->setFocus(Qt::TabFocusReason);
+}
+
+/// Without a person the typist goes on at the button that chooses one.
+bool frmMovimentos::stopsEnter(const QWidget* control) const {
+    return control == Command2 ? Text3->Text().isEmpty() : RecordScreen::stopsEnter(control);
+}
+
+/// What a refusal of the try-out or the posting speaks of.
+QWidget* frmMovimentos::fieldNamedBy(const QString& text) const {
+    const std::pair<QStringView, QWidget*> named[] = {
+        {u"indicar um modo de pagamento", DataCombo3},
+        {u"data do documento", Text1},
+        {u"número do documento", Text5},
+        {u"indicar um hospital", DataCombo2},
+        {u"indicar uma rubrica", DataCombo1},
+        {u"código de familiar", Socio_ID != 0 ? static_cast<QWidget*>(Command2) : No_Kor},
+        {u"valor de incidência", Text9},
+        {u"valor para o campo Recebido", Text9},
+        {u"O valor recebido é", Text9},
+        {u"valor para o documento", Text6},
+        {u"O valor do documento é", Text6},
+    };
+    for (const auto& [words, field] : named)
+        if (text.contains(words, Qt::CaseInsensitive)) return field;
+    return nullptr;
 }
 
 void frmMovimentos::showReadOnly(const QString& tipo) {
@@ -125,17 +152,28 @@ void frmMovimentos::showReadOnly(const QString& tipo) {
     forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     for (forms::TextBox* box : {No_Kor, Text2, Text3, Text4, Text1, Text5, Text6})
         box->setLocked(true);
+    forms::setBackColor({No_Kor, Text1, Text5, Text6}, BackColor::Menu);
     for (forms::DataCombo* combo : {DataCombo1, DataCombo2, DataCombo3}) combo->setLocked(true);
     Command1->hide();
     Command2->hide();
     Command6->show();
-    showForReading();
+    showForReading(data::noteOf(*Adodc1->Recordset()));
 }
 
 void frmMovimentos::setDefaults() {
     Text7->setValue(core::fromDate(core::today()));
     Text8->setText((bHospital ? data::tipo::Hospital : data::tipo::Document).toString());
     DataCombo3->setBoundText((bHospital ? data::modo::Cheque : data::modo::Transfer).toString());
+    // A member known from the entry before was never typed here.
+    if (Socio_ID != 0) rateHoldsAValue();
+}
+
+/// Typing a member's number resets the VAT. A member who came by another way resets nothing, but
+/// the rate that nobody has typed must not hold the typist: an empty one cannot be left.
+void frmMovimentos::rateHoldsAValue() {
+    if (!Text11->Text().isEmpty()) return;
+    Text10->setText(u"0"_s);
+    Text11->setText(u"0"_s);
 }
 
 // --- The document's fields
@@ -226,18 +264,22 @@ void frmMovimentos::post() {
                                          &payments::frmPagamentoCheque::ask};
     coverage::TryOut run;
     run.onShown = [this](const coverage::Results& results) { showResults(results); };
-    if (coverage::post(posting, run, operation_)) return leaveEntry();
+    if (coverage::post(posting, run, operation_))
+        return leaveEntry(u"Lançado com o nº %1"_s.arg(operation_.movimento_no));
     if (operation_.isRegistered) lockFields();
 }
 
 void frmMovimentos::Command4_Click() {
-    leaveEntry();
+    if (!mayGiveUp()) return;
+    leaveEntry(operation_.isRegistered ? u"Lançado com o nº %1; "_s.arg(operation_.movimento_no) +
+                                             data::missingText(operation_)
+                                       : u"Nada foi lançado"_s);
 }
 
-void frmMovimentos::leaveEntry() {
+void frmMovimentos::leaveEntry(const QString& outcome) {
     operation_ = {};
     Hide();
-    if (onLeft) onLeft();
+    if (onLeft) onLeft(outcome);
 }
 
 void frmMovimentos::Command6_Click() {

@@ -25,8 +25,9 @@ public:
     bool bHospital = false;
     QPointer<QObject> CallbackClass;  ///< told of an annulment; may be null
 
-    /// Called when the entry was posted or given up; the screen is hidden by then.
-    std::function<void()> onLeft;
+    /// Called when the entry was posted or given up, with a sentence that says which; the screen
+    /// is hidden by then.
+    std::function<void(const QString& outcome)> onLeft;
 
     /// The form of a hospital entry, before the row is given.
     void showAsHospital();
@@ -75,6 +76,7 @@ public:
 protected:
     void setDefaults() override;
     void post() override;
+    bool stopsEnter(const QWidget* control) const override;
 
 private:
     void makeControls();
@@ -104,7 +106,9 @@ private:
     void searchMember();
     void clearMember();
     void workOutVat();
-    void leaveEntry();
+    void rateHoldsAValue();
+    QWidget* fieldNamedBy(const QString& text) const;
+    void leaveEntry(const QString& outcome);
     coverage::Entry entry() const;
     void showResults(const coverage::Results& results);
 

@@ -58,12 +58,14 @@ void frmMovimentos::Command1_Click() {
     forms::handlePlainly([this] { searchMember(); });
 }
 
+/// The search component is dropped at the end. A premium statement that is open stays until another
+/// one takes its place.
 void frmMovimentos::searchMember() {
-    search_ = data::openSearch();
-    const qint32 id = data::chooseMember(search_);
+    const qint32 id = data::chooseMember(data::openSearch());
     if (id == 0) return;
+    noteChoice();
     if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
-        com::Object statement = testPremium(id);
+        if (com::Object statement = testPremium(id)) search_ = statement;
         testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
         Socio_ID = id;
         memberNumber_ = core::toText(member->Collect(u"no_kor"_s));
@@ -73,7 +75,8 @@ void frmMovimentos::searchMember() {
         Command2->setEnabled(true);
         forms::greyOut({Text3, Text4});
         Familia_ID = {};
-        search_ = statement;
+        rateHoldsAValue();
+        Command2->setFocus(Qt::TabFocusReason);
         return;
     }
     No_Kor->Clear();
@@ -96,6 +99,8 @@ void frmMovimentos::Command2_Click() {
     if (!person) return;
     Text3->setText(core::toText(person->codABC));
     if (!core::isNull(person->nome)) Text4->setText(core::toText(person->nome));
+    noteChoice();
+    Text1->setFocus(Qt::TabFocusReason);
 }
 
 }  // namespace entry

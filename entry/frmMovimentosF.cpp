@@ -12,6 +12,7 @@ namespace entry {
 
 frmMovimentosF::frmMovimentosF()
     : Form(u"frmMovimentosF"_s, u"Sair de Lançamentos"_s),
+      Label2(new QLabel),
       Option1(new forms::OptionButton(u"Option1"_s, u"&Sair"_s)),
       Option2(
           new forms::OptionButton(u"Option2"_s, u"Continuar a registar com o mesmo &Associado"_s)),
@@ -31,6 +32,12 @@ void frmMovimentosF::layOut() {
     auto* options = new QVBoxLayout(frame);
     options->setContentsMargins(16, 12, 16, 12);
     options->setSpacing(8);
+    Label2->setObjectName(u"Label2"_s);
+    QFont bold = Label2->font();
+    bold.setBold(true);
+    Label2->setFont(bold);
+    Label2->hide();
+    options->addWidget(Label2);
     auto* question = new QLabel(u"Escolha uma das seguintes opções:"_s);
     question->setObjectName(u"Label1"_s);
     options->addWidget(question);
@@ -38,6 +45,11 @@ void frmMovimentosF::layOut() {
         options->addWidget(option);
 
     forms::layOutSmallScreen(this, frame, Command1, 380);
+}
+
+void frmMovimentosF::tell(const QString& outcome) {
+    Label2->setText(outcome);
+    Label2->setVisible(!outcome.isEmpty());
 }
 
 void frmMovimentosF::offerOtherMember() {

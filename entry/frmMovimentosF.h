@@ -4,6 +4,8 @@
 #include "platform/forms/Controls.h"
 #include "platform/forms/Form.h"
 
+class QLabel;
+
 namespace entry {
 
 /// What to do after an entry was posted or given up.
@@ -14,6 +16,8 @@ public:
 
     frmMovimentosF();
 
+    /// What became of the entry, beside the options.
+    void tell(const QString& outcome);
     /// The choice that is left after statements: another member, or to leave.
     void offerOtherMember();
 
@@ -25,6 +29,7 @@ private:
     void Command1_Click();
     void choose(Choice choice);
 
+    QLabel* Label2;  ///< what became of the entry
     forms::OptionButton* Option1;
     forms::OptionButton* Option2;
     forms::OptionButton* Option3;

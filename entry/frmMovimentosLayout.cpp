@@ -73,7 +73,7 @@ void frmMovimentos::makeControls() {
 QWidget* frmMovimentos::beneficiaryFrame() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
     QGridLayout* grid = pairsIn(frame, OnePair);
-    addRow(grid, 0, u"Número KOR:"_s, {No_Kor, Text2, Command1}, u"Label1"_s);
+    addRow(grid, 0, u"Número &KOR:"_s, {No_Kor, Text2, Command1}, u"Label1"_s);
     addRow(grid, 1, u"Familiar:"_s, {Text3, Text4, Command2}, u"Label3"_s);
     for (TextBox* code : {No_Kor, Text3}) code->setFixedWidth(widthFor(code, u"0000000000"));
     // 6375 twips, fifteen to the pixel.
@@ -86,14 +86,14 @@ QWidget* frmMovimentos::beneficiaryFrame() {
 QWidget* frmMovimentos::documentFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Documento:"_s);
     QGridLayout* grid = pairsIn(frame, ThreePairs);
-    addPair(grid, 0, 0, u"Data:"_s, Text1);
-    addPair(grid, 0, 1, u"Nº Documento:"_s, Text5);
-    addPair(grid, 0, 2, u"Valor Euros:"_s, Text6);
-    Label19 = addPair(grid, 1, 0, u"Recebido Euros:"_s, Text9, u"Label19"_s);
-    addPair(grid, 1, 1, u"Taxa IVA:"_s, Text11);
+    addPair(grid, 0, 0, u"&Data:"_s, Text1);
+    addPair(grid, 0, 1, u"&Nº Documento:"_s, Text5);
+    addPair(grid, 0, 2, u"Va&lor Euros:"_s, Text6);
+    Label19 = addPair(grid, 1, 0, u"Rece&bido Euros:"_s, Text9, u"Label19"_s);
+    addPair(grid, 1, 1, u"Ta&xa IVA:"_s, Text11);
     addPair(grid, 1, 2, u"Imposto IVA:"_s, Text10);
-    addPair(grid, 2, 0, u"Entidade:"_s, DataCombo4, {}, 3);
-    addPair(grid, 3, 0, u"Observações:"_s, Text12, {}, 3);
+    addPair(grid, 2, 0, u"En&tidade:"_s, DataCombo4, {}, 3);
+    addPair(grid, 3, 0, u"Obser&vações:"_s, Text12, {}, 3);
     return frame;
 }
 
@@ -101,9 +101,9 @@ QWidget* frmMovimentos::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Propriedades do Lançamento:"_s);
     QGridLayout* grid = pairsIn(frame, OnePair);
     addPair(grid, 0, 0, u"Data:"_s, Text7);
-    addPair(grid, 0, 1, u"Rúbrica:"_s, DataCombo1);
+    addPair(grid, 0, 1, u"&Rúbrica:"_s, DataCombo1);
     addPair(grid, 1, 0, u"Tipo:"_s, Text8);
-    Label18 = addPair(grid, 1, 1, u"Hospital:"_s, DataCombo2, u"Label18"_s);
+    Label18 = addPair(grid, 1, 1, u"&Hospital:"_s, DataCombo2, u"Label18"_s);
     for (TextBox* box : {Text7, Text8}) box->setFixedWidth(widthFor(box, u"00-00-00000"));
     // The hospital's row keeps its place while it is hidden.
     grid->setColumnMinimumWidth(2, Label18->sizeHint().width());
@@ -116,6 +116,7 @@ QWidget* frmMovimentos::propertiesFrame() {
 
 QWidget* frmMovimentos::resultFrame() {
     auto* frame = new forms::Frame(u"Frame4"_s, u"Resultado do Lançamento:"_s);
+    keepInSight(frame);
     QGridLayout* grid = pairsIn(frame, ThreePairs);
     // What will be posted stands out.
     for (TextBox* outcome : {Credito, Debito}) {
@@ -141,7 +142,7 @@ void frmMovimentos::layOut() {
     auto* foot = new QWidget;
     QGridLayout* below = pairsIn(foot, OnePair);
     below->setContentsMargins(12, 2, 0, 0);
-    addRow(below, 0, u"Modo de Pagamento:"_s, {DataCombo3});
+    addRow(below, 0, u"&Modo de Pagamento:"_s, {DataCombo3});
     DataCombo3->setMinimumWidth(widthFor(DataCombo3, data::modo::Widest));
     below->setColumnStretch(2, 1);
     int column = 3;
@@ -159,8 +160,8 @@ void frmMovimentos::layOut() {
         body->addWidget(part);
     body->addStretch(1);
 
-    // Enter tries the document out, which does no harm; posting wants its own key.
-    Command5->setDefault(true);
+    // Enter ends by trying the document out, which does no harm; posting wants its own key.
+    letEnterGoOn(Command5);
     setTabOrders();
     No_Kor->setFocus();
 }

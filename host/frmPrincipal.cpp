@@ -164,10 +164,10 @@ QAction* frmPrincipal::addOperation(QMenu* menu, const QString& caption, const Q
 
 void frmPrincipal::run(const OperationCall& call) {
     if (QWidget* entry = entryUnderWay(screensTakenBy(call.operation))) {
-        bringForward(entry);
         core::MsgBox(u"Já há um lançamento aberto.\nTermine-o ou cancele-o antes de abrir outro."_s,
                      core::Icon::Information);
-        return;
+        // After the box, which gives the focus back to this window.
+        return bringForward(entry);
     }
     forms::handle([&] { operations_.call(call); });
     movements_->takeNewer();

@@ -7,6 +7,7 @@
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
 #include "data/Members.h"
+#include "data/MovementNote.h"
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
@@ -35,6 +36,17 @@ AccountScreen::AccountScreen(const QString& name)
     bindControls();
     No_Kor->onValidate = [this](bool& cancel) { No_Kor_Validate(cancel); };
     Credito->onGotFocus = [this] { Credito->SelectAll(); };
+    onBoxClosed = [this](const QString& text) { return fieldNamedBy(text); };
+    Command4->onClick = [this] {
+        if (mayGiveUp()) Unload();
+    };
+}
+
+QWidget* AccountScreen::fieldNamedBy(const QString& text) const {
+    if (text.contains("modo de pagamento"_L1)) return DataCombo3;
+    if (text.contains("indicar um Sócio"_L1)) return No_Kor;
+    if (text.contains("valor"_L1) && text.contains("para o crédito"_L1)) return Credito;
+    return nullptr;
 }
 
 void AccountScreen::bindControls() {
@@ -52,8 +64,10 @@ void AccountScreen::showReadOnly(const ado::RecordsetPtr& rows) {
     Text2->bind(Adodc1, u"nome"_s);
     Text2->setBackColor(BackColor::Window);
     lockFields();
+    for (forms::TextBox* box : findChildren<forms::TextBox*>())
+        if (box != Text2) box->setBackColor(BackColor::Menu);
     Command1->hide();
-    showForReading();
+    showForReading(data::noteOf(*rows));
 }
 
 /// Whether the member is enrolled in the plan is not tested here, only where a search of the
@@ -90,7 +104,7 @@ void AccountScreen::clearMember() {
 void AccountScreen::makeBeneficiaryFrame() {
     beneficiaryFrame_ = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
     beneficiary_ = forms::pairsIn(beneficiaryFrame_, {u"Modo de Pagamento:"});
-    forms::addRow(beneficiary_, 0, u"Número KOR:"_s, {No_Kor, Text2, Command1});
+    forms::addRow(beneficiary_, 0, u"Número &KOR:"_s, {No_Kor, Text2, Command1});
     No_Kor->setFixedWidth(forms::widthFor(No_Kor, u"0000000000"));
     Text2->setMinimumWidth(forms::widthFor(Text2, u"Maria da Conceição de Vasconcelos"));
     beneficiary_->setColumnStretch(2, 1);
@@ -99,7 +113,7 @@ void AccountScreen::makeBeneficiaryFrame() {
 QWidget* AccountScreen::notesFrame() {
     auto* frame = new forms::Frame(u"Frame4"_s, u"Obeservações"_s);
     QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:"});
-    grid->addWidget(fieldLabel(u"Notas:"_s, Text1), 0, 0, Qt::AlignTop | Qt::AlignRight);
+    grid->addWidget(fieldLabel(u"&Notas:"_s, Text1), 0, 0, Qt::AlignTop | Qt::AlignRight);
     grid->addWidget(Text1, 0, 1);
     grid->setColumnStretch(1, 1);
     return frame;
@@ -117,8 +131,8 @@ void AccountScreen::layOut(const QString& title, const QString& explanation,
     foot->addStretch(1);
     for (forms::Button* button : buttons) foot->addWidget(button);
     body->addLayout(foot);
-    // It asks before it posts.
-    Command3->setDefault(true);
+    // Posting wants its own key.
+    letEnterGoOn(nullptr);
     No_Kor->setFocus();
 }
 

@@ -38,6 +38,8 @@ protected:
     virtual void clearMember();
     data::Operation operation;  ///< the posting or annulment that this screen is for
 
+    /// What a refusal of the posting speaks of; null for nothing that can be filled in.
+    virtual QWidget* fieldNamedBy(const QString& text) const;
     /// The number was wiped.
     virtual void numberWiped() { clearMember(); }
 

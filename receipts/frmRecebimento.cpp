@@ -33,7 +33,6 @@ frmRecebimento::frmRecebimento()
     Text4->bind(Adodc1, u"cheque"_s);
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
-    Command4->onClick = [this] { Unload(); };
     forms::tabThrough(
         {No_Kor, Command1, Text3, Credito, DataCombo3, Text4, Text1, Command3, Command2, Command4});
 }
@@ -41,11 +40,11 @@ frmRecebimento::frmRecebimento()
 QWidget* frmRecebimento::receiptFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Recebimento:"_s);
     QGridLayout* grid = forms::pairsIn(frame, {u"Modo de Pagamento:", u"Número do Cheque:"});
-    addPair(grid, 0, 0, u"Data:"_s, Text3);
+    addPair(grid, 0, 0, u"&Data:"_s, Text3);
     addPair(grid, 0, 1, u"Tipo:"_s, Text8);
-    addPair(grid, 1, 0, u"Valor a Creditar:"_s, Credito);
-    addPair(grid, 2, 0, u"Modo de Pagamento:"_s, DataCombo3);
-    addPair(grid, 2, 1, u"Número do Cheque:"_s, Text4);
+    addPair(grid, 1, 0, u"&Valor a Creditar:"_s, Credito);
+    addPair(grid, 2, 0, u"&Modo de Pagamento:"_s, DataCombo3);
+    addPair(grid, 2, 1, u"Número do C&heque:"_s, Text4);
     Text4->setMinimumWidth(forms::widthFor(Text4, u"0000000000"));
     return frame;
 }
@@ -72,10 +71,12 @@ void frmRecebimento::Command1_Click() {
     core::passingOver([this] {
         const qint32 id = data::chooseMember(data::openSearch());
         if (id == 0) return;
+        noteChoice();
         if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
             const QString nome = core::toText(member->Collect(u"nome"_s));
             No_Kor->setText(core::toText(member->Collect(u"no_kor"_s)));
             takeMember(id, nome);
+            Text3->setFocus(Qt::TabFocusReason);
         } else {
             No_Kor->Clear();
             clearMember();

@@ -47,7 +47,6 @@ frmReposicao::frmReposicao()
     Debito->onGotFocus = [this] { Debito->SelectAll(); };
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
-    Command4->onClick = [this] { Unload(); };
     forms::tabThrough({No_Kor, Command1, Command2, Text7, DataCombo1, DataCombo3, Debito, Credito,
                        Text1, Command3, Command4});
 }
@@ -69,10 +68,10 @@ void frmReposicao::addPersonRow() {
 QWidget* frmReposicao::propertiesFrame() {
     auto* frame = new forms::Frame(u"Frame2"_s, u"Propriedades do Lançamento:"_s);
     QGridLayout* grid = forms::pairsIn(frame, TwoPairs);
-    addPair(grid, 0, 0, u"Data:"_s, Text7);
-    addPair(grid, 0, 1, u"Rúbrica:"_s, DataCombo1);
+    addPair(grid, 0, 0, u"&Data:"_s, Text7);
+    addPair(grid, 0, 1, u"&Rúbrica:"_s, DataCombo1);
     addPair(grid, 1, 0, u"Tipo:"_s, Text8);
-    addPair(grid, 1, 1, u"Modo de Pagamento:"_s, DataCombo3);
+    addPair(grid, 1, 1, u"&Modo de Pagamento:"_s, DataCombo3);
     for (forms::TextBox* box : {Text7, Text8})
         box->setFixedWidth(forms::widthFor(box, u"00-00-00000"));
     grid->setColumnStretch(1, 0);
@@ -82,8 +81,8 @@ QWidget* frmReposicao::propertiesFrame() {
 QWidget* frmReposicao::resultFrame() {
     auto* frame = new forms::Frame(u"Frame3"_s, u"Resultado do Lançamento:"_s);
     QGridLayout* grid = forms::pairsIn(frame, TwoPairs);
-    addPair(grid, 0, 0, u"Débito:"_s, Debito);
-    addPair(grid, 0, 1, u"Crédito:"_s, Credito);
+    addPair(grid, 0, 0, u"Dé&bito:"_s, Debito);
+    addPair(grid, 0, 1, u"Crédi&to:"_s, Credito);
     return frame;
 }
 
@@ -104,6 +103,13 @@ void frmReposicao::takeMember(qint32 socio_id, const QString& nome) {
     AccountScreen::takeMember(socio_id, nome);
     forms::setBackColor({Text3, Text4}, forms::BackColor::Window);
     Command2->setEnabled(true);
+}
+
+QWidget* frmReposicao::fieldNamedBy(const QString& text) const {
+    if (text.contains("associada a um familiar"_L1))
+        return Text3->Text().isEmpty() ? static_cast<QWidget*>(Command2) : DataCombo1;
+    if (text.contains("para o débito"_L1) && Debito->Text().isEmpty()) return Debito;
+    return AccountScreen::fieldNamedBy(text);
 }
 
 void frmReposicao::clearMember() {
@@ -132,6 +138,8 @@ void frmReposicao::Command1_Click() {
         const QString nome = core::toText(data::ofMember(id, u"nome"_s));
         No_Kor->setText(core::toText(data::ofMember(id, u"no_kor"_s)));
         takeMember(id, nome);
+        noteChoice();
+        Command2->setFocus(Qt::TabFocusReason);
     });
 }
 
@@ -143,6 +151,8 @@ void frmReposicao::Command2_Click() {
         const QVariant value = data::ofPerson(Familia_ID, column);
         if (!core::isNull(value)) box->setText(core::toText(value));
     }
+    noteChoice();
+    Text7->setFocus(Qt::TabFocusReason);
 }
 
 /// Without a rubric the row holds 0, also when nothing was wiped.

@@ -30,6 +30,7 @@ protected:
     void post() override;
     void takeMember(qint32 socio_id, const QString& nome) override;
     void clearMember() override;
+    QWidget* fieldNamedBy(const QString& text) const override;
 
 private:
     void addPersonRow();

@@ -6,7 +6,8 @@
 namespace core {
 
 enum class Icon { None, Information, Exclamation, Question, Critical };
-enum class Buttons { Ok, YesNo };
+/// NoYes shows the same two buttons as YesNo, but Enter says no: for what cannot be undone.
+enum class Buttons { Ok, YesNo, NoYes };
 enum class Answer { Ok, Yes, No };
 
 /// Title of a box that has none of its own.

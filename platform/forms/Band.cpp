@@ -13,6 +13,8 @@ namespace forms {
 
 namespace {
 
+constexpr QStringView NoteName = u"Nota";
+
 class Band : public QWidget {
 public:
     using QWidget::QWidget;
@@ -91,16 +93,17 @@ QWidget* headingBand(const QString& title, const QString& explanation, const QSt
     row->setSpacing(12);
     row->addWidget(new Picture(pictureName, band->fontMetrics().height() * 2 + 4));
     row->addLayout(texts, 1);
+    QLabel* note = bandLabel({}, NoteName.toString());
+    note->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    note->hide();
+    row->addWidget(note);
     return band;
 }
 
-QLabel* fieldLabel(const QString& text, QWidget* field, const QString& name) {
-    auto* label = new QLabel(text);
-    label->setObjectName(name);
-    label->setTextFormat(Qt::PlainText);
-    label->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
-    label->setBuddy(field);
-    return label;
+void setBandNote(const QWidget* screen, const QString& note) {
+    auto* label = screen->findChild<QLabel*>(NoteName.toString());
+    label->setText(note);
+    label->setVisible(!note.isEmpty());
 }
 
 }  // namespace forms

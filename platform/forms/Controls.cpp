@@ -10,12 +10,25 @@
 
 namespace forms {
 
+namespace {
+
+/// Runs what a press of a control does, unless a handler of its screen is running already or the
+/// screen has gone: the press that an assistive program asks for comes a moment later.
+void handlePress(const QWidget* control, const std::function<void()>& handler) {
+    const auto* screen = qobject_cast<const Form*>(control->window());
+    if (screen && screen->isUnloaded()) return;
+    const Turn turn(control->window());
+    if (turn) handle(handler);
+}
+
+}  // namespace
+
 Button::Button(const QString& name, const QString& caption, QWidget* parent)
     : QPushButton(caption, parent) {
     setObjectName(name);
     // A dialog would otherwise choose a default button of its own.
     setAutoDefault(false);
-    connect(this, &QPushButton::clicked, this, [this] { handle(onClick); });
+    connect(this, &QPushButton::clicked, this, [this] { handlePress(this, onClick); });
 }
 
 void Button::setKey(const QString& key) {
@@ -38,18 +51,18 @@ void Button::keyPressEvent(QKeyEvent* event) {
 OptionButton::OptionButton(const QString& name, const QString& caption, QWidget* parent)
     : QRadioButton(caption, parent) {
     setObjectName(name);
-    connect(this, &QRadioButton::clicked, this, [this] { handle(onClick); });
+    connect(this, &QRadioButton::clicked, this, [this] { handlePress(this, onClick); });
 }
 
 CheckBox::CheckBox(const QString& name, const QString& caption, QWidget* parent)
     : QCheckBox(caption, parent) {
     setObjectName(name);
-    connect(this, &QCheckBox::clicked, this, [this] { handle(onClick); });
+    connect(this, &QCheckBox::clicked, this, [this] { handlePress(this, onClick); });
 }
 
 ListBox::ListBox(const QString& name, QWidget* parent) : QListWidget(parent) {
     setObjectName(name);
-    connect(this, &QListWidget::itemClicked, this, [this] { handle(onClick); });
+    connect(this, &QListWidget::itemClicked, this, [this] { handlePress(this, onClick); });
 }
 
 QVariant ListBox::Text() const {

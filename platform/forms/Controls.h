@@ -13,6 +13,7 @@
 namespace forms {
 
 // Each handler (onClick, onTimer, …) runs through forms::handle: what it throws is shown in a box.
+// A press (onClick) takes the turn of its screen and is ignored when another handler has it.
 
 /// A push button; "&" in the caption makes Alt+letter press it, and so does Enter while it has the
 /// focus. Only a button that was told so (setDefault) answers to Enter in a field.

@@ -6,28 +6,39 @@
 #include <QFocusEvent>
 #include <QKeyEvent>
 #include <QLineEdit>
+#include <QScreen>
 #include <QSignalBlocker>
+#include <QStringListModel>
 #include <QWheelEvent>
 
+#include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Form.h"
+#include "platform/forms/ListMatch.h"
 #include "platform/forms/Look.h"
+
+using namespace Qt::StringLiterals;
 
 namespace forms {
 
-DataCombo::DataCombo(const QString& name, QWidget* parent) : QComboBox(parent) {
+DataCombo::DataCombo(const QString& name, QWidget* parent)
+    : QComboBox(parent), offered_(new QStringListModel(this)) {
     setObjectName(name);
     setEditable(true);
     setInsertPolicy(QComboBox::NoInsert);
     setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
     setMinimumContentsLength(12);
     setMaxVisibleItems(16);
-    auto* completer = new QCompleter(model(), this);
-    completer->setCaseSensitivity(Qt::CaseInsensitive);
-    completer->setFilterMode(Qt::MatchContains);
+    // It shows what it is given: the toolkit's own matching knows nothing of accents.
+    auto* completer = new QCompleter(offered_, this);
+    completer->setCompletionMode(QCompleter::UnfilteredPopupCompletion);
     completer->setMaxVisibleItems(16);
     setCompleter(completer);
-    connect(lineEdit(), &QLineEdit::textEdited, this, [this] { edited_ = true; });
+    completer->popup()->installEventFilter(this);
+    connect(lineEdit(), &QLineEdit::textEdited, this, [this] {
+        edited_ = true;
+        offerMatches();
+    });
     connect(this, &QComboBox::activated, this, [this] {
         edited_ = false;
         chosen_ = BoundText();
@@ -100,6 +111,7 @@ void DataCombo::setBoundText(const QVariant& value) {
 void DataCombo::setLocked(bool locked) {
     locked_ = locked;
     lineEdit()->setReadOnly(locked);
+    tint(hasFocus());
 }
 
 void DataCombo::refreshFromRow() {
@@ -110,31 +122,38 @@ void DataCombo::rowReplaced() {
     choose(rowValue());
 }
 
-/// The entry that reads as typed; else the first that begins so; else the only one that holds it: a
-/// stray letter must not choose what happens to contain it. -1 for none. Case does not count.
-int DataCombo::entryFor(const QString& typed) const {
-    if (typed.isEmpty()) return -1;
-    for (const Qt::MatchFlags how :
-         {Qt::MatchFlags(Qt::MatchExactly | Qt::MatchCaseSensitive),
-          Qt::MatchFlags(Qt::MatchFixedString), Qt::MatchFlags(Qt::MatchStartsWith)}) {
-        const int entry = findText(typed, how);
-        if (entry >= 0) return entry;
-    }
-    const QModelIndexList holding =
-        model()->match(model()->index(0, 0), Qt::DisplayRole, typed, 2, Qt::MatchContains);
-    return holding.size() == 1 ? holding.front().row() : -1;
+QStringList DataCombo::entries() const {
+    QStringList texts;
+    for (int at = 0; at < count(); ++at) texts << itemText(at);
+    return texts;
 }
 
-void DataCombo::settleTypedText() {
-    if (!edited_) return;
-    edited_ = false;
-    const int entry = entryFor(currentText());
+void DataCombo::offerMatches() {
+    QStringList texts;
+    for (const qsizetype entry : matching(entries(), currentText()))
+        texts << itemText(static_cast<int>(entry));
+    offered_->setStringList(texts);
+    completer()->popup()->setMinimumWidth(listWidth());
+}
+
+/// The first entry that a text fits; -1 for none.
+int DataCombo::entryFor(const QString& typed) const {
+    const QList<qsizetype> fitting = matching(entries(), typed);
+    return fitting.isEmpty() ? -1 : static_cast<int>(fitting.front());
+}
+
+/// False when the text fits no entry; it stays as it is, so that it can be put right.
+bool DataCombo::settleTypedText() {
+    const QString typed = currentText().trimmed();
+    const int entry = entryFor(typed);
+    if (entry < 0 && !typed.isEmpty()) return false;
     const bool hadChoice = !core::isNull(chosen_);
+    edited_ = false;
     const QSignalBlocker quiet(this);
     setCurrentIndex(entry);
-    // What is no entry must not look like a choice.
     setEditText(entry < 0 ? QString() : itemText(entry));
     chosen_ = entry < 0 && hadChoice ? wiped_ : BoundText();
+    return true;
 }
 
 bool DataCombo::writeChoice() {
@@ -147,7 +166,14 @@ bool DataCombo::leave() {
     // The list of completions would keep the next click to itself.
     if (completer() && completer()->popup()->isVisible()) completer()->popup()->hide();
     if (!edited_) return true;
-    settleTypedText();
+    if (!settleTypedText()) {
+        constexpr qsizetype Quoted = 40;
+        const QString typed = currentText().trimmed();
+        core::MsgBox(u"«"_s + (typed.size() > Quoted ? typed.left(Quoted) + u'…' : typed) +
+                         u"» não consta da lista."_s,
+                     core::Icon::Exclamation);
+        return false;
+    }
     if (writeChoice()) return true;
     edited_ = true;
     return false;
@@ -166,15 +192,37 @@ void DataCombo::focusOutEvent(QFocusEvent* event) {
     if (isAnotherWindows(event) || !entered_) return;
     entered_ = false;
     tint(false);
-    leave();
+    // A text that fits nothing is refused by whoever asks before the focus goes on.
+    const bool fits = currentText().trimmed().isEmpty() || entryFor(currentText()) >= 0;
+    if (!edited_ || fits) leave();
     handle(onLostFocus);
 }
 
-/// The ground of the field that has the focus, as in the text boxes.
+/// The ground of the field that has the focus, or that is locked, as in the text boxes.
 void DataCombo::tint(bool focused) {
     QPalette colours;
-    if (focused && !locked_) colours.setColor(QPalette::Base, focusedGround(palette()));
+    if (locked_)
+        colours.setColor(QPalette::Base, palette().color(QPalette::Window));
+    else if (focused)
+        colours.setColor(QPalette::Base, focusedGround(palette()));
     lineEdit()->setPalette(colours);
+}
+
+/// While the entries that fit are shown, the keys go to their list: what leaves the field takes the
+/// marked entry, or the first one, and goes on as if the list were not there.
+bool DataCombo::eventFilter(QObject* watched, QEvent* event) {
+    QAbstractItemView* offers = completer() ? completer()->popup() : nullptr;
+    if (watched != offers || event->type() != QEvent::KeyPress)
+        return QComboBox::eventFilter(watched, event);
+    const auto* key = static_cast<QKeyEvent*>(event);
+    const bool leaves = key->key() == Qt::Key_Tab || key->key() == Qt::Key_Backtab ||
+                        key->key() == Qt::Key_Return || key->key() == Qt::Key_Enter;
+    if (!leaves) return QComboBox::eventFilter(watched, event);
+    if (offers->currentIndex().isValid()) setEditText(offers->currentIndex().data().toString());
+    offers->hide();
+    QKeyEvent again(key->type(), key->key(), key->modifiers(), key->text(), key->isAutoRepeat());
+    QCoreApplication::sendEvent(this, &again);
+    return true;
 }
 
 void DataCombo::keyPressEvent(QKeyEvent* event) {
@@ -195,7 +243,18 @@ void DataCombo::wheelEvent(QWheelEvent* event) {
 }
 
 void DataCombo::showPopup() {
-    if (!locked_) QComboBox::showPopup();
+    if (locked_) return;
+    view()->setMinimumWidth(listWidth());
+    QComboBox::showPopup();
+}
+
+/// At which the longest entry shows whole beside the scroll bar, as far as the screen goes.
+int DataCombo::listWidth() const {
+    int widest = 0;
+    for (int at = 0; at < count(); ++at)
+        widest = qMax(widest, fontMetrics().horizontalAdvance(itemText(at)));
+    const int beside = style()->pixelMetric(QStyle::PM_ScrollBarExtent) + fontMetrics().height();
+    return qBound(width(), widest + beside, screen()->availableGeometry().width());
 }
 
 }  // namespace forms

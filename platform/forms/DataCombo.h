@@ -7,12 +7,15 @@
 #include "platform/forms/Bound.h"
 #include "platform/forms/Validation.h"
 
+class QStringListModel;
+
 namespace forms {
 
 /// A list from a row set: shows one column, stores another in the column it is bound to. A person
-/// types the beginning (or, with the list open, any part) of an entry and Tab takes it; Alt+Down
-/// opens the list; an emptied text is no choice, and so is a text that fits no entry. When the
-/// list's row set is opened again the combo takes the list anew and keeps what was chosen.
+/// types a part of an entry, and leaving takes the first entry that it fits (matching()); Alt+Down
+/// opens the list. An emptied text is no choice. A text that fits no entry stays and is refused
+/// with a box. When the list's row set is opened again the combo takes the list anew and keeps what
+/// was chosen.
 class DataCombo : public QComboBox, public Bound, public Validating {
     Q_OBJECT
 public:
@@ -40,9 +43,11 @@ public:
     /// Runs when the focus leaves, after the choice was written to the row.
     std::function<void()> onLostFocus;
 
-    /// Takes the entry that was typed and writes it. Refuses only when the row cannot take it, with
-    /// a box that says why; in a row set that is open to read only a change goes nowhere.
+    /// Takes the entry that was typed and writes it. Refuses, with a box that says why, a text that
+    /// fits no entry and what the row cannot take; in a row set that is open to read only a change
+    /// goes nowhere.
     bool leave() override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
 
 protected:
     void refreshFromRow() override;
@@ -57,9 +62,13 @@ private:
     void fill();
     void choose(const QVariant& value);
     void tint(bool focused);
-    void settleTypedText();
+    void offerMatches();
+    bool settleTypedText();
     int entryFor(const QString& typed) const;
+    QStringList entries() const;
+    int listWidth() const;
     bool writeChoice();
+    QStringListModel* offered_;  ///< the entries that fit what is being typed
     ado::RecordsetPtr list_;
     QString listField_;
     QString boundColumn_;

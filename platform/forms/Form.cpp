@@ -5,6 +5,8 @@
 #include <QCloseEvent>
 #include <QEventLoop>
 #include <QKeyEvent>
+#include <QLineEdit>
+#include <QSet>
 #include <QWindow>
 #include <vector>
 
@@ -66,8 +68,32 @@ bool handlePlainly(const std::function<void()>& handler) {
     return run(handler, core::Icon::None);
 }
 
+namespace {
+
+/// The owners whose turn is taken. The object of an unloaded screen outlives its handlers, so that
+/// no other object comes to the same address meanwhile.
+QSet<const QObject*>& takenTurns() {
+    static QSet<const QObject*> owners;
+    return owners;
+}
+
+/// Asked to the front, and not there yet: a window manager answers later.
+QPointer<Form> shownLast;
+
+}  // namespace
+
+Turn::Turn(const QObject* owner) : owner_(takenTurns().contains(owner) ? nullptr : owner) {
+    if (owner_) takenTurns().insert(owner_);
+}
+
+Turn::~Turn() {
+    takenTurns().remove(owner_);
+}
+
 Form::Form(const QString& name, const QString& caption) {
     install();
+    // The control that has the focus is marked from the start: people work by keys here.
+    setAttribute(Qt::WA_KeyboardFocusChange);
     setObjectName(name);
     setWindowTitle(caption);
 }
@@ -80,6 +106,7 @@ void Form::Show() {
     show();
     raise();
     activateWindow();
+    shownLast = isVisible() && !isActiveWindow() ? this : nullptr;
 }
 
 void Form::ShowModal() {
@@ -137,6 +164,40 @@ void Form::setCancelButton(Button* button) {
 
 QWidget* Form::ActiveControl() const {
     return focusWidget();
+}
+
+Form* Form::comingForward() {
+    return shownLast && shownLast->isVisible() ? shownLast : nullptr;
+}
+
+void Form::changeEvent(QEvent* event) {
+    // Any screen that gets the keyboard ends the way of another one to the front.
+    if (event->type() == QEvent::ActivationChange && isActiveWindow()) shownLast = nullptr;
+    QDialog::changeEvent(event);
+}
+
+void Form::letEnterGoOn(Button* last) {
+    enterGoesOn_ = true;
+    enterPresses_ = last;
+}
+
+bool Form::stopsEnter(const QWidget* control) const {
+    if (!dynamic_cast<const Validating*>(control)) return false;
+    const auto* line = qobject_cast<const QLineEdit*>(control);
+    return !line || !line->isReadOnly();
+}
+
+void Form::goOnFrom(QWidget* field) {
+    // The window itself stands at the end of the chain.
+    for (QWidget* next = field->nextInFocusChain(); next != this && next != field;
+         next = next->nextInFocusChain()) {
+        const bool reachable =
+            next->isVisible() && next->isEnabled() && (next->focusPolicy() & Qt::TabFocus);
+        if (reachable && stopsEnter(next)) return next->setFocus(Qt::TabFocusReason);
+    }
+    if (!enterPresses_ || !enterPresses_->isVisible() || !enterPresses_->isEnabled()) return;
+    enterPresses_->setFocus(Qt::TabFocusReason);
+    enterPresses_->click();
 }
 
 void Form::reject() {

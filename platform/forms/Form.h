@@ -21,6 +21,26 @@ bool handle(const std::function<void()>& handler);
 /// The same with a plain box, for handlers that report their failures themselves.
 bool handlePlainly(const std::function<void()>& handler);
 
+/// The turn of a handler: a screen runs one at a time. It is taken where a handler begins. As long
+/// as it is held, also while the handler's box or a modal screen is open, other handlers of the
+/// same owner do not get theirs and have to do nothing: five clicks that a program makes on "&OK"
+/// must post once. Buttons take it for their screen by themselves.
+///
+///     const forms::Turn turn(this);
+///     if (!turn) return;
+class Turn {
+public:
+    /// @param owner  the screen or window; another one has turns of its own
+    explicit Turn(const QObject* owner);
+    ~Turn();
+    Turn(const Turn&) = delete;
+    Turn& operator=(const Turn&) = delete;
+    explicit operator bool() const { return owner_ != nullptr; }
+
+private:
+    const QObject* owner_;  ///< null when another handler has the turn
+};
+
 /// A screen. Its objectName is its name in the code; so is each control's.
 ///
 /// Life: made hidden; Show or ShowModal; Hide keeps it loaded; Unload takes it away for good.
@@ -53,16 +73,39 @@ public:
     /// The control that has the focus; null for none.
     QWidget* ActiveControl() const;
 
+    /// Enter in a field goes on to the next field, as Tab does, but passes buttons by, and from
+    /// the last field it presses `last` (null: it stays there). It presses no default button.
+    void letEnterGoOn(Button* last);
+    bool enterGoesOn() const { return enterGoesOn_; }
+    /// What Enter does in a field that lets go.
+    void goOnFrom(QWidget* field);
+
+    /// The control that a box of this screen speaks of, null for none: the focus is there once the
+    /// box is closed.
+    std::function<QWidget*(const QString& text)> onBoxClosed;
+    /// Boxes of this screen do not cover that part of it.
+    void keepInSight(QWidget* part) { inSight_ = part; }
+    const QWidget* partInSight() const { return inSight_; }
+    /// The screen that has been shown last, while it is still on its way to the front; null when
+    /// it has arrived.
+    static Form* comingForward();
+
     void setVisible(bool visible) override;
     void reject() override;
 
 protected:
     void closeEvent(QCloseEvent* event) override;
+    void changeEvent(QEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
+    /// Whether Enter stops at a control on its way: at fields that a person can type into.
+    virtual bool stopsEnter(const QWidget* control) const;
 
 private:
     bool unloaded_ = false;
     bool loaded_ = false;
+    bool enterGoesOn_ = false;
+    QPointer<Button> enterPresses_;
+    QPointer<QWidget> inSight_;
     QPointer<Button> cancel_;
     QEventLoop* modalLoop_ = nullptr;
 };
@@ -89,12 +132,19 @@ private:
     }
 };
 
-/// The band at the head of a screen: picture, title, one line of explanation. The labels get the
-/// names given. It belongs at the top of a layout without margins.
+/// The band at the head of a screen: picture, title, one line of explanation, and at the right a
+/// note that is empty for now. The labels get the names given. It belongs at the top of a layout
+/// without margins.
 QWidget* headingBand(const QString& title, const QString& explanation, const QString& titleName,
                      const QString& explanationName, const QString& pictureName);
 
-/// A right-aligned label that is the buddy of its field; an "&" in the text is its accelerator.
+/// Writes the note on the band of a screen.
+void setBandNote(const QWidget* screen, const QString& note);
+
+/// A right-aligned label that is the buddy of its field. The letter behind an "&" is its
+/// accelerator; the label's text is without the "&".
 QLabel* fieldLabel(const QString& text, QWidget* field, const QString& name = {});
+/// Gives such a label another text.
+void setFieldLabel(QLabel* label, const QString& text);
 
 }  // namespace forms

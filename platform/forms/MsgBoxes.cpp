@@ -70,12 +70,40 @@ void addButtons(QMessageBox& box, core::Buttons buttons) {
     }
     box.addButton(QMessageBox::Yes)->setText(u"&Sim"_s);
     box.addButton(QMessageBox::No)->setText(u"&Não"_s);
-    box.setDefaultButton(QMessageBox::Yes);
+    box.setDefaultButton(buttons == core::Buttons::NoYes ? QMessageBox::No : QMessageBox::Yes);
     box.setEscapeButton(QMessageBox::No);
+}
+
+/// Boxes are narrower than many a title, which the frame of the window would then cut.
+void makeRoomForTitle(QMessageBox& box, const QString& title) {
+    auto* label = box.findChild<QLabel*>(u"qt_msgbox_label"_s);
+    // The frame's letters may be bold, and its buttons and picture stand beside them.
+    const int height = box.fontMetrics().height();
+    const int frame = box.fontMetrics().horizontalAdvance(title) * 6 / 5 + height * 8;
+    const int besideLabel = height * 5;
+    if (label) label->setMinimumWidth(qMax(label->minimumWidth(), frame - besideLabel));
+}
+
+/// Puts the box below the part of the screen that is to stay in sight, else above it.
+void keepClearOf(const QWidget* part, QMessageBox& box) {
+    if (!part || !part->isVisible()) return;
+    box.adjustSize();
+    const QRect there(part->mapToGlobal(QPoint(0, 0)), part->size());
+    const QRect room = part->screen()->availableGeometry();
+    const QWidget* window = part->window();
+    const int frame = qMax(window->geometry().top() - window->frameGeometry().top(),
+                           box.fontMetrics().height() * 3 / 2);
+    const int gap = box.fontMetrics().height() / 2;
+    int top = there.bottom() + gap;
+    if (top + frame + box.height() > room.bottom()) top = there.top() - gap - frame - box.height();
+    const int left = there.center().x() - box.width() / 2;
+    box.move(qBound(room.left(), left, room.right() - box.width()), qMax(room.top(), top));
 }
 
 /// The window that a box belongs to.
 QWidget* owner() {
+    // A box of the window behind it would cover it for good.
+    if (Form::comingForward()) return Form::comingForward();
     if (QApplication::activeWindow()) return QApplication::activeWindow();
     if (QApplication::activeModalWidget()) return QApplication::activeModalWidget();
     for (QWidget* window : QApplication::topLevelWidgets())
@@ -92,11 +120,18 @@ core::Answer showBox(const QString& text, core::Icon icon, const QString& title,
     box->setIcon(boxIcon(icon));
     box->setWindowTitle(title);
     addButtons(*box, buttons);
-    if (isLong(text)) letTextScroll(*box);
+    if (isLong(text))
+        letTextScroll(*box);
+    else
+        makeRoomForTitle(*box, title);
+    const QPointer<Form> form = qobject_cast<Form*>(parent);
+    if (form) keepClearOf(form->partInSight(), *box);
     const int pressed = box->exec();
     delete box;
     // Without a window manager nobody else gives the focus back.
     if (parent && parent->isVisible()) parent->activateWindow();
+    QWidget* named = form && form->onBoxClosed ? form->onBoxClosed(text) : nullptr;
+    if (named && named->isVisible()) named->setFocus(Qt::OtherFocusReason);
     if (buttons == core::Buttons::Ok) return core::Answer::Ok;
     return pressed == QMessageBox::Yes ? core::Answer::Yes : core::Answer::No;
 }

@@ -10,8 +10,17 @@ MultiLineBox::MultiLineBox(const QString& name, QWidget* parent) : QPlainTextEdi
     setObjectName(name);
     setTabChangesFocus(true);
     connect(this, &QPlainTextEdit::textChanged, this, [this] {
-        if (!showing_) edited_ = true;
+        if (showing_) return;
+        edited_ = true;
+        emit textEdited();
     });
+}
+
+void MultiLineBox::setLocked(bool locked) {
+    setReadOnly(locked);
+    QPalette colours;
+    if (locked) colours.setColor(QPalette::Base, colours.color(QPalette::Window));
+    setPalette(colours);
 }
 
 QSize MultiLineBox::sizeHint() const {
@@ -48,7 +57,7 @@ void MultiLineBox::focusInEvent(QFocusEvent* event) {
 
 void MultiLineBox::focusOutEvent(QFocusEvent* event) {
     QPlainTextEdit::focusOutEvent(event);
-    if (!isAnotherWindows(event)) setPalette(QPalette());
+    if (!isAnotherWindows(event) && !isReadOnly()) setPalette(QPalette());
 }
 
 }  // namespace forms

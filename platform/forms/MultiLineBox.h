@@ -19,12 +19,16 @@ public:
     /// The lines, parted by "\n".
     QString Text() const { return toPlainText(); }
     /// Locked: shown and selectable, but nobody can type into it.
-    void setLocked(bool locked) { setReadOnly(locked); }
+    void setLocked(bool locked);
 
     /// Five lines high.
     QSize sizeHint() const override;
     bool leave() override;
     bool takesEnter() const override { return true; }
+
+signals:
+    /// A person has changed the text.
+    void textEdited();
 
 protected:
     void refreshFromRow() override;

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "platform/forms/RecordScreen.h"
 
+#include <QCloseEvent>
+
+#include "platform/core/MsgBox.h"
 #include "platform/forms/DataCombo.h"
 #include "platform/forms/MultiLineBox.h"
 #include "platform/forms/TextBox.h"
@@ -24,11 +27,40 @@ void RecordScreen::showNew(const ado::RecordsetPtr& rows) {
     Adodc1->setRecordset(rows);
     rows->AddNew();
     bShowing = false;
+    watchTyping();
+    typed_ = false;
     Timer1->setEnabled(true);
     Show();
 }
 
-void RecordScreen::showForReading() {
+void RecordScreen::watchTyping() {
+    if (watching_) return;
+    watching_ = true;
+    // The lists' own lines among them.
+    for (QLineEdit* line : findChildren<QLineEdit*>())
+        connect(line, &QLineEdit::textEdited, this, &RecordScreen::noteChoice);
+    for (QComboBox* list : findChildren<QComboBox*>())
+        connect(list, &QComboBox::activated, this, &RecordScreen::noteChoice);
+    for (MultiLineBox* box : findChildren<MultiLineBox*>())
+        connect(box, &MultiLineBox::textEdited, this, &RecordScreen::noteChoice);
+}
+
+bool RecordScreen::mayGiveUp() {
+    if (!isUnderWay() || !typed_) return true;
+    return core::MsgBox(u"Há dados por lançar, que se perdem.\nQuer deixar o lançamento?"_s,
+                        core::Icon::Question, Caption(), core::Buttons::NoYes) == core::Answer::Yes;
+}
+
+void RecordScreen::closeEvent(QCloseEvent* event) {
+    const Turn turn(this);
+    if (turn && mayGiveUp())
+        Form::closeEvent(event);
+    else
+        event->ignore();
+}
+
+void RecordScreen::showForReading(const QString& note) {
+    setBandNote(this, note);
     Timer1->setEnabled(false);
     bShowing = true;
     Command4->hide();
@@ -42,6 +74,8 @@ void RecordScreen::lockFields() {
     for (TextBox* box : findChildren<TextBox*>()) box->setLocked(true);
     for (DataCombo* combo : findChildren<DataCombo*>()) combo->setLocked(true);
     for (MultiLineBox* box : findChildren<MultiLineBox*>()) box->setLocked(true);
+    // What stands in the fields is in the book; nothing of it is lost with the screen.
+    typed_ = false;
 }
 
 void RecordScreen::Timer1_Timer() {

@@ -21,6 +21,9 @@ public:
 
     /// Adds a new row to the row set and shows the screen on it, modeless.
     void showNew(const ado::RecordsetPtr& rows);
+    /// A person has chosen something in another window that is now part of the new row; what is
+    /// typed into the controls counts by itself.
+    void noteChoice() { typed_ = true; }
     /// True while a person is at work on a new row.
     bool isUnderWay() const { return isVisible() && !bShowing; }
 
@@ -31,15 +34,22 @@ protected:
     virtual void post() = 0;
     /// Turns the screen into the view of an existing row: no defaults, "&Sair" in place of both
     /// buttons.
-    void showForReading();
+    /// @param note  what is to be known of the row, for the heading band
+    void showForReading(const QString& note);
     /// Locks all fields: what is typed cannot change the row any more.
     void lockFields();
+    /// Whether a new row may be given up: asks when something was typed into it.
+    bool mayGiveUp();
+    void closeEvent(QCloseEvent* event) override;
 
 private:
+    void watchTyping();
     void Timer1_Timer();
     void Command3_Click();
 
     Timer* Timer1;
+    bool typed_ = false;  ///< a person has typed or chosen something since the row was added
+    bool watching_ = false;
 };
 
 /// Unloads the default instance of a record screen if it only shows a row: it holds nothing that a

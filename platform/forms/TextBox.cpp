@@ -5,6 +5,7 @@
 #include <QKeyEvent>
 #include <QStyleOptionFrame>
 
+#include "platform/core/Clock.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Form.h"
@@ -43,6 +44,10 @@ bool TextBox::isNumeric() const {
            format_ == core::format::Rate;
 }
 
+bool TextBox::isDate() const {
+    return format_ == core::format::Date;
+}
+
 void TextBox::limitToColumn() {
     if (!hasRow()) return;
     const int size = DataSource()->Recordset()->Fields(DataField()).DefinedSize();
@@ -75,6 +80,7 @@ void TextBox::initStyleOption(QStyleOptionFrame* option) const {
 QVariant TextBox::convert(const QString& text) const {
     if (hasRow()) return fromTypedText(text, DataSource()->Recordset()->Fields(DataField()).Type());
     if (text.isEmpty()) return {};
+    if (isDate()) return fromTypedDate(text);
     const std::optional<double> number =
         isNumeric() ? core::parseNumber(text) : std::optional<double>();
     return number ? QVariant(*number) : QVariant(text);
@@ -95,7 +101,14 @@ void TextBox::rowReplaced() {
     showValue(rowValue());
 }
 
+/// Pasted blanks are no part of a number, a date or a name's number.
+void TextBox::cutBlanks() {
+    const QString text = QLineEdit::text().trimmed();
+    if (edited_ && !format_.isEmpty() && text != QLineEdit::text()) QLineEdit::setText(text);
+}
+
 bool TextBox::leave() {
+    cutBlanks();
     bool cancel = false;
     if (onValidate && !handle([this, &cancel] { onValidate(cancel); })) return false;
     if (cancel) return false;
@@ -130,7 +143,22 @@ void TextBox::keyPressEvent(QKeyEvent* event) {
         edited_ = true;
         return;
     }
+    const auto modifiers = event->modifiers() & ~Qt::KeypadModifier;
+    const bool arrow = event->key() == Qt::Key_Up || event->key() == Qt::Key_Down;
+    if (arrow && modifiers == Qt::NoModifier && isDate() && !isReadOnly())
+        return stepDay(event->key() == Qt::Key_Up ? 1 : -1);
     QLineEdit::keyPressEvent(event);
+}
+
+void TextBox::stepDay(int days) {
+    const std::optional<QDate> day = core::parseDate(text());
+    if (!day && !text().trimmed().isEmpty()) return;
+    const QDate next = day ? day->addDays(days) : core::today();
+    QLineEdit::setText(core::formatted(next, core::format::Date));
+    selectAll();
+    // As if it had been typed.
+    edited_ = true;
+    emit textEdited(text());
 }
 
 void TextBox::mousePressEvent(QMouseEvent* event) {

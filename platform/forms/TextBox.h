@@ -22,7 +22,9 @@ enum class BackColor { Menu, Window };
 /// set that is open to read only takes no change: the box shows the row's value again. One that is
 /// open to write keeps the change as pending, also where the rows of a view can never be updated.
 ///
-/// In a box with a number format the decimal key of the numeric pad types the locale's mark.
+/// In a box with a number format the decimal key of the numeric pad types the locale's mark. In one
+/// with the date format the arrows go a day on and back, from today in an empty box. Blanks around
+/// what was typed or pasted are cut off when a box with a format is left.
 class TextBox : public QLineEdit, public Bound, public Validating {
     Q_OBJECT
 public:
@@ -70,6 +72,9 @@ protected:
 private:
     void showValue(const QVariant& value);
     bool isNumeric() const;
+    bool isDate() const;
+    void stepDay(int days);
+    void cutBlanks();
     QString format_;
     QVariant shown_;              ///< the value behind the text, as long as nobody types
     bool edited_ = false;         ///< a person has changed the text since it was last shown

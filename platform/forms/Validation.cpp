@@ -13,6 +13,7 @@
 #include <QWindow>
 
 #include "platform/forms/Controls.h"
+#include "platform/forms/Form.h"
 
 namespace forms {
 
@@ -45,6 +46,15 @@ QWidget* receiverOf(QWidget* target) {
 QPushButton* defaultButtonOf(const QWidget* window) {
     for (QPushButton* button : window->findChildren<QPushButton*>())
         if (button->isDefault() && button->isVisible() && button->isEnabled()) return button;
+    return nullptr;
+}
+
+QAbstractButton* disabledButtonOf(const QWidget* window, const QKeyEvent* key) {
+    if (!(key->modifiers() & Qt::AltModifier)) return nullptr;
+    const QKeySequence pressed(key->keyCombination());
+    for (QAbstractButton* button : window->findChildren<QAbstractButton*>())
+        if (button->isVisible() && !button->isEnabled() && button->shortcut() == pressed)
+            return button;
     return nullptr;
 }
 
@@ -94,7 +104,12 @@ private:
         if (asking_.contains(field)) return false;
         asking_.append(field);
         const QPointer<QWidget> alive = field;
-        const bool agreed = dynamic_cast<Validating*>(field)->leave();
+        bool agreed = false;
+        {
+            // While a box of the field is open, a program presses nothing on its screen.
+            const Turn turn(field->window());
+            agreed = dynamic_cast<Validating*>(field)->leave();
+        }
         agreed_ = agreed ? alive : nullptr;
         if (!agreed && alive && !alive->hasFocus()) alive->setFocus(Qt::OtherFocusReason);
         asking_.removeOne(field);
@@ -148,13 +163,38 @@ private:
         const bool plain = !(key->modifiers() & (Qt::ControlModifier | Qt::AltModifier));
         if (plain && (key->key() == Qt::Key_Tab || key->key() == Qt::Key_Backtab))
             return !agrees(widget);
-        if (key->key() != Qt::Key_Return && key->key() != Qt::Key_Enter) return false;
+        if (key->key() != Qt::Key_Return && key->key() != Qt::Key_Enter)
+            return pressesWhatItEnables(widget, key) || typesByAccelerator(*key);
         if (dynamic_cast<Validating*>(widget)->takesEnter()) return false;
+        auto* form = qobject_cast<Form*>(widget->window());
+        if (form && form->enterGoesOn()) {
+            // A key held down must not run through the whole screen.
+            const QPointer<QWidget> alive = widget;
+            if (!key->isAutoRepeat() && agrees(widget) && alive) form->goOnFrom(widget);
+            return true;
+        }
         const QPointer<QPushButton> button = defaultButtonOf(widget->window());
         if (!button || passes(button)) return false;
         if (!agrees(widget)) return true;
         if (button && button->isEnabled()) button->setFocus(Qt::TabFocusReason);
         return false;
+    }
+
+    /// An accelerator that belongs to nothing would type its letter into the field.
+    static bool typesByAccelerator(const QKeyEvent& key) {
+        return key.modifiers() == Qt::AltModifier && !key.text().isEmpty() &&
+               key.text().front().isPrint();
+    }
+
+    /// The accelerator of a disabled button, which what stands in the field may enable: the field
+    /// is left first, as with any other accelerator.
+    bool pressesWhatItEnables(QWidget* field, const QKeyEvent* key) {
+        const QPointer<QAbstractButton> button = disabledButtonOf(field->window(), key);
+        if (!button) return false;
+        if (!agrees(field) || !button || !button->isEnabled()) return true;
+        button->setFocus(Qt::ShortcutFocusReason);
+        button->click();
+        return true;
     }
 
     /// The net under the filter: focus that code or a list's popup has moved.

@@ -90,6 +90,8 @@ TEST_F(Beneficiary, TypingResetsTheVatAndKeepsThePersonSearchingTheOtherWayRound
               u"Lumbra.appShow(\"QUO01\", 1, nothing, \"Activos\", "
               "\"tbQuotas_Movimentos.socio_id=%1\", true, true)"_s.arg(socio));
     EXPECT_EQ(companions.statementsOpen, 1);
+    search(0);
+    EXPECT_EQ(companions.statementsOpen, 1) << "a search that is given up closes nothing";
 }
 
 TEST_F(Beneficiary, ArrearsWarnAndTheQuestionAlwaysFollows) {
@@ -125,6 +127,9 @@ TEST_F(Beneficiary, PersonWhoIsRefusedOrNotChosenLeavesTheFormerOne) {
     expectFormer();
     choosePerson(0);
     expectFormer();
+    EXPECT_TRUE(form().Command2->hasFocus());
+    choosePerson(child);
+    EXPECT_TRUE(form().Text1->hasFocus());
 }
 
 TEST_F(Beneficiary, CompanionsThatAnswerNonsenseOrAreMissingAreSaid) {

@@ -85,6 +85,13 @@ void EntryTest::typeDocument(const QString& value, const QString& received, cons
     if (form().bHospital) person.fill(u"DataCombo2"_s, u"H01"_s);
 }
 
+void EntryTest::expectGivingUp(core::Answer answer) {
+    person.expectBox({.text = u"Há dados por lançar, que se perdem.\nQuer deixar o lançamento?"_s,
+                      .answer = answer,
+                      .icon = core::Icon::Question,
+                      .title = form().Caption()});
+}
+
 void EntryTest::postAndLeave() {
     person.expectBox({.text = u"Deseja finalizar o registo?"_s,
                       .answer = Answer::Yes,

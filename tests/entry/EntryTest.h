@@ -32,6 +32,8 @@ protected:
     void typeDocument(const QString& value, const QString& received = QStringLiteral("0"),
                       const QString& rate = QStringLiteral("0"));
 
+    /// The next question whether a filled entry may be left gets that answer.
+    void expectGivingUp(core::Answer answer = core::Answer::Yes);
     /// "&OK" and yes, up to what the posting says. On frmMovimentosF the person then leaves.
     void postAndLeave();
 

@@ -1,5 +1,9 @@
 // SPDX-License-Identifier: MIT
 // Try-out and posting at the screen, to the stored rows.
+#include <QAccessible>
+#include <QTest>
+#include <QTimer>
+
 #include "tests/entry/EntryTest.h"
 
 using namespace Qt::StringLiterals;
@@ -87,6 +91,72 @@ TEST_F(Posting, HospitalBillByChequeTakesTheOvertypedNumber) {
               "500|1200"_s.arg(hospital));
     EXPECT_EQ(book.text(u"select cheque_no from tbCheques"_s), u"501"_s);
     EXPECT_EQ(accumulator(), u"A|500|1200|1"_s);
+}
+
+/// Presses a button as an assistive program does, and by the call that every program has.
+void pressFiveTimes(QAbstractButton* button) {
+    for (int time = 0; time < 5; ++time) {
+        button->click();
+        QAccessible::queryAccessibleInterface(button)->actionInterface()->doAction(
+            QAccessibleActionInterface::pressAction());
+        EXPECT_TRUE(QTest::qWaitFor([button] { return !button->isDown(); }));
+    }
+}
+
+TEST_F(Posting, ProgramsThatPressFiveTimesPostAndAnnulOnce) {
+    openNew();
+    typeDocument(u"100"_s);
+    forms::Button* ok = form().Command3;
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+    person.onScreen(u"frmMovimentosF"_s, [&] {
+        pressFiveTimes(ok);
+        person.accelerator(u'S');
+        person.enter();
+    });
+    QTimer::singleShot(0, [ok] { pressFiveTimes(ok); });
+    ok->click();
+    EXPECT_EQ(stored(u"movimento_no, credito"_s), u"1|75"_s);
+    EXPECT_EQ(accumulator(), u"A|75|75|1"_s);
+
+    openView(book.value(u"select movimento_id from tbZelmar_Movimentos"_s));
+    person.expectBox({.text = u"Deseja anular este registo?"_s, .answer = Answer::Yes});
+    QTimer::singleShot(0, [this] { pressFiveTimes(form().Command6); });
+    form().Command6->click();
+    EXPECT_EQ(book.text(u"select tipo, credito from tbZelmar_Movimentos order by movimento_no"_s),
+              u"ANL|75\nCOR|-75"_s);
+    EXPECT_EQ(accumulator(), u"A|0|0|0"_s);
+}
+
+TEST_F(Posting, ARefusalLeadsToTheFieldThatItNames) {
+    const std::tuple<QString, QString, QString> rows[] = {
+        {u"DataCombo1"_s, u"Tem de Indicar uma rubrica!"_s, u"0101"_s},
+        {u"Text6"_s, u"Tem de indicar um valor para o documento!"_s, u"100"_s},
+        {u"Text9"_s, u"Tem de indicar um valor para o campo Recebido!"_s, u"101"_s},
+        {u"Text9"_s, u"O valor recebido é maior que o valor do documento."_s, u"0"_s},
+        {u"DataCombo3"_s, u"Tem de indicar um modo de pagamento."_s, u"TRF"_s},
+        {u"Text1"_s, u"Tem de introduzir a data do documento."_s, u"10-03-2026"_s},
+        {u"Text5"_s, u"Tem de introduzir o número do documento."_s, u"4711"_s},
+    };
+    openNew();
+    typeMember();
+    person.expectBox({.text = u"Não foi atribuido nenhum código de familiar!"_s});
+    person.fill(u"DataCombo1"_s, u"0101"_s);
+    person.accelerator(u'E');
+    EXPECT_TRUE(form().Command2->hasFocus());
+    forms::DefaultInstance<frmMovimentos>::unload();
+    openNew();
+    typeDocument(u"100"_s);
+    for (const auto& [field, text, mended] : rows) {
+        SCOPED_TRACE(text.toStdString());
+        if (!text.startsWith(u"O valor"_s)) person.fill(field, {});
+        person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+        person.expectBox({.text = text});
+        person.accelerator(u'O');
+        person.expectNoBoxesLeft();
+        ASSERT_TRUE(person.find(field)->hasFocus());
+        person.fill(field, mended);
+        if (mended == u"101"_s) person.accelerator(u'E');  // fills the incidence
+    }
 }
 
 TEST_F(Posting, FailingWriteIsSaidKeepsWhatWasTypedAndCanBeTriedAgain) {

@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: MIT
 // A movement under view.
+#include <QLabel>
+
 #include "tests/entry/EntryTest.h"
 
 using namespace Qt::StringLiterals;
@@ -20,7 +22,8 @@ protected:
             "doc_data = '2026-01-30 00:00:00', doc_valor = 1200.5, doc_iva = 67.95, "
             "recebido = 12.25, incidencia = 1000, comparticipacao = 750, saldo_plafond = 499.9, "
             "saldo_acumulado = -3.5, iliquido = 749, liquido = 499.8, credito = 498, "
-            "debito = 1200.4, modo_pagamento = 'CHQ' where movimento_id = %1"_s.arg(key));
+            "debito = 1200.4, modo_pagamento = 'CHQ', cheque = 77, created_by = 'maria' where movimento_id = %1"_s
+                .arg(key));
         return key;
     }
 };
@@ -55,6 +58,9 @@ TEST_F(ReadOnlyView, ShowsAHospitalBillAndLocksIt) {
          {form().No_Kor, form().Text1, form().Text3, form().Text5, form().Text6})
         EXPECT_TRUE(box->isReadOnly()) << box->objectName().toStdString();
 
+    EXPECT_EQ(person.find<QLabel>(u"Nota"_s)->text(),
+              u"Movimento nº 31\nLançado por maria · Cheque 77 · Em vigor"_s);
+    EXPECT_EQ(form().Text6->backColor(), forms::BackColor::Menu);
     const QString before = book.everything();
     // Through every field, as they are: no box, no field that holds.
     for (int at = 0; at < 20; ++at) person.tab();

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // From an entry to the next one, and what stays of an entry when something else opens.
+#include <QLabel>
 #include <QRadioButton>
 
 #include "boundary/General.h"
@@ -13,6 +14,7 @@ namespace entry {
 
 namespace {
 
+using core::Answer;
 using core::Icon;
 
 class Route : public EntryTest {
@@ -54,12 +56,14 @@ TEST_F(Route, TheWayOutOffersFourOptions) {
         person.put(u"Text1"_s, u"31-02-2026"_s);  // what refuses does not hold "&Cancelar"
         person.onScreen(u"frmMovimentosF"_s, [&, name = name, text = text, key = key] {
             EXPECT_FALSE(form().isVisible());
+            EXPECT_EQ(person.find<QLabel>(u"Label2"_s)->text(), u"Nada foi lançado"_s);
             EXPECT_TRUE(person.find<QRadioButton>(u"Option2"_s)->isChecked());
             EXPECT_EQ(person.find<QRadioButton>(name)->text(), text);
             person.accelerator(key);
             if (key == u'E') person.onScreen(u"frmExtratos"_s, [this] { person.here()->close(); });
             person.accelerator(u'O');
         });
+        expectGivingUp();
         person.accelerator(u'C');
         key == u'A'   ? expectNewEntry(true, socio)
         : key == u'C' ? expectNewEntry(true, 0)
@@ -70,11 +74,61 @@ TEST_F(Route, TheWayOutOffersFourOptions) {
     EXPECT_EQ(book.everything(), before);
 }
 
+TEST_F(Route, GivingUpAsksOnlyWhenSomethingWasTyped) {
+    const std::function<void()> waysOut[] = {[this] { person.escape(); },
+                                             [this] { person.accelerator(u'C'); },
+                                             [this] { form().close(); }};
+    for (const auto& giveUp : waysOut) {
+        for (const bool typed : {true, false}) {
+            openNew();
+            if (typed) {
+                person.put(u"Text12"_s, u"a meio"_s);
+                expectGivingUp(Answer::No);
+                giveUp();
+                person.expectNoBoxesLeft();
+                EXPECT_EQ(form().Text12->Text(), u"a meio"_s);
+                expectGivingUp();
+            }
+            if (&giveUp != &waysOut[2])
+                person.onScreen(u"frmMovimentosF"_s, [this] { person.here()->close(); });
+            giveUp();
+            person.settle();
+            expectNoScreen();
+        }
+    }
+}
+
+TEST_F(Route, AfterTheSameMemberTheTypistGoesOnAtThePersonAndNoRateHoldsHim) {
+    openNew();
+    typeDocument(u"100"_s);
+    person.expectBox({.text = u"Deseja finalizar o registo?"_s, .answer = Answer::Yes});
+    person.onScreen(u"frmMovimentosF"_s, [this] {
+        EXPECT_EQ(person.find<QLabel>(u"Label2"_s)->text(), u"Lançado com o nº 1"_s);
+        person.enter();
+    });
+    person.accelerator(u'O');
+    expectNewEntry(false, socio);
+    EXPECT_TRUE(form().Command2->hasFocus());
+    EXPECT_EQ(form().Text11->Text(), u"00,00"_s);
+    companions.personChosen = self;
+    person.enter();
+    EXPECT_TRUE(form().Text1->hasFocus());
+    forms::DefaultInstance<frmMovimentos>::unload();
+    openNew();
+    companions.memberFound = socio;
+    person.expectBox(
+        {.text = u"Quer ver o extrato de quotizações deste Associado?"_s, .answer = Answer::No});
+    person.accelerator(u'P');
+    EXPECT_TRUE(form().Command2->hasFocus());
+    EXPECT_EQ(form().Text11->Text(), u"00,00"_s);
+}
+
 TEST_F(Route, NumberTypedButNeverAcceptedDoesNotTravelOn) {
     book.premiumInOrder(book.member({.no_kor = u"100077"_s, .nome = u"Rui Sá"_s}));
     openNew();
     typeMember();
     person.put(u"No_Kor"_s, u"100077"_s);
+    expectGivingUp();
     person.onScreen(u"frmMovimentosF"_s, [this] { person.enter(); });
     person.escape();
     expectNewEntry(false, socio);
@@ -109,6 +163,7 @@ TEST_F(Route, EntryThatCannotBeOpenedIsSaidAndLeavesNothingInTheWay) {
     openNew();
     typeMember();
     environment::dtZelmars::instance().MSAccess()->Close();
+    expectGivingUp();
     person.expectBox({.icon = Icon::Critical, .partly = true});
     person.onScreen(u"frmMovimentosF"_s, [this] { person.enter(); });
     person.accelerator(u'C');

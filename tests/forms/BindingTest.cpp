@@ -3,7 +3,9 @@
 
 #include <QDateTime>
 
+#include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Format.h"
 #include "platform/core/Money.h"
 #include "platform/core/Values.h"
 #include "tests/forms/SampleBook.h"
@@ -16,7 +18,9 @@ namespace {
 
 class Binding : public testing::Test {
 protected:
+    ~Binding() override { core::setToday({}); }
     void SetUp() override {
+        core::setToday(QDate(2026, 3, 10));
         screen.take(rows);
         screen.Show();
         person.screen(u"frmRecibo"_s);
@@ -48,6 +52,7 @@ TEST_F(Binding, WhatIsTypedIsShownInItsFormatAndKept) {
         {u"Valor"_s, u""_s, u""_s, u"valor"_s, {}},
         {u"Ordem"_s, u"-32.768"_s, u"-32768"_s, u"ordem"_s, u"-32768"_s},
         {u"Dia"_s, u"5/3/2026"_s, u"05-03-2026"_s, u"dia"_s, u"2026-03-05"_s},
+        {u"Dia"_s, u"0503"_s, u"05-03-2026"_s, u"dia"_s, u"2026-03-05"_s},
         {u"Dia"_s, u""_s, u""_s, u"dia"_s, {}},
         {u"Numero"_s, u"A1"_s, u"A1"_s, u"numero"_s, u"A1"_s},
         {u"Numero"_s, u""_s, u""_s, u"numero"_s, u""_s},
@@ -81,6 +86,40 @@ TEST_F(Binding, AnAmountIsEditedAsAPlainNumberAndLookingAtItWritesNothing) {
     person.type(u"5"_s);
     person.tab();
     EXPECT_EQ(rowText(u"valor"_s), "12.5");
+}
+
+TEST_F(Binding, DaysGoOnAndBackByTheArrowsFromToday) {
+    for (const QString& field : {u"Dia"_s, u"Desde"_s}) {
+        const auto* box = person.find<forms::TextBox>(field);
+        person.put(field, {});
+        QStringList days;
+        for (const Qt::Key key : {Qt::Key_Down, Qt::Key_Down, Qt::Key_Up, Qt::Key_Up}) {
+            person.press(key);
+            days << box->Text();
+        }
+        EXPECT_EQ(days, u"10-03-2026 09-03-2026 10-03-2026 11-03-2026"_s.split(u' '));
+        person.tab();
+        EXPECT_EQ(box->Text(), u"11-03-2026"_s);
+    }
+    EXPECT_EQ(core::toDate(row(u"dia"_s)), QDate(2026, 3, 11));
+}
+
+TEST_F(Binding, BlanksAroundWhatWasPastedAreCut) {
+    screen.Livre.setFormat(core::format::Number);
+    QString validated;
+    screen.Livre.onValidate = [&](bool&) { validated = screen.Livre.Text(); };
+    const std::tuple<QString, QString, QString> pastes[] = {
+        {u"Livre"_s, u"\t100015 "_s, u"100015"_s},
+        {u"Valor"_s, u" \u00a087,35 "_s, u"€ 87,35"_s},
+        {u"Dia"_s, u" 05-03-2026\n"_s, u"05-03-2026"_s},
+    };
+    for (const auto& [field, pasted, shown] : pastes) {
+        person.put(field, {});
+        person.paste(pasted);
+        person.tab();
+        EXPECT_EQ(person.find<forms::TextBox>(field)->Text(), shown);
+    }
+    EXPECT_EQ(validated, u"100015"_s);
 }
 
 TEST_F(Binding, WhatTheColumnDoesNotTakeIsRefusedAndNothingTypedIsLost) {

@@ -86,6 +86,41 @@ TEST_F(Focus, AnAcceleratorPressesAtOnceAndTakesTheFocusAlong) {
     EXPECT_EQ(order, (QStringList{u"option"_s, u"ok"_s}));
 }
 
+TEST_F(Focus, EnterGoesThroughTheFieldsAndPressesOnlyTheButtonAtTheirEnd) {
+    screen.letEnterGoOn(&screen.Command1);
+    expectRefusal();
+    person.enter();
+    EXPECT_TRUE(screen.Livre.hasFocus());
+    refusing = false;
+    QStringList passed;
+    for (const Qt::Key key : {Qt::Key_Return, Qt::Key_Enter, Qt::Key_Return, Qt::Key_Enter,
+                              Qt::Key_Return, Qt::Key_Enter, Qt::Key_Return}) {
+        const auto modifier = key == Qt::Key_Enter ? Qt::KeypadModifier : Qt::NoModifier;
+        person.press(key, modifier);
+        passed << screen.focusWidget()->objectName();
+    }
+    // The box that only shows is no field.
+    EXPECT_EQ(passed, u"Numero Valor Ordem Dia Rubrica Notas Desde"_s.split(u' '));
+    EXPECT_EQ(screen.pressed, 0);
+    person.enter();
+    EXPECT_EQ(screen.pressed, 1);
+    EXPECT_EQ(screen.finished, 0);
+}
+
+TEST_F(Focus, TheAcceleratorOfAButtonThatTheFieldEnablesPressesItAtOnce) {
+    screen.Command1.setEnabled(false);
+    screen.Livre.onValidate = [this](bool& cancel) {
+        cancel = refusing;
+        screen.Command1.setEnabled(!refusing);
+    };
+    for (const int pressed : {0, 1}) {
+        person.accelerator(u'P');
+        EXPECT_EQ(screen.pressed, pressed);
+        refusing = false;
+    }
+    EXPECT_EQ(screen.Livre.Text(), u"999"_s) << "the letter is not typed";
+}
+
 TEST_F(Focus, GivingUpIsNeverHeldAndTheFieldPassedByIsAskedLater) {
     person.escape();
     person.click(u"Command4"_s);

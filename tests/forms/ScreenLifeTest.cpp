@@ -2,10 +2,14 @@
 // Failures in handlers, and modal screens.
 #include <gtest/gtest.h>
 
+#include <QAccessible>
+#include <QApplication>
 #include <QTest>
+#include <QTimer>
 #include <stdexcept>
 
 #include "platform/core/Failure.h"
+#include "platform/forms/MsgBoxes.h"
 #include "tests/forms/SampleScreen.h"
 #include "tests/support/Operator.h"
 
@@ -18,6 +22,21 @@ class ScreenLife : public testing::Test {
 protected:
     support::Operator person;
 };
+
+// Nobody stands by to answer this box: the test itself presses Enter.
+TEST(Questions, EnterSaysNoToWhatCannotBeUndone) {
+    forms::install();
+    for (const auto& [buttons, answer] : {std::pair(core::Buttons::YesNo, core::Answer::Yes),
+                                          std::pair(core::Buttons::NoYes, core::Answer::No)}) {
+        QTimer::singleShot(0, [] {
+            QWidget* box = QApplication::activeModalWidget();
+            ASSERT_TRUE(box);
+            QTest::keyClick(box->windowHandle(), Qt::Key_Return);
+        });
+        EXPECT_EQ(core::MsgBox(u"Deseja anular este registo?"_s, Icon::Question, {}, buttons),
+                  answer);
+    }
+}
 
 TEST_F(ScreenLife, AFailingHandlerShowsItsTextAndTheProgramGoesOn) {
     const Held<SampleScreen> held;
@@ -60,6 +79,53 @@ TEST_F(ScreenLife, AModalScreenReturnsWhenItIsHiddenAndKeepsTheOthersFromClicks)
     person.screen(u"frmRecibo"_s);
     person.click(u"Command1"_s);
     EXPECT_EQ(behind->pressed, 1);
+}
+
+// Assistive programs press buttons without a person's click, boxes or no boxes.
+TEST_F(ScreenLife, APressIsIgnoredWhileAHandlerOfTheSameScreenRuns) {
+    const Held<SampleScreen> held;
+    const Held<SampleScreen> modal(u"frmModal"_s);
+    SampleScreen& screen = *held;
+    const auto pressFiveTimes = [&screen] {
+        for (int time = 0; time < 5; ++time) {
+            for (forms::Button* button : {&screen.Command1, &screen.Command3}) {
+                button->click();
+                QAccessible::queryAccessibleInterface(button)->actionInterface()->doAction(
+                    QAccessibleActionInterface::pressAction());
+                EXPECT_TRUE(QTest::qWaitFor([button] { return !button->isDown(); }));
+            }
+        }
+    };
+    screen.Command1.onClick = [&] {
+        ++screen.pressed;
+        QTimer::singleShot(0, &screen, pressFiveTimes);
+        core::MsgBox(u"Deseja finalizar o registo?"_s);
+        modal->ShowModal();
+    };
+    modal->Command1.onClick = [&] {
+        ++modal->pressed;
+        pressFiveTimes();
+        modal->Hide();
+    };
+    screen.Show();
+    person.screen(u"frmRecibo"_s);
+    for (int time = 1; time <= 2; ++time) {
+        person.expectBox({.text = u"Deseja finalizar o registo?"_s});
+        person.onScreen(u"frmModal"_s, [&] { person.click(u"Command1"_s); });
+        screen.Command1.click();
+        EXPECT_EQ(screen.pressed, time);
+        EXPECT_EQ(modal->pressed, time) << "another screen has turns of its own";
+    }
+    EXPECT_EQ(screen.finished, 0);
+    person.screen(u"frmRecibo"_s);
+    // A field's question is a handler too.
+    screen.Livre.onValidate = [&](bool&) {
+        QTimer::singleShot(0, &screen, pressFiveTimes);
+        core::MsgBox(u"Este Associado não tem NIB!"_s);
+    };
+    person.expectBox({.text = u"Este Associado não tem NIB!"_s});
+    person.fill(u"Livre"_s, u"1"_s);
+    EXPECT_EQ(screen.pressed + screen.finished, 2);
 }
 
 TEST_F(ScreenLife, ModalScreensNest) {

@@ -147,6 +147,8 @@ TEST_F(Reposition, ViewShowsItAndMakesRoomForTheNextButNotForWhatIsTyped) {
     general.Registo({}, key);
     EXPECT_EQ(entry.Adodc1->Recordset(), attached) << "nothing makes room for a view refused";
     EXPECT_EQ(shown(u"Credito"_s), u"€ 2,00"_s);
+    person.expectBox(
+        {.text = u"Há dados por lançar"_s, .answer = core::Answer::Yes, .partly = true});
     person.accelerator(u'C');
     openView(key, Screen);
     EXPECT_EQ(shown(u"Debito"_s), u"€ 3,00"_s);
