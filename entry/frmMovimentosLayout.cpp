@@ -65,6 +65,9 @@ void frmMovimentos::makeControls() {
 
     DataCombo3 = new forms::DataCombo(u"DataCombo3"_s);
     Command5 = new forms::Button(u"Command5"_s, u"&Ensaio"_s);
+    // A second key, for one finger.
+    Command5->grabShortcut(QKeySequence(Qt::Key_F9));
+    Command5->setToolTip(u"F9"_s);
     Command6 = new forms::Button(u"Command6"_s, u"Anular"_s);
     Command6->setKey(u"Alt+A"_s);
     Command6->hide();

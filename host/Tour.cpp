@@ -140,6 +140,7 @@ public:
         player_.step(u"frmFichaSocio"_s, u"15-ficha-de-associado"_s, typing({u"<Escape>"_s}));
         player_.step(u"frmQuotas"_s, u"16-quotizacoes"_s, [](QWidget* screen) { screen->close(); });
         player_.step(u"frmMovimentos"_s, {}, typing({u"<Escape>"_s}));
+        player_.step(u"box:Há dados por lançar"_s, {}, typing({u"<Alt+S>"_s}));
         leave();
         player_.step(u"frmPrincipal"_s, {}, {});
     }
@@ -180,7 +181,7 @@ private:
 
     /// Today and then one field after the other; tries the document out.
     void fillIn(const Keys& texts) {
-        Keys keys{u"<Tab>"_s, core::today().toString(u"dd-MM-yyyy"_s)};
+        Keys keys{core::today().toString(u"dd-MM-yyyy"_s)};
         for (const QString& text : texts) {
             keys << u"<Tab>"_s;
             if (!text.isEmpty()) keys << text;

@@ -21,6 +21,7 @@ frmPagamentoCheque::frmPagamentoCheque(const ado::RecordsetPtr& movement, const 
     layOut();
     Text1->setText(number);
     Text1->SelectAll();
+    onBoxClosed = [this](const QString&) { return Text1; };
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { step(-1); };
     Command3->onClick = [this] { step(1); };

@@ -39,6 +39,7 @@ void frmExtratos::makeControls() {
     Text2->setDisplayOnly();
     Text2->setBackColor(BackColor::Menu);
     Command1 = new forms::Button(u"Command1"_s, u"Procurar Sócio"_s);
+    Command1->setKey(u"Alt+P"_s);
 
     Option1 = new forms::OptionButton(u"Option1"_s, u"Selecionado por data:"_s);
     Option1->setChecked(true);
@@ -60,7 +61,7 @@ void frmExtratos::makeControls() {
 QWidget* frmExtratos::beneficiaryFrame() {
     auto* frame = new forms::Frame(u"Frame1"_s, u"Identificação do Beneficiário:"_s);
     auto* row = new QHBoxLayout(frame);
-    row->addWidget(forms::fieldLabel(u"Número KOR:"_s, No_Kor, u"Label1"_s));
+    row->addWidget(forms::fieldLabel(u"Número &KOR:"_s, No_Kor, u"Label1"_s));
     row->addWidget(No_Kor);
     row->addWidget(Text2, 1);
     row->addWidget(Command1);
@@ -122,6 +123,7 @@ void frmExtratos::connectHandlers() {
     No_Kor->onValidate = [this](bool& cancel) { No_Kor_Validate(cancel); };
     Command1->onClick = [this] { Command1_Click(); };
     connect(Option1, &QRadioButton::toggled, this, &frmExtratos::showOption);
+    onBoxClosed = [this](const QString& text) { return fieldNamedBy(text); };
     Imprimir->onClick = [this] { Imprimir_Click(); };
     Command4->onClick = [this] { Command4_Click(); };
     setCancelButton(Command4);
@@ -188,6 +190,12 @@ QString frmExtratos::missing() const {
     if (Option2->isChecked() && Text1->Text().isEmpty())
         return u"Tem de preencher o campo do documento!"_s;
     return {};
+}
+
+QWidget* frmExtratos::fieldNamedBy(const QString& text) const {
+    if (text.contains("um associado"_L1)) return No_Kor;
+    if (text.contains("campos da data"_L1)) return core::isNull(Text3->Value()) ? Text3 : Text4;
+    return text.contains("campo do documento"_L1) ? Text1 : nullptr;
 }
 
 Selection frmExtratos::selection() const {

@@ -42,6 +42,7 @@ private:
     void clearMember();
     /// What is missing before anything can be printed; empty for nothing.
     QString missing() const;
+    QWidget* fieldNamedBy(const QString& text) const;
     Selection selection() const;
     void print(const ado::Recordset& member);
 

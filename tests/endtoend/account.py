@@ -128,7 +128,6 @@ def corrections(desktop, book, counter):
     desktop.at("Escolher Familiar")
     desktop.keys("Return")
     desktop.at(ACCOUNT)
-    desktop.keys("Tab")
     typed(desktop, "", "5.02", "", "12,5", "0", "acerto")
     desktop.show("correccao")
     with_rubric = posted(desktop, book, counter)

@@ -36,6 +36,7 @@ class Desktop:
 
     def __init__(self, environment):
         self.programs = []
+        self.pressed = 0  # keys so far; Alt with a letter is one
         # The server picks the number of a free display and writes it to the pipe.
         readable, writable = os.pipe()
         self._start(
@@ -98,9 +99,11 @@ class Desktop:
         wait_until(f"«{title}» has gone", lambda: not self.active_title().startswith(title))
 
     def keys(self, *names):
+        self.pressed += len(names)
         self.run(["xdotool", "key", "--clearmodifiers", "--delay", "20", *names])
 
     def type(self, text):
+        self.pressed += len(text)
         self.run(["xdotool", "type", "--delay", "15", text])
 
     def ask(self, key):

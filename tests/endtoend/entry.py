@@ -25,8 +25,7 @@ def choose_person(desktop, *way):
 
 
 def fill_in_fields(desktop, *texts):
-    """Types one field after the other, beginning behind «Indicar Familiar»."""
-    desktop.keys("Tab")
+    """Types one field after the other, beginning with the date, where the person leaves off."""
     for text in texts:
         if text:
             desktop.type(text)

@@ -129,7 +129,8 @@ def road(desktop, programs, book):
     # The member is known: the person can be chosen at once.
     choose_person(desktop)
     desktop.show("mesmo-associado")
-    desktop.keys("alt+c")
+    desktop.ask("alt+c")
+    desktop.keys("alt+s")
     leave(desktop)
 
     bill = hospital_bill(desktop, book, today)

@@ -48,6 +48,8 @@ TEST_F(Keys, EnterGoesFromFieldToFieldAndTriesOutOnlyAtTheEnd) {
     person.expectBox({.text = u"Tem de Indicar uma rubrica!"_s});
     person.enter();
     EXPECT_TRUE(form().DataCombo1->hasFocus());
+    person.expectBox({.text = u"Tem de Indicar uma rubrica!"_s});
+    person.press(Qt::Key_F9);
 
     // Nothing posts by Enter: the notes take it.
     General().Recebimento();

@@ -103,18 +103,19 @@ TEST_F(Extratos, BothStatementsInBothSelectionsAddUpWhatTheyList) {
 
 TEST_F(Extratos, WhatIsMissingIsSaidInItsOrderAndNothingIsPrinted) {
     open([this] {
-        const auto refused = [this](const QString& text) {
+        const auto refused = [this](const QString& text, const QString& field) {
             person.expectBox(
                 {.text = text, .icon = Icon::Information, .title = u"Impressão de Extratos"_s});
             person.click(u"Imprimir"_s);
             person.expectNoBoxesLeft();
+            EXPECT_TRUE(person.find(field)->hasFocus());
         };
         person.fill(u"Text3"_s, {});
-        refused(u"Tem de indicar um associado!"_s);
+        refused(u"Tem de indicar um associado!"_s, u"No_Kor"_s);
         person.fill(u"No_Kor"_s, u"100015"_s);
-        refused(u"Tem de preencher os campos da data!"_s);
+        refused(u"Tem de preencher os campos da data!"_s, u"Text3"_s);
         choose(u"Option2"_s, true);
-        refused(u"Tem de preencher o campo do documento!"_s);
+        refused(u"Tem de preencher o campo do documento!"_s, u"Text1"_s);
         person.put(u"Text1"_s, u"D/7"_s);
         book.exec(u"delete from tbSocios"_s);  // who has left gets nothing, and nobody is told
         person.accelerator(u'I');
@@ -224,6 +225,7 @@ TEST_F(Extratos, WayFromAnEntryLeadsBackToAnother) {
             person.accelerator(u'E');
             person.enter();
         });
+        expectGivingUp();
         person.accelerator(u'C');
         EXPECT_FALSE(person.isShown(u"frmMovimentosF"_s));
         EXPECT_EQ(forms::DefaultInstance<entry::frmMovimentos>::isLoaded(), end == End::NewMember);
