@@ -32,10 +32,6 @@ void enterAsAdministrator(database::ServerCatalogue& server, const QString& admi
                      admin, server.shown()));
 }
 
-QString counted(qint64 number) {
-    return core::userLocale().toString(number);
-}
-
 volatile std::sig_atomic_t interrupted = 0;
 
 /// While it lives, Ctrl+C is a wish and not the end.
@@ -59,7 +55,7 @@ void showProgress(const database::CopyProgress& progress) {
     if (!isTerminal && !progress.isTableDone) return;
     const qint64 percent = progress.total == 0 ? 100 : progress.allRows * 100 / progress.total;
     const QString line =
-        u"%1 %  %2: %3 linhas"_s.arg(percent, 3).arg(progress.table, counted(progress.rows));
+        u"%1 %  %2: %3 linhas"_s.arg(percent, 3).arg(progress.table, core::grouped(progress.rows));
     if (isTerminal)
         QTextStream(stdout) << '\r' << line << "\x1b[K" << (progress.isTableDone ? "\n" : "")
                             << Qt::flush;
@@ -107,8 +103,8 @@ void copyBook(const CommandLine& line) {
     const database::CopySummary summary = database::copyBook(from, into, showProgress);
     say(u"Copiado de %1 para %2: %3 tabelas, %4 linhas. Os números de linhas e as somas de %5 "
         "colunas de montantes são iguais nos dois livros."_s.arg(
-            from.shown(), into.shown(), counted(summary.tables), counted(summary.rows),
-            counted(summary.sums)));
+            from.shown(), into.shown(), core::grouped(summary.tables), core::grouped(summary.rows),
+            core::grouped(summary.sums)));
 }
 
 }  // namespace host

@@ -12,6 +12,8 @@ namespace core {
 
 namespace {
 
+constexpr double MostMoney = 9e14;  // a round figure inside the range of money
+
 /// A number cut to cents for the eye, halves away from zero.
 struct Cents {
     bool negative = false;
@@ -20,26 +22,34 @@ struct Cents {
     bool isZero() const { return whole == QStringLiteral("0") && part == QStringLiteral("00"); }
 };
 
+Cents cents(Money amount) {
+    // From the exact digits: a double does not hold all of them.
+    const qint64 units = amount.units();
+    const qint64 rest = units % 100;
+    const qint64 rounded = units / 100 + (rest >= 50 ? 1 : rest <= -50 ? -1 : 0);
+    const QString digits = QString::number(rounded < 0 ? -rounded : rounded);
+    const QString padded = digits.rightJustified(3, u'0');
+    return {units < 0, padded.chopped(2), padded.right(2)};
+}
+
 Cents cents(const QVariant& value) {
-    if (value.typeId() == qMetaTypeId<Money>()) {
-        // From the exact digits: a double does not hold all of them.
-        const qint64 units = value.value<Money>().units();
-        const qint64 rest = units % 100;
-        const qint64 rounded = units / 100 + (rest >= 50 ? 1 : rest <= -50 ? -1 : 0);
-        const QString digits = QString::number(rounded < 0 ? -rounded : rounded);
-        const QString padded = digits.rightJustified(3, u'0');
-        return {units < 0, padded.chopped(2), padded.right(2)};
-    }
+    if (value.typeId() == qMetaTypeId<Money>()) return cents(value.value<Money>());
     const double number = toDouble(value);
+    // Engines give a computed column as a double, which lies beside most decimals: 1.005 is a
+    // little less, and would lose the cent that a sum over the same rows shows.
+    if (std::abs(number) < MostMoney) return cents(Money::fromDouble(number));
     const QString plain = QString::number(std::abs(number), 'f', 2);
     return {number < 0, plain.chopped(3), plain.right(2)};
 }
 
-QString shown(const Cents& cents, const QLocale& locale) {
-    QString whole = cents.whole;
+QString withMarks(QString digits, const QLocale& locale) {
     const QChar mark = thousandsMark(locale);
-    for (qsizetype at = whole.size() - 3; at > 0; at -= 3) whole.insert(at, mark);
-    return whole + decimalMark(locale) + cents.part;
+    for (qsizetype at = digits.size() - 3; at > 0; at -= 3) digits.insert(at, mark);
+    return digits;
+}
+
+QString shown(const Cents& cents, const QLocale& locale) {
+    return withMarks(cents.whole, locale) + decimalMark(locale) + cents.part;
 }
 
 bool isNumber(const QVariant& value) {
@@ -130,6 +140,11 @@ QString formatted(const QVariant& value, QStringView format, const QLocale& loca
         return toDate(value).toString(QStringLiteral("dd-MM-yyyy"));
     if (isNumber(value)) return formattedNumber(value, format, locale);
     return toText(value);
+}
+
+QString grouped(qint64 number, const QLocale& locale) {
+    const QString digits = QString::number(number);
+    return number < 0 ? u'-' + withMarks(digits.mid(1), locale) : withMarks(digits, locale);
 }
 
 std::optional<QString> parseDecimal(const QString& typed) {

@@ -33,6 +33,9 @@ QChar thousandsMark(const QLocale& locale = userLocale());
 /// numbers with the locale's decimal mark.
 QString formatted(const QVariant& value, QStringView format, const QLocale& locale = userLocale());
 
+/// A whole number with the marks between thousands that amounts have.
+QString grouped(qint64 number, const QLocale& locale = userLocale());
+
 /// Reads a number as a person types it or as formatted() shows it: optional currency sign, sign or
 /// brackets, thousands marks only where they belong, one decimal mark. Exponents, letters and marks
 /// in the wrong place give nothing, and so does an empty text.

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/core/Format.h"
+#include "platform/core/Money.h"
 #include "platform/core/Values.h"
 #include "platform/reports/Output.h"
 #include "platform/reports/SavedFile.h"
@@ -45,9 +46,15 @@ QStringList heading(const QStringList& names) {
     return cells;
 }
 
+/// A computed column comes as a double, with what it lies beside the amount meant.
+QVariant asAmount(const QVariant& value) {
+    if (value.typeId() != QMetaType::Double) return value;
+    return QVariant::fromValue(core::Money::fromDouble(value.toDouble()));
+}
+
 QString cell(const QVariant& value) {
     if (value.typeId() != QMetaType::QString)
-        return core::formatted(value, {}, core::portugueseLocale());
+        return core::formatted(asAmount(value), {}, core::portugueseLocale());
     return quoted(harmless(value.toString()));
 }
 

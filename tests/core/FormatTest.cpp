@@ -28,12 +28,17 @@ TEST(Format, ShowsValuesAsAPortugueseReaderExpects) {
         {money("0.0049"), format::Money, u"€ 0,00"_s},
         {money("-0.0049"), format::Money, u"€ 0,00"_s},
         {87.35f, format::Money, u"€ 87,35"_s},
+        {1.005, format::Money, u"€ 1,01"_s},
+        {-2.675, format::Amount, u"-2,68"_s},
+        {1e17, format::Amount, u"100.000.000.000.000.000,00"_s},
         {QVariant(), format::Money, QString()},
         {money("-1234.5"), format::Amount, u"-1.234,50"_s},
         {money("-1234.5"), format::Escudos, u"-1.234,50 Esc"_s},
         {QDateTime(QDate(2024, 2, 29), QTime(13, 5), Qt::UTC), format::Date, u"29-02-2024"_s},
     };
     for (const auto& row : rows) EXPECT_EQ(core::formatted(row.value, row.format), row.shown);
+    EXPECT_EQ(core::grouped(1007388), u"1.007.388"_s);
+    EXPECT_EQ(core::grouped(-999), u"-999"_s);
 }
 
 TEST(Format, ReadsNumbersAsPeopleTypeThem) {

@@ -105,6 +105,23 @@ TEST_F(Ledger, KeepsTotalsExactAndBesideTheirLastRow) {
     EXPECT_EQ(textsOf(*pages, 1), u"%1|Soma:|%2|Linhas:|%1"_s.arg(perPage).arg(sum));
 }
 
+TEST_F(Ledger, ShowsAComputedAmountAsTheTotalOverItDoes) {
+    reports::Report design;
+    addValues(design.detail, {{u""_s, u"valor"_s, 40, reports::Align::Right, core::format::Money}});
+    addTotal(design.reportFooter, reports::Total::Of::Sum, u"Soma:"_s, u"valor"_s,
+             core::format::Money);
+    fill(1);
+    for (const char* const amount : {"1.005", "-2.675"}) {
+        const ado::RecordsetPtr rows =
+            open(u"SELECT 3 * %1 - 2 * %1 AS valor FROM tbZelmar_Movimentos"_s.arg(
+                QLatin1StringView(amount)));
+        const QStringList texts = textsOf(*laidOut(design, rows), 0).split(u'|');
+        EXPECT_EQ(texts.value(0), texts.value(2)) << amount;
+        EXPECT_TRUE(texts.value(0).contains(u",01"_s) || texts.value(0).contains(u",68"_s))
+            << texts.value(0).toStdString();
+    }
+}
+
 TEST(Totals, AreRoundedOnceWhenTheyAreShown) {
     const struct {
         QVariant value;
