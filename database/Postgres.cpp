@@ -15,7 +15,12 @@ using namespace Qt::StringLiterals;
 namespace {
 
 ado::PostgresAddress addressOf(const ServerCatalogue& catalogue) {
-    return {catalogue.host, catalogue.port, catalogue.user, catalogue.password, catalogue.name};
+    return {.host = catalogue.host,
+            .port = catalogue.port,
+            .user = catalogue.user,
+            .password = catalogue.password,
+            .catalog = catalogue.name,
+            .allowsPlain = catalogue.allowsPlain};
 }
 
 struct Free {
@@ -32,38 +37,29 @@ ServerCatalogue ServerCatalogue::at(const QString& place, const QString& name) {
     ado::PostgresAddress address;
     address.catalog = name;
     address.place(place);
-    return {.host = address.host, .port = address.port, .user = {}, .password = {}, .name = name};
+    return {.host = address.host,
+            .port = address.port,
+            .user = {},
+            .password = {},
+            .name = name,
+            .allowsPlain = address.allowsPlain};
 }
 
 QString ServerCatalogue::shown() const {
     return addressOf(*this).shown();
 }
 
+QString ServerCatalogue::dataSource() const {
+    return u"postgresql:"_s + addressOf(*this).source();
+}
+
 namespace postgres {
 
-Database::Database(const ServerCatalogue& catalogue) {
-    // Whether the server can be reached at all, and is new enough, has one rule and its texts.
-    { const ado::PostgresHandle probe(addressOf(catalogue), ado::PostgresHandle::Role::Reader); }
-    const QByteArray values[] = {catalogue.host.toUtf8(), catalogue.port.toUtf8(),
-                                 catalogue.user.toUtf8(), catalogue.password.toUtf8(),
-                                 catalogue.name.toUtf8()};
-    // A server that is gone is noticed after half a minute, however long a statement may run.
-    const std::pair<const char*, const char*> settings[] = {
-        {"host", values[0]},       {"port", values[1]},           {"user", values[2]},
-        {"password", values[3]},   {"dbname", values[4]},         {"client_encoding", "UTF8"},
-        {"connect_timeout", "15"}, {"tcp_user_timeout", "30000"}, {"application_name", "zelmars"},
-        {nullptr, nullptr}};
-    std::vector<const char*> names;
-    std::vector<const char*> texts;
-    for (const auto& [name, text] : settings) {
-        names.push_back(name);
-        texts.push_back(text);
-    }
-    connection_ = PQconnectdbParams(names.data(), texts.data(), 0);
+Database::Database(const ServerCatalogue& catalogue)
+    : connection_(ado::PostgresHandle::connected(addressOf(catalogue))) {
     PQsetNoticeProcessor(
         connection_, [](void*, const char*) {}, nullptr);
     try {
-        if (PQstatus(connection_) != CONNECTION_OK) fail(nullptr);
         run("SET datestyle = ISO, MDY; SET extra_float_digits = 1; SET jit = off");
     } catch (...) {
         PQfinish(connection_);

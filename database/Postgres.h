@@ -17,11 +17,14 @@ struct ServerCatalogue {
     QString user;
     QString password;
     QString name;
+    bool allowsPlain = false;  ///< a remote server need not encrypt
 
-    /// The catalogue of a server named "HOST[:PORT]". Fails when the port is none.
+    /// The catalogue of a server named "HOST[:PORT][?tls=no]". Fails when the port is none.
     static ServerCatalogue at(const QString& place, const QString& name);
     /// Server and catalogue, for people; never the password.
     QString shown() const;
+    /// What a workstation's `dtDataSource` says of the server.
+    QString dataSource() const;
 };
 
 }  // namespace database

@@ -61,7 +61,7 @@ public:
             makeBook(sample);
         }
         enterAsOperator();
-        writeSettings({worker_.user, worker_.password, catalogue_.name, dataSource()});
+        writeSettings({worker_.user, worker_.password, catalogue_.name, catalogue_.dataSource()});
         undo.dismiss();
         postgres::Database(catalogue_).run("COMMENT ON TABLE public.tbcontadores IS NULL");
     }
@@ -162,7 +162,7 @@ private:
         ado::Connection connection;
         connection.ConnectionString =
             u"User ID=%1;Password=%2;Initial Catalog=%3;Data Source=%4;Connect Timeout=15"_s.arg(
-                worker_.user, worker_.password, catalogue_.name, dataSource());
+                worker_.user, worker_.password, catalogue_.name, catalogue_.dataSource());
         connection.Open();
     }
 
@@ -188,9 +188,6 @@ private:
     }
 
     QString owner() const { return catalogue_.name + u"_dono"_s; }
-    QString dataSource() const {
-        return catalogue_.shown().chopped(catalogue_.name.size() + 1);  // without "/NAME"
-    }
 
     ServerCatalogue catalogue_;
     ServerOperator worker_;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "host/BookSettings.h"
 
+#include "platform/ado/ConnectionSettings.h"
 #include "platform/registry/Registry.h"
 
 using namespace Qt::StringLiterals;
@@ -33,7 +34,9 @@ QString BookSettings::connectionString() const {
 }
 
 QString BookSettings::bookText() const {
-    return u"%1 (%2)"_s.arg(catalogue, dataSource);
+    const QString warning =
+        ado::isReadableOnTheWay(dataSource) ? u", ligação não cifrada"_s : QString();
+    return u"%1 (%2%3)"_s.arg(catalogue, dataSource, warning);
 }
 
 }  // namespace host

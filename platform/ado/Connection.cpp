@@ -12,6 +12,17 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+constexpr auto Server = "postgresql"_L1;
+
+struct Source {
+    QString engine;  ///< in small letters
+    QString place;
+};
+
+Source parted(const QString& dataSource) {
+    return {dataSource.section(u':', 0, 0).trimmed().toLower(), dataSource.section(u':', 1)};
+}
+
 std::shared_ptr<Session> openServer(const ConnectionSettings& settings, const QString& place,
                                     const QString& catalog, int timeoutSeconds) {
     PostgresAddress address;
@@ -33,9 +44,8 @@ std::shared_ptr<Session> openSession(const ConnectionSettings& settings, int tim
             core::InvalidCall,
             u"Não foi possível abrir a origem dos dados «%1»: %2"_s.arg(source, why));
     };
-    const QString engine = source.section(u':', 0, 0).trimmed().toLower();
-    const QString place = source.section(u':', 1);
-    const bool isServer = engine == "postgresql"_L1;
+    const auto& [engine, place] = parted(source);
+    const bool isServer = engine == Server;
     if (place.isEmpty() || (!isServer && engine != "sqlite"_L1))
         throw refuse(u"as formas conhecidas são «sqlite:PASTA» e «postgresql:SERVIDOR[:PORTA]»."_s);
     if (catalog.isEmpty()) throw refuse(u"falta o nome do livro (Initial Catalog)."_s);
@@ -61,6 +71,18 @@ ConnectionSettings::ConnectionSettings(const QString& text) {
             isQuoted ? text.mid(from + 1, close - from - 1) : text.mid(from, end - from);
         values_.insert(text.mid(at, sign - at).trimmed().toLower(), value);
         at = end + 1;
+    }
+}
+
+bool isReadableOnTheWay(const QString& dataSource) {
+    const auto& [engine, place] = parted(dataSource);
+    if (engine != Server) return false;
+    try {
+        PostgresAddress address;
+        address.place(place);
+        return address.isReadable();
+    } catch (const core::Failure&) {
+        return false;
     }
 }
 

@@ -1,14 +1,19 @@
 // SPDX-License-Identifier: MIT
 // Where a server is: names are looked up here and not by the client library, which would wait for a
-// silent name server as long as that pleases.
+// silent name server as long as that pleases. And what a connection to it must prove before it gets
+// a password.
+#include <arpa/inet.h>
 #include <netdb.h>
 #include <sys/socket.h>
 
+#include <QDir>
+#include <QFile>
 #include <chrono>
 #include <future>
 #include <thread>
 
 #include "platform/ado/PostgresHandle.h"
+#include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
 
 namespace ado {
@@ -40,9 +45,41 @@ PostgresAddress::Found addressesOf(const QByteArray& host) {
     return found;
 }
 
+/// Where the certificate of whoever signs the servers' certificates lies: the client library's own
+/// places first, then the one for everybody who works here. Empty when there is none.
+QByteArray rootCertificate() {
+    if (const QByteArray named = qgetenv("PGSSLROOTCERT"); !named.isEmpty()) return named;
+    for (const QString& file :
+         {QDir::homePath() + u"/.postgresql/root.crt"_s, u"/etc/zelmars/root.crt"_s})
+        if (QFile::exists(file)) return QFile::encodeName(file);
+    return {};
+}
+
+/// Also "localhost" may be made to lead elsewhere: every address that it stands for counts.
+bool isLocal(const QString& host, const QByteArray& addresses) {
+    if (!isLocalHost(host)) return false;
+    for (const QByteArray& address : addresses.split(','))
+        if (!address.isEmpty() && !isLocalHost(QString::fromLatin1(address))) return false;
+    return true;
+}
+
 }  // namespace
 
-void PostgresAddress::place(const QString& text) {
+bool isLocalHost(const QString& host) {
+    // The library would take a list for several hosts, of which only the first was looked at.
+    if (host.contains(u',')) return false;
+    if (host.startsWith(u'/') || host.startsWith(u'@')) return true;
+    if (host.compare("localhost"_L1, Qt::CaseInsensitive) == 0) return true;
+    const QByteArray text = host.toUtf8();
+    in_addr four{};
+    if (inet_pton(AF_INET, text.constData(), &four) == 1) return text.startsWith("127.");
+    in6_addr six{};
+    return inet_pton(AF_INET6, text.constData(), &six) == 1 && IN6_IS_ADDR_LOOPBACK(&six);
+}
+
+void PostgresAddress::place(const QString& whole) {
+    const QString word = whole.section(u'?', 1).trimmed();
+    const QString text = whole.section(u'?', 0, 0);
     const qsizetype colon = text.lastIndexOf(u':');
     if (colon > text.lastIndexOf(u']')) {
         host = text.left(colon);
@@ -59,12 +96,23 @@ void PostgresAddress::place(const QString& text) {
     }
     host = host.trimmed();
     if (host.startsWith(u'[') && host.endsWith(u']')) host = host.mid(1, host.size() - 2);
+    allowsPlain = word == "tls=no"_L1;
+    if (whole.contains(u'?') && !allowsPlain)
+        throw core::Failure(
+            core::InvalidCall,
+            u"Não foi possível abrir o livro «%1»: «?%2» não se conhece; só «?tls=no»."_s.arg(
+                shown(), word));
 }
 
 QString PostgresAddress::shown() const {
+    return u"postgresql:"_s + source() + u'/' + catalog;
+}
+
+QString PostgresAddress::source() const {
     const bool isNumeric = host.contains(u':') && host[0] != u'/' && host[0] != u'[';
     const QString place = isNumeric ? u'[' + host + u']' : host;
-    return u"postgresql:"_s + place + (port.isEmpty() ? QString() : u':' + port) + u'/' + catalog;
+    return place + (port.isEmpty() ? QString() : u':' + port) +
+           (allowsPlain ? u"?tls=no"_s : QString());
 }
 
 PostgresAddress::Found PostgresAddress::lookUp(const QDeadlineTimer& deadline) const {
@@ -81,6 +129,32 @@ PostgresAddress::Found PostgresAddress::lookUp(const QDeadlineTimer& deadline) c
     found.isLate = answer.wait_for(std::chrono::milliseconds(deadline.remainingTime())) !=
                    std::future_status::ready;
     return found.isLate ? found : answer.get();
+}
+
+std::vector<PostgresOption> PostgresAddress::options(const Found& found) const {
+    std::vector<PostgresOption> options{
+        {"host", found.hosts},
+        {"hostaddr", found.addresses},
+        {"port", port.toUtf8()},
+        {"user", user.toUtf8()},
+        {"password", password.toUtf8()},
+        {"dbname", catalog.toUtf8()},
+        {"client_encoding", "UTF8"},
+        {"application_name", workstation()},
+        // Milliseconds after which a server that is gone is noticed, however long a statement runs.
+        {"tcp_user_timeout", "30000"},
+    };
+    if (isLocal(host, found.addresses)) return options;
+    options.push_back({"gssencmode", "disable"});
+    if (allowsPlain) {
+        options.push_back({"sslmode", "disable"});
+        return options;
+    }
+    const QByteArray root = rootCertificate();
+    options.push_back({"sslmode", root.isEmpty() ? "require" : "verify-full"});
+    options.push_back({"sslrootcert", root});
+    options.push_back({"channel_binding", "require"});
+    return options;
 }
 
 }  // namespace ado

@@ -2,11 +2,12 @@
 #include "platform/ado/PostgresHandle.h"
 
 #include <poll.h>
+#include <sys/socket.h>
 
 #include <QRegularExpression>
+#include <QtEndian>
 #include <utility>
 
-#include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
 
 namespace ado {
@@ -80,6 +81,13 @@ PostgresHandle::~PostgresHandle() {
     PQfinish(connection_);
 }
 
+PGconn* PostgresHandle::connected(const PostgresAddress& address) {
+    PostgresHandle handle;
+    handle.place_ = address.shown();
+    handle.connect(address);
+    return std::exchange(handle.connection_, nullptr);
+}
+
 void PostgresHandle::connect(const PostgresAddress& address) {
     const auto fail = [&](const QString& why,
                           const QString& code = QLatin1StringView(CannotConnect)) {
@@ -103,6 +111,10 @@ void PostgresHandle::connect(const PostgresAddress& address) {
         }
         if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline))
             throw fail(silent);
+        if (address.isReadable() && wantsBarePassword())
+            throw fail(
+                u"o servidor pediu a palavra-passe sem a proteger (é preciso scram-sha-256); não "
+                "lhe foi dada."_s);
     }
     if (PQserverVersion(connection_) < OldestServer)
         throw fail(u"o servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
@@ -110,29 +122,38 @@ void PostgresHandle::connect(const PostgresAddress& address) {
 }
 
 void PostgresHandle::start(const PostgresAddress& address, const PostgresAddress::Found& found) {
-    const QByteArray values[] = {found.hosts,
-                                 found.addresses,
-                                 address.port.toUtf8(),
-                                 address.user.toUtf8(),
-                                 address.password.toUtf8(),
-                                 address.catalog.toUtf8(),
-                                 "UTF8",
-                                 workstation()};
-    const char* const names[] = {"host",
-                                 "hostaddr",
-                                 "port",
-                                 "user",
-                                 "password",
-                                 "dbname",
-                                 "client_encoding",
-                                 "application_name",
-                                 nullptr};
+    const std::vector<PostgresOption> options = address.options(found);
+    std::vector<const char*> names;
     std::vector<const char*> texts;
-    for (const QByteArray& value : values) texts.push_back(value.constData());
+    for (const PostgresOption& option : options) {
+        names.push_back(option.name);
+        texts.push_back(option.value.constData());
+    }
+    names.push_back(nullptr);
     texts.push_back(nullptr);
-    connection_ = PQconnectStartParams(names, texts.data(), 0);
+    connection_ = PQconnectStartParams(names.data(), texts.data(), 0);
     // Of a refused connection the code is told nowhere else.
     PQsetErrorVerbosity(connection_, PQERRORS_VERBOSE);
+}
+
+/// True when the server, on an unencrypted line, wants the password as it is or scrambled in the
+/// old way that gives it away. The library would answer by itself, so what came is looked at before
+/// the library reads it. A request of which only a part came is not trusted either.
+bool PostgresHandle::wantsBarePassword() const {
+    constexpr ssize_t Head = 9;  // 'R', the length behind it, the kind: four bytes each
+    constexpr quint32 ClearText = 3;
+    constexpr quint32 Md5 = 5;
+    if (PQstatus(connection_) != CONNECTION_AWAITING_RESPONSE) return false;
+    char came[4096];
+    const ssize_t size = recv(PQsocket(connection_), came, sizeof came, MSG_PEEK | MSG_DONTWAIT);
+    ssize_t at = 0;
+    while (at < size && came[at] == 'R') {
+        if (size - at < Head) return true;
+        const auto kind = qFromBigEndian<quint32>(came + at + 5);
+        if (kind == ClearText || kind == Md5) return true;
+        at += 1 + qMax(Head - 1, static_cast<ssize_t>(qFromBigEndian<quint32>(came + at + 1)));
+    }
+    return false;
 }
 
 void PostgresHandle::settle(Role role) {

@@ -14,6 +14,17 @@
 
 namespace ado {
 
+/// True for what never leaves this machine: the folder of a local socket, "localhost" and the
+/// loopback addresses in their usual form (127.0.0.0/8, ::1). Any other name counts as remote,
+/// wherever it leads now, because whoever answers for names may lead it elsewhere.
+bool isLocalHost(const QString& host);
+
+/// An option of the client library for a new connection.
+struct PostgresOption {
+    const char* name;
+    QByteArray value;
+};
+
 /// Where a book is and who opens it.
 struct PostgresAddress {
     QString host;  ///< a name, an address, or a folder with the server's local socket
@@ -21,12 +32,18 @@ struct PostgresAddress {
     QString user;
     QString password;
     QString catalog;
-    int connectSeconds = 15;  ///< after which a server counts as gone
+    int connectSeconds = 15;   ///< after which a server counts as gone
+    bool allowsPlain = false;  ///< somebody decided that nothing need be encrypted on the way
 
-    /// Reads "HOST[:PORT]"; an IPv6 address stands in brackets. Fails when the port is none.
+    /// Reads "HOST[:PORT][?tls=no]"; an IPv6 address stands in brackets. Fails when the port is
+    /// none or another word follows.
     void place(const QString& text);
+    /// The server alone, as place() reads it behind "postgresql:".
+    QString source() const;
     /// Server and book, as texts of failures name them; never the password.
     QString shown() const;
+    /// True when anybody on the way to the server can read along.
+    bool isReadable() const { return allowsPlain && !isLocalHost(host); }
 
     /// What a host's name stands for.
     struct Found {
@@ -36,6 +53,10 @@ struct PostgresAddress {
         bool isLate = false;   ///< the deadline came first
     };
     Found lookUp(const QDeadlineTimer& deadline) const;
+    /// All that the client library needs to know to connect. Without the plain setting a remote
+    /// server must encrypt and must prove that it knows the password; where a root certificate is
+    /// configured it must also show a certificate for its name that this root has signed.
+    std::vector<PostgresOption> options(const Found& found) const;
 };
 
 struct PostgresClear {
@@ -64,6 +85,9 @@ public:
     ~PostgresHandle();
     PostgresHandle(const PostgresHandle&) = delete;
     PostgresHandle& operator=(const PostgresHandle&) = delete;
+
+    /// A bare connection, for work of another kind than a workstation's; the caller's own.
+    static PGconn* connected(const PostgresAddress& address);
 
     /// Seconds that a statement may run or wait for a lock.
     void setTimeout(int seconds);
@@ -96,8 +120,10 @@ public:
     void finish();
 
 private:
+    PostgresHandle() = default;
     void connect(const PostgresAddress& address);
     void start(const PostgresAddress& address, const PostgresAddress::Found& found);
+    bool wantsBarePassword() const;
     void settle(Role role);
     /// Both give the number of answers that will come.
     int dispatch(const QByteArray& text);
