@@ -35,6 +35,25 @@ QString described(QWidget* screen) {
     return screen->objectName();
 }
 
+/// The modal screens in front when the keys were pressed that have not come back yet, the last one
+/// behind; null for none.
+std::vector<QPointer<QWidget>> keysAtWork;
+
+/// A key that opens a modal screen comes back when that is closed, and the next steps are played
+/// meanwhile. One that closes its screen has to come back first: until then what opened the screen
+/// is still at work.
+bool keyIsAtWork() {
+    const QWidget* modal = QApplication::activeModalWidget();
+    return !keysAtWork.empty() && (!modal || modal == keysAtWork.back());
+}
+
+void send(const QPointer<QWindow>& window, const std::function<void(QTest::KeyAction)>& key) {
+    keysAtWork.emplace_back(QApplication::activeModalWidget());
+    for (const auto action : {QTest::Press, QTest::Release})
+        if (window) key(action);
+    keysAtWork.pop_back();
+}
+
 }  // namespace
 
 TourPlayer::TourPlayer(const QString& folder) : folder_(folder) {
@@ -66,7 +85,7 @@ void TourPlayer::tick() {
     // A step that opens a modal screen is still on the stack while the next ones are played; a
     // timer never fires inside its own handler, so each tick starts the next one.
     clock_.start(TickMilliseconds);
-    if (acting_) return;
+    if (acting_ || keyIsAtWork()) return;
     if (failed_) return giveUp();
     if (at_ == steps_.size()) return finished_();
     const Step step = steps_[at_];
@@ -115,14 +134,15 @@ void TourPlayer::type(QWidget* screen, const QStringList& keys) {
         if (key.startsWith(u'<')) {
             const QString name = key.mid(1, key.size() - 2);
             const auto named = QKeySequence::fromString(name, QKeySequence::PortableText)[0];
-            if (window) QTest::keyPress(window, named.key(), named.keyboardModifiers());
-            if (window) QTest::keyRelease(window, named.key(), named.keyboardModifiers());
+            send(window, [&](QTest::KeyAction action) {
+                QTest::keyEvent(action, window, named.key(), named.keyboardModifiers());
+            });
             continue;
         }
         for (const QChar letter : key)
-            for (const auto action : {QTest::Press, QTest::Release})
-                if (window)
-                    QTest::sendKeyEvent(action, window, Qt::Key_unknown, letter, Qt::NoModifier);
+            send(window, [&](QTest::KeyAction action) {
+                QTest::sendKeyEvent(action, window, Qt::Key_unknown, letter, Qt::NoModifier);
+            });
     }
 }
 
