@@ -95,6 +95,19 @@ class Desktop:
         wait_until(f"«{title}» has the keyboard (now «{self.active_title()}»)",
                    lambda: self.active_title().startswith(title))
 
+    def settled(self, title):
+        """Fails when another window comes to the front of that one a moment later."""
+        deadline = time.monotonic() + 0.5
+        while time.monotonic() < deadline:
+            if not self.active_title().startswith(title):
+                raise Failed(f"«{self.active_title()}» came in front of «{title}»")
+            time.sleep(0.05)
+
+    def place_of(self, window):
+        """X, Y, WIDTH and HEIGHT of a window, without its frame."""
+        lines = self.run(["xdotool", "getwindowgeometry", "--shell", window]).split()
+        return {name: int(value) for name, value in (line.split("=") for line in lines)}
+
     def gone(self, title):
         wait_until(f"«{title}» has gone", lambda: not self.active_title().startswith(title))
 
