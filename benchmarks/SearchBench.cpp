@@ -4,6 +4,7 @@
 #include <QFile>
 #include <QProcess>
 #include <QStringList>
+#include <QTimer>
 #include <algorithm>
 
 #include "benchmarks/Benches.h"
@@ -11,6 +12,7 @@
 #include "boundary/environment/dtZelmars.h"
 #include "companions/search/MemberList.h"
 #include "host/MovementBook.h"
+#include "host/MovementsView.h"
 
 using namespace Qt::StringLiterals;
 
@@ -63,6 +65,31 @@ void measureMovementSearch(Report& report, const Book& large) {
                  }));
 }
 
+/// The longest that the window takes no key while it reads the whole book, in milliseconds.
+double longestHold(const Book& large) {
+    use(large);
+    QElapsedTimer turn;
+    double longest = 0;
+    QTimer beat;
+    QObject::connect(&beat, &QTimer::timeout, [&] {
+        longest = std::max(longest, static_cast<double>(turn.nsecsElapsed()) / 1e6);
+        turn.start();
+    });
+    host::MovementsView view;
+    bool isRead = false;
+    QObject::connect(&view, &host::MovementsView::countChanged,
+                     [&](const QString& text) { isRead = !text.contains(u"a ler"_s); });
+    view.resize(1200, 700);
+    view.show();
+    turn.start();
+    beat.start(0);
+    view.open(host::BookSettings::read());
+    while (!isRead) QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+    // What was put off until the rows were there.
+    for (int turns = 0; turns < 20; ++turns) QCoreApplication::processEvents();
+    return longest;
+}
+
 /// The program as people run it, until it has read the whole book.
 void measureHostMemory(Report& report, const Book& large) {
     use(large);
@@ -100,6 +127,10 @@ void measureSearches(Report& report) {
         const Book large = largeBook();
         measureMemberSearch(report, large);
         measureMovementSearch(report, large);
+    }
+    for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) {
+        const QString name = u"longest hold of the window while reading, "_s + nameOf(engine);
+        if (report.wanted(name)) report.value(name, u"ms"_s, 100, longestHold(largeBook(engine)));
     }
     if (report.wanted(u"resident memory"_s)) measureHostMemory(report, largeBook());
 }

@@ -37,13 +37,7 @@ private:
     core::HandlerScope scope_;
 };
 
-QString notYetText(const QString& operation) {
-    return u"A operação %1 ainda não está disponível nesta versão."_s.arg(operation);
-}
-
-[[noreturn]] void notYet(const QString& operation) {
-    throw core::Failure(core::InvalidCall, notYetText(operation));
-}
+const QString NotYet = u"Esta operação ainda não está disponível nesta versão."_s;
 
 /// How every operation but the login begins.
 void openingPreamble() {
@@ -91,18 +85,18 @@ void showModal() {
 }
 
 /// An operation whose screen is still to come.
-void openLater(const QString& operation) {
+void openLater() {
     const Operation running;
-    if (loggedInOrRefused()) notYet(operation);
+    if (loggedInOrRefused()) throw core::Failure(core::InvalidCall, NotYet);
 }
 
 /// One of the operations whose failures say nothing and give false. That its screen is still to
 /// come is said in a box, as nobody would hear of it otherwise.
-bool openLaterInSilence(const QString& operation) {
+bool openLaterInSilence() {
     const Operation running;
     try {
         openingPreamble();
-        core::MsgBox(notYetText(operation), core::Icon::Critical);
+        core::MsgBox(NotYet, core::Icon::Critical);
     } catch (const std::exception&) {
         // The host hears of it by the result.
     }
@@ -117,23 +111,23 @@ General::General() {
 }
 
 void General::CallPlafonds(QString*, QString*) {
-    openLater(u"CallPlafonds"_s);
+    openLater();
 }
 
 void General::CallHospitais(QString*, QString*) {
-    openLater(u"CallHospitais"_s);
+    openLater();
 }
 
 void General::CallManutencaoDados() {
-    openLater(u"CallManutencaoDados"_s);
+    openLater();
 }
 
 void General::CallIRS() {
-    openLater(u"CallIRS"_s);
+    openLater();
 }
 
 void General::CallFechoAno() {
-    openLater(u"CallFechoAno"_s);
+    openLater();
 }
 
 bool General::Login(QString*, QString*, QString*, QString*, QString*) {
@@ -171,17 +165,17 @@ void General::Extratos(QString*, QString*) {
 }
 
 void General::LPagamentos() {
-    openLater(u"LPagamentos"_s);
+    openLater();
 }
 
 bool General::Ldividas() {
-    return openLaterInSilence(u"Ldividas"_s);
+    return openLaterInSilence();
 }
 
 bool General::Lcartasdividas() {
-    return openLaterInSilence(u"Lcartasdividas"_s);
+    return openLaterInSilence();
 }
 
 bool General::Lhospitais() {
-    return openLaterInSilence(u"Lhospitais"_s);
+    return openLaterInSilence();
 }

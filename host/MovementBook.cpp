@@ -3,9 +3,12 @@
 
 #include <QSet>
 #include <QStringList>
+#include <algorithm>
+#include <tuple>
 
 #include "platform/ado/Recordset.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Money.h"
 #include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
@@ -16,28 +19,44 @@ namespace {
 
 // One row is one movement in force; the columns of MovementKey in its order.
 const QString Keys =
-    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, "
-    "ficheiro from vwZelmars_Movimentos_Vigor "_s;
-// The same with the names of its persons.
+    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, "
+    "doc_valor, credito, debito from vwZelmars_Movimentos_Vigor "_s;
+// The same of some movements, with the names of their persons.
 const QString NamedKeys =
-    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, no_kor, "
-    "nome, familiar from vwZelmars_Movimentos_Vigor "_s;
+    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, "
+    "doc_valor, credito, debito, no_kor, nome, familiar from vwZelmars_Movimentos_Vigor where "
+    "movimento_id in (%1)"_s;
 // The day comes first: corrections for members who left have keys of another range.
 const QString NewestFirst = u"order by data desc, movimento_id desc"_s;
-// What was posted since, in one of the two tables behind the view.
-const QString Since = u"where ficheiro = '%1' and movimento_id > %2 "_s;
+// The keys of the movements since a day, in one of the two tables behind the view.
+const QString NewestKeys =
+    u"select movimento_id from %1 where data >= CONVERT(DATETIME,'%2 00:00:00', 102) "_s;
+// One row: the greatest key of one of them.
+const QString GreatestKey = u"select max(movimento_id) from %1"_s;
+// What was posted since, in one of them.
+const QString KeysSince = u"select movimento_id from %1 where movimento_id > %2"_s;
 // What was annulled of one member's.
 const QString AnnulledOf = u"where socio_id = %1 and tipo = 'ANL'"_s;
 // One row is one movement as the list shows it; the columns of MovementRow in its order.
 const QString Rows =
     u"select movimento_id, movimento_no, data, no_kor, nome, familiar, tipo, doc_no, doc_valor, "
     "credito, debito from vwZelmars_Movimentos_Vigor where movimento_id in (%1)"_s;
+// Two of the members that database/Book.h promises of every sample.
+const QString SampleMembers =
+    u"select count(*) from tbSocios where (no_kor = '100015' and nome = 'António Manuel Silva "
+    "Matos') or (no_kor = '100107' and nome = 'Luísa Margarida Paz Leal')"_s;
 // One row is one member, or one relative.
 const QString Members = u"select socio_id, no_kor, nome from %1"_s;
 const QString Relatives = u"select socio_id, codABC, nome from %1"_s;
 
 qint32 number(const QVariant& value) {
     return core::isNull(value) ? 0 : value.toInt();
+}
+
+/// A view gives its amounts as one engine's money and as the other's doubles.
+qint64 units(const QVariant& amount) {
+    if (amount.typeId() == qMetaTypeId<core::Money>()) return amount.value<core::Money>().units();
+    return core::Money::fromDouble(core::toDouble(amount)).units();
 }
 
 MovementKey keyOf(const ado::Recordset& row) {
@@ -50,13 +69,27 @@ MovementKey keyOf(const ado::Recordset& row) {
     key.tipo = core::toText(row.value(5));
     key.doc_no = core::toText(row.value(6));
     key.activo = row.value(7) == u"ACTIVO"_s;
+    for (std::size_t at = 0; at < key.amounts.size(); ++at) {
+        const QVariant amount = row.value(8 + int(at));
+        if (!core::isNull(amount)) key.amounts[at] = units(amount);
+    }
     return key;
 }
 
+QString tableOf(bool activo) {
+    return activo ? u"tbZelmar_Movimentos"_s : u"tbZelmar_Movimentos_Inactivos"_s;
+}
+
+QString listed(const std::vector<qint32>& keys) {
+    QStringList list;
+    for (const qint32 key : keys) list.append(QString::number(key));
+    return list.join(','_L1);
+}
+
 void takeNames(const ado::Recordset& row, const MovementKey& key, MovementSearch& search) {
-    search.nameMember(key.socio_id, core::toText(row.value(8)), core::toText(row.value(9)));
+    search.nameMember(key.socio_id, core::toText(row.value(11)), core::toText(row.value(12)));
     if (!key.codABC.isEmpty())
-        search.nameRelative(key.socio_id, key.codABC, core::toText(row.value(10)));
+        search.nameRelative(key.socio_id, key.codABC, core::toText(row.value(13)));
 }
 
 }  // namespace
@@ -69,15 +102,42 @@ MovementBook::MovementBook(const BookSettings& settings)
 
 std::shared_ptr<MovementSearch> MovementBook::newest(int count) const {
     auto search = std::make_shared<MovementSearch>();
-    const auto row = ado::Recordset::create();
-    for (row->Open(NamedKeys + NewestFirst, connection_); !row->atEnd() && count > 0; --count) {
-        const MovementKey key = keyOf(*row);
-        search->append(key);
-        takeNames(*row, key, *search);
-        row->MoveNext();
+    // The newest days need not hold any movement of the members who left: what was posted since
+    // counts from the last key, not from the last one shown.
+    for (const bool activo : {false, true}) {
+        const std::vector<qint32> greatest = numbers(GreatestKey.arg(tableOf(activo)));
+        if (!greatest.empty()) search->knowKey(activo, greatest.front());
     }
-    row->Close();
+    std::vector<MovementKey> movements = named(newestKeys(count), *search);
+    movements.resize(std::min(movements.size(), std::size_t(count)));
+    for (const MovementKey& movement : movements) search->append(movement);
     return search;
+}
+
+/// The newest of each table, together in no order. The view would look the names up for all
+/// movements before it takes the newest, and a server would sort all days.
+std::vector<qint32> MovementBook::newestKeys(int count) const {
+    std::vector<qint32> keys;
+    for (const bool activo : {false, true}) {
+        const auto newest = [&](QDate since) {
+            return numbers(NewestKeys.arg(tableOf(activo), since.toString(u"MM/dd/yyyy"_s)) +
+                           NewestFirst + u" limit %1"_s.arg(count));
+        };
+        const QDate last = lastDay(tableOf(activo));
+        if (!last.isValid()) continue;
+        std::vector<qint32> found = newest(last.addMonths(-1));
+        if (int(found.size()) < count) found = newest(QDate(1753, 1, 1));
+        keys.insert(keys.end(), found.begin(), found.end());
+    }
+    return keys;
+}
+
+QDate MovementBook::lastDay(const QString& table) const {
+    const auto row = ado::Recordset::create();
+    row->Open(u"select max(data) from %1"_s.arg(table), connection_);
+    const QDate day = row->atEnd() ? QDate() : core::toDate(row->value(0));
+    row->Close();
+    return day;
 }
 
 std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
@@ -107,23 +167,45 @@ std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
 int MovementBook::takeNewer(MovementSearch& search) const {
     int taken = 0;
     QSet<qint32> corrected;
-    const auto row = ado::Recordset::create();
     for (const bool activo : {false, true}) {
-        std::vector<MovementKey> newer;
-        const QString since =
-            Since.arg(activo ? u"ACTIVO"_s : u"INACTIVO"_s).arg(search.newest(activo));
-        row->Open(NamedKeys + since + NewestFirst, connection_);
-        for (; !row->atEnd(); row->MoveNext()) {
-            newer.push_back(keyOf(*row));
-            takeNames(*row, newer.back(), search);
-            if (newer.back().tipo == "COR"_L1) corrected.insert(newer.back().socio_id);
-        }
-        row->Close();
+        const QString since = KeysSince.arg(tableOf(activo)).arg(search.newest(activo));
+        const std::vector<MovementKey> newer = named(numbers(since), search);
+        for (const MovementKey& key : newer)
+            if (key.tipo == "COR"_L1) corrected.insert(key.socio_id);
         search.prepend(newer);
         taken += int(newer.size());
     }
     for (const qint32 socio_id : corrected) takeAnnulled(search, socio_id);
     return taken;
+}
+
+/// The movements of these keys, the newest first; their persons are named to the search.
+std::vector<MovementKey> MovementBook::named(const std::vector<qint32>& keys,
+                                             MovementSearch& search) const {
+    std::vector<MovementKey> movements;
+    if (keys.empty()) return movements;
+    const auto row = ado::Recordset::create();
+    row->Open(NamedKeys.arg(listed(keys)), connection_);
+    for (; !row->atEnd(); row->MoveNext()) {
+        movements.push_back(keyOf(*row));
+        takeNames(*row, movements.back(), search);
+    }
+    row->Close();
+    // Asked for in this order, an engine may pass over all days in search of a few keys.
+    std::sort(movements.begin(), movements.end(), [](const MovementKey& a, const MovementKey& b) {
+        return std::tie(a.data, a.movimento_id) > std::tie(b.data, b.movimento_id);
+    });
+    return movements;
+}
+
+/// The numbers in the first column of a statement's rows; null gives 0.
+std::vector<qint32> MovementBook::numbers(const QString& statement) const {
+    std::vector<qint32> numbers;
+    const auto row = ado::Recordset::create();
+    for (row->Open(statement, connection_); !row->atEnd(); row->MoveNext())
+        numbers.push_back(number(row->value(0)));
+    row->Close();
+    return numbers;
 }
 
 /// A correcting row is its annulled movement's only trace since; it names the member alone.
@@ -134,12 +216,14 @@ void MovementBook::takeAnnulled(MovementSearch& search, qint32 socio_id) const {
     row->Close();
 }
 
+bool MovementBook::isSample() const {
+    return numbers(SampleMembers) == std::vector<qint32>{2};
+}
+
 std::vector<MovementRow> MovementBook::rows(const std::vector<qint32>& keys) const {
-    QStringList list;
-    for (const qint32 key : keys) list.append(QString::number(key));
     std::vector<MovementRow> rows;
     const auto row = ado::Recordset::create();
-    for (row->Open(Rows.arg(list.join(','_L1)), connection_); !row->atEnd(); row->MoveNext()) {
+    for (row->Open(Rows.arg(listed(keys)), connection_); !row->atEnd(); row->MoveNext()) {
         MovementRow& shown = rows.emplace_back();
         shown.movimento_id = number(row->value(0));
         for (int column = 0; column < MovementRow::ColumnCount; ++column)

@@ -45,10 +45,17 @@ public:
     /// posted.
     int takeNewer(MovementSearch& search) const;
 
+    /// Whether it holds the members whom every sample book has.
+    bool isSample() const;
+
     /// What the list shows of some movements, in any order; missing ones are left out.
     std::vector<MovementRow> rows(const std::vector<qint32>& keys) const;
 
 private:
+    std::vector<qint32> numbers(const QString& statement) const;
+    QDate lastDay(const QString& table) const;
+    std::vector<qint32> newestKeys(int count) const;
+    std::vector<MovementKey> named(const std::vector<qint32>& keys, MovementSearch& search) const;
     void takeAnnulled(MovementSearch& search, qint32 socio_id) const;
     ado::ConnectionPtr connection_;
 };

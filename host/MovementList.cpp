@@ -2,6 +2,7 @@
 #include "host/MovementList.h"
 
 #include <QApplication>
+#include <numeric>
 
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -64,6 +65,7 @@ void MovementList::setBook(std::shared_ptr<MovementBook> book,
                            std::shared_ptr<MovementSearch> search) {
     book_ = std::move(book);
     search_ = std::move(search);
+    order_.clear();
     refilter();
 }
 
@@ -72,9 +74,25 @@ void MovementList::setFilter(const QString& filter) {
     refilter();
 }
 
-void MovementList::takeNewer() {
-    if (!book_ || !search_ || book_->takeNewer(*search_) == 0) return forgetRows();
+void MovementList::setOrder(const std::vector<quint32>& positions) {
+    order_ = positions;
     refilter();
+}
+
+int MovementList::takeNewer() {
+    const int count = book_ && search_ ? book_->takeNewer(*search_) : 0;
+    if (count == 0) {
+        forgetRows();
+        return 0;
+    }
+    if (!order_.empty()) {
+        for (quint32& position : order_) position += quint32(count);
+        std::vector<quint32> newer(static_cast<std::size_t>(count));
+        std::iota(newer.begin(), newer.end(), 0U);
+        order_.insert(order_.begin(), newer.begin(), newer.end());
+    }
+    refilter();
+    return count;
 }
 
 void MovementList::forgetRows() {
@@ -85,12 +103,31 @@ void MovementList::forgetRows() {
 void MovementList::refilter() {
     beginResetModel();
     read_.clear();
-    found_ = search_ ? search_->find(filter_) : std::vector<quint32>();
+    found_ = search_ ? inOrder(search_->find(filter_)) : std::vector<quint32>();
     endResetModel();
+}
+
+std::vector<quint32> MovementList::inOrder(const std::vector<quint32>& found) const {
+    if (order_.empty()) return found;
+    std::vector<bool> isFound(search_->size());
+    for (const quint32 position : found) isFound[position] = true;
+    std::vector<quint32> ordered;
+    ordered.reserve(found.size());
+    std::copy_if(order_.begin(), order_.end(), std::back_inserter(ordered),
+                 [&](quint32 position) { return isFound[position]; });
+    return ordered;
 }
 
 qint32 MovementList::movimento_id(int row) const {
     return search_->movimento_id(found_[std::size_t(row)]);
+}
+
+QString MovementList::number(int row) const {
+    return core::toText(rowAt(row).values[MovementRow::Number]);
+}
+
+QString MovementList::tipo(int row) const {
+    return core::toText(rowAt(row).values[MovementRow::Type]);
 }
 
 int MovementList::rowOf(qint32 movimento_id) const {

@@ -7,9 +7,14 @@
 namespace host {
 
 void MovementLoader::start(const BookSettings& settings) {
-    const int run = ++run_;
-    reading_ = true;
-    thread_ = std::jthread([this, run, settings](std::stop_token stop) {
+    if (!isReading_) return run(settings);
+    thread_.request_stop();
+    next_ = settings;
+}
+
+void MovementLoader::run(const BookSettings& settings) {
+    isReading_ = true;
+    thread_ = std::jthread([this, settings](std::stop_token stop) {
         std::shared_ptr<MovementSearch> search;
         QString failure;
         try {
@@ -17,13 +22,15 @@ void MovementLoader::start(const BookSettings& settings) {
         } catch (const core::Failure& thrown) {
             failure = thrown.text();
         }
-        QMetaObject::invokeMethod(this, [this, run, search, failure] {
-            if (run != run_) return;
-            reading_ = false;
-            if (search) emit loaded(search);
-            if (!failure.isEmpty()) emit failed(failure);
-        });
+        QMetaObject::invokeMethod(this, [this, search, failure] { take(search, failure); });
     });
+}
+
+void MovementLoader::take(const std::shared_ptr<MovementSearch>& search, const QString& failure) {
+    if (next_) return run(*std::exchange(next_, std::nullopt));
+    isReading_ = false;
+    if (search) emit loaded(search);
+    if (!failure.isEmpty()) emit failed(failure);
 }
 
 }  // namespace host

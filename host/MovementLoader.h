@@ -3,6 +3,7 @@
 
 #include <QObject>
 #include <memory>
+#include <optional>
 #include <thread>
 
 #include "host/BookSettings.h"
@@ -16,17 +17,20 @@ class MovementLoader : public QObject {
     Q_OBJECT
 public:
     using QObject::QObject;
-    /// Stops a reading that is under way and starts afresh.
+    /// Reads afresh. What is under way is stopped and nobody hears of it.
     void start(const BookSettings& settings);
-    bool isReading() const { return reading_; }
+    bool isReading() const { return isReading_; }
 
 signals:
     void loaded(const std::shared_ptr<MovementSearch>& search);
     void failed(const QString& text);
 
 private:
-    bool reading_ = false;
-    int run_ = 0;  // what an earlier run still has to say is not heard
+    void run(const BookSettings& settings);
+    void take(const std::shared_ptr<MovementSearch>& search, const QString& failure);
+
+    bool isReading_ = false;
+    std::optional<BookSettings> next_;  // a server that has not answered yet is not waited for
     std::jthread thread_;
 };
 

@@ -109,28 +109,41 @@ private:
 
 void MovementSearch::append(const MovementKey& movement) {
     entries_.push_back(entryOf(movement));
+    amounts_.push_back(movement.amounts);
 }
 
 void MovementSearch::prepend(const std::vector<MovementKey>& movements) {
     std::vector<Entry> newer;
-    for (const MovementKey& movement : movements) newer.push_back(entryOf(movement));
+    std::vector<std::array<qint64, 3>> amounts;
+    for (const MovementKey& movement : movements) {
+        newer.push_back(entryOf(movement));
+        amounts.push_back(movement.amounts);
+    }
     entries_.insert(entries_.begin(), newer.begin(), newer.end());
+    amounts_.insert(amounts_.begin(), amounts.begin(), amounts.end());
 }
 
 void MovementSearch::correct(const MovementKey& movement) {
     const auto known = std::find_if(entries_.begin(), entries_.end(), [&](const Entry& entry) {
         return entry.id == movement.movimento_id;
     });
-    if (known != entries_.end()) *known = entryOf(movement);
+    if (known == entries_.end()) return;
+    *known = entryOf(movement);
+    amounts_[std::size_t(known - entries_.begin())] = movement.amounts;
+}
+
+void MovementSearch::knowKey(bool activo, qint32 movimento_id) {
+    qint32& newest = newest_[activo ? 1 : 0];
+    newest = std::max(newest, movimento_id);
 }
 
 void MovementSearch::nameMember(qint32 socio_id, const QString& no_kor, const QString& nome) {
-    name(memberAt(socio_id), core::foldedWords(no_kor) + core::foldedWords(nome));
+    name(memberAt(socio_id), core::foldedWords(no_kor), core::foldedWords(nome));
 }
 
 void MovementSearch::nameRelative(qint32 socio_id, const QString& codABC, const QString& nome) {
     if (codABC.isEmpty()) return;
-    name(relativeAt(socio_id, codABC), core::foldedWords(nome));
+    name(relativeAt(socio_id, codABC), {}, core::foldedWords(nome));
 }
 
 std::vector<quint32> MovementSearch::find(const QString& filter) const {
@@ -146,8 +159,7 @@ std::vector<quint32> MovementSearch::find(const QString& filter) const {
 }
 
 MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
-    qint32& newest = newest_[movement.activo ? 1 : 0];
-    newest = std::max(newest, movement.movimento_id);
+    knowKey(movement.activo, movement.movimento_id);
     const std::string document =
         ' ' + core::folded(movement.doc_no.simplified()).substr(0, LongestText);
     const Entry entry{movement.movimento_id,
@@ -177,17 +189,19 @@ quint32 MovementSearch::relativeAt(qint32 socio_id, const QString& codABC) {
 
 quint32 MovementSearch::addPerson(quint64 key, quint32 member) {
     const auto person = quint32(persons_.size());
-    persons_.push_back({member, 0, 0});
+    persons_.push_back({member, 0, 0, 0});
     personAt_.insert(key, person);
     return person;
 }
 
-void MovementSearch::name(quint32 person, const std::string& words) {
-    const std::string_view known = text(persons_[person].words, persons_[person].wordsSize);
-    if (known == words) return;
-    persons_[person].words = quint32(texts_.size());
-    persons_[person].wordsSize = quint16(std::min(words.size(), LongestText));
-    texts_.append(words, 0, persons_[person].wordsSize);
+void MovementSearch::name(quint32 at, const std::string& staff, const std::string& nome) {
+    Person& person = persons_[at];
+    const std::string words = staff + nome;
+    if (text(person.words, person.wordsSize) == words) return;
+    person.words = quint32(texts_.size());
+    person.wordsSize = quint16(std::min(words.size(), LongestText));
+    person.staffSize = quint16(std::min(staff.size(), LongestText));
+    texts_.append(words, 0, person.wordsSize);
 }
 
 std::string_view MovementSearch::text(quint32 from, quint16 size) const {

@@ -4,14 +4,18 @@
 #include <QDate>
 #include <QHash>
 #include <QString>
+#include <array>
+#include <limits>
 #include <string>
 #include <string_view>
 #include <vector>
 
 namespace host {
 
-/// What the list looks a movement up by.
+/// What the list looks a movement up and sorts it by.
 struct MovementKey {
+    static constexpr qint64 NoAmount = std::numeric_limits<qint64>::min();
+
     qint32 movimento_id = 0;
     qint32 movimento_no = 0;  ///< 0 for none
     qint32 socio_id = 0;
@@ -20,9 +24,11 @@ struct MovementKey {
     QString tipo = {};
     QString doc_no = {};
     bool activo = true;  ///< stands in the table of the active members
+    /// Value, credit and debit, in the least unit of money.
+    std::array<qint64, 3> amounts = {NoAmount, NoAmount, NoAmount};
 };
 
-/// All movements in force, newest first, in about 40 bytes each, so that a million of them answer
+/// All movements in force, newest first, in about 60 bytes each, so that a million of them answer
 /// a keystroke without asking the database.
 ///
 /// A filter is a list of words; a movement fits when every word fits one of: the beginning of its
@@ -44,13 +50,17 @@ public:
 
     std::size_t size() const { return entries_.size(); }
     qint32 movimento_id(std::size_t position) const { return entries_[position].id; }
-    /// The greatest key in the table of the active members, or of those who left; 0 without any.
+    /// The greatest key known of the table of the active members, or of those who left; 0 without
+    /// any.
     qint32 newest(bool activo) const { return newest_[activo ? 1 : 0]; }
+    /// Tells that a table holds a key, whether or not its movement is here.
+    void knowKey(bool activo, qint32 movimento_id);
 
     /// Positions of the movements that fit, newest first.
     std::vector<quint32> find(const QString& filter) const;
 
 private:
+    friend class MovementOrder;
     struct Entry {
         qint32 id;
         qint32 number;
@@ -64,6 +74,7 @@ private:
         quint32 member;  // whose relative he is; a member is his own
         quint32 words;   // where his words begin in texts_
         quint16 wordsSize;
+        quint16 staffSize;  // of them, the words of the staff number, which come first
     };
     class Word;
 
@@ -71,10 +82,11 @@ private:
     quint32 memberAt(qint32 socio_id);
     quint32 relativeAt(qint32 socio_id, const QString& codABC);
     quint32 addPerson(quint64 key, quint32 member);
-    void name(quint32 person, const std::string& words);
+    void name(quint32 person, const std::string& staff, const std::string& nome);
     std::string_view text(quint32 from, quint16 size) const;
 
     std::vector<Entry> entries_;
+    std::vector<std::array<qint64, 3>> amounts_;  // of the entries
     std::vector<Person> persons_;
     QHash<quint64, quint32> personAt_;  // by socio_id and, below it, the position in codes_ plus 1
     std::vector<std::string> types_;

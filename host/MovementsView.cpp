@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementsView.h"
 
-#include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
 #include <QStackedWidget>
-#include <QTableView>
 
+#include "host/MovementTable.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Format.h"
 #include "platform/forms/Form.h"
 
 using namespace Qt::StringLiterals;
@@ -19,30 +19,12 @@ namespace {
 
 constexpr int FirstMovements = 300;  // more than any screen shows
 
-// Usual widths, in digits of the list's font; the name takes what is left.
-constexpr int Widths[MovementRow::ColumnCount] = {8, 12, 9, 34, 34, 6, 14, 13, 13, 13};
-
-QTableView* movementTable(MovementList* movements) {
-    auto* list = new QTableView;
-    list->setObjectName(u"Lista"_s);
-    list->setModel(movements);
-    list->setSelectionBehavior(QAbstractItemView::SelectRows);
-    list->setSelectionMode(QAbstractItemView::SingleSelection);
-    list->setAlternatingRowColors(true);
-    list->setShowGrid(false);
-    list->setWordWrap(false);
-    list->setTabKeyNavigation(false);
-    list->setFrameShape(QFrame::NoFrame);
-    list->verticalHeader()->hide();
-    list->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    list->verticalHeader()->setDefaultSectionSize(list->fontMetrics().height() * 3 / 2);
-    list->horizontalHeader()->setHighlightSections(false);
-    list->horizontalHeader()->setSectionsMovable(false);
-    for (int column = 0; column < MovementRow::ColumnCount; ++column)
-        list->setColumnWidth(column,
-                             list->fontMetrics().horizontalAdvance('0'_L1) * Widths[column]);
-    list->horizontalHeader()->setSectionResizeMode(MovementRow::Name, QHeaderView::Stretch);
-    return list;
+/// Why a movement has no screen to be looked at on; empty for those that have one.
+QString reasonNotToOpen(const QString& tipo) {
+    if (tipo == "ANL"_L1) return u"foi anulado."_s;
+    if (tipo == "COR"_L1) return u"é a correção de um movimento anulado."_s;
+    if (tipo == "SA"_L1) return u"é o saldo que passou do ano anterior."_s;
+    return {};
 }
 
 QLabel* centredLabel(const QString& name) {
@@ -58,7 +40,9 @@ QLabel* centredLabel(const QString& name) {
 }  // namespace
 
 MovementsView::MovementsView()
-    : movements_(new MovementList(this)), loader_(new MovementLoader(this)) {
+    : movements_(new MovementList(this)),
+      loader_(new MovementLoader(this)),
+      sorter_(new MovementSorter(this)) {
     layOut();
     connectParts();
 }
@@ -75,7 +59,7 @@ void MovementsView::layOut() {
     filterRow->addWidget(forms::fieldLabel(u"&Filtro:"_s, filter_, u"Label1"_s));
     filterRow->addWidget(filter_);
 
-    list_ = movementTable(movements_);
+    list_ = new MovementTable(movements_);
     notice_ = centredLabel(u"Aviso"_s);
     hint_ = centredLabel(u"Sugestao"_s);
     hint_->setForegroundRole(QPalette::PlaceholderText);
@@ -103,6 +87,14 @@ void MovementsView::connectParts() {
     connect(filter_, &QLineEdit::textChanged, this, &MovementsView::filterChanged);
     connect(list_, &QTableView::doubleClicked, this, &MovementsView::chooseCurrent);
     connect(loader_, &MovementLoader::loaded, this, &MovementsView::takeLoaded);
+    connect(list_, &MovementTable::copied, this, [this](int rows, bool all) {
+        const QString text = rows == 1 ? u"Uma linha copiada."_s : u"%1 linhas copiadas."_s;
+        emit told((rows == 1 ? text : text.arg(core::grouped(rows))) +
+                  (all ? QString() : u" As restantes não foram."_s));
+    });
+    connect(movements_, &MovementList::sortWanted, this, &MovementsView::sortBy);
+    list_->setSortingEnabled(true);
+    connect(sorter_, &MovementSorter::finished, this, &MovementsView::takeSorted);
     connect(loader_, &MovementLoader::failed, this, &MovementsView::showUnreadable);
     // Rows are read while they are painted: what failed is shown afterwards.
     connect(movements_, &MovementList::failed, this, &MovementsView::showUnreadable,
@@ -111,17 +103,21 @@ void MovementsView::connectParts() {
 
 void MovementsView::open(const BookSettings& settings) {
     settings_ = settings;
+    sorter_->forget();
     movements_->setBook({}, {});
     book_.reset();
+    isSample_ = false;
     if (!settings.isComplete)
         return showNotice(u"Ainda não há um livro para este utilizador."_s,
                           u"Um livro novo faz-se com: zelmars init PASTA"_s);
     try {
         book_ = std::make_shared<MovementBook>(settings);
+        isSample_ = book_->isSample();
         movements_->setBook(book_, book_->newest(FirstMovements));
         loader_->start(settings);
         stack_->setCurrentIndex(0);
         list_->selectRow(0);
+        sortAgain();
         showCount();
     } catch (const core::Failure& failure) {
         showUnreadable(failure.text());
@@ -155,14 +151,41 @@ void MovementsView::changeList(Change&& change) {
 }
 
 void MovementsView::takeNewer() {
-    changeList([this] { movements_->takeNewer(); });
+    isNewerWanted_ = sorter_->isBusy();
+    if (isNewerWanted_) return;
+    changeList([this] {
+        if (movements_->takeNewer() > 0) sortAgain();
+    });
 }
 
 void MovementsView::takeLoaded(const std::shared_ptr<MovementSearch>& search) {
     if (!book_) return;
     keepingPlace([&] { movements_->setBook(book_, search); });
+    sorter_->forget();
     takeNewer();
+    sortAgain();
     emit bookRead();
+}
+
+void MovementsView::sortBy(int column, Qt::SortOrder order) {
+    sortColumn_ = column;
+    sortOrder_ = order;
+    sorter_->forget();
+    if (column < 0) keepingPlace([this] { movements_->setOrder({}); });
+    sortAgain();
+    showCount();
+}
+
+void MovementsView::sortAgain() {
+    if (sortColumn_ >= 0 && movements_->search())
+        sorter_->start({movements_->search(), MovementRow::Column(sortColumn_), sortOrder_});
+}
+
+void MovementsView::takeSorted(const std::vector<quint32>& positions) {
+    if (positions.size() == std::size_t(movements_->total()))
+        keepingPlace([&] { movements_->setOrder(positions); });
+    showCount();
+    if (isNewerWanted_) takeNewer();
 }
 
 void MovementsView::focusFilter() {
@@ -175,11 +198,11 @@ void MovementsView::focusList() {
 }
 
 QByteArray MovementsView::columns() const {
-    return list_->horizontalHeader()->saveState();
+    return list_->columns();
 }
 
 void MovementsView::setColumns(const QByteArray& columns) {
-    list_->horizontalHeader()->restoreState(columns);
+    list_->setColumns(columns);
 }
 
 bool MovementsView::eventFilter(QObject* watched, QEvent* event) {
@@ -225,7 +248,11 @@ bool MovementsView::keyInList(const QKeyEvent& key) {
 void MovementsView::chooseCurrent() {
     const QModelIndex current = list_->currentIndex();
     if (!current.isValid() || stack_->currentIndex() != 0) return;
-    emit chosen(movements_->movimento_id(current.row()));
+    const QString tipo = movements_->tipo(current.row());
+    const QString reason = reasonNotToOpen(tipo);
+    if (reason.isEmpty()) return emit chosen(movements_->movimento_id(current.row()));
+    emit told(
+        u"O movimento nº %1 não se abre: %2"_s.arg(movements_->number(current.row()), reason));
 }
 
 void MovementsView::filterChanged(const QString& text) {
@@ -251,13 +278,25 @@ void MovementsView::showNotice(const QString& text, const QString& hint) {
 }
 
 void MovementsView::showCount() {
-    const QLocale locale;
-    const QString shown = locale.toString(movements_->rowCount());
-    QString text = u"%1 movimentos"_s.arg(shown);
+    const int shown = movements_->rowCount();
+    QString text = shown == 1 ? u"1 movimento"_s : u"%1 movimentos"_s.arg(core::grouped(shown));
     if (!movements_->filter().simplified().isEmpty())
-        text = u"%1 de %2 movimentos"_s.arg(shown, locale.toString(movements_->total()));
+        text =
+            u"%1 de %2 movimentos"_s.arg(core::grouped(shown), core::grouped(movements_->total()));
     if (loader_->isReading()) text += u" (a ler os restantes…)"_s;
+    if (sorter_->isBusy()) text += u" (a ordenar…)"_s;
     emit countChanged(text);
+    showEmptyText();
+}
+
+void MovementsView::showEmptyText() {
+    if (movements_->filter().simplified().isEmpty())
+        return list_->setEmptyText(u"Este livro ainda não tem movimentos."_s,
+                                   u"Ctrl+N começa um documento, Ctrl+R um recebimento."_s);
+    const QString text = u"Nenhum movimento corresponde a «%1»."_s.arg(movements_->filter());
+    list_->setEmptyText(text, loader_->isReading()
+                                  ? u"Os mais antigos ainda estão a ser lidos."_s
+                                  : u"Esc apaga o filtro; F5 lê o livro de novo."_s);
 }
 
 }  // namespace host

@@ -5,13 +5,15 @@
 
 #include "host/MovementList.h"
 #include "host/MovementLoader.h"
+#include "host/MovementSorter.h"
 
 class QLabel;
 class QLineEdit;
 class QStackedWidget;
-class QTableView;
 
 namespace host {
+
+class MovementTable;
 
 /// The list of movements in force with its filter; in place of the list a text when the book cannot
 /// be read.
@@ -24,6 +26,9 @@ public:
     void open(const BookSettings& settings);
     /// Shows what was posted or annulled since, here or at another workstation.
     void takeNewer();
+
+    /// True when the book that is open holds sample data.
+    bool isSample() const { return isSample_; }
 
     void focusFilter();
     void focusList();
@@ -40,6 +45,8 @@ signals:
     void countChanged(const QString& text);
     /// The whole book was read afresh.
     void bookRead();
+    /// Something to be read in passing, for the status line.
+    void told(const QString& text);
 
 protected:
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -51,6 +58,9 @@ private:
     bool keyInList(const QKeyEvent& key);
     void filterChanged(const QString& text);
     void takeLoaded(const std::shared_ptr<MovementSearch>& search);
+    void sortBy(int column, Qt::SortOrder order);
+    void sortAgain();
+    void takeSorted(const std::vector<quint32>& positions);
     template <class Change>
     void changeList(Change&& change);
     template <class Change>
@@ -58,13 +68,19 @@ private:
     void showUnreadable(const QString& text);
     void showNotice(const QString& text, const QString& hint);
     void showCount();
+    void showEmptyText();
 
     BookSettings settings_;
+    bool isSample_ = false;
     std::shared_ptr<MovementBook> book_;
     MovementList* movements_;
     MovementLoader* loader_;
+    MovementSorter* sorter_;
+    int sortColumn_ = -1;  // none: the newest first
+    Qt::SortOrder sortOrder_ = Qt::AscendingOrder;
+    bool isNewerWanted_ = false;  // put off until what is sorted may be changed
     QLineEdit* filter_;
-    QTableView* list_;
+    MovementTable* list_;
     QLabel* notice_;
     QLabel* hint_;
     QStackedWidget* stack_;

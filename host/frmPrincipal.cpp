@@ -6,10 +6,12 @@
 #include <QMenu>
 #include <QMenuBar>
 #include <QScopedValueRollback>
+#include <QScreen>
 #include <QSettings>
 #include <QStandardPaths>
 #include <QStatusBar>
 
+#include "data/Procedures.h"
 #include "host/BookSettings.h"
 #include "host/MovementsView.h"
 #include "host/UnfinishedOperations.h"
@@ -50,6 +52,9 @@ void bringForward(QWidget* window) {
     window->activateWindow();
 }
 
+constexpr QSize FrameSize(16, 48);  // about what a window manager adds
+constexpr int MessageTime = 8000;   // in milliseconds
+
 QSettings windowSettings() {
     const QString folder =
         QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation) + u"/zelmars"_s;
@@ -79,7 +84,10 @@ frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
             [this](qint32 key) { run(Operations::movement(key, this)); });
     connect(movements_, &MovementsView::bookRead, this, &frmPrincipal::offerToFinish,
             Qt::QueuedConnection);
+    connect(movements_, &MovementsView::told, this,
+            [this](const QString& text) { statusBar()->showMessage(text, MessageTime); });
     restoreLook();
+    guardKeys();
     reload();
     movements_->focusFilter();
 }
@@ -92,12 +100,12 @@ void frmPrincipal::addEntryMenu() {
     addOperation(menu, u"Novo documento de &hospital"_s, u"Ctrl+H"_s, Operations::newDocument(true),
                  u"NewMovimentoHospital"_s);
     addOperation(menu, u"&Recebimento"_s, u"Ctrl+R"_s, {u"Recebimento"_s, {}});
-    addOperation(menu, u"&Correcção"_s, u"Ctrl+K"_s, {u"Correcao"_s, {}});
+    addOperation(menu, u"&Correção"_s, u"Ctrl+K"_s, {u"Correcao"_s, {}});
     menu->addSeparator();
     addItem(menu, u"Registo"_s, u"&Abrir movimento"_s, u"Ctrl+O"_s,
             [this] { movements_->chooseCurrent(); });
     menu->addSeparator();
-    addItem(menu, u"Login"_s, u"&Ligar novamente"_s, {}, [this] { login(); });
+    addItem(menu, u"Login"_s, u"&Ligar novamente"_s, {}, [this] { once([this] { login(); }); });
     addItem(menu, u"Sair"_s, u"&Sair"_s, u"Ctrl+Q"_s, [this] { close(); });
 }
 
@@ -114,7 +122,7 @@ void frmPrincipal::addListingMenus() {
 
 void frmPrincipal::addYearMenus() {
     QMenu* tables = menuBar()->addMenu(u"&Tabelas"_s);
-    addOperation(tables, u"&Rúbricas e plafonds"_s, {}, Operations::rubrics());
+    addOperation(tables, u"&Rubricas e plafonds"_s, {}, Operations::rubrics());
     addOperation(tables, u"&Hospitais"_s, {}, Operations::hospitals());
     QMenu* year = menuBar()->addMenu(u"&Anual"_s);
     addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
@@ -124,13 +132,15 @@ void frmPrincipal::addYearMenus() {
 
 void frmPrincipal::addHelpMenu() {
     QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
-    addItem(menu, u"Actualizar"_s, u"&Actualizar a lista"_s, u"F5"_s, [this] { reload(); });
+    addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
     addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
     menu->addSeparator();
-    addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [] {
-        core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(
-                         QApplication::applicationVersion()),
-                     core::Icon::Information);
+    addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
+        once([] {
+            core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(
+                             QApplication::applicationVersion()),
+                         core::Icon::Information);
+        });
     });
 }
 
@@ -139,10 +149,18 @@ void frmPrincipal::addStatusLine() {
     count_->setObjectName(u"Contagem"_s);
     book_ = new QLabel;
     book_->setObjectName(u"Livro"_s);
-    user_ = new QLabel;
+    sample_ = new QLabel(u"Dados de exemplo"_s);
+    sample_->setObjectName(u"Exemplo"_s);
+    QFont bold = sample_->font();
+    bold.setBold(true);
+    sample_->setFont(bold);
+    sample_->hide();
+    // The one whose name goes into what is posted.
+    user_ = new QLabel(u"Utilizador: "_s + data::ObterUtilizador());
     user_->setObjectName(u"Utilizador"_s);
-    for (QLabel* label : {count_, book_, user_}) label->setContentsMargins(8, 0, 8, 0);
+    for (QLabel* label : {count_, sample_, book_, user_}) label->setContentsMargins(8, 0, 8, 0);
     statusBar()->addWidget(count_, 1);
+    statusBar()->addPermanentWidget(sample_);
     statusBar()->addPermanentWidget(book_);
     statusBar()->addPermanentWidget(user_);
 }
@@ -158,11 +176,25 @@ QAction* frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& 
 
 QAction* frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
                                     const OperationCall& call, const QString& name) {
-    return addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
-                   [this, call] { run(call); });
+    QAction* action = addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
+                              [this, call] { run(call); });
+    action->setEnabled(Operations::isThere(call.operation));
+    return action;
+}
+
+/// A handler whose box or modal screen is still open is not started again, nor is another one: an
+/// assistive program can choose from the menu although the box keeps the keys.
+void frmPrincipal::once(const std::function<void()>& handler) {
+    if (isRunning_) return;
+    const QScopedValueRollback<bool> running(isRunning_, true);
+    handler();
 }
 
 void frmPrincipal::run(const OperationCall& call) {
+    once([&] { runUnguarded(call); });
+}
+
+void frmPrincipal::runUnguarded(const OperationCall& call) {
     if (QWidget* entry = entryUnderWay(screensTakenBy(call.operation))) {
         core::MsgBox(u"Já há um lançamento aberto.\nTermine-o ou cancele-o antes de abrir outro."_s,
                      core::Icon::Information);
@@ -177,7 +209,7 @@ void frmPrincipal::login() {
     const bool isLoggedIn = operations_.call({u"Login"_s, {}}).toBool();
     reload();
     if (isLoggedIn)
-        statusBar()->showMessage(u"Ligado ao livro."_s, 5000);
+        statusBar()->showMessage(u"Ligado ao livro."_s, MessageTime);
     else
         core::MsgBox(u"Não foi possível ligar ao livro: faltam valores na configuração."_s,
                      core::Icon::Critical);
@@ -190,9 +222,8 @@ void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {
 void frmPrincipal::reload() {
     const BookSettings settings = BookSettings::read();
     book_->setText(settings.isComplete ? u"Livro: "_s + settings.bookText() : u"Sem livro"_s);
-    user_->setText(u"Utilizador: "_s + settings.user);
-    user_->setVisible(!settings.user.isEmpty());
     movements_->open(settings);
+    sample_->setVisible(movements_->isSample());
 }
 
 /// After the book was read afresh, at the start as well as after a lost connection.
@@ -204,6 +235,23 @@ void frmPrincipal::offerToFinish() {
 
 void frmPrincipal::showCount(const QString& text) {
     count_->setText(text);
+}
+
+/// Fields take some keys for themselves (Ctrl+E for the end of the line, Ctrl+K for deleting it):
+/// here the menu comes first.
+void frmPrincipal::guardKeys() {
+    for (QWidget* child : findChildren<QWidget*>()) child->installEventFilter(this);
+}
+
+bool frmPrincipal::eventFilter(QObject* watched, QEvent* event) {
+    if (event->type() != QEvent::ShortcutOverride) return QMainWindow::eventFilter(watched, event);
+    const QKeySequence pressed(static_cast<QKeyEvent*>(event)->keyCombination());
+    const QList<QAction*> actions = findChildren<QAction*>();
+    const bool isOurs = std::any_of(actions.begin(), actions.end(), [&](const QAction* action) {
+        return !action->objectName().isEmpty() && action->shortcut() == pressed;
+    });
+    if (isOurs) event->ignore();
+    return isOurs || QMainWindow::eventFilter(watched, event);
 }
 
 bool frmPrincipal::event(QEvent* event) {
@@ -229,7 +277,8 @@ void frmPrincipal::closeEvent(QCloseEvent* event) {
 
 void frmPrincipal::restoreLook() {
     const QSettings settings = windowSettings();
-    if (!restoreGeometry(settings.value(u"janela"_s).toByteArray())) resize(1180, 700);
+    if (!restoreGeometry(settings.value(u"janela"_s).toByteArray()))
+        resize(QSize(1180, 700).boundedTo(screen()->availableSize() - FrameSize));
     movements_->setColumns(settings.value(u"colunas"_s).toByteArray());
 }
 

@@ -27,11 +27,13 @@ public:
     /// Reads the settings and the book afresh.
     void reload();
     /// Runs an operation of the component; a failure is shown in a box. An entry under way is
-    /// brought forward in place of an operation that would take its screen away.
+    /// brought forward in place of an operation that would take its screen away. Nothing runs while
+    /// an operation or its box is still open.
     void run(const OperationCall& call);
 
 protected:
     bool event(QEvent* event) override;
+    bool eventFilter(QObject* watched, QEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
 
 private:
@@ -45,6 +47,9 @@ private:
     void addHelpMenu();
     void addStatusLine();
 
+    void guardKeys();
+    void runUnguarded(const OperationCall& call);
+    void once(const std::function<void()>& handler);
     void login();
     void offerToFinish();
     void showCount(const QString& text);
@@ -53,8 +58,10 @@ private:
 
     bool isOffering_ = false;  ///< the question about unfinished operations is open
     Operations operations_;
+    bool isRunning_ = false;
     MovementsView* movements_;
     QLabel* count_;
+    QLabel* sample_;
     QLabel* book_;
     QLabel* user_;
 };

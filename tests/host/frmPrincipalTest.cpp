@@ -4,11 +4,18 @@
 #include <gtest/gtest.h>
 
 #include <QAction>
+#include <QClipboard>
 #include <QCloseEvent>
+#include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
+#include <QStatusBar>
 #include <QTableView>
 #include <map>
+
+#include "data/Procedures.h"
+#include "host/MovementsView.h"
+#include "host/Operations.h"
 
 #include "platform/com/Component.h"
 #include "platform/core/Failure.h"
@@ -163,9 +170,140 @@ TEST_F(PrincipalWindow, EveryOperationIsInTheMenuWithItsArguments) {
     for (const auto& [name, call] : calls) {
         auto* action = window_.findChild<QAction*>(name);
         ASSERT_TRUE(action) << name.toStdString();
+        // What is still to come is grey.
+        EXPECT_EQ(action->isEnabled(), host::Operations::isThere(call.section(u' ', 0, 0)));
+        action->setEnabled(true);
         action->trigger();
         EXPECT_EQ(Recorder::calls.last(), call);
     }
+}
+
+TEST_F(PrincipalWindow, NewMovementsOfMembersWhoLeftAreNotTakenForAllOfTheirs) {
+    // None of the newest rows is a leaver's, and the window comes back before all are read.
+    book_.exec(
+        u"insert into tbZelmar_Movimentos_Inactivos (movimento_id, movimento_no, socio_id, "
+        "data, tipo) values (1, 7, 1, '2020-01-01', 'DOC')"_s);
+    for (int number = 10; number < 310; ++number) post(number, member_, "DOC", 1);
+    window_.reload();
+    QEvent back(QEvent::WindowActivate);
+    QCoreApplication::sendEvent(&window_, &back);
+    ASSERT_TRUE(count().contains(u"a ler"_s));
+    EXPECT_EQ(rows(), 300);
+    EXPECT_EQ(cell(0, 0), u"309"_s);
+    person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
+    EXPECT_EQ(rows(), 304);
+    EXPECT_EQ(cell(303, 0), u"7"_s);
+}
+
+TEST_F(PrincipalWindow, SortsByAnyColumnAndKeepsTheMovementInHand) {
+    auto* list = person_.find<QTableView>(u"Lista"_s);
+    const auto sorted = [&](int column, Qt::SortOrder order) {
+        list->horizontalHeader()->setSortIndicator(column, order);
+        person_.waitUntil([&] { return !count().contains(u"a ordenar"_s); }, u"it is sorted"_s);
+        QStringList numbers;
+        for (int row = 0; row < rows(); ++row) numbers << cell(row, 0);
+        return numbers.join(u' ');
+    };
+    post(4, other_, "SA", 7);
+    person_.press(Qt::Key_F5);
+    person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
+    const struct {
+        int column;
+        Qt::SortOrder order;
+        const char16_t* numbers;
+    } rows[] = {
+        {0, Qt::AscendingOrder, u"1 2 3 4"},  {1, Qt::AscendingOrder, u"4 3 2 1"},
+        {2, Qt::DescendingOrder, u"4 2 3 1"}, {3, Qt::AscendingOrder, u"3 1 4 2"},
+        {4, Qt::DescendingOrder, u"3 1 4 2"}, {5, Qt::AscendingOrder, u"3 1 2 4"},
+        {6, Qt::DescendingOrder, u"4 3 2 1"}, {7, Qt::DescendingOrder, u"2 1 4 3"},
+        {-1, Qt::AscendingOrder, u"4 3 2 1"},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(sorted(row.column, row.order), QString::fromUtf16(row.numbers)) << row.column;
+    // A filter keeps the order; what is posted since comes into its place.
+    sorted(7, Qt::AscendingOrder);
+    list->selectRow(2);
+    post(5, member_, "DOC", 6);
+    QEvent back(QEvent::WindowActivate);
+    QCoreApplication::sendEvent(&window_, &back);
+    EXPECT_EQ(sorted(7, Qt::AscendingOrder), u"3 5 4 1 2"_s);
+    EXPECT_EQ(list->currentIndex().siblingAtColumn(0).data().toString(), u"1"_s);
+    person_.put(u"Filtro"_s, u"silva"_s);
+    EXPECT_EQ(sorted(7, Qt::DescendingOrder), u"1 5 3"_s);
+}
+
+TEST_F(PrincipalWindow, CopiesWholeRowsAndSaysWhatCannotBeOpened) {
+    auto* list = person_.find<QTableView>(u"Lista"_s);
+    person_.press(Qt::Key_Down);
+    list->selectRow(1);
+    person_.press(Qt::Key_Down, Qt::ShiftModifier);
+    person_.press(Qt::Key_C, Qt::ControlModifier);
+    EXPECT_EQ(QApplication::clipboard()->text(),
+              u"2\t20-11-2026\t100023\tInês Araújo\t\tHOS\tFT 2\t€ 12.000,00\t\t\n"
+              "1\t20-11-2026\t100015\tAntónio Silva\tRui Silva\tDOC\tFT 1\t€ 87,35\t\t\n"_s);
+    list->selectRow(0);
+    person_.enter();
+    EXPECT_EQ(window_.statusBar()->currentMessage(),
+              u"O movimento nº 3 não se abre: foi anulado."_s);
+    EXPECT_TRUE(Recorder::calls.isEmpty());
+    person_.put(u"Filtro"_s, u"zzz"_s);
+    EXPECT_EQ(person_.find<QLabel>(u"Vazio"_s)->text(), u"Nenhum movimento corresponde a «zzz»."_s);
+    EXPECT_EQ(person_.find<QLabel>(u"Utilizador"_s)->text(),
+              u"Utilizador: "_s + data::ObterUtilizador());
+}
+
+TEST_F(PrincipalWindow, ColumnsKeepTheirWidthsAndTheNamesTakeTheRest) {
+    auto* list = person_.find<QTableView>(u"Lista"_s);
+    window_.resize(1500, 700);
+    const auto fills = [&] {
+        return list->horizontalHeader()->length() == list->viewport()->width();
+    };
+    EXPECT_TRUE(fills());
+    list->setColumnWidth(6, 217);
+    EXPECT_TRUE(fills());
+    list->setColumnWidth(3, 301);
+    EXPECT_TRUE(fills());
+    EXPECT_EQ(list->columnWidth(3), 301);
+    window_.resize(window_.width() + 100, window_.height());
+    EXPECT_TRUE(fills());
+    EXPECT_EQ(list->columnWidth(3), 351);
+    // So they stand when the window is opened again.
+    host::MovementsView next;
+    next.resize(list->width(), 400);
+    next.setColumns(window_.findChild<host::MovementsView*>()->columns());
+    next.show();
+    for (const int column : {3, 6})
+        EXPECT_EQ(next.findChild<QTableView*>(u"Lista"_s)->columnWidth(column),
+                  list->columnWidth(column));
+}
+
+TEST_F(PrincipalWindow, EveryKeyOfTheMenusWorksFromEverywhere) {
+    for (const auto& [widget, name] : {std::pair{u"Filtro"_s, "filter"}, {u"Lista"_s, "list"}})
+        for (QAction* action : window_.findChildren<QAction*>()) {
+            const QKeySequence key = action->shortcut();
+            if (key.isEmpty() || action->objectName() == u"Sair"_s || !action->isEnabled())
+                continue;
+            window_.findChild<QWidget*>(widget)->setFocus();
+            int triggered = 0;
+            const auto heard = QObject::connect(action, &QAction::triggered, [&] { ++triggered; });
+            person_.press(Qt::Key(key[0].key()), key[0].keyboardModifiers());
+            EXPECT_EQ(triggered, 1) << name << ' ' << key.toString().toStdString();
+            QObject::disconnect(heard);
+        }
+}
+
+TEST_F(PrincipalWindow, NothingRunsWhileABoxIsOpen) {
+    Recorder::failure = u"disk I/O error"_s;
+    // As an assistive program chooses from the menu while the box is there.
+    QTimer::singleShot(0, &window_, [&] {
+        EXPECT_TRUE(QApplication::activeModalWidget());
+        window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
+        window_.findChild<QAction*>(u"Login"_s)->trigger();
+    });
+    person_.expectBox({.text = u"disk I/O error"_s});
+    window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
+    person_.expectNoBoxesLeft();
+    EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
 }
 
 TEST_F(PrincipalWindow, AMissingOrFailingOperationShowsItsTextAndGoesOn) {
@@ -211,6 +349,7 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
     auto* button = new QPushButton(u"&OK"_s, &entry);
     button->setObjectName(u"Command3"_s);
     entry.show();
+    person_.find<QTableView>(u"Lista"_s)->selectRow(1);
     for (const char* name : {"NewMovimento", "NewMovimentoHospital", "Registo"}) {
         person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
         window_.findChild<QAction*>(QString::fromLatin1(name))->trigger();
@@ -230,9 +369,10 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
     entry.setObjectName(u"frmRecebimento"_s);
     button->setText(u"&OK"_s);
     person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
+    person_.find<QTableView>(u"Lista"_s)->selectRow(1);
     for (const char* name : {"Recebimento", "Correcao", "Registo"})
         window_.findChild<QAction*>(QString::fromLatin1(name))->trigger();
-    EXPECT_EQ(Recorder::calls.mid(1), QStringList({u"Correcao"_s, u"Registo %1"_s.arg(last_)}));
+    EXPECT_EQ(Recorder::calls.mid(1), QStringList({u"Correcao"_s, u"Registo %1"_s.arg(last_ - 1)}));
 }
 
 TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {

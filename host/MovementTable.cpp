@@ -1,0 +1,164 @@
+// SPDX-License-Identifier: MIT
+#include "host/MovementTable.h"
+
+#include <QApplication>
+#include <QClipboard>
+#include <QHeaderView>
+#include <QKeyEvent>
+#include <QLabel>
+
+#include "host/MovementBook.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+namespace {
+
+// Usual widths, in digits of the list's font; the names take what is left.
+constexpr int Widths[MovementRow::ColumnCount] = {8, 12, 9, 34, 34, 6, 14, 13, 13, 13};
+constexpr int LeastName = 16;
+constexpr int MostCopied = 10'000;
+
+QLabel* centredLabel(const QString& name) {
+    auto* label = new QLabel;
+    label->setObjectName(name);
+    label->setTextFormat(Qt::PlainText);
+    label->setAlignment(Qt::AlignHCenter);
+    label->setWordWrap(true);
+    return label;
+}
+
+}  // namespace
+
+MovementTable::MovementTable(QAbstractItemModel* movements) {
+    setObjectName(u"Lista"_s);
+    setAccessibleName(u"Movimentos"_s);
+    setModel(movements);
+    setSelectionBehavior(SelectRows);
+    setSelectionMode(ExtendedSelection);
+    setAlternatingRowColors(true);
+    setShowGrid(false);
+    setWordWrap(false);
+    setTabKeyNavigation(false);
+    setFrameShape(QFrame::NoFrame);
+    setHorizontalScrollMode(ScrollPerPixel);
+    verticalHeader()->hide();
+    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    verticalHeader()->setDefaultSectionSize(fontMetrics().height() * 3 / 2);
+    QHeaderView* header = horizontalHeader();
+    header->setHighlightSections(false);
+    header->setSectionsMovable(false);
+    header->setSectionsClickable(true);
+    header->setSortIndicatorClearable(true);
+    header->setSortIndicatorShown(true);
+    header->setSortIndicator(-1, Qt::AscendingOrder);
+    for (int column = 0; column < MovementRow::ColumnCount; ++column)
+        setColumnWidth(column, fontMetrics().horizontalAdvance('0'_L1) * Widths[column]);
+    connect(header, &QHeaderView::sectionResized, this, [this](int column, int before, int after) {
+        giveFreeSpace(column, std::max(0, after - before));
+    });
+    addEmptyText();
+    connect(movements, &QAbstractItemModel::modelReset, this, &MovementTable::showEmptyText);
+}
+
+void MovementTable::addEmptyText() {
+    empty_ = centredLabel(u"Vazio"_s);
+    hint_ = centredLabel(u"VazioSugestao"_s);
+    hint_->setForegroundRole(QPalette::PlaceholderText);
+    auto* column = new QVBoxLayout(viewport());
+    column->setContentsMargins(60, 20, 60, 20);
+    column->addStretch(2);
+    column->addWidget(empty_);
+    column->addWidget(hint_);
+    column->addStretch(3);
+}
+
+void MovementTable::setEmptyText(const QString& text, const QString& hint) {
+    empty_->setText(text);
+    hint_->setText(hint);
+    showEmptyText();
+}
+
+void MovementTable::showEmptyText() {
+    const bool isEmpty = model()->rowCount() == 0;
+    empty_->setVisible(isEmpty);
+    hint_->setVisible(isEmpty);
+}
+
+QByteArray MovementTable::columns() const {
+    return horizontalHeader()->saveState();
+}
+
+void MovementTable::setColumns(const QByteArray& columns) {
+    QHeaderView* header = horizontalHeader();
+    header->restoreState(columns);
+    // Widths alone are kept: the newest are at the top when the window opens.
+    header->setSectionResizeMode(QHeaderView::Interactive);
+    header->setSortIndicatorClearable(true);
+    header->setSortIndicatorShown(true);
+    header->setSortIndicator(-1, Qt::AscendingOrder);
+}
+
+// Before it is shown, the table has a width that means nothing.
+void MovementTable::showEvent(QShowEvent* event) {
+    QTableView::showEvent(event);
+    giveFreeSpace(-1, viewport()->width());
+}
+
+void MovementTable::resizeEvent(QResizeEvent* event) {
+    QTableView::resizeEvent(event);
+    if (isVisible())
+        giveFreeSpace(-1, std::max(0, event->oldSize().width() - event->size().width()));
+}
+
+/// The names grow and shrink so that the columns fill the window: by what the person gave to
+/// another column or took from the window, so that a list that he made wider than the window stays
+/// so. A name's column whose width he is changing keeps what he gives it.
+/// @param kept  that column; -1 for none
+/// @param mostTaken  how much the names shrink at most, in pixels
+void MovementTable::giveFreeSpace(int kept, int mostTaken) {
+    if (isFitting_) return;
+    isFitting_ = true;
+    const int least = fontMetrics().horizontalAdvance('0'_L1) * LeastName;
+    int free = std::max(viewport()->width() - horizontalHeader()->length(), -mostTaken);
+    int sharing = kept == MovementRow::Name || kept == MovementRow::Person ? 1 : 2;
+    for (const int column : {MovementRow::Name, MovementRow::Person}) {
+        if (column == kept) continue;
+        const int before = columnWidth(column);
+        const int after = std::max(before + free / sharing--, std::min(before, least));
+        setColumnWidth(column, after);
+        free -= after - before;
+    }
+    isFitting_ = false;
+}
+
+void MovementTable::keyPressEvent(QKeyEvent* event) {
+    if (event->matches(QKeySequence::Copy))
+        copyRows();
+    else
+        QTableView::keyPressEvent(event);
+}
+
+/// The rows from top to bottom, a line each, their columns parted by tabs, as spreadsheets take
+/// them.
+void MovementTable::copyRows() {
+    QItemSelection ranges = selectionModel()->selection();
+    std::sort(ranges.begin(), ranges.end(),
+              [](const auto& a, const auto& b) { return a.top() < b.top(); });
+    QStringList lines;
+    for (const QItemSelectionRange& range : ranges)
+        for (int row = range.top(); row <= range.bottom() && lines.size() < MostCopied; ++row) {
+            QStringList cells;
+            for (int column = 0; column < model()->columnCount(); ++column)
+                cells << model()->index(row, column).data().toString().simplified();
+            lines << cells.join('\t'_L1);
+        }
+    if (lines.isEmpty()) return;
+    QApplication::clipboard()->setText(lines.join('\n'_L1) + '\n'_L1);
+    const int selected = std::accumulate(ranges.begin(), ranges.end(), 0,
+                                         [](int sum, auto& range) { return sum + range.height(); });
+    emit copied(int(lines.size()), lines.size() == selected);
+}
+
+}  // namespace host
