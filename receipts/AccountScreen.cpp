@@ -44,8 +44,8 @@ AccountScreen::AccountScreen(const QString& name)
 
 QWidget* AccountScreen::fieldNamedBy(const QString& text) const {
     if (text.contains("modo de pagamento"_L1)) return DataCombo3;
-    if (text.contains("indicar um Sócio"_L1)) return No_Kor;
-    if (text.contains("valor"_L1) && text.contains("para o crédito"_L1)) return Credito;
+    if (text.contains(u"indicar um Sócio"_s)) return No_Kor;
+    if (text.contains("valor"_L1) && text.contains(u"para o crédito"_s)) return Credito;
     return nullptr;
 }
 

@@ -66,6 +66,10 @@ void frmRecebimento::numberWiped() {
     Text3->setBackColor(forms::BackColor::Menu);
 }
 
+QWidget* frmRecebimento::fieldNamedBy(const QString& text) const {
+    return text.contains("data do registo"_L1) ? Text3 : AccountScreen::fieldNamedBy(text);
+}
+
 /// Gives up without a word when anything fails.
 void frmRecebimento::Command1_Click() {
     core::passingOver([this] {

@@ -21,6 +21,7 @@ protected:
     void setDefaults() override;
     void post() override;
     void numberWiped() override;
+    QWidget* fieldNamedBy(const QString& text) const override;
 
 private:
     QWidget* receiptFrame();

@@ -108,7 +108,8 @@ void frmReposicao::takeMember(qint32 socio_id, const QString& nome) {
 QWidget* frmReposicao::fieldNamedBy(const QString& text) const {
     if (text.contains("associada a um familiar"_L1))
         return Text3->Text().isEmpty() ? static_cast<QWidget*>(Command2) : DataCombo1;
-    if (text.contains("para o débito"_L1) && Debito->Text().isEmpty()) return Debito;
+    if (text.contains(u"para o débito"_s) && Debito->Text().isEmpty()) return Debito;
+    if (text.contains("data do registo"_L1)) return Text7;
     return AccountScreen::fieldNamedBy(text);
 }
 

@@ -92,8 +92,6 @@ Turn::~Turn() {
 
 Form::Form(const QString& name, const QString& caption) {
     install();
-    // The control that has the focus is marked from the start: people work by keys here.
-    setAttribute(Qt::WA_KeyboardFocusChange);
     setObjectName(name);
     setWindowTitle(caption);
 }
@@ -171,8 +169,12 @@ Form* Form::comingForward() {
 }
 
 void Form::changeEvent(QEvent* event) {
-    // Any screen that gets the keyboard ends the way of another one to the front.
-    if (event->type() == QEvent::ActivationChange && isActiveWindow()) shownLast = nullptr;
+    if (event->type() == QEvent::ActivationChange && isActiveWindow()) {
+        // Any screen that gets the keyboard ends the way of another one to the front.
+        shownLast = nullptr;
+        // The control that has the focus is marked from the start: people work by keys here.
+        setAttribute(Qt::WA_KeyboardFocusChange);
+    }
     QDialog::changeEvent(event);
 }
 

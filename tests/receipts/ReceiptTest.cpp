@@ -73,6 +73,7 @@ TEST_F(Receipt, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
     for (const auto& [field, text, box] : missing) {
         person.fill(field, {});
         postAnd({{.text = box, .icon = Icon::Information, .title = title}});
+        EXPECT_TRUE(person.find(field)->hasFocus());
         person.fill(field, text);
     }
     EXPECT_TRUE(isGrey(u"Text3"_s)) << "a wiped number turns the date grey, for good";

@@ -62,9 +62,11 @@ TEST_F(Reposition, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
     const QString noPerson = u"Uma rubrica tem de estar associada a um familiar."_s;
     typeReposition({}, u"5"_s);
     refused(noAmount);
+    EXPECT_TRUE(person.find(u"Debito"_s)->hasFocus());
     person.fill(u"Debito"_s, u"0"_s);
     person.fill(u"Credito"_s, {});
     refused(noAmount);
+    EXPECT_TRUE(person.find(u"Credito"_s)->hasFocus());
     person.fill(u"Credito"_s, u"0"_s);
     refused(noAmount);
     person.fill(u"Credito"_s, u"10"_s);
