@@ -60,7 +60,8 @@ Database::Database(const ServerCatalogue& catalogue)
     PQsetNoticeProcessor(
         connection_, [](void*, const char*) {}, nullptr);
     try {
-        run("SET datestyle = ISO, MDY; SET extra_float_digits = 1; SET jit = off");
+        run("SET search_path = public, pg_temp; SET datestyle = ISO, MDY;"
+            "SET extra_float_digits = 1; SET jit = off");
     } catch (...) {
         PQfinish(connection_);
         throw;

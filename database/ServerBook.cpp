@@ -185,6 +185,8 @@ private:
         book.run("REVOKE ALL ON DATABASE " + book.name(catalogue_.name) + " FROM " +
                  book.name(worker_.user));
         book.run("REVOKE ALL ON SCHEMA public FROM " + book.name(worker_.user));
+        book.run("ALTER ROLE " + book.name(worker_.user) + " IN DATABASE " +
+                 book.name(catalogue_.name) + " RESET search_path");
     }
 
     QString owner() const { return catalogue_.name + u"_dono"_s; }

@@ -8,17 +8,49 @@ REVOKE CREATE ON SCHEMA public FROM PUBLIC;
 GRANT CONNECT ON DATABASE {catalogue} TO {operator};
 GRANT USAGE ON SCHEMA public TO {operator};
 
--- Screens read everything and write what is listed. Generated keys need no right of their own.
+-- Nor can anybody else's schema or temporary table stand before the book's own names.
+ALTER ROLE {operator} IN DATABASE {catalogue} SET search_path = public, pg_temp;
+REVOKE USAGE ON LANGUAGE plpgsql FROM PUBLIC;
+
+-- Screens read everything and write the columns that are listed, and nothing else. Generated keys
+-- are left out, so that nobody gives one himself; no movement, member or counter is ever deleted.
+REVOKE ALL ON ALL TABLES IN SCHEMA public FROM {operator};
 GRANT SELECT ON ALL TABLES IN SCHEMA public TO {operator};
-GRANT INSERT, UPDATE, DELETE ON
-    tbZelmar_Movimentos, tbZelmar_Movimentos_Inactivos, tbZelmar_Movimentos_Historico,
-    tbSocios_Acumulados, tbSocios_Acumulados_Inactivos,
-    tbZelmar_Plafonds, tbHospitais, tbContadores, tbCheques
-    TO {operator};
--- The journal of operations, whose rows ride in the commits of other writes.
+
+-- A movement is posted whole. What an annulment marks is all that changes in it later.
+GRANT INSERT (
+        movimento_no, socio_id, codABC, rubrica_id, hospital_id, oe_id, data, tipo, doc_data,
+        doc_no, doc_valor, doc_iva, doc_tx_iva, recebido, incidencia, comparticipacao,
+        saldo_plafond, saldo_acumulado, iliquido, liquido, credito, debito, modo_pagamento, cheque,
+        descrit, obs, created_by),
+    UPDATE (tipo, modo_pagamento)
+    ON tbZelmar_Movimentos TO {operator};
+-- Of a member who has left, movements are only annulled: the mark and the correcting row.
+GRANT INSERT (
+        movimento_no, socio_id, codABC, rubrica_id, hospital_id, data, tipo, doc_data, doc_no,
+        doc_valor, credito, debito),
+    UPDATE (tipo, modo_pagamento)
+    ON tbZelmar_Movimentos_Inactivos TO {operator};
+
+-- A receipt or a reposition writes also whose row it is, into the row that it found by that.
+GRANT INSERT (socio_id, codABC, rubrica_id, rubrica_id_main, debito_ac, credito_ac, no_docs),
+    UPDATE (socio_id, codABC, rubrica_id, debito_ac, credito_ac, no_docs)
+    ON tbSocios_Acumulados TO {operator};
+GRANT INSERT (debito_ac, credito_ac), UPDATE (debito_ac, credito_ac, no_docs)
+    ON tbSocios_Acumulados_Inactivos TO {operator};
+
+GRANT INSERT (zelmars), UPDATE (zelmars) ON tbContadores TO {operator};
+GRANT INSERT (cheque_no), UPDATE (cheque_no) ON tbCheques TO {operator};
+
+-- The member file changes what it shows, but for the number; members come and go by other programs.
+GRANT UPDATE (
+        nome, nome_guerra, nib, zelmar, zelmar_data_carencia, no_contribuinte, morada1,
+        code_postal1, localidade1)
+    ON tbSocios TO {operator};
+
+-- The journal of operations, whose rows ride in the commits of other writes. A posting's row goes
+-- once nothing is missing any more.
 GRANT INSERT, UPDATE, DELETE ON tbOperacoes TO {operator};
--- The member file changes what it shows; members come and go by other programs.
-GRANT UPDATE ON tbSocios TO {operator};
 
 -- A SELECT can call functions. These do more than read, and some of them also where nothing may be
 -- written: they keep large objects, send messages, end or stop other workstations' statements, run

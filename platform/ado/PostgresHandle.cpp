@@ -163,6 +163,8 @@ void PostgresHandle::settle(Role role) {
         connection_, [](void*, const char*) {}, nullptr);
     send("SET datestyle = ISO, MDY");
     send("SET standard_conforming_strings = on");
+    // A name means the book's own table, whatever somebody has set for the role.
+    send("SET search_path = public, pg_temp");
     // What a book's administrator may have set otherwise: the read behind a lock must see what the
     // row's last holder stored, and a number must come with all its digits.
     send("SET default_transaction_isolation = 'read committed'");
