@@ -4,9 +4,9 @@
 #include <QMessageBox>
 #include <QPushButton>
 
-#include "boundary/Finishing.h"
 #include "boundary/environment/dtZelmars.h"
 #include "host/BookSettings.h"
+#include "host/Finishing.h"
 #include "platform/core/Failure.h"
 
 using namespace Qt::StringLiterals;
@@ -56,7 +56,7 @@ bool wantsToFinish(QWidget* window, const QStringList& lines) {
 
 QString finishOne(const data::Operation& operation) {
     try {
-        return boundary::finish(operation);
+        return finish(operation);
     } catch (const core::Failure& failure) {
         return data::named(operation) + u": não foi possível concluir. "_s + failure.text();
     }

@@ -9,13 +9,13 @@
 #include <QTextStream>
 #include <cstdio>
 
-#include "boundary/Finishing.h"
 #include "boundary/Login.h"
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/annulment.h"
 #include "data/Codes.h"
 #include "data/NewMovement.h"
 #include "data/RowSets.h"
+#include "host/Finishing.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
@@ -62,7 +62,7 @@ bool postReceipt(qint32 socio_id, const QString& amount) {
 bool finishAll() {
     for (const data::Operation& operation : data::journal::unfinished()) {
         say(u"box "_s + data::described(operation));
-        say(u"box "_s + boundary::finish(operation));
+        say(u"box "_s + host::finish(operation));
     }
     return true;
 }

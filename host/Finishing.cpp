@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "boundary/Finishing.h"
+#include "host/Finishing.h"
 
 #include "coverage/Posting.h"
 #include "data/Codes.h"
@@ -10,7 +10,7 @@
 
 using namespace Qt::StringLiterals;
 
-namespace boundary {
+namespace host {
 
 namespace {
 
@@ -46,4 +46,4 @@ QString finish(data::Operation operation) {
     return what + u": concluído."_s;
 }
 
-}  // namespace boundary
+}  // namespace host

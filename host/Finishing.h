@@ -3,11 +3,11 @@
 
 #include "data/Operations.h"
 
-namespace boundary {
+namespace host {
 
 /// Does what is missing of a posting or annulment that was cut short, each step once, whoever else
 /// is at it. Gives in a sentence what was done. Fails with what the failing step fails with; what
 /// was done until then stays done.
 QString finish(data::Operation operation);
 
-}  // namespace boundary
+}  // namespace host
