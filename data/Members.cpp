@@ -22,8 +22,13 @@ QString memberById(qint32 socio_id) {
 
 }  // namespace
 
-ado::RecordsetPtr openMemberByNumber(const QString& no_kor) {
-    return openToRead(memberByNumber(no_kor));
+ado::RecordsetPtr openMemberByNumber(const QString& typed) {
+    const QString no_kor = typed.trimmed();
+    ado::RecordsetPtr member = openToRead(memberByNumber(no_kor));
+    if (member->atEnd()) return nullptr;
+    // A quote in the text changes the statement, which then finds anybody.
+    const bool isHis = core::toText(member->Collect(u"no_kor"_s)).trimmed() == no_kor;
+    return isHis ? member : nullptr;
 }
 
 ado::RecordsetPtr openMemberById(qint32 socio_id) {
@@ -31,7 +36,8 @@ ado::RecordsetPtr openMemberById(qint32 socio_id) {
 }
 
 QVariant memberIdOf(const QString& no_kor) {
-    return DLookup(memberByNumber(no_kor), {}, u"socio_id"_s);
+    const ado::RecordsetPtr member = openMemberByNumber(no_kor);
+    return member ? member->Collect(u"socio_id"_s) : u""_s;
 }
 
 QVariant ofMember(qint32 socio_id, const QString& column) {

@@ -8,8 +8,9 @@
 /// Active members, as the screens find them. Values are joined into the statements as they stand.
 namespace data {
 
-/// The staff number is what people type.
-ado::RecordsetPtr openMemberByNumber(const QString& no_kor);
+/// The staff number is what people type. Null when nobody has that number, whatever the statement
+/// found; blanks around what was typed or stored do not count.
+ado::RecordsetPtr openMemberByNumber(const QString& typed);
 ado::RecordsetPtr openMemberById(qint32 socio_id);
 
 /// The member's key by his staff number; empty text when there is no such member.

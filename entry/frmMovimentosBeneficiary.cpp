@@ -25,7 +25,7 @@ void frmMovimentos::No_Kor_Validate(bool& cancel) {
     Text10->setText(u"0"_s);
     Text11->setText(u"0"_s);
     const ado::RecordsetPtr member = data::openMemberByNumber(No_Kor->Text());
-    if (member->atEnd()) {
+    if (!member) {
         MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Associados"_s);
         cancel = true;
         return;

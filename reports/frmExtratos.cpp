@@ -151,7 +151,7 @@ void frmExtratos::No_Kor_Validate(bool& cancel) {
         return;
     }
     const ado::RecordsetPtr member = data::openMemberByNumber(No_Kor->Text());
-    if (member->atEnd()) {
+    if (!member) {
         clearMember();
         MsgBox(u"Número de Empresa não encontrado!"_s, Icon::Critical, u"Sócios"_s);
         cancel = true;
