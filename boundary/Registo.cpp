@@ -16,10 +16,12 @@ namespace tipo = data::tipo;
 
 namespace {
 
-/// True while something is being typed that the view of a movement would take away.
+/// True while something is being typed that the view of a movement would take away: each type has
+/// a screen of its own.
 bool isUnderWay(const QString& type) {
-    return entry::isEntryUnderWay() || (type == tipo::Receipt && receipts::isReceiptUnderWay()) ||
-           (type == tipo::Reposition && receipts::isRepositionUnderWay());
+    if (type == tipo::Receipt) return receipts::isReceiptUnderWay();
+    if (type == tipo::Reposition) return receipts::isRepositionUnderWay();
+    return entry::isEntryUnderWay();
 }
 
 }  // namespace
@@ -41,8 +43,9 @@ void openRegisto(const QVariant& Pkey, QObject* Caller) {
         throw core::Failure(core::InvalidCall,
                             u"Há um lançamento por terminar. Termine-o ou cancele-o antes de ver "
                             "outro movimento."_s);
-    // Of every type: the hidden entry screen keeps the row as well as the screen that shows it.
-    entry::attachMovement(rows, Caller);
+    // Of every type: the hidden entry screen keeps the row as well as the screen that shows it. One
+    // on which somebody is typing keeps the row that is typed.
+    if (!entry::isEntryUnderWay()) entry::attachMovement(rows, Caller);
     if (isDocument)
         entry::showMovement(type);
     else if (type == tipo::Receipt)

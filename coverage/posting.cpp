@@ -65,6 +65,17 @@ bool save(const PostingEntry& posting, data::Operation& operation) {
     return data::savedOrTold(posting.entry.caption);
 }
 
+bool confirmTyped(const Entry& entry, data::Operation& operation) {
+    return data::confirmUnusual(
+        *entry.record,
+        {{u"data"_s, u"A data do registo"_s},
+         {u"doc_data"_s, u"A data do documento"_s},
+         {u"doc_valor"_s, u"O valor do documento"_s},
+         entry.bHospital ? data::Typed{u"incidencia"_s, u"O valor de incidência"_s}
+                         : data::Typed{u"recebido"_s, u"O valor recebido"_s}},
+        entry.caption, operation);
+}
+
 void addToAccumulators(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
@@ -94,7 +105,7 @@ bool post(const PostingEntry& posting, TryOut& run, data::Operation& operation) 
     const Entry& entry = posting.entry;
     if (data::isRegistered(operation))
         return data::finishPosting(operation, documentRules(), *entry.record, entry.caption);
-    if (!data::confirmPosting(entry.caption)) return false;
+    if (!data::confirmPosting(entry.caption) || !confirmTyped(entry, operation)) return false;
     tryOut(entry, run);
     // Still true after the boxes of the minimum and of the number of documents: the posting then
     // goes on with what the row holds. It is meant so.

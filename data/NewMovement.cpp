@@ -1,10 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "data/NewMovement.h"
 
+#include <cmath>
+
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
 #include "data/MovementNumber.h"
+#include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 
@@ -24,6 +28,46 @@ ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL) {
 bool confirmPosting(const QString& caption) {
     return core::MsgBox(u"Deseja finalizar o registo?"_s, core::Icon::Question, caption,
                         core::Buttons::YesNo) == core::Answer::Yes;
+}
+
+namespace {
+
+constexpr int YearsBack = 5;
+constexpr int YearsAhead = 1;
+constexpr double LargestUsual = 1'000'000;  // euros
+
+/// What is in doubt, as a question; empty for a usual value.
+QString doubtOf(const QVariant& value, const QString& name) {
+    if (core::isNull(value)) return {};
+    if (value.typeId() == QMetaType::QDateTime) {
+        const QDate day = core::toDate(value);
+        const QDate today = core::today();
+        if (day >= today.addYears(-YearsBack) && day <= today.addYears(YearsAhead)) return {};
+        return u"%1 é %2. Está certa?"_s.arg(name, core::formatted(value, core::format::Date));
+    }
+    if (std::abs(core::toDouble(value)) <= LargestUsual) return {};
+    return u"%1 é %2. Está certo?"_s.arg(name, core::formatted(value, core::format::Money));
+}
+
+}  // namespace
+
+bool confirmUnusual(const ado::Recordset& movement, std::initializer_list<Typed> values,
+                    const QString& caption, Operation& posting) {
+    for (const Typed& typed : values) {
+        const QString doubt = doubtOf(movement.Collect(typed.column), typed.name);
+        if (doubt.isEmpty() || posting.confirmed.contains(doubt)) continue;
+        if (core::MsgBox(doubt, core::Icon::Question, caption, core::Buttons::NoYes) !=
+            core::Answer::Yes)
+            return false;
+        posting.confirmed += doubt;
+    }
+    return true;
+}
+
+bool checkDated(const ado::Recordset& movement, const QString& caption) {
+    if (!core::isNull(movement.Collect(u"data"_s))) return true;
+    core::MsgBox(u"Tem de introduzir a data do registo."_s, core::Icon::Information, caption);
+    return false;
 }
 
 void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id) {

@@ -13,6 +13,20 @@ ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL);
 /// Asks whether to finish the entry.
 bool confirmPosting(const QString& caption);
 
+/// A typed value that may be a slip of the keyboard.
+struct Typed {
+    QString column;  ///< of the movement: a date or an amount
+    QString name;    ///< as the question calls it: "A data do documento"
+};
+
+/// Asks about each date more than five years back or one ahead, and each amount above a million
+/// euros, unless the operator said yes to the same value before. True when nothing is in doubt.
+bool confirmUnusual(const ado::Recordset& movement, std::initializer_list<Typed> values,
+                    const QString& caption, Operation& posting);
+
+/// False, and told, when the movement has no date.
+bool checkDated(const ado::Recordset& movement, const QString& caption);
+
 /// Readies a movement that has no document for being saved: it is the member's, its document's
 /// value is 0, and no failure is pending.
 void readyWithoutDocument(ado::Recordset& movement, qint32 socio_id);

@@ -46,6 +46,7 @@ struct Operation {
     qint32 correcao_no = 0;  ///< number of the correcting row; 0 when there is none yet
     QString quem;            ///< user@machine
     QDateTime quando;
+    QStringList confirmed;  ///< unusual values that the operator said yes to
 };
 
 /// Chooses the key, and says who and when. Does nothing to an operation that was begun before: a

@@ -100,9 +100,13 @@ void offerOtherMember() {
 }
 
 void showEntry(bool bHospital, const ado::RecordsetPtr& rows) {
-    // The form of a hospital entry does not turn back into an ordinary one.
-    if (Entry::isLoaded() && Entry::get().bHospital && !bHospital) Entry::unload();
+    // The form of a hospital entry does not turn back into an ordinary one, and a registered one
+    // stays locked.
+    if (Entry::isLoaded() &&
+        (Entry::get().isRegistered() || (Entry::get().bHospital && !bHospital)))
+        Entry::unload();
     frmMovimentos& screen = Entry::get();
+    if (screen.isVisible()) screen.forgetEntry();
     screen.bHospital = bHospital;
     if (bHospital) screen.showAsHospital();
     screen.onLeft = askHowToGoOn;

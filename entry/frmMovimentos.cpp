@@ -23,6 +23,17 @@ using core::Icon;
 using core::MsgBox;
 using forms::BackColor;
 
+namespace {
+
+/// The number that a box holds, with the digits that its format does not show; nothing for a text
+/// that is none.
+std::optional<double> numberIn(const forms::TextBox* box) {
+    if (!core::parseNumber(box->Text())) return {};
+    return core::toDouble(box->Value());
+}
+
+}  // namespace
+
 frmMovimentos::frmMovimentos()
     : RecordScreen(u"frmMovimentos"_s, u"Lançamento (Plano de Saúde)"_s) {
     makeControls();
@@ -71,7 +82,7 @@ void frmMovimentos::connectFieldHandlers() {
     Text1->onValidate = [this](bool& cancel) { Text1_Validate(cancel); };
     Text5->onGotFocus = [this] { Text5_GotFocus(); };
     Text6->onGotFocus = [this] { Text6->SelectAll(); };
-    Text6->onValidate = [this](bool&) { Text6_Validate(); };
+    Text6->onValidate = [this](bool& cancel) { Text6_Validate(cancel); };
     Text9->onGotFocus = [this] { Text9->SelectAll(); };
     Text9->onValidate = [this](bool&) { emptyBecomesNull(Text9); };
     Text11->onValidate = [this](bool& cancel) { Text11_Validate(cancel); };
@@ -87,6 +98,15 @@ void frmMovimentos::showAsHospital() {
     forms::setFieldLabel(Label19, u"Incidênci&a:"_s);
     Text9->bind(Adodc1, u"incidencia"_s);
     DataCombo3->setBoundText(data::modo::Cheque.toString());
+}
+
+void frmMovimentos::forgetEntry() {
+    No_Kor->Clear();
+    clearMember();
+    operation_ = {};
+    for (forms::TextBox* result : {Incidencia, Comparticipacao, LimiteAplicavel, SaldoCC, Iliquido,
+                                   SaldoPlafond, Credito, Debito, Liquido})
+        result->Clear();
 }
 
 void frmMovimentos::setMember(qint32 id, const QString& number, const QString& name) {
@@ -194,22 +214,29 @@ void frmMovimentos::emptyBecomesNull(forms::TextBox* box) {
         Adodc1->Recordset()->setCollect(box->DataField(), QVariant());
 }
 
-void frmMovimentos::Text6_Validate() {
+void frmMovimentos::Text6_Validate(bool& cancel) {
     if (bShowing) return;
     if (Text6->Text().isEmpty()) {
         emptyBecomesNull(Text6);
         return;
     }
     // A value that is no number is refused by the binding, right after this.
-    if (!core::parseNumber(Text6->Text()) || Text11->Text().isEmpty()) return;
-    const std::optional<double> rate = core::parseNumber(Text11->Text());
-    if (rate && *rate > 0) workOutVat();
+    const std::optional<double> rate = numberIn(Text11);
+    if (!numberIn(Text6) || !rate || *rate <= 0) return;
+    try {
+        workOutVat();
+    } catch (const core::Failure& failure) {
+        if (failure.number() != core::Overflow) throw;
+        MsgBox(u"O valor %1 é demasiado grande para calcular o IVA."_s.arg(Text6->Text()),
+               Icon::Information);
+        cancel = true;
+    }
 }
 
 void frmMovimentos::Text11_Validate(bool& cancel) {
     // In a view nothing is worked out, and an empty rate must not hold anybody.
     if (bShowing) return;
-    const std::optional<double> rate = core::parseNumber(Text11->Text());
+    const std::optional<double> rate = numberIn(Text11);
     if (!rate) {
         MsgBox(u"O valor que digitou não é um número válido."_s, Icon::Information);
         cancel = true;
@@ -223,10 +250,10 @@ void frmMovimentos::Text11_Validate(bool& cancel) {
     }
 }
 
-/// From the texts in the boxes; does nothing with a value that is no number.
+/// From what the boxes hold; does nothing with a value that is no number.
 void frmMovimentos::workOutVat() {
-    const std::optional<double> value = core::parseNumber(Text6->Text());
-    const std::optional<double> rate = core::parseNumber(Text11->Text());
+    const std::optional<double> value = numberIn(Text6);
+    const std::optional<double> rate = numberIn(Text11);
     if (!value || !rate) return;
     Text10->setValue(vatOf(core::toSingle(*value), *rate));
 }
@@ -277,7 +304,6 @@ void frmMovimentos::Command4_Click() {
 }
 
 void frmMovimentos::leaveEntry(const QString& outcome) {
-    operation_ = {};
     Hide();
     if (onLeft) onLeft(outcome);
 }

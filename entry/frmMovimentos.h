@@ -31,6 +31,10 @@ public:
 
     /// The form of a hospital entry, before the row is given.
     void showAsHospital();
+    /// Nothing of an entry that another one takes the place of: neither its person nor its result.
+    void forgetEntry();
+    /// True once the entry stands in the book, also where something of it is missing.
+    bool isRegistered() const { return operation_.isRegistered; }
     /// A member already known from the entry before.
     void setMember(qint32 id, const QString& number, const QString& name);
     /// The number of the chosen member. What stands in No_Kor may be another one, typed since and
@@ -95,7 +99,7 @@ private:
     void Command2_Click();
     void Text1_Validate(bool& cancel);
     void Text5_GotFocus();
-    void Text6_Validate();
+    void Text6_Validate(bool& cancel);
     void emptyBecomesNull(forms::TextBox* box);
     void Text11_Validate(bool& cancel);
     void Command4_Click();

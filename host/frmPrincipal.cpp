@@ -38,12 +38,12 @@ QWidget* entryUnderWay(const QStringList& screens) {
     return nullptr;
 }
 
-/// The screens that an operation would take away from what is typed into them. A movement that is
-/// only looked at stays attached to the screen of documents, whatever its type.
+/// The screens that an operation would take away from what is typed into them. Which one shows a
+/// movement hangs on its type: the component sees to that.
 QStringList screensTakenBy(const QString& operation) {
     if (operation == "Recebimento"_L1) return {u"frmRecebimento"_s};
     if (operation == "Correcao"_L1) return {u"frmReposicao"_s};
-    if (operation == "NewMovimento"_L1 || operation == "Registo"_L1) return {u"frmMovimentos"_s};
+    if (operation == "NewMovimento"_L1) return {u"frmMovimentos"_s};
     return {};
 }
 

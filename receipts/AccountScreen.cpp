@@ -96,6 +96,12 @@ void AccountScreen::takeMember(qint32 socio_id, const QString& nome) {
     Socio_ID = socio_id;
 }
 
+void AccountScreen::forgetEntry() {
+    No_Kor->Clear();
+    clearMember();
+    operation = {};
+}
+
 void AccountScreen::clearMember() {
     forms::greyOut({Text2});
     Socio_ID = 0;

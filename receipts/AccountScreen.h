@@ -26,6 +26,10 @@ public:
     forms::MultiLineBox* Text1;
     forms::Button* Command1;
 
+    /// True once the entry stands in the book, also where something of it is missing.
+    bool isRegistered() const { return operation.isRegistered; }
+    /// Nothing of an entry that another one takes the place of.
+    void forgetEntry();
     /// The read-only view of the current row.
     virtual void showReadOnly(const ado::RecordsetPtr& rows);
 

@@ -13,7 +13,12 @@ template <class Screen>
 void openNew(QString& strConMember, QString& strSQL) {
     const ado::RecordsetPtr rows = data::openNewMovement(strConMember, strSQL);
     forms::closeView<Screen>();
-    forms::DefaultInstance<Screen>::get().showNew(rows);
+    using Instance = forms::DefaultInstance<Screen>;
+    // A registered one stays locked.
+    if (Instance::isLoaded() && Instance::get().isRegistered()) Instance::unload();
+    Screen& screen = Instance::get();
+    if (screen.isVisible()) screen.forgetEntry();
+    screen.showNew(rows);
 }
 
 template <class Screen>

@@ -28,7 +28,7 @@ bool receiptChecks(const ReceiptEntry& receipt) {
     // Below 0 is let through, and lowers the account.
     if (core::compareNumbers(receipt.record->Collect(u"credito"_s), 0) == 0)
         return missing(u"Tem de indicar um valor diferente de 0(zero) para o crédito !"_s);
-    return true;
+    return data::checkDated(*receipt.record, receipt.caption);
 }
 
 /// The account-level row alone, and there the credit alone.
@@ -79,6 +79,11 @@ bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation) {
     if (data::isRegistered(operation))
         return data::finishPosting(operation, receiptRules(), *receipt.record, receipt.caption);
     if (!data::confirmPosting(receipt.caption) || !receiptChecks(receipt)) return false;
+    if (!data::confirmUnusual(
+            *receipt.record,
+            {{u"data"_s, u"A data do registo"_s}, {u"credito"_s, u"O valor a creditar"_s}},
+            receipt.caption, operation))
+        return false;
     receipt.record->setCollect(u"debito"_s, 0);
     data::readyWithoutDocument(*receipt.record, receipt.Socio_ID);
     // Not passed over, unlike on the other screens: a failure goes up with the engine's text.

@@ -30,7 +30,7 @@ bool repositionChecks(const RepositionEntry& reposition) {
     if (reposition.No_Kor.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
     if (reposition.Debito.isEmpty() || reposition.Credito.isEmpty()) return missing(noAmount);
     if (isZero(u"debito"_s) && isZero(u"credito"_s)) return missing(noAmount);
-    return true;
+    return data::checkDated(*reposition.record, reposition.caption);
 }
 
 /// Accumulators of member, rubric and person; rubric 0 where none was chosen. The comparison with
@@ -79,6 +79,12 @@ bool postReposition(const RepositionEntry& reposition, data::Operation& operatio
     if (data::isRegistered(operation))
         return data::finishPosting(operation, repositionRules(), *reposition.record, caption);
     if (!data::confirmPosting(caption) || !repositionChecks(reposition)) return false;
+    if (!data::confirmUnusual(*reposition.record,
+                              {{u"data"_s, u"A data do registo"_s},
+                               {u"debito"_s, u"O valor do débito"_s},
+                               {u"credito"_s, u"O valor do crédito"_s}},
+                              caption, operation))
+        return false;
     data::readyWithoutDocument(*reposition.record, reposition.Socio_ID);
     passingOver([&] { data::numberAndSave(*reposition.record, operation); });
     if (!data::savedOrTold(caption)) return false;

@@ -32,6 +32,9 @@ public:
 
     /// The text as it stands in the box.
     QString Text() const { return text(); }
+    /// The value behind the text, with the digits that the display format does not show; of a text
+    /// that somebody is typing, what it stands for. Fails with TypeMismatch when it is none.
+    QVariant Value() const { return edited_ ? convert(text()) : shown_; }
     /// Sets the text and, when bound, writes it to the row at once, as typing and leaving would.
     /// Fails with TypeMismatch when the column does not take it.
     void setText(const QString& text);

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What a posting writes, and what the book holds when a write fails.
+#include "platform/core/Values.h"
 #include "tests/coverage/Desk.h"
 
 using namespace Qt::StringLiterals;
@@ -37,6 +38,27 @@ TEST_F(Posting, WritesTheMovementItsNumberAndTheTotals) {
               "1|1|B|DOC|87.35|87.35|69.88|69.88|69.88|69.88|69.88|operador|2026-05-15 00:00:00\n"
               "2|1|B|HOS|250|200|160|160|160|160|250|operador|2026-05-15 00:00:00");
     expectState("3|2|229.88|319.88|2");
+}
+
+TEST_F(Posting, AsksAboutUnusualValuesBeforeItTriesOutAndNotAgain) {
+    const coverage::PostingEntry entry =
+        posting(enter({.rubrica_id = rubric, .doc_valor = 1'000'000.5}));
+    entry.entry.record->setCollect(u"doc_data"_s, core::fromDate({1926, 5, 12}));
+    const auto asks = [&](const QString& text, core::Answer answer) {
+        person.expectBox({.text = text, .answer = answer, .icon = Icon::Question});
+    };
+    const QString finish = u"Deseja finalizar o registo?"_s;
+    const QString day = u"A data do documento é 12-05-1926. Está certa?"_s;
+    const QString value = u"O valor do documento é € 1.000.000,50. Está certo?"_s;
+    asks(finish, core::Answer::Yes);
+    asks(day, core::Answer::Yes);
+    asks(value, core::Answer::No);
+    EXPECT_FALSE(coverage::post(entry, run, begun));
+    EXPECT_EQ(book.count(u"tbSocios_Acumulados"_s), 0);
+    asks(finish, core::Answer::Yes);
+    asks(value, core::Answer::Yes);
+    EXPECT_TRUE(coverage::post(entry, run, begun));
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 1);
 }
 
 TEST_F(Posting, OnAnEmptyCounterGivesTheNumberOneTwice) {

@@ -46,6 +46,33 @@ TEST_F(DocumentFields, VatIsWhatTheValueContainsToTheCentHalvesToEven) {
     EXPECT_EQ(form().Text10->Text(), u"100,00"_s) << "a new value works it out again";
 }
 
+TEST_F(DocumentFields, VatDoesNotHangOnTheOrderOfTypingOrOnWhatTheFormatShows) {
+    openNew();
+    person.fill(u"Text11"_s, u"100"_s);
+    person.fill(u"Text6"_s, u"48,9298"_s);
+    EXPECT_EQ(form().Text10->Text(), u"24,46"_s);
+    person.fill(u"Text6"_s, u"1"_s);
+    person.fill(u"Text11"_s, u"0"_s);
+    person.fill(u"Text6"_s, u"48,9298"_s);
+    person.fill(u"Text11"_s, u"100"_s);
+    EXPECT_EQ(form().Text10->Text(), u"24,46"_s);
+    person.fill(u"Text11"_s, u"12,345"_s);  // shown as 12,35
+    person.fill(u"Text6"_s, u"100000"_s);
+    EXPECT_EQ(form().Text10->Text(), u"10.988,47"_s);
+}
+
+TEST_F(DocumentFields, ValueTooLargeForItsVatIsNamedAsItWasTypedAndKept) {
+    openNew();
+    person.fill(u"Text11"_s, u"23"_s);
+    person.expectBox({.text = u"O valor 500000000000 é demasiado grande para calcular o IVA."_s,
+                      .icon = Icon::Information});
+    person.fill(u"Text6"_s, u"500000000000"_s);
+    person.expectNoBoxesLeft();
+    EXPECT_TRUE(form().Text6->hasFocus());
+    EXPECT_EQ(form().Text6->Text(), u"500000000000"_s);
+    EXPECT_FALSE(pending(u"doc_iva"_s).isValid());
+}
+
 TEST_F(DocumentFields, WipedAmountsAreNullAndWipedListsZero) {
     openNew(true);
     typeMember();
@@ -102,6 +129,8 @@ TEST_F(DocumentFields, BadInputIsSaidAndLosesNothing) {
         {u"a"_s + QChar(u'\0') + u"b"_s, failed},
         {u"%"_s, unknown},
         {QString(10000, u'x'), unknown},
+        {u"' or '1'='1"_s, unknown},
+        {u"1' or no_kor ='100015"_s, unknown},
         {u"😀"_s, unknown},
     };
     for (const auto& [typed, box] : rows) {

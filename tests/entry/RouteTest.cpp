@@ -155,6 +155,37 @@ TEST_F(Route, AnotherLoginOrOperationLeavesThePendingRowAndItPosts) {
               u"87.35|65.5125|a meio"_s);
 }
 
+TEST_F(Route, ReceiptIsShownBesideAnEntryUnderWayWhichKeepsItsRow) {
+    const qint64 key = book.insert(u"tbZelmar_Movimentos"_s,
+                                   {{"socio_id", socio}, {"tipo", u"PAG"_s}, {"movimento_no", 77}});
+    openNew();
+    typeDocument(u"87,35"_s);
+    General().Registo({}, key);
+    person.screen(u"frmRecebimento"_s);
+    EXPECT_EQ(person.peek<forms::TextBox>(u"No_Kor"_s)->Text(), u"100015"_s);
+    person.accelerator(u'S');
+    person.screen(u"frmMovimentos"_s);
+    EXPECT_FALSE(form().bShowing);
+    postAndLeave();
+    EXPECT_EQ(book.text(u"select doc_valor from tbZelmar_Movimentos where movimento_no = 1"_s),
+              u"87.35"_s);
+}
+
+TEST_F(Route, KeptEntryThatIsOpenedAnewShowsNothingOfTheFormerOne) {
+    openNew();
+    typeDocument(u"87,35"_s);
+    person.accelerator(u'E');
+    EXPECT_FALSE(form().Credito->Text().isEmpty());
+    openNew();
+    EXPECT_EQ(form().Socio_ID, 0);
+    EXPECT_FALSE(form().Command2->isEnabled());
+    for (const char* name :
+         {"No_Kor", "Text2", "Text3", "Text4", "Text5", "Text6", "Incidencia", "Comparticipacao",
+          "LimiteAplicavel", "SaldoCC", "Iliquido", "SaldoPlafond", "Credito", "Debito", "Liquido"})
+        EXPECT_EQ(person.peek<forms::TextBox>(QString::fromLatin1(name))->Text(), QString())
+            << name;
+}
+
 TEST_F(Route, EntryThatCannotBeOpenedIsSaidAndLeavesNothingInTheWay) {
     const qint64 key = book.insert(u"tbZelmar_Movimentos"_s, {{"tipo", u"DOC"_s}});
     QString strConMember = u"Nenhuma"_s;

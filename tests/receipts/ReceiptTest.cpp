@@ -61,6 +61,39 @@ TEST_F(Receipt, IsPostedByKeysAndAddsItsCreditToTheAccountLevelRowAlone) {
     EXPECT_EQ(totals(), "3" + others.substr(1) + "\n3|1|NULL|NULL|0|0|-0.5|NULL");
 }
 
+TEST_F(Receipt, AsksOnceAboutEachDateAndAmountThatMayBeASlip) {
+    const auto slip = [&](const QString& text, core::Answer answer) {
+        return support::Operator::Box{
+            .text = text, .answer = answer, .icon = Icon::Question, .title = title};
+    };
+    const QString day = u"A data do registo é 14-05-2021. Está certa?"_s;
+    const QString value = u"O valor a creditar é € 1.000.000,01. Está certo?"_s;
+    openNew();
+    typeReceipt(u"1000000,01"_s);
+    person.fill(u"Text3"_s, u"14-05-2021"_s);
+    postAnd({slip(day, core::Answer::No)});
+    postAnd({slip(day, core::Answer::Yes), slip(value, core::Answer::No)});
+    EXPECT_EQ(book.count(u"tbZelmar_Movimentos"_s), 0);
+    // Usual ones, up to the limits, are not asked about.
+    person.fill(u"Text3"_s, u"15-05-2027"_s);
+    postAnd({slip(value, core::Answer::No)});
+    person.fill(u"Text3"_s, u"14-05-2021"_s);
+    postAnd({slip(value, core::Answer::Yes)});
+    EXPECT_EQ(stored("select data, credito from tbZelmar_Movimentos"),
+              "2021-05-14 00:00:00|1000000.01");
+    openNew();
+    typeReceipt(u"1000000"_s);
+    person.fill(u"Text3"_s, u"15-05-2021"_s);
+    postAnd();
+}
+
+TEST_F(Receipt, TakesOnlyTheMemberWhoseNumberIsTypedWithoutTheBlanksAround) {
+    openNew();
+    expectHeld(u"No_Kor"_s, u"' or '1'='1"_s, u"Número KOR não encontrado!"_s);
+    person.fill(u"No_Kor"_s, u"  100015 "_s);
+    EXPECT_EQ(shown(u"Text2"_s), u"António Manuel Silva Matos"_s);
+}
+
 TEST_F(Receipt, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
     openNew();
     typeReceipt(u"10"_s);
@@ -69,6 +102,7 @@ TEST_F(Receipt, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
         {u"DataCombo3"_s, u"CHQ"_s, u"Tem de indicar um modo de pagamento!"_s},
         {u"No_Kor"_s, u"100015"_s, u"Tem de indicar um Sócio!"_s},
         {u"Credito"_s, u"10"_s, u"Tem de indicar um valor para o crédito!"_s},
+        {u"Text3"_s, u"15-05-2026"_s, u"Tem de introduzir a data do registo."_s},
     };
     for (const auto& [field, text, box] : missing) {
         person.fill(field, {});

@@ -80,6 +80,9 @@ TEST_F(Reposition, RefusesWhatIsMissingOrWrongAndKeepsWhatWasTyped) {
     EXPECT_FALSE(person.peek(u"Command2"_s)->isEnabled());
     refused(u"Tem de indicar um Sócio!"_s);
     person.fill(u"No_Kor"_s, u"100015"_s);
+    person.fill(u"Text7"_s, {});
+    refused(u"Tem de introduzir a data do registo."_s);
+    person.fill(u"Text7"_s, u"15-05-2026"_s);
     postAnd();
     EXPECT_EQ(stored("select rubrica_id, codABC, credito from tbZelmar_Movimentos"), "0||10");
 }

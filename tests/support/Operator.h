@@ -49,6 +49,8 @@ public:
     void expectBox(const Box& box) { expected_.append(box); }
     /// Fails the test when an expected box has not come yet.
     void expectNoBoxesLeft();
+    /// How many expected boxes have not come yet.
+    qsizetype boxesLeft() const { return expected_.size(); }
 
     // Screens. What follows below acts on the modal window if there is one, else on the screen
     // named last.
