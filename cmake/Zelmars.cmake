@@ -34,6 +34,23 @@ add_compile_options(-fPIC)
 if(ZELMARS_CCACHE)
     add_compile_options(-fpch-preprocess)
 endif()
+
+# What keeps a fault from becoming somebody else's code: checks of the stack, of copies into fixed
+# room and of positions in containers, jumps only to where a function begins, and nothing of the
+# dynamic linker's tables left to write once the program runs.
+add_compile_options(-fstack-protector-strong -fstack-clash-protection)
+add_compile_definitions(_GLIBCXX_ASSERTIONS)
+include(CheckCXXCompilerFlag)
+check_cxx_compiler_flag(-fcf-protection=full ZELMARS_CF_PROTECTION)
+if(ZELMARS_CF_PROTECTION)
+    add_compile_options(-fcf-protection=full)
+endif()
+if(NOT ZELMARS_SANITIZE)  # which checks copies itself
+    add_compile_options(-U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=3)
+endif()
+add_link_options(-Wl,-z,relro,-z,now,-z,noexecstack
+                 $<$<STREQUAL:$<TARGET_PROPERTY:TYPE>,EXECUTABLE>:-pie>)
+
 if(ZELMARS_SANITIZE)
     add_compile_options(-fsanitize=address,undefined -fno-omit-frame-pointer
                         -fno-sanitize-recover=undefined)
