@@ -2,6 +2,7 @@
 #include "host/BookSettings.h"
 
 #include "platform/ado/ConnectionSettings.h"
+#include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
 
 using namespace Qt::StringLiterals;
@@ -25,6 +26,16 @@ BookSettings BookSettings::read() {
     take(u"dtInitialCatalog"_s, settings.catalogue);
     take(u"dtDataSource"_s, settings.dataSource);
     return settings;
+}
+
+BookSettings BookSettings::readOrTell() {
+    try {
+        return read();
+    } catch (const core::Failure& failure) {
+        BookSettings settings;
+        settings.unreadable = failure.text();
+        return settings;
+    }
 }
 
 QString BookSettings::connectionString() const {

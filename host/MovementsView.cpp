@@ -107,6 +107,9 @@ void MovementsView::open(const BookSettings& settings) {
     movements_->setBook({}, {});
     book_.reset();
     isSample_ = false;
+    if (!settings.unreadable.isEmpty())
+        return showNotice(u"As definições não se deixam ler:\n"_s + settings.unreadable,
+                          u"F5 tenta de novo."_s);
     if (!settings.isComplete)
         return showNotice(u"Ainda não há um livro para este utilizador."_s,
                           u"Um livro novo faz-se com: zelmars init PASTA"_s);

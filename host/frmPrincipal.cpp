@@ -220,7 +220,7 @@ void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {
 }
 
 void frmPrincipal::reload() {
-    const BookSettings settings = BookSettings::read();
+    const BookSettings settings = BookSettings::readOrTell();
     book_->setText(settings.isComplete ? u"Livro: "_s + settings.bookText() : u"Sem livro"_s);
     movements_->open(settings);
     sample_->setVisible(movements_->isSample());

@@ -25,8 +25,8 @@ public:
 
     const QString& path() const { return path_; }
 
-    /// False when the rights of the system keep this user from writing the book or its folder, which
-    /// also holds the journal.
+    /// False when the rights of the system keep this user from writing the book or its folder,
+    /// which also holds the journal.
     bool isOpenToUser() const;
     /// To be asked before anything of the book is read, which would bring the journal's pages into
     /// it. Fails when there is a journal that was written for another file than the one that lies

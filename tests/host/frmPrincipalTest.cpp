@@ -381,7 +381,12 @@ TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
         person_.find<QLabel>(u"Aviso"_s)->text().contains(u"vwZelmars"_s, Qt::CaseInsensitive));
     EXPECT_TRUE(window_.isVisible());
 
-    ASSERT_TRUE(QFile::remove(book_.registryFolder() + u"/HKEY_LOCAL_MACHINE.ini"_s));
+    QFile settings(book_.registryFolder() + u"/HKEY_LOCAL_MACHINE.ini"_s);
+    ASSERT_TRUE(settings.open(QFile::Append) && settings.write("sem sinal\n") > 0);
+    settings.close();
+    person_.press(Qt::Key_F5);
+    EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"não se deixam ler"_s));
+    ASSERT_TRUE(settings.remove());
     person_.press(Qt::Key_F5);
     EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"Ainda não há um livro"_s));
     EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(), u"Sem livro"_s);
