@@ -22,12 +22,13 @@ core::Answer yes(const QString&, core::Icon, const QString&, core::Buttons butto
 }
 
 /// A document in force, as a screen shows it.
-ado::RecordsetPtr anyDocument() {
+/// Documents, each of which can be annulled once.
+ado::RecordsetPtr documents() {
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(
-        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = (SELECT max("
-        "movimento_id) FROM tbZelmar_Movimentos WHERE tipo = 'DOC')"_s,
-        environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
+        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE tipo = 'DOC' AND ficheiro = 'ACTIVO' "
+        "ORDER BY movimento_id DESC"_s,
+        environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic, ado::adLockOptimistic,
         ado::adCmdUnknown);
     return rows;
 }
@@ -107,13 +108,14 @@ void measureOn(Report& report, Engine engine) {
     const std::unique_ptr<Bare> alone = bare(copy.book());
     const qint32 member = usedCases(sampleBook(), 1).front().socio_id;
     runReceipt(member);  // adds the account-level row
-    const ado::RecordsetPtr shown = anyDocument();
+    const ado::RecordsetPtr shown = documents();
     report.pair(
         receipt, 1.5, 20, [&] { runReceipt(member); }, [&] { runBareReceipt(*alone, member); });
     report.pair(
         annulment, 1.5, 20,
         [&] {
             data::Operation operation;
+            shown->MoveNext();
             coverage::annul({shown, u"Medição"_s}, operation);
         },
         [&] { runBareAnnulment(*alone, *shown); });

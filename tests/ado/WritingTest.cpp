@@ -30,6 +30,58 @@ TEST_F(Writing, ANewRowTakesTheTablesDefaultsAndGivesItsKeyBack) {
     EXPECT_EQ(book.text(u"SELECT socio, credito FROM tbSoma"_s), u"NULL|NULL"_s);
 }
 
+// A note in another table: both writes stand, or neither.
+TEST_F(Writing, WhatAccompaniesARowIsStoredWithItOrNothingIs) {
+    using Kind = ado::Accompanying::Kind;
+    const auto state = [this] {
+        return book.text(
+            u"SELECT (SELECT count(*) FROM tbMov), (SELECT max(nome) FROM tbMov), "
+            "(SELECT count(*) FROM tbHosp), (SELECT max(nome) FROM tbHosp), "
+            "(SELECT max(hosp_id) FROM tbHosp)"_s);
+    };
+    const auto note = [](const QString& code, const QString& nome) {
+        return ado::Accompanying{
+            Kind::Update,           u"tbHosp"_s,        {u"nome"_s}, {nome}, {},
+            {u"code"_s, u"nome"_s}, {code, u"espera"_s}};
+    };
+    const auto rows = open(Movements, connection);
+    rows->AddNew();
+    rows->setCollect(u"nome"_s, u"um"_s);
+    rows->Update(ado::Accompanying{
+        Kind::Insert, u"tbHosp"_s, {u"code"_s, u"nome"_s}, {u"a"_s, u"espera"_s}, u"hosp_id"_s});
+    EXPECT_EQ(rows->Collect(u"id"_s), QVariant(1));
+    EXPECT_EQ(state(), u"1|um|1|espera|1"_s);
+
+    rows->setCollect(u"nome"_s, u"dois"_s);
+    EXPECT_EQ(failureOf([&] { rows->Update(note(u"b"_s, u"feito"_s)); }).number(),
+              core::NotAccompanied);
+    const ado::Accompanying none{Kind::Delete, u"tbHosp"_s, {}, {}, {}, {u"code"_s}, {u"b"_s}};
+    EXPECT_EQ(failureOf([&] { rows->Update(none); }).number(), core::NotAccompanied);
+    rows->AddNew();
+    rows->setCollect(u"nome"_s, u"novo"_s);
+    EXPECT_EQ(failureOf([&] { rows->Update(note(u"b"_s, u"feito"_s)); }).number(),
+              core::NotAccompanied);
+    EXPECT_EQ(state(), u"1|um|1|espera|1"_s);
+
+    const auto again = open(Movements, connection);
+    again->setCollect(u"nome"_s, u"dois"_s);
+    again->Update(note(u"a"_s, u"feito"_s));
+    EXPECT_EQ(state(), u"1|dois|1|feito|1"_s);
+    // Also where the row itself has no change.
+    book.exec(u"UPDATE tbHosp SET nome = 'espera'"_s);
+    again->Update(ado::Accompanying{Kind::Delete, u"tbHosp"_s, {}, {}, {}, {u"code"_s}, {u"a"_s}});
+    EXPECT_EQ(state(), u"1|dois|0|NULL|NULL"_s);
+    // The row's own failure takes the note back.
+    book.refuse(u"update on tbMov"_s, u"disco cheio"_s);
+    again->setCollect(u"nome"_s, u"tres"_s);
+    EXPECT_NE(
+        failureOf([&] {
+            again->Update(ado::Accompanying{Kind::Insert, u"tbHosp"_s, {u"code"_s}, {u"c"_s}});
+        }).text(),
+        QString());
+    EXPECT_EQ(state(), u"1|dois|0|NULL|NULL"_s);
+}
+
 TEST_F(Writing, APendingRowSurvivesClosingAndReopeningTheConnection) {
     const auto rows = open(u"select * from tbMov where id = 0"_s, connection);
     rows->AddNew();
