@@ -77,11 +77,15 @@ void addButtons(QMessageBox& box, core::Buttons buttons) {
 /// Boxes are narrower than many a title, which the frame of the window would then cut.
 void makeRoomForTitle(QMessageBox& box, const QString& title) {
     auto* label = box.findChild<QLabel*>(u"qt_msgbox_label"_s);
+    if (!label) return;
     // The frame's letters may be bold, and its buttons and picture stand beside them.
     const int height = box.fontMetrics().height();
     const int frame = box.fontMetrics().horizontalAdvance(title) * 6 / 5 + height * 8;
     const int besideLabel = height * 5;
-    if (label) label->setMinimumWidth(qMax(label->minimumWidth(), frame - besideLabel));
+    // A least width takes the place of the one that the text needs, so only where it is wider.
+    label->ensurePolished();
+    if (label->sizeHint().width() < frame - besideLabel)
+        label->setMinimumWidth(frame - besideLabel);
 }
 
 /// Puts the box below the part of the screen that is to stay in sight, else above it.
@@ -93,7 +97,8 @@ void keepClearOf(const QWidget* part, QMessageBox& box) {
     const QWidget* window = part->window();
     const int frame = qMax(window->geometry().top() - window->frameGeometry().top(),
                            box.fontMetrics().height() * 3 / 2);
-    const int gap = box.fontMetrics().height() / 2;
+    // Wide enough for a window manager that takes the place given for the box without its frame.
+    const int gap = frame;
     int top = there.bottom() + gap;
     if (top + frame + box.height() > room.bottom()) top = there.top() - gap - frame - box.height();
     const int left = there.center().x() - box.width() / 2;

@@ -4,6 +4,7 @@
 
 #include <QAccessible>
 #include <QApplication>
+#include <QLabel>
 #include <QTest>
 #include <QTimer>
 #include <stdexcept>
@@ -35,6 +36,25 @@ TEST(Questions, EnterSaysNoToWhatCannotBeUndone) {
         });
         EXPECT_EQ(core::MsgBox(u"Deseja anular este registo?"_s, Icon::Question, {}, buttons),
                   answer);
+    }
+}
+
+// Neither the title nor the text is cut, whichever is the longer.
+TEST(Questions, AreWideEnoughForTitleAndText) {
+    forms::install();
+    const QString longText = u"«zzz» não consta da lista de rúbricas"_s;
+    for (const auto& [text, title] :
+         {std::pair(longText, QString()), std::pair(u"Sim?"_s, u"Lançamento (Plano de Saúde)"_s)}) {
+        QTimer::singleShot(0, [] {
+            QWidget* box = QApplication::activeModalWidget();
+            ASSERT_TRUE(box);
+            const auto* label = box->findChild<QLabel*>(u"qt_msgbox_label"_s);
+            const QFontMetrics letters = box->fontMetrics();
+            EXPECT_GE(label->width(), letters.horizontalAdvance(label->text()));
+            EXPECT_GE(box->width(), letters.horizontalAdvance(box->windowTitle()) + 100);
+            QTest::keyClick(box->windowHandle(), Qt::Key_Return);
+        });
+        core::MsgBox(text, Icon::Exclamation, title);
     }
 }
 
