@@ -31,7 +31,7 @@ frmProcurar::frmProcurar(const ado::ConnectionPtr& connection)
       txtProcurar(new forms::TextBox(u"txtProcurar"_s, this)),
       lstSocios(new QTableView(this)),
       lblEncontrados(new QLabel(this)),
-      cmdActualizar(new forms::Button(u"cmdActualizar"_s, u"Actualizar (F5)"_s, this)),
+      cmdActualizar(new forms::Button(u"cmdActualizar"_s, u"Atualizar (F5)"_s, this)),
       cmdEscolher(new forms::Button(u"cmdEscolher"_s, u"&Escolher"_s, this)),
       cmdDesistir(new forms::Button(u"cmdDesistir"_s, u"&Desistir"_s, this)) {
     layOut();

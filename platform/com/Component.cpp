@@ -109,7 +109,7 @@ void registerRunning(const QString& progId, const std::function<QObject*()>& mak
 Object createObject(const QString& progId) {
     if (const auto make = runningClasses().value(progId.toLower())) {
         std::unique_ptr<QObject> object(make());
-        if (!object) cannotCreate(progId, u"a classe não fez nenhum objecto."_s);
+        if (!object) cannotCreate(progId, u"a classe não fez nenhum objeto."_s);
         return Object(makeAutomation(std::move(object)));
     }
     const Guid clsid = classIdOf(progId);

@@ -14,6 +14,7 @@
 #include "platform/core/MsgBox.h"
 #include "platform/forms/Controls.h"
 #include "platform/forms/MsgBoxes.h"
+#include "platform/forms/ScrolledBody.h"
 #include "platform/forms/Validation.h"
 
 using namespace Qt::StringLiterals;
@@ -150,6 +151,7 @@ void Form::setVisible(bool visible) {
         loaded_ = true;
         handle(onLoad);
         if (unloaded_) return;
+        fitToDisplay(*this);
     }
     QDialog::setVisible(visible);
     if (!visible && modalLoop_) modalLoop_->quit();

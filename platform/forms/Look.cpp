@@ -3,12 +3,14 @@
 
 #include <QApplication>
 #include <QIcon>
+#include <QLibraryInfo>
 #include <QLocale>
 #include <QPainter>
 #include <QPainterPath>
 #include <QPalette>
 #include <QPixmap>
-#include <QStyleFactory>
+#include <QProxyStyle>
+#include <QStyleOption>
 #include <QTranslator>
 
 #include "platform/core/Format.h"
@@ -21,7 +23,8 @@ namespace forms {
 namespace {
 
 constexpr QColor Accent(0x2b, 0x7a, 0x8c);
-constexpr QColor AccentOnDark(0x3f, 0x9d, 0xb3);
+constexpr QColor AccentOnDark(0x62, 0xbc, 0xd0);
+constexpr QColor TextOnBright(0x10, 0x18, 0x1b);
 
 struct Wording {
     const char* source;
@@ -37,7 +40,7 @@ constexpr Wording Wordings[] = {
     {"&Copy", u"&Copiar"},
     {"&Paste", u"Co&lar"},
     {"Delete", u"Eliminar"},
-    {"Select All", u"Seleccionar tudo"},
+    {"Select All", u"Selecionar tudo"},
     {"OK", u"OK"},
     {"&Yes", u"&Sim"},
     {"&No", u"&Não"},
@@ -107,7 +110,7 @@ constexpr Wording Wordings[] = {
      u"«%1» não se entende. Separe páginas e intervalos com vírgulas, ligue os extremos com um "
      u"hífen, e não repita páginas."},
     {"Current Page", u"Página à vista"},
-    {"Selection", u"Selecção"},
+    {"Selection", u"Seleção"},
     {"Page Set:", u"Páginas:"},
     {"All Pages", u"Todas"},
     {"Odd Pages", u"Ímpares"},
@@ -175,9 +178,9 @@ constexpr Wording Wordings[] = {
     {"Night (18:00 to 05:59)", u"De noite (18:00 a 05:59)"},
     {"Second Shift (16:00 to 23:59)", u"Segundo turno (16:00 a 23:59)"},
     {"Third Shift (00:00 to 07:59)", u"Terceiro turno (00:00 a 07:59)"},
-    {"Weekend (Saturday to Sunday)", u"Ao fim-de-semana"},
+    {"Weekend (Saturday to Sunday)", u"Ao fim de semana"},
     {"Specific Time", u"À hora indicada"},
-    {"Billing information:", u"Facturação:"},
+    {"Billing information:", u"Faturação:"},
     {"Job priority:", u"Prioridade:"},
     {"Banner Pages", u"Folhas de rosto"},
     {"Start:", u"No princípio:"},
@@ -213,15 +216,62 @@ public:
     }
 };
 
-QPalette withAccent(QPalette palette) {
-    const bool dark = palette.color(QPalette::Window).lightness() < 128;
-    palette.setColor(QPalette::Highlight, dark ? AccentOnDark : Accent);
-    palette.setColor(QPalette::HighlightedText, Qt::white);
-    // Dark desktops leave it near black.
-    palette.setColor(QPalette::PlaceholderText,
-                     blended(palette.color(QPalette::Base), palette.color(QPalette::Text), 0.55));
-    return palette;
+/// The translation that came with the toolkit, for texts that nobody thought of above. There is
+/// none of Portugal's for this version; Brazil's is nearer than English.
+void loadToolkitTexts() {
+    auto* translator = new QTranslator(qApp);
+    if (translator->load(u"qtbase_pt_BR"_s, QLibraryInfo::path(QLibraryInfo::TranslationsPath)))
+        qApp->installTranslator(translator);
 }
+
+/// Fusion with borders that can be seen, 3:1 at least, and without pictures on the buttons of
+/// boxes.
+class Style : public QProxyStyle {
+public:
+    Style() : QProxyStyle(u"Fusion"_s) {}
+
+    int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                  QStyleHintReturn* data) const override {
+        if (hint == SH_DialogButtonBox_ButtonsHaveIcons) return 0;
+        return QProxyStyle::styleHint(hint, option, widget, data);
+    }
+    void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
+                       const QWidget* widget) const override {
+        const bool hasBorder = element == PE_FrameLineEdit || element == PE_IndicatorCheckBox ||
+                               element == PE_IndicatorRadioButton ||
+                               element == PE_PanelButtonCommand;
+        const Bordered bordered(hasBorder ? option : nullptr);
+        QProxyStyle::drawPrimitive(element, option, painter, widget);
+    }
+    void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                            QPainter* painter, const QWidget* widget) const override {
+        const Bordered bordered(control == CC_ComboBox || control == CC_SpinBox ? option : nullptr);
+        QProxyStyle::drawComplexControl(control, option, painter, widget);
+    }
+
+private:
+    /// Fusion draws borders in a darker shade of the window's colour and asks for no other: while
+    /// this lives, the option has a window colour of which that shade is the one wanted.
+    class Bordered {
+    public:
+        explicit Bordered(const QStyleOption* option) : option_(const_cast<QStyleOption*>(option)) {
+            if (!option_) return;
+            before_ = option_->palette;
+            const QColor border =
+                blended(before_.color(QPalette::Window), before_.color(QPalette::WindowText), 0.5);
+            option_->palette.setColor(QPalette::Window, border.lighter(140));
+        }
+        ~Bordered() {
+            if (option_) option_->palette = before_;
+        }
+        Bordered(const Bordered&) = delete;
+        Bordered& operator=(const Bordered&) = delete;
+
+    private:
+        QStyleOption* option_;
+        QPalette before_;
+    };
+};
 
 }  // namespace
 
@@ -235,11 +285,22 @@ QColor focusedGround(const QPalette& palette) {
     return blended(palette.color(QPalette::Base), palette.color(QPalette::Highlight), 0.12);
 }
 
+QPalette readable(QPalette palette) {
+    const bool dark = palette.color(QPalette::Window).lightness() < 128;
+    palette.setColor(QPalette::Highlight, dark ? AccentOnDark : Accent);
+    palette.setColor(QPalette::HighlightedText, dark ? TextOnBright : QColor(Qt::white));
+    // Dark desktops leave it near black.
+    palette.setColor(QPalette::PlaceholderText,
+                     blended(palette.color(QPalette::Base), palette.color(QPalette::Text), 0.68));
+    return palette;
+}
+
 void settleLook() {
-    QApplication::setStyle(QStyleFactory::create(u"Fusion"_s));
-    QApplication::setPalette(withAccent(QApplication::palette()));
+    QApplication::setStyle(new Style);
+    QApplication::setPalette(readable(QApplication::palette()));
     QLocale::setDefault(core::userLocale());
     QApplication::setWindowIcon(QIcon(emblem(128, Accent)));
+    loadToolkitTexts();
     qApp->installTranslator(new Portuguese(qApp));
 }
 

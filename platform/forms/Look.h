@@ -10,6 +10,9 @@ namespace forms {
 /// Settles style, colours, locale, the window icon and the Portuguese of the toolkit's own texts.
 void settleLook();
 
+/// The desktop's colours with ours for what is chosen: every text on its ground at 4.5:1 at least.
+QPalette readable(QPalette desktop);
+
 /// `part` of `over`, the rest of `under`; 0..1.
 QColor blended(const QColor& under, const QColor& over, double part);
 
