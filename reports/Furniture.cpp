@@ -73,8 +73,11 @@ void addTitles(Section& section, const std::vector<Column>& columns) {
 
 void addValues(Section& section, const std::vector<Column>& columns) {
     addColumns(section, columns, [](const Column& column, const QRectF& box) {
-        return Field{
-            column.column, box, column.format.toString(), {.points = 8, .align = column.align}};
+        return Field{.column = column.column,
+                     .box = box,
+                     .format = column.format.toString(),
+                     .style = {.points = 8, .align = column.align},
+                     .whole = column.whole};
     });
 }
 

@@ -35,6 +35,7 @@ struct Column {
     double width;
     Align align = Align::Left;
     QStringView format = {};  ///< of core/Format.h
+    bool whole = false;       ///< a text too long is set smaller, so that it can be read whole
 };
 
 /// The columns' titles on a shaded band, side by side from the left margin.

@@ -21,6 +21,12 @@ Label memberLabel(double x, double y, double width, const QString& name) {
     return made;
 }
 
+/// A text that the member must be able to read whole.
+Field whole(Field text) {
+    text.whole = true;
+    return text;
+}
+
 /// Letterhead and member, the same on both statements.
 Section memberHeader() {
     constexpr double Value = 22;
@@ -87,13 +93,13 @@ Report prtExtrato1() {
         label(2, first, 27, u"Lançamento Nº:"_s),
         field(29, first, 40, u"movimento_no"_s, {}, bold),
         field(134, first, 50, u"data"_s, Date, boldRight),
-        field(2, second, 9, u"codABC"_s, {}, bold),
-        label(12, second, 17, u"Familiar:"_s),
-        field(29, second, 69, u"Familiar"_s),
+        whole(field(2, second, 10, u"codABC"_s, {}, bold)),
+        label(13, second, 16, u"Familiar:"_s),
+        whole(field(29, second, 69, u"Familiar"_s)),
         label(100, second, 15, u"Rúbrica:"_s),
-        field(115, second, 69, u"rubrica"_s),
+        whole(field(115, second, 69, u"rubrica"_s)),
         label(2, third, 27, u"Nº Documento:"_s),
-        field(29, third, 40, u"doc_no"_s),
+        whole(field(29, third, 40, u"doc_no"_s)),
         label(71, third, 29, u"Data Documento:"_s),
         field(100, third, 22, u"doc_data"_s, Date),
         label(124, third, 30, u"Modo Pagamento:"_s),
@@ -115,12 +121,12 @@ Report prtExtrato1() {
 
 Report rptExtrato2() {
     const std::vector<Column> columns{
-        {u"No."_s, u"movimento_no"_s, 13, Align::Right},
+        {u"No."_s, u"movimento_no"_s, 12, Align::Right},
         {u"Data"_s, u"data"_s, 17.5, Align::Left, Date},
-        {u"F."_s, u"codABC"_s, 7},
+        {u"F."_s, u"codABC"_s, 10.5, Align::Left, {}, true},
         {u"Tipo"_s, u"tipo"_s, 9.5},
-        {u"Rúbrica"_s, u"rubrica"_s, 50.5},
-        {u"Documento"_s, u"doc_no"_s, 22},
+        {u"Rúbrica"_s, u"rubrica"_s, 43, Align::Left, {}, true},
+        {u"Documento"_s, u"doc_no"_s, 27, Align::Left, {}, true},
         {u"Valor"_s, u"doc_valor"_s, 19, Align::Right, Money},
         {{}, u"modo_pagamento"_s, 9.5},
         {u"Crédito"_s, u"credito"_s, 19, Align::Right, Money},

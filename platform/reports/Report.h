@@ -44,6 +44,7 @@ struct Field {
     QString format;  ///< as core::formatted takes it; empty for the plain value
     Style style;
     int lines = 1;
+    bool whole = false;  ///< a text, too, is set smaller: one that the reader cannot do without
 };
 
 /// A figure over the rows printed so far: of the report in its footer, of the group in the group's.

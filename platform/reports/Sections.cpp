@@ -136,9 +136,9 @@ void PreparedSection::add(Runs& texts, const Label& label, int number) const {
 
 void PreparedSection::add(Runs& texts, const FieldOfRow& of, int) const {
     const QVariant& value = row_.values()[of.place];
-    const bool isText = value.typeId() == QMetaType::QString;
+    const bool mayCut = value.typeId() == QMetaType::QString && !of.field.whole;
     set(texts, faces_, formatted(value, of.field.format), of.field.box, of.field.style,
-        of.field.lines, isText ? Overlong::Cut : Overlong::Shrink);
+        of.field.lines, mayCut ? Overlong::Cut : Overlong::Shrink);
 }
 
 void PreparedSection::add(Runs& texts, const TotalSoFar& of, int) const {

@@ -7,6 +7,7 @@
 #include "platform/reports/Tallies.h"
 #include "platform/reports/Typesetting.h"
 #include "reports/Furniture.h"
+#include "reports/StatementReports.h"
 #include "tests/reports/Ledger.h"
 
 using namespace Qt::StringLiterals;
@@ -119,6 +120,18 @@ TEST_F(Ledger, ShowsAComputedAmountAsTheTotalOverItDoes) {
         EXPECT_EQ(texts.value(0), texts.value(2)) << amount;
         EXPECT_TRUE(texts.value(0).contains(u",01"_s) || texts.value(0).contains(u",68"_s))
             << texts.value(0).toStdString();
+    }
+}
+
+TEST_F(Ledger, CutsNothingOnAStatementThatAMemberMustRead) {
+    fill(2);
+    const QString number = u"FATURA-2026/00012345"_s;
+    book.exec(u"update tbZelmar_Movimentos set codABC = 'CWM1', doc_no = '%1'"_s.arg(number));
+    for (const reports::Report& report : {reports::rptExtrato2(), reports::prtExtrato1()}) {
+        const auto pages = laidOut(report, movements());
+        const QString texts = textsOf(*pages, 0);
+        EXPECT_TRUE(texts.contains(u"|CWM1|"_s) && texts.contains(number)) << texts.toStdString();
+        EXPECT_FALSE(texts.contains(u'…')) << texts.toStdString();
     }
 }
 
