@@ -14,9 +14,9 @@
 #include <map>
 
 #include "data/Procedures.h"
+#include "database/Book.h"
 #include "host/MovementsView.h"
 #include "host/Operations.h"
-
 #include "platform/com/Component.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
@@ -390,6 +390,16 @@ TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
     person_.press(Qt::Key_F5);
     EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"Ainda não há um livro"_s));
     EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(), u"Sem livro"_s);
+
+    // Of another machine, whether others can read along on the way there.
+    for (const QString& word : {QString(), u"?tls=no"_s}) {
+        const QString source = u"postgresql:127.1:1"_s + word;
+        database::writeSettings({u"ana"_s, u"x"_s, u"livro"_s, source});
+        person_.press(Qt::Key_F5);
+        EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(),
+                  u"Livro: livro (%1%2)"_s.arg(
+                      source, word.isEmpty() ? QString() : u", ligação não cifrada"_s));
+    }
 }
 
 #include "frmPrincipalTest.moc"
