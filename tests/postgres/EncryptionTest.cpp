@@ -42,11 +42,11 @@ public:
 
     QString port() const { return port_; }
     /// All that one caller said.
-    QByteArray heard() {
+    std::string heard() {
         QByteArray all;
         for (QByteArray next = line(); next != "end" && !next.isEmpty(); next = line())
             all += next + ' ';
-        return all.trimmed();
+        return all.trimmed().toStdString();
     }
 
 private:
