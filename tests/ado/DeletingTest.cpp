@@ -44,4 +44,24 @@ TEST_F(Deleting, ARowThatTheSetAddedGoesOnWithTheRowBehindIt) {
     }
 }
 
+// Short sets are held in memory, long ones are not.
+TEST_F(Deleting, TheLastRowsLeavesTheRowBeforeThemTheLast) {
+    for (const int count : {3, 500}) {
+        SCOPED_TRACE(count);
+        book.exec(u"DELETE FROM tbMov"_s);
+        fill(count);
+        const auto rows = open(u"select * from tbMov"_s, connection, ado::adLockOptimistic);
+        for (int last = count; last > count - 3; --last) {
+            rows->MoveLast();
+            ASSERT_FALSE(rows->atEnd());
+            EXPECT_EQ(rows->Collect(u"nome"_s).toString(), u"n%1"_s.arg(last));
+            rows->Delete();
+        }
+        rows->MoveLast();
+        EXPECT_EQ(rows->atEnd(), count == 3);
+        EXPECT_EQ(rows->RecordCount(), count - 3);
+        EXPECT_EQ(book.count(u"tbMov"_s), count - 3);
+    }
+}
+
 }  // namespace
