@@ -26,14 +26,16 @@ bool isUnderWay(const QString& type) {
 
 }  // namespace
 
+QString movementInForceStatement(const QVariant& Pkey) {
+    return u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey);
+}
+
 void openRegisto(const QVariant& Pkey, QObject* Caller) {
     // A key that is no number fails here; as a number it is not used.
     core::toLong(Pkey);
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(
-        u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey),
-        environment::dtZelmars::instance().MSAccess(), ado::adOpenDynamic, ado::adLockOptimistic,
-        ado::adCmdUnknown);
+    rows->Open(movementInForceStatement(Pkey), environment::dtZelmars::instance().MSAccess(),
+               ado::adOpenDynamic, ado::adLockOptimistic, ado::adCmdUnknown);
     if (rows->atEnd()) return;
     const QString type = core::toText(rows->Collect(u"tipo"_s));
     const bool isDocument = type == tipo::Document || type == tipo::Hospital;

@@ -18,6 +18,10 @@ QString accumulator(const QVariant& rubrica_id, qint32 socio_id, const QString& 
            u"')"_s;
 }
 
+QString accumulators() {
+    return u"Select * from tbSocios_Acumulados"_s;
+}
+
 QString creditOfHousehold(const QVariant& rubrica_id, qint32 socio_id) {
     return u"SELECT tbSocios_Acumulados.socio_id, tbSocios_Acumulados.rubrica_id, "
            "Sum(tbSocios_Acumulados.credito_ac) AS sum_credito_agregado "

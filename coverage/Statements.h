@@ -14,6 +14,8 @@ QString rubric(const QVariant& rubrica_id);
 /// @param table  that of the active members, or of those who have left
 QString accumulator(const QVariant& rubrica_id, qint32 socio_id, const QString& codABC,
                     const QString& table = QStringLiteral("tbSocios_Acumulados"));
+/// Every accumulator of the active members.
+QString accumulators();
 /// One row: the credit of a rubric, the member and all his family, as `sum_credito_agregado`.
 QString creditOfHousehold(const QVariant& rubrica_id, qint32 socio_id);
 /// One row: the credit of a rubric, the relatives alone, as `sum_credito_tfamilia`.

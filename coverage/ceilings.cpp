@@ -47,7 +47,7 @@ struct Accumulated {
 
 /// The row stays also when the operator gives the entry up.
 void addAccumulator(const Entry& entry, const ado::Recordset& rubric) {
-    const ado::RecordsetPtr rows = data::openToWrite(u"Select * from tbSocios_Acumulados"_s);
+    const ado::RecordsetPtr rows = data::openToWrite(statements::accumulators());
     rows->AddNew();
     rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
     rows->setCollect(u"Rubrica_ID"_s, core::toLong(rubric.Collect(u"Rubrica_ID"_s)));

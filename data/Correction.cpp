@@ -20,6 +20,10 @@ Twins twinsOf(const ado::Recordset& shown) {
     return {u"tbZelmar_Movimentos_Inactivos"_s, u"tbSocios_Acumulados_Inactivos"_s};
 }
 
+QString movementStatement(const QString& table, const QVariant& movimento_id) {
+    return u"Select * from "_s + table + u" where movimento_id = "_s + core::toText(movimento_id);
+}
+
 bool confirmAnnulment(const QString& title) {
     return core::MsgBox(u"Deseja anular este registo?"_s, core::Icon::Question, title,
                         core::Buttons::NoYes) == core::Answer::Yes;
@@ -28,9 +32,8 @@ bool confirmAnnulment(const QString& title) {
 namespace {
 
 ado::RecordsetPtr openMarkable(const ado::Recordset& shown) {
-    return openToWrite(u"Select * from "_s + twinsOf(shown).movements +
-                       u" where movimento_id = "_s +
-                       core::toText(shown.Collect(u"movimento_id"_s)));
+    return openToWrite(
+        movementStatement(twinsOf(shown).movements, shown.Collect(u"movimento_id"_s)));
 }
 
 void tellAnnulledElsewhere(const Operation& annulment, const QString& caption) {

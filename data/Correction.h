@@ -16,6 +16,9 @@ struct Twins {
 /// shown; a row without that column is a new one of an active member.
 Twins twinsOf(const ado::Recordset& shown);
 
+/// One row: a movement of one of the tables.
+QString movementStatement(const QString& table, const QVariant& movimento_id);
+
 /// Asks whether to annul.
 bool confirmAnnulment(const QString& title);
 

@@ -8,6 +8,12 @@
 /// Active members, as the screens find them. Values are joined into the statements as they stand.
 namespace data {
 
+/// One row: a member, by the staff number or by the key.
+QString memberStatement(const QString& no_kor);
+QString memberStatement(qint32 socio_id);
+/// One row: a person of a member's family.
+QString personStatement(const QVariant& socio_familia_id);
+
 /// The staff number is what people type. Null when nobody has that number, whatever the statement
 /// found; blanks around what was typed or stored do not count.
 ado::RecordsetPtr openMemberByNumber(const QString& typed);

@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QtGlobal>
+#include <QStringView>
 
 namespace data {
+
+/// One row: the counters.
+inline constexpr QStringView CounterStatement = u"select * from tbContadores";
 
 /// Draws the next movement number from the counter, whose row is held meanwhile, so that no other
 /// workstation is given the same. Fails when what follows it cannot be stored.

@@ -6,6 +6,10 @@
 /// What every new movement goes through, whatever its type.
 namespace data {
 
+/// Returns no movement, but all their columns.
+inline constexpr QStringView NoMovementStatement =
+    u"select * from tbzelmar_movimentos where movimento_id = 0";
+
 /// The empty row set to which a screen adds its new row. Empty texts receive their defaults: the
 /// connection "MSAccess" and the statement that returns no movement. Fails as opening does.
 ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL);

@@ -11,6 +11,9 @@
 /// Who a document is for, and whether that member or relative may have one processed.
 namespace entry {
 
+/// One row: a member's premium.
+QString premiumStatement(qint32 socio_id);
+
 /// Warns of premium arrears, and in every case offers the premium statement. Nothing of it stops
 /// the choice of the member. Gives the component that shows the statement, whose window lives as
 /// long as somebody keeps it; empty when no statement was wanted.

@@ -17,7 +17,7 @@ constexpr qint64 LargestNumber = 999'999'999'999'999;
 
 ado::RecordsetPtr openCheques() {
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(u"Select * from tbCheques"_s, environment::dtZelmars::instance().MSAccess(),
+    rows->Open(ChequesStatement.toString(), environment::dtZelmars::instance().MSAccess(),
                ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
     return rows;
 }

@@ -5,6 +5,9 @@
 
 namespace payments {
 
+/// One row: the running number.
+inline constexpr QStringView ChequesStatement = u"Select * from tbCheques";
+
 /// The next cheque number to offer. A book without one gets the row, holding 0.
 QString nextChequeNumber();
 

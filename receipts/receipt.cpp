@@ -34,9 +34,8 @@ bool receiptChecks(const ReceiptEntry& receipt) {
 /// The account-level row alone, and there the credit alone.
 void addToAccount(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
-    const ado::RecordsetPtr rows = data::openToWrite(
-        u"Select * from "_s + data::twinsOf(movement).accumulators + u" WHERE (socio_id="_s +
-        QString::number(socio_id) + u") and (rubrica_id_main=0)"_s);
+    const ado::RecordsetPtr rows =
+        data::openToWrite(accountStatement(data::twinsOf(movement).accumulators, socio_id));
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"rubrica_id_main"_s, 0);
@@ -59,8 +58,7 @@ void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
 /// whichever it is. A row that has to be added is nobody's and keeps null sums. It is meant so.
 void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
     const ado::RecordsetPtr rows = data::openToWrite(
-        u"Select * from "_s + data::twinsOf(shown).accumulators + u" WHERE (socio_id="_s +
-        core::toText(shown.Collect(u"socio_id"_s)) + u")"_s);
+        accumulatorsStatement(data::twinsOf(shown).accumulators, shown.Collect(u"socio_id"_s)));
     if (rows->atEnd()) rows->AddNew();
     data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
     data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
@@ -69,6 +67,15 @@ void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
 }
 
 }  // namespace
+
+QString accountStatement(const QString& table, qint32 socio_id) {
+    return u"Select * from "_s + table + u" WHERE (socio_id="_s + QString::number(socio_id) +
+           u") and (rubrica_id_main=0)"_s;
+}
+
+QString accumulatorsStatement(const QString& table, const QVariant& socio_id) {
+    return u"Select * from "_s + table + u" WHERE (socio_id="_s + core::toText(socio_id) + u")"_s;
+}
 
 const data::MovementRules& receiptRules() {
     static const data::MovementRules rules{addToAccount, setCorrection, takeBack};

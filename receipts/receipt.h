@@ -15,6 +15,12 @@ struct ReceiptEntry {
     QString Credito;           ///< the amount
 };
 
+// Statements. `table` is that of the active members, or of those who have left.
+/// The account-level accumulator of a member, to which receipts are added.
+QString accountStatement(const QString& table, qint32 socio_id);
+/// All accumulators of a member.
+QString accumulatorsStatement(const QString& table, const QVariant& socio_id);
+
 /// Asks, checks, draws the number, saves the row and adds to the member's account-level
 /// accumulator. True when all of it is done; false when it was refused or something is missing (the
 /// operator was told) and the screen stays.

@@ -33,19 +33,6 @@ bool repositionChecks(const RepositionEntry& reposition) {
     return data::checkDated(*reposition.record, reposition.caption);
 }
 
-/// Accumulators of member, rubric and person; rubric 0 where none was chosen. The comparison with
-/// Null holds for no row, so that every reposition without a rubric adds one. It is meant so.
-QString accumulatorStatement(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
-                             const QString& codABC) {
-    const QString rubric = core::isNull(rubrica_id)
-                               ? u" AND (rubrica_id = 0 )"_s
-                               : u" AND (rubrica_id ="_s + core::toText(rubrica_id) + u")"_s;
-    const QString person =
-        codABC.isEmpty() ? u"AND (codABC = Null)"_s : u"AND (codABC='"_s + codABC + u"')"_s;
-    return u"Select * from "_s + table + u" WHERE (socio_id="_s + QString::number(socio_id) +
-           u")"_s + rubric + person;
-}
-
 void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
     const QString codABC = core::toText(movement.Collect(u"codABC"_s));
@@ -68,6 +55,17 @@ void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& 
 }
 
 }  // namespace
+
+QString accumulatorStatement(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
+                             const QString& codABC) {
+    const QString rubric = core::isNull(rubrica_id)
+                               ? u" AND (rubrica_id = 0 )"_s
+                               : u" AND (rubrica_id ="_s + core::toText(rubrica_id) + u")"_s;
+    const QString person =
+        codABC.isEmpty() ? u"AND (codABC = Null)"_s : u"AND (codABC='"_s + codABC + u"')"_s;
+    return u"Select * from "_s + table + u" WHERE (socio_id="_s + QString::number(socio_id) +
+           u")"_s + rubric + person;
+}
 
 const data::MovementRules& repositionRules() {
     static const data::MovementRules rules{addToAccumulator};

@@ -19,6 +19,12 @@ struct RepositionEntry {
     QString Credito;
 };
 
+/// Accumulators of member, rubric and person; rubric 0 where none was chosen (null). Intentional:
+/// the comparison with Null holds for no row, so that every reposition without a rubric adds one.
+/// @param table  that of the active members, or of those who have left
+QString accumulatorStatement(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
+                             const QString& codABC);
+
 /// Asks, checks, draws the number, saves the row and adds to the accumulator of member, rubric and
 /// person. True when all of it is done; false when it was refused or something is missing (the
 /// operator was told) and the screen stays.

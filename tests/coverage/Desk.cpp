@@ -2,6 +2,7 @@
 #include "tests/coverage/Desk.h"
 
 #include "boundary/environment/dtZelmars.h"
+#include "data/NewMovement.h"
 #include "platform/com/Component.h"
 #include "platform/core/Clock.h"
 #include "platform/core/UserName.h"
@@ -43,9 +44,8 @@ Desk::~Desk() {
 
 coverage::Entry Desk::enter(const Document& document) const {
     const ado::RecordsetPtr row = ado::Recordset::create();
-    row->Open(u"select * from tbzelmar_movimentos where movimento_id = 0"_s,
-              environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
-              ado::adLockPessimistic, ado::adCmdUnknown);
+    row->Open(data::NoMovementStatement.toString(), environment::dtZelmars::instance().MSAccess(),
+              ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
     row->AddNew();
     const QVariant& ninth = document.hospital ? document.incidencia : document.recebido;
     const std::pair<QString, QVariant> columns[] = {

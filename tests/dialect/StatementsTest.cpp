@@ -9,6 +9,7 @@
 #include "platform/ado/Recordset.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Values.h"
+#include "tests/dialect/StatementsOfTheCode.h"
 #include "tests/support/BookHandle.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Lines.h"
@@ -18,16 +19,10 @@ using support::BookHandle;
 
 namespace {
 
-/// A statement of the list: a line with what it reads, behind it " (no row)" where the sample book
-/// has none, and the statement in the next line.
-struct Listed {
-    QString name;
-    QString text;
-    bool hasRows = true;
-};
-
+/// Those that the code gives, and those of the list: a line with what it reads, behind it
+/// " (no row)" where the sample book has none, and the statement in the next line.
 QList<Listed> listed() {
-    QList<Listed> all;
+    QList<Listed> all = statementsOfTheCode();
     const QStringList lines = support::linesOf(QStringLiteral(STATEMENTS_FILE));
     for (qsizetype at = 0; at + 1 < lines.size(); at += 2)
         all << Listed{lines[at], lines[at + 1], !lines[at].endsWith(u" (no row)")};
