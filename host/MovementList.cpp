@@ -7,6 +7,7 @@
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
+#include "platform/core/Wait.h"
 
 using namespace Qt::StringLiterals;
 
@@ -163,7 +164,12 @@ QVariant MovementList::headerData(int section, Qt::Orientation orientation, int 
 
 const MovementRow& MovementList::rowAt(int row) const {
     const qint32 key = movimento_id(row);
-    if (!read_.contains(key)) readBlock(row);
+    if (!read_.contains(key)) {
+        // Painted while something else is waited for: the row is read when that is over.
+        static const MovementRow unread;
+        if (core::isWaiting()) return unread;
+        readBlock(row);
+    }
     return read_[key];
 }
 

@@ -12,6 +12,7 @@
 
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
+#include "platform/core/Wait.h"
 #include "platform/forms/Controls.h"
 #include "platform/forms/MsgBoxes.h"
 #include "platform/forms/ScrolledBody.h"
@@ -42,6 +43,8 @@ public:
 
 bool run(const std::function<void()>& handler, core::Icon icon) {
     if (!handler) return true;
+    // The engine is in the midst of something; a timer comes again, and nobody can click.
+    if (core::isWaiting()) return false;
     const Running scope;
     const core::HandlerScope pending;
     QString text;

@@ -13,6 +13,7 @@
 #include "platform/forms/Form.h"
 #include "platform/forms/Look.h"
 #include "platform/forms/Validation.h"
+#include "platform/forms/WaitWindow.h"
 
 using namespace Qt::StringLiterals;
 
@@ -151,6 +152,7 @@ void install() {
     settleLook();
     keepFocus();
     core::setMsgBoxPresenter(showBox);
+    installWaitWindow();
 }
 
 }  // namespace forms
