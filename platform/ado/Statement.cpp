@@ -145,6 +145,9 @@ void Statement::requireQuery(bool shapes) const {
         if (is(i, ";"_L1)) refuseFrom(u"Só é aceite uma consulta de cada vez"_s);
         if (is(i, "$"_L1) || isMarkedText(i))
             refuseFrom(u"Uma consulta não pode ter «$» nem uma letra colada a um texto"_s);
+        // An engine takes them for parameters, which nobody would fill.
+        if (is(i, "?"_L1) || is(i, ":"_L1) || is(i, "@"_L1))
+            refuseFrom(u"Uma consulta não pode ter «?», «:» nem «@» fora de um texto"_s);
     }
 }
 

@@ -143,6 +143,20 @@ TEST_F(Reading, EndsAStatementThatNeverEnds) {
     EXPECT_TRUE(open(Movements, brief, ado::adLockReadOnly)->atEnd());
 }
 
+TEST_F(Reading, RefusesParametersThatNobodyFills) {
+    fill(1);
+    for (const QString& typed : {u":x"_s, u"@x"_s, u"$x"_s, u"?1"_s, u"?"_s, u"id::x"_s}) {
+        const core::Failure failure = failureOf([&] {
+            open(u"select * from tbMov where id = "_s + typed, connection, ado::adLockReadOnly);
+        });
+        EXPECT_EQ(failure.number(), core::InvalidCall) << qPrintable(typed);
+        EXPECT_TRUE(failure.text().contains(u"fora de um texto"_s) ||
+                    failure.text().contains(u"«$»"_s))
+            << failure.what();
+    }
+    EXPECT_TRUE(open(u"select * from tbMov where nome = ':x @x $x ?1'"_s, connection)->atEnd());
+}
+
 TEST_F(Reading, OfAStatementThatTheEngineRefusesBringsItsText) {
     const core::Failure failure = failureOf([&] { open(u"select nada from tbMov"_s, connection); });
     EXPECT_EQ(failure.text(),
