@@ -12,9 +12,11 @@
 #include <future>
 #include <thread>
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/PostgresHandle.h"
 #include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Wait.h"
 
 namespace ado {
 
@@ -22,14 +24,19 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
+/// After which the windows get a turn.
+constexpr std::chrono::milliseconds WaitSlice(50);
+
 PostgresAddress::Found addressesOf(const QByteArray& host) {
     addrinfo wanted{};
     wanted.ai_socktype = SOCK_STREAM;
     addrinfo* list = nullptr;
     PostgresAddress::Found found;
     if (const int error = getaddrinfo(host.constData(), nullptr, &wanted, &list); error != 0) {
-        found.error = u"o nome «%1» não foi encontrado (%2)."_s.arg(
-            QString::fromUtf8(host), QString::fromLocal8Bit(gai_strerror(error)));
+        found.error = withDetails(
+            u"O servidor «%1» não foi encontrado. Veja se o nome está certo e se a rede está "
+            "ligada."_s.arg(QString::fromUtf8(host)),
+            QString::fromLocal8Bit(gai_strerror(error)));
         return found;
     }
     for (const addrinfo* each = list; each; each = each->ai_next) {
@@ -126,9 +133,13 @@ PostgresAddress::Found PostgresAddress::lookUp(const QDeadlineTimer& deadline) c
     std::thread([name = found.hosts, given = std::move(promise)]() mutable {
         given.set_value(addressesOf(name));
     }).detach();
-    found.isLate = answer.wait_for(std::chrono::milliseconds(deadline.remainingTime())) !=
-                   std::future_status::ready;
-    return found.isLate ? found : answer.get();
+    core::Wait waiting(u"À espera do endereço do servidor «%1»."_s.arg(host));
+    while (answer.wait_for(WaitSlice) != std::future_status::ready) {
+        if (!waiting.goesOn()) throw givenUp();
+        found.isLate = deadline.hasExpired();
+        if (found.isLate) return found;
+    }
+    return answer.get();
 }
 
 std::vector<PostgresOption> PostgresAddress::options(const Found& found) const {

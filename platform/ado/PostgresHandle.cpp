@@ -8,7 +8,10 @@
 #include <QtEndian>
 #include <utility>
 
+#include "platform/ado/EngineTexts.h"
+#include "platform/ado/RowHolders.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Wait.h"
 
 namespace ado {
 
@@ -19,6 +22,8 @@ namespace {
 /// A server that is silent for the whole time-out counts as gone, but not before these seconds.
 constexpr int LeastPatience = 4;
 constexpr int OldestServer = 140000;
+/// Milliseconds after which the windows get a turn while an answer is waited for.
+constexpr qint64 WaitSlice = 50;
 /// Statements that stay prepared; more than these and all are prepared anew.
 constexpr int PreparedStatements = 128;
 
@@ -58,16 +63,26 @@ std::vector<const char*> pointers(const PostgresValues& values) {
 }
 
 /// Waits until the socket is ready; false when the time is over.
-bool await(PGconn* connection, short events, const QDeadlineTimer& deadline) {
+bool isReady(PGconn* connection, short events, qint64 milliseconds) {
     pollfd socket{PQsocket(connection), events, 0};
-    const qint64 left = deadline.remainingTime();
-    return poll(&socket, 1, static_cast<int>(left)) != 0;
+    return poll(&socket, 1, static_cast<int>(milliseconds)) != 0;
+}
+
+/// The same; false also when the operator gives up.
+bool await(PGconn* connection, short events, const QDeadlineTimer& deadline, core::Wait& waiting) {
+    while (waiting.goesOn()) {
+        const qint64 left = deadline.remainingTime();
+        if (isReady(connection, events, qMin(left, WaitSlice))) return true;
+        if (left <= WaitSlice && deadline.hasExpired()) return false;
+    }
+    return false;
 }
 
 }  // namespace
 
 PostgresHandle::PostgresHandle(const PostgresAddress& address, Role role)
-    : place_(address.shown()) {
+    : place_(address.shown()),
+      awaited_(u"À espera da resposta do servidor de «%1»."_s.arg(place_)) {
     try {
         connect(address);
         settle(role);
@@ -93,31 +108,35 @@ void PostgresHandle::connect(const PostgresAddress& address) {
                           const QString& code = QLatin1StringView(CannotConnect)) {
         return core::Failure(
             core::DatabaseFailure,
-            u"Não foi possível abrir o livro «%1» como «%2»: %3"_s.arg(place_, address.user, why),
+            u"Não foi possível abrir o livro «%1» como «%2». %3"_s.arg(place_, address.user, why),
             code);
     };
     const QDeadlineTimer deadline(address.connectSeconds * 1000);
     const PostgresAddress::Found found = address.lookUp(deadline);
     const QString silent =
-        u"o servidor não respondeu em %1 segundos."_s.arg(address.connectSeconds);
+        u"O servidor não respondeu em %1 segundos."_s.arg(address.connectSeconds);
     if (!found.error.isEmpty()) throw fail(found.error);
     if (found.isLate) throw fail(silent);
     start(address, found);
+    core::Wait waiting(u"À espera da ligação a «%1»."_s.arg(place_));
     for (PostgresPollingStatusType next = PGRES_POLLING_WRITING; next != PGRES_POLLING_OK;
          next = PQconnectPoll(connection_)) {
         if (next == PGRES_POLLING_FAILED || PQstatus(connection_) == CONNECTION_BAD) {
             const Said said = withoutCode(oneLine(PQerrorMessage(connection_)));
-            throw said.code.isEmpty() ? fail(said.text) : fail(said.text, said.code);
+            const QString code =
+                said.code.isEmpty() ? QString::fromLatin1(CannotConnect) : said.code;
+            throw fail(postgresFailure(code, said.text).text(), code);
         }
-        if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline))
-            throw fail(silent);
+        if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline,
+                   waiting))
+            throw waiting.isGivenUp() ? givenUp() : fail(silent);
         if (address.isReadable() && wantsBarePassword())
             throw fail(
-                u"o servidor pediu a palavra-passe sem a proteger (é preciso scram-sha-256); não "
+                u"O servidor pediu a palavra-passe sem a proteger (é preciso scram-sha-256); não "
                 "lhe foi dada."_s);
     }
     if (PQserverVersion(connection_) < OldestServer)
-        throw fail(u"o servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
+        throw fail(u"O servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
             PQserverVersion(connection_) / 10000));
 }
 
@@ -188,8 +207,7 @@ void PostgresHandle::setTimeout(int seconds) {
 }
 
 bool PostgresHandle::isLost() {
-    const QDeadlineTimer now(0);
-    while (!lost_ && await(connection_, POLLIN, now))
+    while (!lost_ && isReady(connection_, POLLIN, 0))
         if (!PQconsumeInput(connection_)) lost_ = true;
     lost_ = lost_ || PQstatus(connection_) == CONNECTION_BAD;
     return lost_;
@@ -224,10 +242,7 @@ PostgresResult PostgresHandle::runThenCommit(const PostgresCall& call, const Mor
     } catch (const core::Failure& failure) {
         if (further) forget(further->text);
         if (!isDone || !lost_) throw;
-        throw core::Failure(
-            failure.number(),
-            failure.text() + u" A linha pode ter ficado gravada: procure-a antes de repetir."_s,
-            failure.code());
+        throw perhapsStored(failure);
     }
     if (isDone) return result;
     forget(call.text);
@@ -321,7 +336,9 @@ void PostgresHandle::synchronise() {
 }
 
 void PostgresHandle::requireConnection() {
-    if (lost_) lose(u"a ligação foi fechada."_s);
+    if (lost_)
+        throw core::Failure(core::DatabaseFailure, u"A ligação a «%1» foi fechada."_s.arg(place_),
+                            u"08006"_s);
 }
 
 /// Reads what earlier statements still answer, up to the last so many synchronisations. Gives the
@@ -355,22 +372,26 @@ PostgresResult PostgresHandle::answers(int count) {
 }
 
 PGresult* PostgresHandle::take() {
-    while (PQisBusy(connection_)) wait();
+    if (PQisBusy(connection_)) {
+        core::Wait waiting(awaited_);
+        while (PQisBusy(connection_)) wait(waiting);
+    }
     PGresult* result = PQgetResult(connection_);
     if (PQstatus(connection_) != CONNECTION_BAD) return result;
     const PostgresResult last(result);
     lose(oneLine(result ? PQresultErrorMessage(result) : PQerrorMessage(connection_)));
 }
 
-void PostgresHandle::wait() {
+void PostgresHandle::wait(core::Wait& waiting) {
     const int sending = PQflush(connection_);
     if (sending < 0) lose(oneLine(PQerrorMessage(connection_)));
-    if (!await(connection_, static_cast<short>(sending > 0 ? POLLIN | POLLOUT : POLLIN),
-               deadline_)) {
+    if (!await(connection_, static_cast<short>(sending > 0 ? POLLIN | POLLOUT : POLLIN), deadline_,
+               waiting)) {
         // Nobody knows what a silent server still does: the connection is given up, at once, so
         // that it lets go of everything when it wakes up.
         lost_ = true;
         PQfinish(std::exchange(connection_, nullptr));
+        if (waiting.isGivenUp()) throw givenUp();
         throw core::Failure(
             core::DatabaseFailure,
             u"O servidor de «%1» não respondeu em %2 segundos; a ligação foi fechada."_s.arg(place_)
@@ -387,13 +408,13 @@ void PostgresHandle::refuse(const PGresult* result) {
         text += u'\n' + oneLine(detail);
     if (text.isEmpty()) text = oneLine(PQresultErrorMessage(result));
     if (code.startsWith(Ending)) lose(text, code);
-    throw core::Failure(core::DatabaseFailure, text, code);
+    throw postgresFailure(code, text);
 }
 
 void PostgresHandle::lose(const QString& text, const QString& code) {
     lost_ = true;
     throw core::Failure(core::DatabaseFailure,
-                        u"A ligação a «%1» perdeu-se: %2"_s.arg(place_, text), code);
+                        withDetails(u"A ligação a «%1» perdeu-se."_s.arg(place_), text), code);
 }
 
 }  // namespace ado

@@ -12,6 +12,10 @@
 #include <optional>
 #include <vector>
 
+namespace core {
+class Wait;
+}
+
 namespace ado {
 
 /// True for what never leaves this machine: the folder of a local socket, "localhost" and the
@@ -52,6 +56,7 @@ struct PostgresAddress {
         QString error;         ///< why there is none
         bool isLate = false;   ///< the deadline came first
     };
+    /// Fails when the operator gives up.
     Found lookUp(const QDeadlineTimer& deadline) const;
     /// All that the client library needs to know to connect. Without the plain setting a remote
     /// server must encrypt and must prove that it knows the password; where a root certificate is
@@ -133,7 +138,7 @@ private:
     void synchronise();
     PostgresResult drain(int but);
     PGresult* take();
-    void wait();
+    void wait(core::Wait& waiting);
     int patience() const;
     void requireConnection();
     PostgresResult answers(int count);
@@ -143,6 +148,7 @@ private:
 
     PGconn* connection_ = nullptr;
     QString place_;
+    QString awaited_;  ///< what the operator reads while an answer is waited for
     bool lost_ = false;
     int timeout_ = -1;
     int unread_ = 0;  ///< synchronisations whose answers nobody has read

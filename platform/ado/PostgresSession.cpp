@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/PostgresSession.h"
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/PostgresPass.h"
 #include "platform/ado/PostgresTypes.h"
 #include "platform/ado/RowStore.h"
@@ -257,6 +258,17 @@ bool PostgresSession::read(const QString& table, RowIdentity row, RowStore& into
     return append(found.get(), row, into);
 }
 
+/// Writes and commits in one round trip: when the connection is lost, nobody knows how far it went.
+PostgresResult PostgresSession::write(PostgresHandle& handle,
+                                      const std::vector<PostgresCall>& calls) {
+    try {
+        return noticing([&] { return handle.run(calls); });
+    } catch (const core::Failure& failure) {
+        if (handle.isLost()) throw perhapsStored(failure);
+        throw;
+    }
+}
+
 RowIdentity PostgresSession::insert(const QString& table, const QStringList& columns,
                                     const std::vector<QVariant>& values,
                                     const Accompaniment& with) {
@@ -282,22 +294,20 @@ bool PostgresSession::update(const QString& table, RowIdentity row, const QStrin
                             quoted(identity(table)) + '=' + parameter(parameters.size());
     PostgresHandle& handle = writerOf(table, row);
     if (!with) {
-        const PostgresResult written = noticing([&] { return handle.run(text, parameters); });
+        const PostgresResult written = write(handle, {{text, parameters}});
         return std::atoi(PQcmdTuples(written.get())) > 0;
     }
     std::vector<PostgresCall> calls;
     if (!columns.isEmpty()) calls.push_back({exactlyOne(text), parameters});
     calls.push_back(callOf(*with, row));
-    noticing([&] { return accompanied([&] { return handle.run(calls); }); });
+    accompanied([&] { return write(handle, calls); });
     return true;
 }
 
 bool PostgresSession::remove(const QString& table, RowIdentity row) {
     const QByteArray text =
         "DELETE FROM " + quoted(table) + " WHERE " + quoted(identity(table)) + "=$1";
-    PostgresHandle& handle = writerOf(table, row);
-    const PostgresResult written =
-        noticing([&] { return handle.run(text, {QByteArray::number(row)}); });
+    const PostgresResult written = write(writerOf(table, row), {{text, {QByteArray::number(row)}}});
     return std::atoi(PQcmdTuples(written.get())) > 0;
 }
 

@@ -76,6 +76,7 @@ private:
     /// Does something with the server that the catalogue has to do with.
     template <class Work>
     PostgresResult noticing(const Work& work);
+    PostgresResult write(PostgresHandle& handle, const std::vector<PostgresCall>& calls);
     PostgresCall selectRow(const QString& table, RowIdentity row);
     /// Appends the one row that was found, if any; false when there is none.
     static bool append(const PGresult* found, RowIdentity row, RowStore& into);

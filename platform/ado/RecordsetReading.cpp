@@ -3,7 +3,7 @@
 #include <limits>
 
 #include "platform/ado/ColumnValue.h"
-#include "platform/ado/MissingPart.h"
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/ado/Statement.h"
 #include "platform/core/Failure.h"

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Writing of row sets.
 #include "platform/ado/ColumnValue.h"
-#include "platform/ado/MissingPart.h"
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/core/Failure.h"
 

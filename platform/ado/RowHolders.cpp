@@ -36,6 +36,10 @@ void refuseRow(const QString& table, RowIdentity row, const QString& holder) {
                                                                                       holder));
 }
 
+QString waitsForRow(const QString& holder) {
+    return u"À espera de uma linha que está a ser usada por %1."_s.arg(holder);
+}
+
 HeldHere::~HeldHere() {
     if (taken_) heldHere.remove(key_);
 }

@@ -18,6 +18,9 @@ inline const QString OtherWorkstation = QStringLiteral("outro posto");
 /// Fails with RowInUse and the holder's name.
 [[noreturn]] void refuseRow(const QString& table, RowIdentity row, const QString& holder);
 
+/// What the operator reads while it is waited for.
+QString waitsForRow(const QString& holder);
+
 /// Notes that this thread holds a row, as long as it lives. Waiting for a row of the same thread
 /// would never end.
 class HeldHere {

@@ -2,7 +2,9 @@
 #include "platform/ado/SqliteHandle.h"
 
 #include <QThread>
+#include <utility>
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/SqliteCollation.h"
 #include "platform/ado/SqliteFile.h"
 #include "platform/core/Failure.h"
@@ -21,8 +23,18 @@ constexpr auto JournalLimit = "PRAGMA journal_size_limit=16777216";
 /// Frames of the journal after which it is written back into the book.
 constexpr int CheckpointFrames = 1000;
 
-/// Steps of the engine between two looks at the clock; a millisecond or so.
-constexpr int StepsUnwatched = 50'000;
+/// Steps of the engine between two looks at the clock. Each may be a function over a value of the
+/// greatest length.
+constexpr int StepsUnwatched = 100;
+/// Bytes of a value or a row. What is longer no screen can have typed, and a function over it would
+/// keep the engine busy past every time-out.
+constexpr int LongestValue = 300'000;
+constexpr int LongestPattern = 128;
+/// Functions that over long values go on for minutes without a look at the clock, and the number of
+/// their arguments. No statement of the system uses them.
+constexpr std::pair<const char*, int> EndlessFunctions[] = {
+    {"printf", -1}, {"format", -1}, {"instr", 2}, {"replace", 3},
+    {"trim", 2},    {"ltrim", 2},   {"rtrim", 2}, {"json_patch", 2}};
 
 /// An enlarged bind that is blank or a comment holds no second statement.
 bool isBlank(const char* text) {
@@ -37,6 +49,7 @@ SqliteHandle::SqliteHandle(const QString& path, Role role, int timeoutSeconds) {
     try {
         if (sqlite3_open_v2(path.toUtf8().constData(), &db_, flags, nullptr) != SQLITE_OK) fail();
         setTimeout(timeoutSeconds);
+        limitWork();
         installCollation(db_);
         execute(role == Role::Reader ? "PRAGMA query_only=1" : "PRAGMA synchronous=FULL");
         if (role == Role::Writer) {
@@ -56,6 +69,14 @@ SqliteHandle::~SqliteHandle() {
     sqlite3_close_v2(db_);
 }
 
+void SqliteHandle::limitWork() {
+    sqlite3_limit(db_, SQLITE_LIMIT_LENGTH, LongestValue);
+    sqlite3_limit(db_, SQLITE_LIMIT_LIKE_PATTERN_LENGTH, LongestPattern);
+    for (const auto& [name, arguments] : EndlessFunctions)
+        sqlite3_create_function_v2(db_, name, arguments, SQLITE_UTF8, nullptr, nullptr, nullptr,
+                                   nullptr, nullptr);
+}
+
 void SqliteHandle::setTimeout(int seconds) {
     if (seconds == timeout_) return;
     timeout_ = seconds;
@@ -63,30 +84,58 @@ void SqliteHandle::setTimeout(int seconds) {
     sqlite3_progress_handler(db_, StepsUnwatched, endLate, this);
 }
 
+SqliteHandle::Asking::Asking(SqliteHandle& handle) : handle_(handle) {
+    handle_.isWorking_ = handle_.isGivenUp_ = false;
+}
+
+SqliteHandle::Asking::~Asking() {
+    if (!handle_.waiting_) return;
+    handle_.isGivenUp_ = handle_.waiting_->isGivenUp();
+    handle_.waiting_.reset();
+}
+
+/// False when the operator does not want to wait any longer.
+bool SqliteHandle::goesOn(const QString& what) {
+    if (!waiting_) waiting_.emplace(what);
+    return waiting_->goesOn();
+}
+
 /// Ends work that takes longer than the time-out, which is a second at the least.
 int SqliteHandle::endLate(void* handle) {
+    static const QString what = u"À espera de que o livro responda a uma consulta demorada."_s;
     auto* const self = static_cast<SqliteHandle*>(handle);
     if (!self->isWorking_) self->works_.start();
     self->isWorking_ = true;
-    return self->works_.elapsed() >= qint64{qMax(1, self->timeout_)} * 1000;
+    return self->works_.elapsed() >= qint64{qMax(1, self->timeout_)} * 1000 || !self->goesOn(what);
 }
 
 /// Waits while another program writes; 0 when the time is over. The engine's own waiting lengthens
 /// its pauses to 100 ms: where several write without end, some are then kept out for seconds.
 int SqliteHandle::awaitOthers(void* handle, int tries) {
+    static const QString what = u"À espera de que outro programa largue o livro."_s;
     auto* const self = static_cast<SqliteHandle*>(handle);
     if (tries == 0) self->waited_.start();
-    if (self->waited_.elapsed() >= qint64{self->timeout_} * 1000) return 0;
+    if (self->waited_.elapsed() >= qint64{self->timeout_} * 1000 || !self->goesOn(what)) return 0;
     QThread::msleep(tries == 0 ? 1 : 2);
     return 1;
+}
+
+int SqliteHandle::step(sqlite3_stmt* statement) {
+    const Asking asking(*this);
+    return sqlite3_step(statement);
+}
+
+int SqliteHandle::prepare(const QByteArray& text, unsigned flags, sqlite3_stmt** statement,
+                          const char** tail) {
+    const Asking asking(*this);
+    return sqlite3_prepare_v3(db_, text.constData(), static_cast<int>(text.size()) + 1, flags,
+                              statement, tail);
 }
 
 SqliteStatement SqliteHandle::prepare(const QByteArray& text) {
     sqlite3_stmt* statement = nullptr;
     const char* tail = nullptr;
-    if (sqlite3_prepare_v2(db_, text.constData(), static_cast<int>(text.size()) + 1, &statement,
-                           &tail) != SQLITE_OK)
-        fail();
+    if (prepare(text, 0, &statement, &tail) != SQLITE_OK) fail();
     SqliteStatement owned(statement);
     if (!isBlank(tail) || (statement && !sqlite3_stmt_readonly(statement)))
         throw core::Failure(core::InvalidCall, u"Só é aceite uma consulta de cada vez."_s);
@@ -115,13 +164,10 @@ sqlite3_stmt* SqliteHandle::cached(const QByteArray& text) {
     if (found == cache_.constEnd()) {
         if (static_cast<std::size_t>(cache_.size()) >= CachedStatements) cache_.clear();
         sqlite3_stmt* statement = nullptr;
-        if (sqlite3_prepare_v3(db_, text.constData(), static_cast<int>(text.size()) + 1,
-                               SQLITE_PREPARE_PERSISTENT, &statement, nullptr) != SQLITE_OK)
-            fail();
+        if (prepare(text, SQLITE_PREPARE_PERSISTENT, &statement, nullptr) != SQLITE_OK) fail();
         found = cache_.insert(text, std::shared_ptr<sqlite3_stmt>(statement, sqlite3_finalize));
     }
     sqlite3_reset(found->get());
-    beginWork();
     return found->get();
 }
 
@@ -139,11 +185,15 @@ int SqliteHandle::committed(void* handle, sqlite3* db, const char* schema, int f
 }
 
 void SqliteHandle::execute(const char* text) {
-    if (sqlite3_exec(db_, text, nullptr, nullptr, nullptr) != SQLITE_OK) fail();
+    const auto run = [&] {
+        const Asking asking(*this);
+        return sqlite3_exec(db_, text, nullptr, nullptr, nullptr);
+    };
+    if (run() != SQLITE_OK) fail();
 }
 
 void SqliteHandle::run(sqlite3_stmt* statement) {
-    const int result = sqlite3_step(statement);
+    const int result = step(statement);
     if (result == SQLITE_DONE || result == SQLITE_ROW) {
         sqlite3_reset(statement);
         return;
@@ -157,15 +207,21 @@ void SqliteHandle::run(sqlite3_stmt* statement) {
 }
 
 void SqliteHandle::fail() {
+    if (isGivenUp_) throw givenUp();
     const int code = sqlite3_extended_errcode(db_);
-    const QString text =
-        code == SQLITE_INTERRUPT
-            ? u"A base de dados não acabou em %1 segundos; o pedido foi interrompido."_s.arg(
-                  qMax(1, timeout_))
-        : (code & 0xFF) == SQLITE_READONLY
-            ? noRightText(QString::fromUtf8(sqlite3_db_filename(db_, "main")))
-            : QString::fromUtf8(sqlite3_errmsg(db_));
-    throw core::Failure(core::DatabaseFailure, text, QString::number(code));
+    if (code == SQLITE_INTERRUPT)
+        throw core::Failure(
+            core::DatabaseFailure,
+            u"A base de dados não acabou em %1 segundos; o pedido foi interrompido."_s.arg(
+                qMax(1, timeout_)),
+            QString::number(code));
+    const QString words = QString::fromUtf8(sqlite3_errmsg(db_));
+    if ((code & 0xFF) == SQLITE_READONLY)
+        throw core::Failure(
+            core::DatabaseFailure,
+            withDetails(noRightText(QString::fromUtf8(sqlite3_db_filename(db_, "main"))), words),
+            QString::number(code));
+    throw sqliteFailure(code, words);
 }
 
 }  // namespace ado

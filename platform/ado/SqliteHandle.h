@@ -8,9 +8,11 @@
 #include <QHash>
 #include <QString>
 #include <memory>
+#include <optional>
 #include <unordered_map>
 
 #include "platform/ado/Session.h"
+#include "platform/core/Wait.h"
 
 namespace ado {
 
@@ -53,12 +55,26 @@ public:
     void execute(const char* text);
     /// Runs a cached statement that gives no row.
     void run(sqlite3_stmt* statement);
-    /// The engine is asked for something: from now on it has the time-out for it. A pass that is
-    /// read slowly is asked again for each row.
-    void beginWork() { isWorking_ = false; }
+    /// Steps a statement; the engine has the time-out for each step.
+    int step(sqlite3_stmt* statement);
     [[noreturn]] void fail();
 
 private:
+    /// As long as the engine is asked for something.
+    class Asking {
+    public:
+        explicit Asking(SqliteHandle& handle);
+        ~Asking();
+        Asking(const Asking&) = delete;
+        Asking& operator=(const Asking&) = delete;
+
+    private:
+        SqliteHandle& handle_;
+    };
+    void limitWork();
+    bool goesOn(const QString& what);
+    int prepare(const QByteArray& text, unsigned flags, sqlite3_stmt** statement,
+                const char** tail);
     static int endLate(void* handle);
     static int awaitOthers(void* handle, int tries);
     static int committed(void* handle, sqlite3* db, const char* schema, int frames);
@@ -69,6 +85,8 @@ private:
     QElapsedTimer waited_;
     bool isWorking_ = false;  ///< for longer than a moment, since works_ was started
     QElapsedTimer works_;
+    std::optional<core::Wait> waiting_;
+    bool isGivenUp_ = false;  ///< by the operator, what the engine was asked for last
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
     std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
 };

@@ -10,9 +10,11 @@
 #include <cerrno>
 #include <cstring>
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/RowHolders.h"
 #include "platform/ado/SqliteSideFile.h"
 #include "platform/core/Failure.h"
+#include "platform/core/Wait.h"
 
 namespace ado {
 
@@ -102,10 +104,13 @@ std::unique_ptr<RowLock> SqliteLocks::lock(const QString& table, RowIdentity row
                                            int timeoutSeconds) const {
     auto lock = std::make_unique<OfdLock>(book_, offsetOf(table, row));
     if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
+    if (lock->take()) return lock;
     QElapsedTimer waited;
     waited.start();
+    core::Wait waiting(waitsForRow(lock->holder()));
     for (unsigned long pause = 1; !lock->take(); pause = qMin(pause * 2, LongestPause)) {
         if (waited.hasExpired(qint64{timeoutSeconds} * 1000)) refuseRow(table, row, lock->holder());
+        if (!waiting.goesOn()) throw givenUp();
         QThread::msleep(pause);
     }
     return lock;

@@ -60,8 +60,7 @@ bool SqlitePass::step() {
         reader_->run(reader_->cached("BEGIN"));
         held_ = true;
     }
-    reader_->beginWork();
-    const int result = sqlite3_step(statement_);
+    const int result = reader_->step(statement_);
     if (steps_ == 1 && sqlite3_stmt_status(statement_, SQLITE_STMTSTATUS_REPREPARE, 1) > 0)
         describeAnew();
     if (result == SQLITE_ROW) return true;

@@ -3,6 +3,7 @@
 
 #include <QDir>
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/LiftedStatement.h"
 #include "platform/ado/RowStore.h"
 #include "platform/ado/SqlitePass.h"
@@ -44,6 +45,18 @@ QByteArray equal(const QStringList& columns, const char* between) {
     return text;
 }
 
+/// Runs a write that commits. Its commit may stand in the journal although the disk did not confirm
+/// it.
+template <class Write>
+void committing(const Write& write) {
+    try {
+        write();
+    } catch (const core::Failure& failure) {
+        if ((failure.code().toInt() & 0xFF) == SQLITE_IOERR) throw perhapsStored(failure);
+        throw;
+    }
+}
+
 }  // namespace
 
 SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int timeoutSeconds)
@@ -55,19 +68,33 @@ SqliteSession::SqliteSession(const QString& folder, const QString& catalog, int 
         readers_.push_back(
             std::make_shared<SqliteHandle>(book(), SqliteHandle::Role::Reader, timeout_));
         SqliteHandle& handle = *readers_.back();
-        // The first read tells a book from a file that is none.
-        handle.run(handle.cached("SELECT count(*) FROM sqlite_schema"));
-        // A book that cannot be written is still readable as it is.
+        requireContent(handle);
+        // A book that cannot be written, or that somebody else has open with another journal, is
+        // still readable as it is: nobody waits for it.
+        handle.setTimeout(0);
         sqlite3_exec(handle.get(), "PRAGMA journal_mode=WAL", nullptr, nullptr, nullptr);
+        handle.setTimeout(timeout_);
         file_.remember(handle.get());
     } catch (const core::Failure& failure) {
         if (!file_.isOpenToUser())
             throw core::Failure(failure.number(), noRightText(book()), failure.code());
         throw core::Failure(failure.number(),
-                            u"Não foi possível abrir o livro «%1»: %2"_s.arg(
+                            u"Não foi possível abrir o livro «%1». %2"_s.arg(
                                 QDir::toNativeSeparators(book()), failure.text()),
                             failure.code());
     }
+}
+
+/// The first read tells a book from a file that is none.
+void SqliteSession::requireContent(SqliteHandle& handle) {
+    sqlite3_stmt* tables = handle.cached("SELECT count(*) FROM sqlite_schema");
+    if (handle.step(tables) != SQLITE_ROW) handle.fail();
+    const int count = sqlite3_column_int(tables, 0);
+    sqlite3_reset(tables);
+    if (count == 0)
+        throw core::Failure(core::DatabaseFailure,
+                            u"O ficheiro está vazio. Reponha uma cópia de segurança."_s,
+                            QString::number(SQLITE_NOTADB));
 }
 
 std::shared_ptr<SqliteHandle> SqliteSession::takeReader() {
@@ -142,7 +169,7 @@ bool SqliteSession::isTable(QStringView name) {
         "SELECT 1 FROM sqlite_schema WHERE type='table' AND name=?1 COLLATE NOCASE "
         "AND sql NOT LIKE '%WITHOUT ROWID'");
     bind(found, 1, name.toString());
-    const bool table = sqlite3_step(found) == SQLITE_ROW;
+    const bool table = reader().step(found) == SQLITE_ROW;
     sqlite3_reset(found);
     return table;
 }
@@ -173,7 +200,7 @@ bool SqliteSession::read(const QString& table, RowIdentity row, RowStore& into) 
     SqliteHandle& handle = reader();
     sqlite3_stmt* statement = handle.cached("SELECT * FROM " + quoted(table) + " WHERE _rowid_=?1");
     sqlite3_bind_int64(statement, 1, row);
-    const int result = sqlite3_step(statement);
+    const int result = handle.step(statement);
     if (result == SQLITE_ROW) {
         into.beginRow(row);
         const int columns = sqlite3_column_count(statement);
@@ -193,17 +220,16 @@ RowIdentity SqliteSession::insert(const QString& table, const QStringList& colum
         inserted_ = {table, columns, insertText(table, columns)};
     RowIdentity row = NoRow;
     const auto add = [&] {
-        write(inserted_.text, values);
+        execute(inserted_.text, values);
         row = sqlite3_last_insert_rowid(writer().get());
     };
-    if (!with) {
-        add();
-        return row;
-    }
-    together([&] {
-        add();
-        accompany(*with, row);
-    });
+    if (!with)
+        committing(add);
+    else
+        together([&] {
+            add();
+            accompany(*with, row);
+        });
     return row;
 }
 
@@ -211,17 +237,20 @@ bool SqliteSession::update(const QString& table, RowIdentity row, const QStringL
                            const std::vector<QVariant>& values, const Accompaniment& with) {
     std::vector<QVariant> bound = values;
     bound.emplace_back(row);
-    const auto change = [&] {
-        return columns.isEmpty() ||
-               write("UPDATE " + quoted(table) + " SET " + equal(columns, ",") + " WHERE _rowid_=?",
-                     bound) > 0;
-    };
-    if (!with) return change();
     bool isThere = true;
-    together([&] {
-        isThere = change();
-        if (isThere) accompany(*with, row);
-    });
+    const auto change = [&] {
+        if (columns.isEmpty()) return;
+        const QByteArray changes = equal(columns, ",");
+        isThere =
+            execute("UPDATE " + quoted(table) + " SET " + changes + " WHERE _rowid_=?", bound) > 0;
+    };
+    if (!with)
+        committing(change);
+    else
+        together([&] {
+            change();
+            if (isThere) accompany(*with, row);
+        });
     return isThere;
 }
 
@@ -231,7 +260,7 @@ void SqliteSession::together(const Writes& writes) {
     handle.run(handle.cached("BEGIN IMMEDIATE"));
     try {
         writes();
-        handle.run(handle.cached("COMMIT"));
+        committing([&] { handle.run(handle.cached("COMMIT")); });
     } catch (...) {
         // Some failures have ended the transaction already.
         sqlite3_exec(handle.get(), "ROLLBACK", nullptr, nullptr, nullptr);
@@ -247,22 +276,26 @@ void SqliteSession::accompany(const Accompanying& with, RowIdentity row) {
             columns += with.keyColumn;
             values.emplace_back(row);
         }
-        write(insertText(with.table, columns), values);
+        execute(insertText(with.table, columns), values);
         return;
     }
     values.insert(values.end(), with.whereValues.begin(), with.whereValues.end());
     const QByteArray head = with.kind == Accompanying::Kind::Delete
                                 ? "DELETE FROM " + quoted(with.table)
                                 : "UPDATE " + quoted(with.table) + " SET " + equal(columns, ",");
-    if (write(head + " WHERE " + equal(with.whereColumns, " AND "), values) != 1)
+    if (execute(head + " WHERE " + equal(with.whereColumns, " AND "), values) != 1)
         throw core::Failure(core::NotAccompanied, NotAccompaniedText.toString());
 }
 
 bool SqliteSession::remove(const QString& table, RowIdentity row) {
-    return write("DELETE FROM " + quoted(table) + " WHERE _rowid_=?", {QVariant(row)}) > 0;
+    int removed = 0;
+    committing([&] {
+        removed = execute("DELETE FROM " + quoted(table) + " WHERE _rowid_=?", {QVariant(row)});
+    });
+    return removed > 0;
 }
 
-int SqliteSession::write(const QByteArray& text, const std::vector<QVariant>& values) {
+int SqliteSession::execute(const QByteArray& text, const std::vector<QVariant>& values) {
     file_.refuseChanged();
     SqliteHandle& handle = writer();
     sqlite3_stmt* statement = handle.cached(text);

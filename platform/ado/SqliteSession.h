@@ -41,11 +41,12 @@ public:
                                          bool withIdentity);
 
 private:
+    static void requireContent(SqliteHandle& handle);
     SqliteHandle& reader();
     SqliteHandle& writer();
     std::unique_ptr<SqliteHandle> opened(SqliteHandle::Role role) const;
     /// Runs a write with its values; gives the number of rows that it touched.
-    int write(const QByteArray& text, const std::vector<QVariant>& values);
+    int execute(const QByteArray& text, const std::vector<QVariant>& values);
     /// Runs writes in one commit; none of them stands when one fails.
     template <class Writes>
     void together(const Writes& writes);

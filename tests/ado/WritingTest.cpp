@@ -191,10 +191,12 @@ TEST_F(Writing, ThatFailsBringsTheEnginesTextAndKeepsWhatWasTyped) {
     EXPECT_EQ(failure.number(), core::DatabaseFailure);
     EXPECT_EQ(failure.code(), support::onServer() ? u"23505"_s : u"1555"_s);
     EXPECT_EQ(failure.text(),
-              support::onServer()
-                  ? u"duplicate key value violates unique constraint \"tbunico_pkey\"\n"
-                    "Key (code)=(a) already exists."_s
-                  : u"UNIQUE constraint failed: tbUnico.code"_s);
+              u"Já existe um registo com este valor, que não se pode repetir; nada foi gravado."
+              "\n\nPormenores: "_s +
+                  (support::onServer()
+                       ? u"duplicate key value violates unique constraint \"tbunico_pkey\"\n"
+                         "Key (code)=(a) already exists."_s
+                       : u"UNIQUE constraint failed: tbUnico.code"_s));
     EXPECT_TRUE(rows->isNewRow());
     rows->setCollect(u"code"_s, u"b"_s);
     rows->Update();
@@ -206,9 +208,10 @@ TEST_F(Writing, ThatAnotherProgramHoldsUpGivesUpInTimeAndCanBeTriedAgain) {
     const auto rows = open(Movements, connect(1), ado::adLockOptimistic);
     rows->setCollect(u"nome"_s, u"novo"_s);
     book.hold(u"tbMov"_s);
-    EXPECT_EQ(failureOf([&] { rows->Update(); }).text(),
-              support::onServer() ? u"canceling statement due to lock timeout"_s
-                                  : u"database is locked"_s);
+    const QString text = failureOf([&] { rows->Update(); }).text();
+    EXPECT_TRUE(text.startsWith(u"Outro posto ou outro programa está a usar"_s));
+    EXPECT_TRUE(text.endsWith(support::onServer() ? u"canceling statement due to lock timeout"_s
+                                                  : u"database is locked"_s));
     book.letGo();
     rows->Update();
     EXPECT_EQ(book.text(u"SELECT nome FROM tbMov"_s), u"novo"_s);

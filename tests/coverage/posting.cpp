@@ -74,11 +74,13 @@ TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothing) {
     const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
     tryOut(entry.entry);
     const auto failToPost = [&](const QString& description) {
-        EXPECT_FALSE(post(entry, {{.text = description, .icon = Icon::None, .title = u"Zelmars"_s},
-                                  {.text = u"Não foi possível registar o registo, contacte o "
-                                           "Administrador do Sistema."_s,
-                                   .icon = Icon::Critical,
-                                   .title = caption}}));
+        EXPECT_FALSE(
+            post(entry,
+                 {{.text = description, .icon = Icon::None, .title = u"Zelmars"_s, .partly = true},
+                  {.text = u"Não foi possível registar o registo, contacte o "
+                           "Administrador do Sistema."_s,
+                   .icon = Icon::Critical,
+                   .title = caption}}));
         expectState("1|NULL|0|0|0");
         EXPECT_FALSE(begun.isRegistered);
     };

@@ -63,12 +63,16 @@ TEST_F(Connections, SayWhatWasTriedAndNeverThePassword) {
         QString text;
         QString part;
     } cases[] = {
+        {as(u"fechado"_s), u"O nome de utilizador ou a palavra-passe não estão certos"_s},
         {as(u"fechado"_s), u"password authentication failed"_s},
+        {elsewhere, u"O servidor não tem este livro"_s},
+        {at(u"postgresql:nao.ha.invalid"_s), u"O servidor «nao.ha.invalid» não foi encontrado"_s},
         {elsewhere, u"database \"nada\" does not exist"_s},
         {as(u"ninguem"_s), u"role \"ninguem\" does not exist"_s},
         {at(u"postgresql:"_s + host + u"/nada"_s), u"No such file or directory"_s},
         {at(u"postgresql:"_s + host + u":5999"_s), u".s.PGSQL.5999"_s},
         {at(u"postgresql:"_s + host + u":99999"_s), u"a porta «99999» não existe"_s},
+        {at(u"postgresql:localhost:1"_s), u"O servidor não aceita a ligação"_s},
         {at(u"postgresql:localhost:1"_s), u"Connection refused"_s},
         {at(u"postgresql:[::1]:1"_s), u"«postgresql:[::1]:1/"_s},
         {at(u"postgresql:"_s), u"«postgresql:SERVIDOR[:PORTA]»"_s},
@@ -143,7 +147,9 @@ TEST_F(Connections, DoNotHangOnAServerThatStopsAnswering) {
     rows->setCollect(u"nome"_s, u"b"_s);
     QElapsedTimer waited;
     waited.start();
-    EXPECT_TRUE(failureOf([&] { rows->Update(); }).text().contains(u"não respondeu"_s));
+    const QString text = failureOf([&] { rows->Update(); }).text();
+    EXPECT_TRUE(text.contains(u"não respondeu"_s)) << qPrintable(text);
+    EXPECT_TRUE(text.contains(u"procure-a antes de repetir"_s)) << qPrintable(text);
     EXPECT_TRUE(failureOf([&] { open(u"select 1"_s, own); }).text().contains(u"não respondeu"_s));
     EXPECT_LT(waited.elapsed(), 10000);
     wake();
