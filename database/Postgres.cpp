@@ -5,8 +5,8 @@
 
 #include <memory>
 
+#include "platform/ado/EngineTexts.h"
 #include "platform/ado/PostgresHandle.h"
-#include "platform/core/Failure.h"
 
 namespace database {
 
@@ -22,6 +22,9 @@ ado::PostgresAddress addressOf(const ServerCatalogue& catalogue) {
             .catalog = catalogue.name,
             .allowsPlain = catalogue.allowsPlain};
 }
+
+/// SQLSTATE of a failure of which the server tells nothing.
+constexpr auto ConnectionLost = "08006";
 
 struct Free {
     void operator()(char* text) const { PQfreemem(text); }
@@ -146,8 +149,9 @@ void Database::fail(const PGresult* result) const {
     for (const int part : {PG_DIAG_MESSAGE_PRIMARY, PG_DIAG_MESSAGE_DETAIL, PG_DIAG_CONTEXT})
         if (const char* text = PQresultErrorField(result, part)) lines << QString::fromUtf8(text);
     if (lines.isEmpty()) lines << QString::fromUtf8(PQerrorMessage(connection_)).simplified();
-    throw core::Failure(core::DatabaseFailure, lines.join(u'\n'),
-                        QString::fromLatin1(PQresultErrorField(result, PG_DIAG_SQLSTATE)));
+    const char* code = PQresultErrorField(result, PG_DIAG_SQLSTATE);
+    throw ado::postgresFailure(QString::fromLatin1(code ? code : ConnectionLost),
+                               lines.join(u'\n'));
 }
 
 Transaction::~Transaction() {

@@ -3,7 +3,7 @@
 
 #include <sqlite3.h>
 
-#include "platform/core/Failure.h"
+#include "platform/ado/EngineTexts.h"
 
 namespace database::sqlite {
 
@@ -11,7 +11,8 @@ namespace {
 
 [[noreturn]] void fail(sqlite3* handle, int result) {
     const char* text = handle ? sqlite3_errmsg(handle) : sqlite3_errstr(result);
-    throw core::Failure(core::DatabaseFailure, QString::fromUtf8(text), QString::number(result));
+    throw ado::sqliteFailure(handle ? sqlite3_extended_errcode(handle) : result,
+                             QString::fromUtf8(text));
 }
 
 }  // namespace
@@ -20,8 +21,8 @@ Database::Database(const QString& file, Mode mode) {
     const int flags = SQLITE_OPEN_READWRITE | (mode == Mode::CreateNew ? SQLITE_OPEN_CREATE : 0);
     const int result = sqlite3_open_v2(file.toUtf8().constData(), &handle_, flags, nullptr);
     if (result == SQLITE_OK) return;
-    const core::Failure failure(core::DatabaseFailure, QString::fromUtf8(sqlite3_errmsg(handle_)),
-                                QString::number(result));
+    const core::Failure failure =
+        ado::sqliteFailure(result, QString::fromUtf8(sqlite3_errmsg(handle_)));
     sqlite3_close(handle_);
     throw failure;
 }
