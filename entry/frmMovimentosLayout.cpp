@@ -80,6 +80,8 @@ QWidget* frmMovimentos::beneficiaryFrame() {
     addRow(grid, 1, u"Familiar:"_s, {Text3, Text4, Command2}, u"Label3"_s);
     for (TextBox* code : {No_Kor, Text3}) code->setFixedWidth(widthFor(code, u"0000000000"));
     // 6375 twips, fifteen to the pixel.
+    Text2->setAccessibleName(u"Nome do sócio"_s);
+    Text4->setAccessibleName(u"Nome do familiar"_s);
     Text2->setMinimumWidth(425);
     Text4->setMinimumWidth(425);
     grid->setColumnStretch(2, 1);

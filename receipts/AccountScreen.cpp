@@ -112,6 +112,7 @@ void AccountScreen::makeBeneficiaryFrame() {
     beneficiary_ = forms::pairsIn(beneficiaryFrame_, {u"Modo de Pagamento:"});
     forms::addRow(beneficiary_, 0, u"Número &KOR:"_s, {No_Kor, Text2, Command1});
     No_Kor->setFixedWidth(forms::widthFor(No_Kor, u"0000000000"));
+    Text2->setAccessibleName(u"Nome do sócio"_s);
     Text2->setMinimumWidth(forms::widthFor(Text2, u"Maria da Conceição de Vasconcelos"));
     beneficiary_->setColumnStretch(2, 1);
 }

@@ -66,6 +66,7 @@ QWidget* frmExtratos::beneficiaryFrame() {
     row->addWidget(Text2, 1);
     row->addWidget(Command1);
     No_Kor->setFixedWidth(No_Kor->fontMetrics().horizontalAdvance(u"000000000000"_s));
+    Text2->setAccessibleName(u"Nome do sócio"_s);
     Text2->setMinimumWidth(Text2->fontMetrics().averageCharWidth() * 50);
     return frame;
 }

@@ -9,6 +9,7 @@
 
 #include "database/Postgres.h"
 #include "database/Sqlite.h"
+#include "host/MovementBook.h"
 #include "tests/support/Server.h"
 
 using namespace Qt::StringLiterals;
@@ -142,6 +143,13 @@ TEST_F(Program, LogsInThroughTheRegisteredComponent) {
 
 TEST_F(Program, CarriesABookToAServerAndWorksThere) {
     ASSERT_EQ(run({u"init"_s, u"--sample"_s, book()}), 0);
+    const host::BookSettings sample{.securityInfo = u"True"_s,
+                                    .user = u"zelmars"_s,
+                                    .password = {},
+                                    .catalogue = u"zelmars"_s,
+                                    .dataSource = u"sqlite:"_s + book(),
+                                    .isComplete = true};
+    EXPECT_TRUE(host::MovementBook(sample).isSample());
     const QString server = u"postgresql:"_s + support::Server::instance().folder();
     const QString admin = QString::fromLatin1(support::Server::User);
     ASSERT_EQ(

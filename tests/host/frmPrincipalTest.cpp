@@ -248,6 +248,7 @@ TEST_F(PrincipalWindow, CopiesWholeRowsAndSaysWhatCannotBeOpened) {
     EXPECT_TRUE(Recorder::calls.isEmpty());
     person_.put(u"Filtro"_s, u"zzz"_s);
     EXPECT_EQ(person_.find<QLabel>(u"Vazio"_s)->text(), u"Nenhum movimento corresponde a «zzz»."_s);
+    EXPECT_FALSE(person_.peek<QLabel>(u"Exemplo"_s)->isVisible());
     EXPECT_EQ(person_.find<QLabel>(u"Utilizador"_s)->text(),
               u"Utilizador: "_s + data::ObterUtilizador());
 }
