@@ -74,6 +74,13 @@ void MovementTable::addEmptyText() {
     column->addStretch(3);
 }
 
+void MovementTable::standOn(int row) {
+    const QModelIndex index = model()->index(row, 0);
+    if (selectionModel()->isSelected(index) && currentIndex().row() == row) return;
+    selectionModel()->setCurrentIndex(
+        index, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
+}
+
 void MovementTable::setEmptyText(const QString& text, const QString& hint) {
     empty_->setText(text);
     hint_->setText(hint);

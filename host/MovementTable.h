@@ -14,6 +14,8 @@ class MovementTable : public QTableView {
 public:
     explicit MovementTable(QAbstractItemModel* movements);
 
+    /// Selects a row alone, whatever keys are held; rows chosen with it stay so.
+    void standOn(int row);
     /// What stands in place of the rows while there are none, and what can be done about it.
     void setEmptyText(const QString& text, const QString& hint);
     /// The widths, for setColumns; anything else leaves the usual ones.

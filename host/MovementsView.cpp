@@ -119,7 +119,7 @@ void MovementsView::open(const BookSettings& settings) {
         movements_->setBook(book_, book_->newest(FirstMovements));
         loader_->start(settings);
         stack_->setCurrentIndex(0);
-        list_->selectRow(0);
+        list_->standOn(0);
         sortAgain();
         showCount();
     } catch (const core::Failure& failure) {
@@ -137,7 +137,7 @@ void MovementsView::keepingPlace(Change&& change) {
     const int rowsAbove = current.row() - above;
     change();
     const int row = current.row() <= 0 ? 0 : std::max(movements_->rowOf(key), 0);
-    list_->selectRow(row);
+    list_->standOn(row);
     list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
 }
 
@@ -261,7 +261,7 @@ void MovementsView::chooseCurrent() {
 void MovementsView::filterChanged(const QString& text) {
     movements_->setFilter(text);
     list_->scrollToTop();
-    list_->selectRow(0);
+    list_->standOn(0);
     showCount();
 }
 
