@@ -203,6 +203,24 @@ TEST_F(Writing, ThatFailsBringsTheEnginesTextAndKeepsWhatWasTyped) {
     EXPECT_EQ(book.count(u"tbUnico"_s), 2);
 }
 
+TEST_F(Writing, ThatBreaksARuleOfTheBookSaysWhich) {
+    book.exec(u"CREATE TABLE tbRegra (a INTEGER NOT NULL, b INTEGER CHECK (b < 5)%1)"_s.arg(
+        support::onServer() ? u", _linha bigint GENERATED ALWAYS AS IDENTITY UNIQUE"_s
+                            : QString()));
+    const auto rows = open(u"select * from tbRegra"_s, connection);
+    const auto textOfAdding = [&](const QVariant& a, const QVariant& b) {
+        rows->AddNew();
+        rows->setCollect(u"a"_s, a);
+        rows->setCollect(u"b"_s, b);
+        const QString text = failureOf([&] { rows->Update(); }).text();
+        rows->CancelUpdate();
+        return text.section(u"; nada foi gravado.\n\nPormenores: "_s, 0, 0);
+    };
+    EXPECT_EQ(textOfAdding({}, 1), u"Falta preencher um valor obrigatório"_s);
+    EXPECT_EQ(textOfAdding(1, 7), u"Um valor não é aceite neste campo"_s);
+    EXPECT_EQ(textOfAdding(1, 1), QString());
+}
+
 TEST_F(Writing, ThatAnotherProgramHoldsUpGivesUpInTimeAndCanBeTriedAgain) {
     fill(1);
     const auto rows = open(Movements, connect(1), ado::adLockOptimistic);

@@ -157,6 +157,16 @@ TEST_F(Connections, DoNotHangOnAServerThatStopsAnswering) {
     EXPECT_EQ(book.text(u"SELECT nome FROM tbMov"_s), u"b"_s);
 }
 
+TEST_F(Connections, SayWhichRightIsMissing) {
+    book.exec(u"REVOKE ALL ON tbHosp FROM \"%1\", PUBLIC"_s.arg(book.user()));
+    const core::Failure failure =
+        failureOf([&] { open(u"select * from tbHosp"_s, connection, ado::adLockReadOnly); });
+    EXPECT_EQ(failure.text(),
+              u"Este utilizador não tem direito a isto; nada foi gravado. Peça-o a quem cuida do "
+              "livro.\n\nPormenores: permission denied for table tbhosp"_s);
+    EXPECT_EQ(failure.code(), u"42501"_s);
+}
+
 TEST_F(Connections, StopAStatementThatTakesTooLong) {
     const auto own = connect(1);
     EXPECT_EQ(failureOf([&] {
