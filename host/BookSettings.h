@@ -13,7 +13,7 @@ struct BookSettings {
     QString catalogue;
     QString dataSource;
     bool isComplete = false;  ///< none of the five is missing; an empty one is not missing
-    QString unreadable;       ///< why the settings cannot be read; empty when they can
+    QString unreadable = {};  ///< why the settings cannot be read; empty when they can
 
     /// Fails with a core::Failure when the settings cannot be read.
     static BookSettings read();

@@ -230,7 +230,7 @@ void frmPrincipal::reload() {
 void frmPrincipal::offerToFinish() {
     if (isOffering_) return;
     const QScopedValueRollback offering(isOffering_, true);
-    if (offerToFinishOperations(this, BookSettings::read())) movements_->takeNewer();
+    if (offerToFinishOperations(this, BookSettings::readOrTell())) movements_->takeNewer();
 }
 
 void frmPrincipal::showCount(const QString& text) {

@@ -67,7 +67,10 @@ void fitToDisplay(QDialog& screen) {
     if (wanted.width() <= most.width() && wanted.height() <= most.height()) return;
     QVBoxLayout* column = columnOfFrames(screen.layout());
     if (!column) return;
+    QWidget* const focused = screen.focusWidget();
     QScrollArea* area = scrolled(column, screen);
+    // A frame that is moved loses the focus of its fields.
+    if (focused) focused->setFocus(Qt::TabFocusReason);
     const int bar = area->verticalScrollBar()->sizeHint().width();
     const int others = wanted.width() - area->widget()->sizeHint().width();
     area->setMinimumWidth(

@@ -203,7 +203,7 @@ TEST_F(BookFile, AUserWithoutTheRightIsToldSoAndAMemberOfTheGroupWorks) {
     const auto kept = hospitalsOf(path("book"));
     for (const char* suffix : {"", "-wal", "-shm"})
         ::chmod((QFile::encodeName(file) + suffix).constData(), 0644);
-    EXPECT_EQ(asUser(60017, Group, posting), refused);
+    EXPECT_TRUE(asUser(60017, Group, posting).startsWith(refused));
     EXPECT_EQ(asUser(60017, Group, [&] { return failureOf([&] { hospitalsOf(path("book")); }); }),
               QString());
     EXPECT_EQ(kept->RecordCount(), 1);

@@ -126,9 +126,9 @@ protected:
 };
 
 TEST_F(Waits, ForABookThatAnotherProgramHoldsCanBeGivenUp) {
-    book.hospital();
-    const auto rows = open(u"select * from tbHospitais"_s, connect());
-    book.hold(u"tbHospitais"_s);
+    book.member({});
+    const auto rows = open(u"select * from tbSocios"_s, connect());
+    book.hold(u"tbSocios"_s);
     rows->setCollect(u"nome"_s, u"Novo"_s);
     if (support::onServer())
         giveUp([&] { rows->Update(); }, u"À espera da resposta do servidor"_s,
@@ -138,7 +138,7 @@ TEST_F(Waits, ForABookThatAnotherProgramHoldsCanBeGivenUp) {
                u"Desistiu de esperar; nada foi gravado."_s);
     book.letGo();
     tryAgain();
-    EXPECT_EQ(book.text(u"select nome from tbHospitais"_s), u"Novo"_s);
+    EXPECT_EQ(book.text(u"select nome from tbSocios"_s), u"Novo"_s);
 }
 
 TEST_F(Waits, ForARowThatAnotherWorkstationHoldsCanBeGivenUp) {
