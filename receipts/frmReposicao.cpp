@@ -40,7 +40,7 @@ frmReposicao::frmReposicao()
     Command2->setKey(u"Alt+I"_s);
     Command2->setEnabled(false);
     addPersonRow();
-    layOut(u"Correcção"_s, u"Correcção da conta corrente do associado, sem cálculo."_s,
+    layOut(u"Correção"_s, u"Correção da conta corrente do associado, sem cálculo."_s,
            {propertiesFrame(), resultFrame()}, {Command3, Command4});
     bindControls();
     DataCombo1->onLostFocus = [this] { DataCombo1_LostFocus(); };

@@ -22,7 +22,7 @@ constexpr std::array<const char*, 4> ReceiptNotes{
     "Regularização do saldo"};
 constexpr std::array<const char*, 3> RepositionNotes{"Acerto de lançamento anterior",
                                                      "Diferença apurada na conferência",
-                                                     "Correcção do valor comparticipado"};
+                                                     "Correção do valor comparticipado"};
 
 // Other entities, as they stand in tbOutrasInstituicoes.
 constexpr int OtherEntities = 12;
