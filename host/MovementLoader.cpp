@@ -1,21 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementLoader.h"
 
-#include <QTimer>
-#include <chrono>
-
+#include "host/LeftForLater.h"
 #include "host/MovementBook.h"
 #include "platform/core/Failure.h"
-#include "platform/core/Wait.h"
 
 namespace host {
-
-namespace {
-
-/// After which it is tried again to tell of what was read.
-constexpr std::chrono::milliseconds WhileWaiting(100);
-
-}  // namespace
 
 void MovementLoader::start(const BookSettings& settings) {
     if (!isReading_) return run(settings);
@@ -39,10 +29,7 @@ void MovementLoader::run(const BookSettings& settings) {
 
 void MovementLoader::take(const std::shared_ptr<MovementSearch>& search, const QString& failure) {
     // Whoever hears of it reads the book.
-    if (core::isWaiting()) {
-        QTimer::singleShot(WhileWaiting, this, [=, this] { take(search, failure); });
-        return;
-    }
+    if (leftForLater(this, [=, this] { take(search, failure); })) return;
     if (next_) return run(*std::exchange(next_, std::nullopt));
     isReading_ = false;
     if (search) emit loaded(search);

@@ -6,6 +6,7 @@
 #include <QScrollBar>
 #include <QStackedWidget>
 
+#include "host/LeftForLater.h"
 #include "host/MovementTable.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -154,6 +155,7 @@ void MovementsView::changeList(Change&& change) {
 }
 
 void MovementsView::takeNewer() {
+    if (leftForLater(this, [this] { takeNewer(); })) return;
     isNewerWanted_ = sorter_->isBusy();
     if (isNewerWanted_) return;
     changeList([this] {

@@ -50,7 +50,21 @@ GRANT UPDATE (
 
 -- The journal of operations, whose rows ride in the commits of other writes. A posting's row goes
 -- once nothing is missing any more.
-GRANT INSERT, UPDATE, DELETE ON tbOperacoes TO {operator};
+GRANT INSERT (
+        operacao_id, operacao, passo, ficheiro, movimento_id, movimento_no, socio_id, tipo,
+        correcao_no, quem, quando),
+    UPDATE (passo, correcao_no, concluida), DELETE
+    ON tbOperacoes TO {operator};
+-- An annulment's row stays: it says who annulled.
+ALTER TABLE tbOperacoes ENABLE ROW LEVEL SECURITY;
+DROP POLICY IF EXISTS ler ON tbOperacoes;
+CREATE POLICY ler ON tbOperacoes FOR SELECT USING (true);
+DROP POLICY IF EXISTS acrescentar ON tbOperacoes;
+CREATE POLICY acrescentar ON tbOperacoes FOR INSERT WITH CHECK (true);
+DROP POLICY IF EXISTS mudar ON tbOperacoes;
+CREATE POLICY mudar ON tbOperacoes FOR UPDATE USING (true);
+DROP POLICY IF EXISTS apagar ON tbOperacoes;
+CREATE POLICY apagar ON tbOperacoes FOR DELETE USING (operacao = 'LAN');
 
 -- A SELECT can call functions. These do more than read, and some of them also where nothing may be
 -- written: they keep large objects, send messages, end or stop other workstations' statements, run

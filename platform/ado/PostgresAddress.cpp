@@ -111,6 +111,10 @@ void PostgresAddress::place(const QString& whole) {
                 shown(), word));
 }
 
+bool PostgresAddress::isReadable(const Found& found) const {
+    return allowsPlain && !isLocal(host, found.addresses);
+}
+
 QString PostgresAddress::shown() const {
     return u"postgresql:"_s + source() + u'/' + catalog;
 }

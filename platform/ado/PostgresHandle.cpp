@@ -130,7 +130,7 @@ void PostgresHandle::connect(const PostgresAddress& address) {
         if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline,
                    waiting))
             throw waiting.isGivenUp() ? givenUp() : fail(silent);
-        if (address.isReadable() && wantsBarePassword())
+        if (address.isReadable(found) && wantsBarePassword())
             throw fail(
                 u"O servidor pediu a palavra-passe sem a proteger (é preciso scram-sha-256); não "
                 "lhe foi dada."_s);
@@ -157,20 +157,24 @@ void PostgresHandle::start(const PostgresAddress& address, const PostgresAddress
 
 /// True when the server, on an unencrypted line, wants the password as it is or scrambled in the
 /// old way that gives it away. The library would answer by itself, so what came is looked at before
-/// the library reads it. A request of which only a part came is not trusted either.
+/// the library reads it. Until the server has let the client in, only whole requests pass: the
+/// library keeps a part that it has read, and nobody would see how it ends.
 bool PostgresHandle::wantsBarePassword() const {
     constexpr ssize_t Head = 9;  // 'R', the length behind it, the kind: four bytes each
+    constexpr quint32 LetIn = 0;
     constexpr quint32 ClearText = 3;
     constexpr quint32 Md5 = 5;
     if (PQstatus(connection_) != CONNECTION_AWAITING_RESPONSE) return false;
     char came[4096];
     const ssize_t size = recv(PQsocket(connection_), came, sizeof came, MSG_PEEK | MSG_DONTWAIT);
-    ssize_t at = 0;
-    while (at < size && came[at] == 'R') {
-        if (size - at < Head) return true;
+    for (ssize_t at = 0; at < size;) {
+        if (came[at] == 'E') return false;  // the server refuses the connection, and says why
+        if (came[at] != 'R' || size - at < Head) return true;
         const auto kind = qFromBigEndian<quint32>(came + at + 5);
+        if (kind == LetIn) return false;
         if (kind == ClearText || kind == Md5) return true;
         at += 1 + qMax(Head - 1, static_cast<ssize_t>(qFromBigEndian<quint32>(came + at + 1)));
+        if (at > size) return true;
     }
     return false;
 }

@@ -58,6 +58,8 @@ struct PostgresAddress {
     };
     /// Fails when the operator gives up.
     Found lookUp(const QDeadlineTimer& deadline) const;
+    /// The same as isReadable() once it is known where the name leads.
+    bool isReadable(const Found& found) const;
     /// All that the client library needs to know to connect. Without the plain setting a remote
     /// server must encrypt and must prove that it knows the password; where a root certificate is
     /// configured it must also show a certificate for its name that this root has signed.

@@ -29,10 +29,6 @@ struct Opened {
     bool operator==(const Opened&) const = default;
 };
 
-/// A book is written without its journal being written as well only when the journal is carried
-/// over into it, which happens right after a posting. Seconds.
-constexpr qint64 LongestCarrying = 60;
-
 std::optional<struct stat> factsOf(const QString& path) {
     struct stat facts {};
     if (::stat(QFile::encodeName(path).constData(), &facts) != 0) return std::nullopt;
@@ -105,10 +101,11 @@ void SqliteFile::refuseForeignJournal() const {
     const auto journal = factsOf(journalOf(path_));
     if (!book || !journal || journal->st_size == 0) return;
     const Opened last = openedLast(path_);
-    const bool isOfAnother = last.journal == FileIdentity{journal->st_dev, journal->st_ino} &&
-                             last.book != FileIdentity{book->st_dev, book->st_ino};
-    const bool isWrittenOver = book->st_mtim.tv_sec > journal->st_mtim.tv_sec + LongestCarrying;
-    if (!isOfAnother && !isWrittenOver) return;
+    // The times of the two files tell nothing: a journal that is carried over long after the last
+    // posting, and cut off in that, is older than its own book.
+    if (last.journal != FileIdentity{journal->st_dev, journal->st_ino} ||
+        last.book == FileIdentity{book->st_dev, book->st_ino})
+        return;
     throw refusal(
         u"O diário «%1-wal» não pertence ao livro «%1»: o livro foi reposto ou substituído e o "
         "diário do anterior ficou. Nada foi alterado.\n\nFeche o programa em todas as janelas, "

@@ -207,8 +207,10 @@ void SqliteHandle::run(sqlite3_stmt* statement) {
 }
 
 void SqliteHandle::fail() {
-    if (isGivenUp_) throw givenUp();
     const int code = sqlite3_extended_errcode(db_);
+    // What failed for another reason just then is told as what it is: it may have been stored.
+    const bool isEndedByWait = (code & 0xFF) == SQLITE_INTERRUPT || (code & 0xFF) == SQLITE_BUSY;
+    if (isGivenUp_ && isEndedByWait) throw givenUp();
     if (code == SQLITE_INTERRUPT)
         throw core::Failure(
             core::DatabaseFailure,

@@ -132,6 +132,9 @@ TEST_F(Rights, LeaveWhatIsPostedAsItIs) {
 
 TEST_F(Rights, LeaveEverythingElseInTheBookAsItIs) {
     expectRefused({
+        "UPDATE tbOperacoes SET quem = 'x'",
+        "UPDATE tbOperacoes SET movimento_id = 1",
+        "TRUNCATE tbOperacoes",
         "DELETE FROM tbContadores",
         "DELETE FROM tbCheques",
         "TRUNCATE tbCheques",

@@ -2,21 +2,24 @@
 # SPDX-License-Identifier: MIT
 """A server that is none: it lets everybody ask and wants the password.
 
-false_server.py (clear|md5|late) [CERTIFICATE KEY]
+false_server.py (clear|md5|late|part) [CERTIFICATE KEY]
 
 Says its port, then one line for each thing that it was told: "tls", "start", "answer …". With a
-certificate it offers encryption. "late" begins as an honest server does and asks behind that.
+certificate it offers encryption. "late" begins as an honest server does and asks behind that,
+and "part" sends that beginning in two pieces.
 """
 import socket
 import ssl
 import struct
 import sys
+import time
 
 SSL_REQUEST = 80877103
 CLEAR = struct.pack("!cII", b"R", 8, 3)
 ASKING = {
     "clear": CLEAR,
     "md5": struct.pack("!cII4s", b"R", 12, 5, b"salt"),
+    "part": struct.pack("!cII", b"R", 23, 10) + b"SCR",
     "late": struct.pack("!cII", b"R", 23, 10) + b"SCRAM-SHA-256\0\0" + CLEAR,
 }
 
@@ -50,6 +53,10 @@ def serve(line, question, context):
         return
     say("start")
     line.sendall(question)
+    if question == ASKING["part"]:
+        # Only once the client has had the chance to take the first part.
+        time.sleep(0.3)
+        line.sendall(b"AM-SHA-256\0\0" + CLEAR)
     if answer := message(line):
         say("answer " + repr(answer))
 
