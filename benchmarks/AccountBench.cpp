@@ -18,11 +18,10 @@ namespace benchmarks {
 namespace {
 
 core::Answer yes(const QString&, core::Icon, const QString&, core::Buttons buttons) {
-    return buttons == core::Buttons::YesNo ? core::Answer::Yes : core::Answer::Ok;
+    return buttons == core::Buttons::Ok ? core::Answer::Ok : core::Answer::Yes;
 }
 
-/// A document in force, as a screen shows it.
-/// Documents, each of which can be annulled once.
+/// Documents in force, as a screen shows them; each can be annulled once.
 ado::RecordsetPtr documents() {
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(

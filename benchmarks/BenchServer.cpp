@@ -44,7 +44,8 @@ const BenchServer& BenchServer::instance() {
 }
 
 BenchServer::BenchServer()
-    : folder_(QDir::current().absoluteFilePath(u"build/bench/books/server"_s)) {
+    // Beside the books, whose folder belongs to whoever made them alone.
+    : folder_(QDir::current().absoluteFilePath(u"build/bench/server"_s)) {
     if (!QDir(folder_).exists(u"PG_VERSION"_s)) {
         QDir().mkpath(folder_);
         if (geteuid() == 0) run({u"chown"_s, u"postgres"_s, folder_}, true);

@@ -29,7 +29,7 @@ private:
 };
 
 core::Answer yes(const QString&, core::Icon, const QString&, core::Buttons buttons) {
-    return buttons == core::Buttons::YesNo ? core::Answer::Yes : core::Answer::Ok;
+    return buttons == core::Buttons::Ok ? core::Answer::Ok : core::Answer::Yes;
 }
 
 ado::RecordsetPtr pendingRow() {
