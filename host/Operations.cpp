@@ -27,7 +27,7 @@ constexpr Signature Signatures[] = {
 std::optional<bool> truth(const QString& text) {
     const QString lower = text.toLower();
     if (lower == "true"_L1 || lower == "verdadeiro"_L1 || lower == "sim"_L1) return true;
-    if (lower == "false"_L1 || lower == "falso"_L1 || lower == "não"_L1) return false;
+    if (lower == "false"_L1 || lower == "falso"_L1 || lower == u"não"_s) return false;
     return {};
 }
 

@@ -73,7 +73,7 @@ TEST(CommandLine, KnowsWhoEntersAServer) {
 
 TEST(CommandLine, GivesOperationsTheirArguments) {
     EXPECT_EQ(parsed(u"newmovimento True"_s).call.operation, u"NewMovimento"_s);
-    EXPECT_EQ(parsed(u"newmovimento falso MSAccess x"_s).call.arguments,
+    EXPECT_EQ(parsed(u"newmovimento não MSAccess x"_s).call.arguments,
               (QVariantList{false, u"MSAccess"_s, u"x"_s}));
     EXPECT_EQ(parsed(u"registo 17"_s).call.arguments.at(1), QVariant(17));
     EXPECT_EQ(parsed(u"CallPlafonds"_s).call.arguments.first(), QVariant(u"MSAccess"_s));
