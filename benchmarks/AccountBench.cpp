@@ -4,7 +4,7 @@
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/annulment.h"
 #include "data/NewMovement.h"
 #include "platform/core/MsgBox.h"

@@ -13,7 +13,7 @@
 #include <memory>
 #include <string_view>
 
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "platform/registry/Registry.h"
 #include "tests/workstations/Jobs.h"
 

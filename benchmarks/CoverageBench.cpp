@@ -8,7 +8,7 @@
 #include "benchmarks/Books.h"
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/Posting.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "platform/core/MsgBox.h"
 
 using namespace Qt::StringLiterals;

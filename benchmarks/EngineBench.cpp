@@ -8,7 +8,7 @@
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
 #include "platform/ado/Recordset.h"
-#include "platform/ado/RowStore.h"
+#include "platform/ado/engine/RowStore.h"
 #include "platform/core/Money.h"
 
 using namespace Qt::StringLiterals;

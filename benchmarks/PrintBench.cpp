@@ -13,11 +13,11 @@
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
 #include "boundary/environment/dtZelmars.h"
-#include "platform/reports/Layout.h"
-#include "platform/reports/Output.h"
-#include "platform/reports/Preview.h"
-#include "platform/reports/Typesetting.h"
-#include "reports/StatementReports.h"
+#include "platform/printing/Layout.h"
+#include "platform/printing/Output.h"
+#include "platform/printing/Preview.h"
+#include "platform/printing/Typesetting.h"
+#include "reports/ExtractReports.h"
 
 using namespace Qt::StringLiterals;
 
@@ -56,24 +56,24 @@ double milliseconds(const QElapsedTimer& clock) {
 }
 
 /// The texts of laid-out pages; only the drawing counts.
-double drawBare(const reports::Pages& pages, const QString& file) {
+double drawBare(const printing::Pages& pages, const QString& file) {
     QElapsedTimer clock;
     clock.start();
     QPdfWriter writer(file);
-    writer.setResolution(reports::UnitsPerInch);
+    writer.setResolution(printing::UnitsPerInch);
     writer.setPageSize(QPageSize(QPageSize::A4));
     writer.setPageMargins({});
     QPainter painter(&writer);
-    reports::Faces faces;
+    printing::Faces faces;
     double spent = milliseconds(clock);
     for (int at = 0; at < pages.count(); ++at) {
-        const reports::Page page = pages.at(at);
+        const printing::Page page = pages.at(at);
         clock.restart();
         if (at > 0) writer.newPage();
-        reports::Style style{.points = 0};
-        for (const reports::TextRun& run : page.texts) {
+        printing::Style style{.points = 0};
+        for (const printing::TextRun& run : page.texts) {
             if (style != run.style) painter.setFont(faces.of(style = run.style).font);
-            painter.drawText(run.baseline * reports::UnitsPerMillimetre, run.text);
+            painter.drawText(run.baseline * printing::UnitsPerMillimetre, run.text);
         }
         spent += milliseconds(clock);
     }
@@ -85,11 +85,11 @@ double drawBare(const reports::Pages& pages, const QString& file) {
 const QString Memory = u"report of 5,000 pages, memory"_s;
 const QString FirstPage = u"report of 5,000 pages, first page shown"_s;
 
-QString pdfOf(const reports::Report& design) {
+QString pdfOf(const printing::Report& design) {
     return design.name + u" to PDF"_s;
 }
 
-void measurePdf(Report& report, const reports::Report& design, int rounds) {
+void measurePdf(Report& report, const printing::Report& design, int rounds) {
     const QTemporaryDir folder;
     const QString file = folder.filePath(u"pages.pdf"_s);
     const ado::RecordsetPtr rows = movements(Movements);
@@ -98,9 +98,9 @@ void measurePdf(Report& report, const reports::Report& design, int rounds) {
     for (int round = 0; round < rounds; ++round) {
         QElapsedTimer clock;
         clock.start();
-        reports::Layout layout(design, rows);
+        printing::Layout layout(design, rows);
         layout.go(-1);
-        reports::writePdf(*layout.pages(), file);
+        printing::writePdf(*layout.pages(), file);
         pages = layout.pages()->count();
         ours.push_back(milliseconds(clock) / pages);
         bytes = static_cast<double>(QFileInfo(file).size());
@@ -117,7 +117,7 @@ void measureMemory(Report& report) {
     mallopt(M_MMAP_THRESHOLD, 128 * 1024);
     const double before = residentMegabytes(QCoreApplication::applicationPid());
     const ado::RecordsetPtr rows = movements(ManyPages * 56);
-    reports::Layout layout(reports::rptExtrato2(), rows);
+    printing::Layout layout(reports::rptExtrato2(), rows);
     layout.go(-1);
     const bool enough = layout.pages()->count() >= ManyPages;
     // A shorter report was not what was asked for, and must not pass.
@@ -130,7 +130,7 @@ void measureFirstPage(Report& report) {
     const double shown = report.medianOf(3, [&] {
         QElapsedTimer clock;
         clock.start();
-        reports::Preview preview(reports::rptExtrato2(), rows);
+        printing::Preview preview(reports::rptExtrato2(), rows);
         preview.Show();
         const auto* place = preview.findChild<QLabel*>(u"Estado"_s);
         while (!place->text().startsWith(u"Página 1 "_s)) QCoreApplication::processEvents();
@@ -150,8 +150,8 @@ void measurePrinting(Report& report) {
         use(largeBook());
         work();
     };
-    const reports::Report summary = reports::rptExtrato2();
-    const reports::Report detailed = reports::prtExtrato1();
+    const printing::Report summary = reports::rptExtrato2();
+    const printing::Report detailed = reports::prtExtrato1();
     measure(pdfOf(summary), [&] { measurePdf(report, summary, 3); });
     // Six times as many pages.
     measure(pdfOf(detailed), [&] { measurePdf(report, detailed, 1); });

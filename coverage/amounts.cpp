@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The amounts of a movement, from the plan's share, what is left of the ceilings and the franchise.
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Procedures.h"
 #include "platform/core/Values.h"

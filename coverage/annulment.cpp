@@ -4,7 +4,7 @@
 #include "coverage/annulment.h"
 
 #include "coverage/Posting.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Correction.h"
 #include "data/RowSets.h"

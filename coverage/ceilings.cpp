@@ -2,7 +2,7 @@
 // What is left of all ceilings that bind a document: each gives a remainder, floored at 0, and the
 // lowest remainder wins. The number of documents is the one limit that stops the try-out.
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Procedures.h"
 #include "data/RowSets.h"

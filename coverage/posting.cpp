@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "coverage/Posting.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Codes.h"
 #include "data/Correction.h"

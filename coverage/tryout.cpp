@@ -2,7 +2,7 @@
 // The frame of a try-out: the checks, the rubric, the minimum, the incidence and the plan's share.
 #include "coverage/TryOut.h"
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Codes.h"
 #include "platform/core/Format.h"

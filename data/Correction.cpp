@@ -20,7 +20,7 @@ Twins twinsOf(const ado::Recordset& shown) {
     return {u"tbZelmar_Movimentos_Inactivos"_s, u"tbSocios_Acumulados_Inactivos"_s};
 }
 
-QString movementStatement(const QString& table, const QVariant& movimento_id) {
+QString movementQuery(const QString& table, const QVariant& movimento_id) {
     return u"Select * from "_s + table + u" where movimento_id = "_s + core::toText(movimento_id);
 }
 
@@ -32,8 +32,7 @@ bool confirmAnnulment(const QString& title) {
 namespace {
 
 ado::RecordsetPtr openMarkable(const ado::Recordset& shown) {
-    return openToWrite(
-        movementStatement(twinsOf(shown).movements, shown.Collect(u"movimento_id"_s)));
+    return openToWrite(movementQuery(twinsOf(shown).movements, shown.Collect(u"movimento_id"_s)));
 }
 
 void tellAnnulledElsewhere(const Operation& annulment, const QString& caption) {

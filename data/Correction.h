@@ -17,7 +17,7 @@ struct Twins {
 Twins twinsOf(const ado::Recordset& shown);
 
 /// One row: a movement of one of the tables.
-QString movementStatement(const QString& table, const QVariant& movimento_id);
+QString movementQuery(const QString& table, const QVariant& movimento_id);
 
 /// Asks whether to annul.
 bool confirmAnnulment(const QString& title);

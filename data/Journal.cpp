@@ -6,7 +6,7 @@
 #include "data/Codes.h"
 #include "data/Operations.h"
 #include "data/RowSets.h"
-#include "platform/ado/RowHolders.h"
+#include "platform/ado/engine/RowHolders.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Values.h"
 

@@ -10,22 +10,22 @@ using namespace Qt::StringLiterals;
 
 namespace data {
 
-QString memberStatement(const QString& no_kor) {
+QString memberQuery(const QString& no_kor) {
     return u"select * from tbsocios where no_kor ='"_s + no_kor + u"'"_s;
 }
 
-QString memberStatement(qint32 socio_id) {
+QString memberQuery(qint32 socio_id) {
     return u"select * from tbsocios where socio_id ="_s + QString::number(socio_id);
 }
 
-QString personStatement(const QVariant& socio_familia_id) {
+QString personQuery(const QVariant& socio_familia_id) {
     return u"Select * from tbsocios_familias where socio_familia_id ="_s +
            core::toText(socio_familia_id);
 }
 
 ado::RecordsetPtr openMemberByNumber(const QString& typed) {
     const QString no_kor = typed.trimmed();
-    ado::RecordsetPtr member = openToRead(memberStatement(no_kor));
+    ado::RecordsetPtr member = openToRead(memberQuery(no_kor));
     if (member->atEnd()) return nullptr;
     // A quote in the text changes the statement, which then finds anybody.
     const bool isHis = core::toText(member->Collect(u"no_kor"_s)).trimmed() == no_kor;
@@ -33,7 +33,7 @@ ado::RecordsetPtr openMemberByNumber(const QString& typed) {
 }
 
 ado::RecordsetPtr openMemberById(qint32 socio_id) {
-    return openToRead(memberStatement(socio_id));
+    return openToRead(memberQuery(socio_id));
 }
 
 QVariant memberIdOf(const QString& no_kor) {
@@ -42,11 +42,11 @@ QVariant memberIdOf(const QString& no_kor) {
 }
 
 QVariant ofMember(qint32 socio_id, const QString& column) {
-    return DLookup(memberStatement(socio_id), {}, column);
+    return DLookup(memberQuery(socio_id), {}, column);
 }
 
 QVariant ofPerson(const QVariant& socio_familia_id, const QString& column) {
-    return DLookup(personStatement(socio_familia_id), {}, column);
+    return DLookup(personQuery(socio_familia_id), {}, column);
 }
 
 bool checkEnrolled(const ado::Recordset& member) {

@@ -9,10 +9,10 @@
 namespace data {
 
 /// One row: a member, by the staff number or by the key.
-QString memberStatement(const QString& no_kor);
-QString memberStatement(qint32 socio_id);
+QString memberQuery(const QString& no_kor);
+QString memberQuery(qint32 socio_id);
 /// One row: a person of a member's family.
-QString personStatement(const QVariant& socio_familia_id);
+QString personQuery(const QVariant& socio_familia_id);
 
 /// The staff number is what people type. Null when nobody has that number, whatever the statement
 /// found; blanks around what was typed or stored do not count.

@@ -11,7 +11,7 @@ namespace data {
 qint32 drawMovementNumber() {
     qint32 number = 1;
     const ado::RecordsetPtr counter = ado::Recordset::create();
-    counter->Open(CounterStatement.toString(), environment::dtZelmars::instance().MSAccess(),
+    counter->Open(CounterQuery.toString(), environment::dtZelmars::instance().MSAccess(),
                   ado::adOpenDynamic, ado::adLockPessimistic, ado::adCmdUnknown);
     if (counter->atEnd()) {
         counter->AddNew();

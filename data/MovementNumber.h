@@ -6,7 +6,7 @@
 namespace data {
 
 /// One row: the counters.
-inline constexpr QStringView CounterStatement = u"select * from tbContadores";
+inline constexpr QStringView CounterQuery = u"select * from tbContadores";
 
 /// Draws the next movement number from the counter, whose row is held meanwhile, so that no other
 /// workstation is given the same. Fails when what follows it cannot be stored.

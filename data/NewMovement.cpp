@@ -17,7 +17,7 @@ using namespace Qt::StringLiterals;
 namespace data {
 
 ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL) {
-    if (strSQL.isEmpty()) strSQL = NoMovementStatement.toString();
+    if (strSQL.isEmpty()) strSQL = NoMovementQuery.toString();
     if (strConMember.isEmpty()) strConMember = u"MSAccess"_s;
     const ado::RecordsetPtr rows = ado::Recordset::create();
     rows->Open(strSQL, environment::dtZelmars::instance().Connections(strConMember),

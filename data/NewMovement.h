@@ -7,7 +7,7 @@
 namespace data {
 
 /// Returns no movement, but all their columns.
-inline constexpr QStringView NoMovementStatement =
+inline constexpr QStringView NoMovementQuery =
     u"select * from tbzelmar_movimentos where movimento_id = 0";
 
 /// The empty row set to which a screen adds its new row. Empty texts receive their defaults: the

@@ -12,8 +12,8 @@
 #include "database/SchemaText.h"
 #include "database/SqliteBookReader.h"
 #include "database/SqliteBookWriter.h"
-#include "platform/ado/PostgresHandle.h"
-#include "platform/ado/SqliteFile.h"
+#include "platform/ado/postgres/Handle.h"
+#include "platform/ado/sqlite/BookFile.h"
 #include "platform/core/Failure.h"
 
 namespace database {
@@ -169,7 +169,7 @@ void withSource(const BookPlace& place, const std::function<void(BookReader&)>& 
     }
     const QString file = bookFile(place.folder, place.name);
     if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
-    ado::SqliteFile(file).refuseForeignJournal();
+    ado::sqlite::BookFile(file).refuseForeignJournal();
     sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
     book.run("BEGIN");
     SqliteBookReader reader(book);

@@ -5,8 +5,8 @@
 
 #include <memory>
 
-#include "platform/ado/EngineTexts.h"
-#include "platform/ado/PostgresHandle.h"
+#include "platform/ado/engine/EngineTexts.h"
+#include "platform/ado/postgres/Handle.h"
 
 namespace database {
 
@@ -14,7 +14,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-ado::PostgresAddress addressOf(const ServerCatalogue& catalogue) {
+ado::postgres::Address addressOf(const ServerCatalogue& catalogue) {
     return {.host = catalogue.host,
             .port = catalogue.port,
             .user = catalogue.user,
@@ -37,7 +37,7 @@ QByteArray taken(char* text) {
 }  // namespace
 
 ServerCatalogue ServerCatalogue::at(const QString& place, const QString& name) {
-    ado::PostgresAddress address;
+    ado::postgres::Address address;
     address.catalog = name;
     address.place(place);
     return {.host = address.host,
@@ -59,7 +59,7 @@ QString ServerCatalogue::dataSource() const {
 namespace postgres {
 
 Database::Database(const ServerCatalogue& catalogue)
-    : connection_(ado::PostgresHandle::connected(addressOf(catalogue))) {
+    : connection_(ado::postgres::Handle::connected(addressOf(catalogue))) {
     PQsetNoticeProcessor(
         connection_, [](void*, const char*) {}, nullptr);
     try {
@@ -80,7 +80,7 @@ void Database::run(const QByteArray& statements) {
 }
 
 qint64 Database::number(const QByteArray& statement) {
-    const ado::PostgresResult result(checked(PQexec(connection_, statement.constData())));
+    const ado::postgres::Result result(checked(PQexec(connection_, statement.constData())));
     if (PQntuples(result.get()) == 0) return 0;
     const QByteArray text = PQgetvalue(result.get(), 0, 0);
     return text == "t" ? 1 : text.toLongLong();
@@ -91,7 +91,7 @@ void Database::eachRow(const QByteArray& statement,
     if (!PQsendQuery(connection_, statement.constData())) fail(nullptr);
     PQsetSingleRowMode(connection_);
     while (PGresult* next = PQgetResult(connection_)) {
-        const ado::PostgresResult result(checked(next));
+        const ado::postgres::Result result(checked(next));
         if (PQresultStatus(next) == PGRES_SINGLE_TUPLE) row(next);
     }
 }
@@ -106,9 +106,9 @@ void Database::copyIn(const QByteArray& statement, const QByteArray& lines) {
 
 /// Reads the answers to the end; fails with the first one that tells of a failure.
 void Database::finish() {
-    ado::PostgresResult failed;
+    ado::postgres::Result failed;
     while (PGresult* next = PQgetResult(connection_)) {
-        ado::PostgresResult result(next);
+        ado::postgres::Result result(next);
         if (!failed && PQresultStatus(next) != PGRES_COMMAND_OK) failed = std::move(result);
     }
     if (failed) fail(failed.get());
@@ -139,7 +139,7 @@ PGresult* Database::checked(PGresult* result) const {
         case PGRES_COPY_IN:
             return result;
         default:
-            const ado::PostgresResult failed(result);
+            const ado::postgres::Result failed(result);
             fail(failed.get());
     }
 }

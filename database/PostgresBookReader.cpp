@@ -5,8 +5,8 @@
 
 #include <charconv>
 
-#include "platform/ado/PostgresTypes.h"
-#include "platform/ado/StatementTranslator.h"
+#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/postgres/Types.h"
 #include "platform/core/Failure.h"
 
 namespace database {
@@ -78,7 +78,8 @@ std::vector<TableShape> PostgresBookReader::tables() {
         if (isHidden || (textAt(row, 4) == "t" && !order_.contains(table))) order_[table] = column;
         if (isHidden) return;
         shapes.back().table.columns.push_back(column);
-        shapes.back().types.push_back(ado::typeOf(textAt(row, 2).toUInt(), textAt(row, 3).toInt()));
+        shapes.back().types.push_back(
+            ado::postgres::typeOf(textAt(row, 2).toUInt(), textAt(row, 3).toInt()));
     });
     return shapes;
 }

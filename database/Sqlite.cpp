@@ -3,7 +3,7 @@
 
 #include <sqlite3.h>
 
-#include "platform/ado/EngineTexts.h"
+#include "platform/ado/engine/EngineTexts.h"
 
 namespace database::sqlite {
 

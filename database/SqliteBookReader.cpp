@@ -3,7 +3,7 @@
 
 #include <sqlite3.h>
 
-#include "platform/ado/SqliteTypes.h"
+#include "platform/ado/sqlite/Types.h"
 
 namespace database {
 
@@ -49,7 +49,7 @@ std::vector<TableShape> SqliteBookReader::tables() {
         if (shapes.empty() || shapes.back().table.name != table)
             shapes.push_back({{table, {}}, {}});
         shapes.back().table.columns.push_back(textAt(columns, 1));
-        shapes.back().types.push_back(ado::typeOfDeclaration(textAt(columns, 2)));
+        shapes.back().types.push_back(ado::sqlite::typeOfDeclaration(textAt(columns, 2)));
     }
     return shapes;
 }

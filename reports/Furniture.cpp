@@ -5,6 +5,8 @@ using namespace Qt::StringLiterals;
 
 namespace reports {
 
+using namespace printing;
+
 namespace {
 
 /// Between a text and the edge of its column.

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "platform/reports/Report.h"
+#include "platform/printing/Report.h"
 
 /// What the printed reports share: letterhead, page footer, columns, totals.
 ///
@@ -18,33 +18,34 @@ inline constexpr QStringView OrganisationAddress = u"Lisboa";
 inline constexpr double LineHeight = 4.8;
 
 /// A text that stays, and the value of a column, each on one line from `x`, `y` of the section on.
-Label label(double x, double y, double width, const QString& caption, const Style& style = {});
-Field field(double x, double y, double width, const QString& column, QStringView format = {},
-            const Style& style = {});
+printing::Label label(double x, double y, double width, const QString& caption,
+                      const printing::Style& style = {});
+printing::Field field(double x, double y, double width, const QString& column,
+                      QStringView format = {}, const printing::Style& style = {});
 
 /// Name and address of the organisation, the day of printing at the right, the title on a band.
-void addLetterhead(Section& section, const QString& title);
+void addLetterhead(printing::Section& section, const QString& title);
 
 /// A rule, "Processado por Computador", and at the right page and number of pages.
-Section pageFooter();
+printing::Section pageFooter();
 
 /// A column of a listing.
 struct Column {
     QString title;
     QString column;
     double width;
-    Align align = Align::Left;
+    printing::Align align = printing::Align::Left;
     QStringView format = {};  ///< of core/Format.h
     bool whole = false;       ///< a text too long is set smaller, so that it can be read whole
 };
 
 /// The columns' titles on a shaded band, side by side from the left margin.
-void addTitles(Section& section, const std::vector<Column>& columns);
+void addTitles(printing::Section& section, const std::vector<Column>& columns);
 /// The columns' values under their titles.
-void addValues(Section& section, const std::vector<Column>& columns);
+void addValues(printing::Section& section, const std::vector<Column>& columns);
 
 /// A line at the right: the caption and the figure over all rows.
-void addTotal(Section& section, Total::Of of, const QString& caption, const QString& column,
-              QStringView format);
+void addTotal(printing::Section& section, printing::Total::Of of, const QString& caption,
+              const QString& column, QStringView format);
 
 }  // namespace reports

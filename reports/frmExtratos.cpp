@@ -12,14 +12,16 @@
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
-#include "platform/reports/DataReport.h"
+#include "platform/printing/DataReport.h"
+#include "reports/ExtractQuery.h"
+#include "reports/ExtractReports.h"
 #include "reports/ReportRows.h"
-#include "reports/StatementReports.h"
-#include "reports/Statements.h"
 
 using namespace Qt::StringLiterals;
 
 namespace reports {
+
+using namespace printing;
 
 using core::Icon;
 using core::MsgBox;
@@ -232,7 +234,7 @@ void frmExtratos::Imprimir_Click() {
 void frmExtratos::print(const ado::Recordset& member) {
     DataReport report(Check2->Value() ? prtExtrato1() : rptExtrato2());
     const ado::RecordsetPtr rows =
-        openReportRows(report.design().dataMember, statementOf(selection()));
+        openReportRows(report.design().dataMember, extractQuery(selection()));
 
     const auto text = [&member](const QString& column) {
         return core::toText(member.Collect(column));

@@ -22,7 +22,7 @@ QString paymentsStatement(const QString& filter) {
            u" ORDER BY tbQuotas_Movimentos.ano DESC, tbQuotas_Movimentos.mes DESC"_s;
 }
 
-QString memberStatement(const QString& members, int socioId) {
+QString memberQuery(const QString& members, int socioId) {
     const QString table = members == u"Activos"_s ? u"tbSocios"_s : u"tbSocios_Inactivos"_s;
     return u"SELECT no_kor, nome FROM %1 WHERE socio_id = %2"_s.arg(table).arg(socioId);
 }
@@ -113,7 +113,7 @@ void frmQuotas::connectHandlers() {
 
 void frmQuotas::showMember(const ado::ConnectionPtr& connection, const QString& members) {
     const auto member = ado::Recordset::create();
-    member->Open(memberStatement(members, socioId_), connection);
+    member->Open(memberQuery(members, socioId_), connection);
     lblAssociado->setText(
         member->atEnd() ? u"Associado desconhecido"_s
                         : u"Associado %1, %2"_s.arg(core::toText(member->Collect(u"no_kor"_s)),

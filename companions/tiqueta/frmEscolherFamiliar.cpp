@@ -18,7 +18,7 @@ namespace {
 enum Column { Code, Kinship, Name, Birth, Waiting, ColumnCount };
 
 // The member's number and name.
-QString memberStatement(int socioId) {
+QString memberQuery(int socioId) {
     return u"SELECT no_kor, nome FROM tbSocios WHERE socio_id = %1"_s.arg(socioId);
 }
 
@@ -44,7 +44,7 @@ bool isMemberHimself(const QString& code) {
 
 QString memberLine(const ado::ConnectionPtr& connection, int socioId) {
     const auto member = ado::Recordset::create();
-    member->Open(memberStatement(socioId), connection);
+    member->Open(memberQuery(socioId), connection);
     if (member->atEnd()) return u"Este associado não se encontra na tabela de activos."_s;
     return u"Associado %1, %2"_s.arg(core::toText(member->value(0)),
                                      core::toText(member->value(1)));

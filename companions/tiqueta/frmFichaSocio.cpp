@@ -17,7 +17,7 @@ using namespace Qt::StringLiterals;
 namespace tiqueta {
 namespace {
 
-QString memberStatement(int socioId) {
+QString memberQuery(int socioId) {
     return u"SELECT * FROM tbSocios WHERE socio_id = %1"_s.arg(socioId);
 }
 
@@ -35,7 +35,7 @@ void addField(QGridLayout* grid, int row, int column, const QString& label, form
 
 void frmFichaSocio::edit(const ado::ConnectionPtr& connection, int socioId) {
     const auto member = ado::Recordset::create();
-    member->Open(memberStatement(socioId), connection, ado::adOpenStatic, ado::adLockOptimistic);
+    member->Open(memberQuery(socioId), connection, ado::adOpenStatic, ado::adLockOptimistic);
     if (member->atEnd())
         throw core::Failure(
             core::NoCurrentRow,

@@ -2,8 +2,8 @@
 #include "platform/ado/Connection.h"
 
 #include "platform/ado/ConnectionSettings.h"
-#include "platform/ado/PostgresSession.h"
-#include "platform/ado/SqliteSession.h"
+#include "platform/ado/postgres/Session.h"
+#include "platform/ado/sqlite/Session.h"
 #include "platform/core/Failure.h"
 
 namespace ado {
@@ -25,14 +25,14 @@ Source parted(const QString& dataSource) {
 
 std::shared_ptr<Session> openServer(const ConnectionSettings& settings, const QString& place,
                                     const QString& catalog, int timeoutSeconds) {
-    PostgresAddress address;
+    postgres::Address address;
     address.place(place);
     address.catalog = catalog;
     address.user = settings.value(u"User ID"_s);
     address.password = settings.value(u"Password"_s);
     if (const int seconds = settings.value(u"Connect Timeout"_s).toInt(); seconds > 0)
         address.connectSeconds = seconds;
-    return std::make_shared<PostgresSession>(address, timeoutSeconds);
+    return std::make_shared<postgres::Session>(address, timeoutSeconds);
 }
 
 /// The engine that `Data Source` names, on the book that `Initial Catalog` names.
@@ -50,7 +50,7 @@ std::shared_ptr<Session> openSession(const ConnectionSettings& settings, int tim
         throw refuse(u"as formas conhecidas são «sqlite:PASTA» e «postgresql:SERVIDOR[:PORTA]»."_s);
     if (catalog.isEmpty()) throw refuse(u"falta o nome do livro (Initial Catalog)."_s);
     if (isServer) return openServer(settings, place, catalog, timeoutSeconds);
-    return std::make_shared<SqliteSession>(place, catalog, timeoutSeconds);
+    return std::make_shared<sqlite::Session>(place, catalog, timeoutSeconds);
 }
 
 }  // namespace
@@ -78,7 +78,7 @@ bool isReadableOnTheWay(const QString& dataSource) {
     const auto& [engine, place] = parted(dataSource);
     if (engine != Server) return false;
     try {
-        PostgresAddress address;
+        postgres::Address address;
         address.place(place);
         return address.isReadable();
     } catch (const core::Failure&) {

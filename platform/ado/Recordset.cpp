@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/Recordset.h"
 
-#include "platform/ado/ColumnValue.h"
 #include "platform/ado/RecordsetImplementation.h"
+#include "platform/ado/engine/ColumnValue.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Values.h"
 

@@ -5,27 +5,15 @@
 #include <QVariant>
 #include <memory>
 
-#include "platform/ado/Accompanying.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/Constants.h"
+#include "platform/ado/engine/Accompanying.h"
+#include "platform/ado/engine/Column.h"
 
 namespace ado {
 
 class Recordset;
 using RecordsetPtr = std::shared_ptr<Recordset>;
-
-/// What a column keeps.
-enum class ColumnType {
-    Integer16,
-    Integer32,
-    Integer64,
-    Single,
-    Double,
-    Money,
-    DateTime,
-    Text,
-    Other
-};
 
 /// One column of a row set; a light view that stays valid while the row set stays open.
 class Field {

@@ -8,7 +8,7 @@
 
 #include "platform/ado/Recordset.h"
 #include "platform/ado/Rows.h"
-#include "platform/ado/ShapeStatement.h"
+#include "platform/ado/dialect/ShapeQuery.h"
 
 namespace ado {
 
@@ -86,8 +86,8 @@ struct Recordset::Implementation {
 
     // Opening.
     void openRows();
-    void openStatement(const Statement& statement);
-    void openShape(const Statement& statement);
+    void openStatement(const Query& statement);
+    void openShape(const Query& statement);
     void close();
 
     // Moving.

@@ -2,10 +2,10 @@
 // Opening, moving and reading of row sets.
 #include <limits>
 
-#include "platform/ado/ColumnValue.h"
-#include "platform/ado/EngineTexts.h"
 #include "platform/ado/RecordsetImplementation.h"
-#include "platform/ado/Statement.h"
+#include "platform/ado/dialect/Query.h"
+#include "platform/ado/engine/ColumnValue.h"
+#include "platform/ado/engine/EngineTexts.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Values.h"
 
@@ -33,11 +33,11 @@ int requireColumn(const Pass& pass, const QString& name) {
 void Recordset::Implementation::openRows() {
     const std::shared_ptr<Session> engine = connection->session();
     engine->setTimeout(connection->CommandTimeout);
-    const Statement statement(source);
+    const Query statement(source);
     statement.requireQuery(connection->shapes());
     book = engine->book();
     try {
-        if (ShapeStatement::isShape(statement)) {
+        if (ShapeQuery::isShape(statement)) {
             openShape(statement);
         } else {
             openStatement(statement);
@@ -48,7 +48,7 @@ void Recordset::Implementation::openRows() {
     at = rows->toFirst() ? At::Row : At::Nothing;
 }
 
-void Recordset::Implementation::openStatement(const Statement& statement) {
+void Recordset::Implementation::openStatement(const Query& statement) {
     Session& engine = *connection->session();
     if (!readOnly()) table = statement.singleTable();
     if (!table.isEmpty() && !engine.isTable(table)) table.clear();
@@ -63,10 +63,10 @@ void Recordset::Implementation::openStatement(const Statement& statement) {
     if (rows->toFirst()) heldPlace.reset();
 }
 
-void Recordset::Implementation::openShape(const Statement& statement) {
-    const ShapeStatement shape = ShapeStatement::parse(statement);
-    const Statement parent(shape.parent);
-    const Statement child(shape.child);
+void Recordset::Implementation::openShape(const Query& statement) {
+    const ShapeQuery shape = ShapeQuery::parse(statement);
+    const Query parent(shape.parent);
+    const Query child(shape.child);
     parent.requireQuery(false);
     child.requireQuery(false);
     Session& engine = *connection->session();

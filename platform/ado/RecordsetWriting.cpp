@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // Writing of row sets.
-#include "platform/ado/ColumnValue.h"
-#include "platform/ado/EngineTexts.h"
 #include "platform/ado/RecordsetImplementation.h"
+#include "platform/ado/engine/ColumnValue.h"
+#include "platform/ado/engine/EngineTexts.h"
 #include "platform/core/Failure.h"
 
 namespace ado {

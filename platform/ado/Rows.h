@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "platform/ado/RowStore.h"
+#include "platform/ado/engine/RowStore.h"
 
 namespace ado {
 

@@ -4,7 +4,7 @@
 
 #include <QHash>
 
-#include "platform/ado/StatementTranslator.h"
+#include "platform/ado/dialect/Translator.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Lines.h"
 
@@ -58,7 +58,7 @@ TEST_P(Translator, Keeps) {
     for (const auto& [dialect, after] : {std::pair(ado::Dialect::Sqlite, rule.sqlite),
                                          {ado::Dialect::Postgres, rule.postgresql}}) {
         SmallSchema schema(dialect);
-        EXPECT_EQ(ado::translate(ado::Statement(rule.before), schema, false, dialect), after);
+        EXPECT_EQ(ado::translate(ado::Query(rule.before), schema, false, dialect), after);
     }
 }
 
@@ -66,7 +66,7 @@ INSTANTIATE_TEST_SUITE_P(Rule, Translator, testing::ValuesIn(rules()),
                          [](const auto& rule) { return rule.param.name.toStdString(); });
 
 TEST(Statement, IsReadWithItsIdentityBeforeTheColumns) {
-    const ado::Statement statement(u"select * from tbB where id=1;"_s);
+    const ado::Query statement(u"select * from tbB where id=1;"_s);
     SmallSchema file(ado::Dialect::Sqlite);
     EXPECT_EQ(ado::translate(statement, file, true),
               u"select _rowid_,* from tbB where id=1 ORDER BY \"tbB\"._rowid_"_s);

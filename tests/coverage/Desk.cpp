@@ -44,7 +44,7 @@ Desk::~Desk() {
 
 coverage::Entry Desk::enter(const Document& document) const {
     const ado::RecordsetPtr row = ado::Recordset::create();
-    row->Open(data::NoMovementStatement.toString(), environment::dtZelmars::instance().MSAccess(),
+    row->Open(data::NoMovementQuery.toString(), environment::dtZelmars::instance().MSAccess(),
               ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
     row->AddNew();
     const QVariant& ninth = document.hospital ? document.incidencia : document.recebido;

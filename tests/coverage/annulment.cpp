@@ -3,7 +3,7 @@
 #include "coverage/annulment.h"
 
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "platform/core/Failure.h"
 #include "tests/coverage/Desk.h"
 #include "tests/support/Failure.h"

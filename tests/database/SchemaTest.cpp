@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include <gtest/gtest.h>
 
-#include "coverage/Statements.h"
+#include "coverage/Queries.h"
 #include "tests/support/Book.h"
 
 using namespace Qt::StringLiterals;

@@ -11,7 +11,7 @@
 #include "database/ServerBook.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/ConnectionSettings.h"
-#include "platform/ado/PostgresHandle.h"
+#include "platform/ado/postgres/Handle.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Server.h"
 
@@ -126,7 +126,7 @@ TEST_F(Encryption, IsForEverythingThatIsNotThisMachine) {
         {u"localhost,servidor"_s, false},
     };
     for (const auto& row : cases)
-        EXPECT_EQ(ado::isLocalHost(row.host), row.isLocal) << qPrintable(row.host);
+        EXPECT_EQ(ado::postgres::isLocalHost(row.host), row.isLocal) << qPrintable(row.host);
 }
 
 TEST_F(Encryption, IsGivenUpByOneWordOnly) {

@@ -1,0 +1,35 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <vector>
+
+#include "platform/ado/engine/Session.h"
+
+namespace ado {
+
+/// Rows in memory, packed: a byte for a null, nine for a number, a text's bytes and five more. A
+/// value is unpacked when it is asked for.
+class RowStore {
+public:
+    qint64 count() const { return static_cast<qint64>(starts_.size()); }
+    void clear();
+    /// True when both keep the same rows with the same values.
+    bool operator==(const RowStore&) const = default;
+
+    /// Appends the row that the pass stands on.
+    void append(const Pass& pass);
+    // The same by steps: one beginRow, then the cells of all columns in their order.
+    void beginRow(RowIdentity identity);
+    void add(const Cell& cell);
+
+    /// Null for a column that the row does not have: the table was altered since.
+    Cell cell(qint64 row, int column) const;
+    RowIdentity identity(qint64 row) const { return identities_[static_cast<std::size_t>(row)]; }
+
+private:
+    std::vector<char> bytes_;
+    std::vector<std::size_t> starts_;
+    std::vector<RowIdentity> identities_;
+};
+
+}  // namespace ado

@@ -1,0 +1,163 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <libpq-fe.h>
+
+#include <QByteArray>
+#include <QDeadlineTimer>
+#include <QHash>
+#include <QString>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace core {
+class Wait;
+}
+
+namespace ado::postgres {
+
+/// True for what never leaves this machine: the folder of a local socket, "localhost" and the
+/// loopback addresses in their usual form (127.0.0.0/8, ::1). Any other name counts as remote,
+/// wherever it leads now, because whoever answers for names may lead it elsewhere.
+bool isLocalHost(const QString& host);
+
+/// An option of the client library for a new connection.
+struct Option {
+    const char* name;
+    QByteArray value;
+};
+
+/// Where a book is and who opens it.
+struct Address {
+    QString host;  ///< a name, an address, or a folder with the server's local socket
+    QString port;  ///< empty for the server's usual one
+    QString user;
+    QString password;
+    QString catalog;
+    int connectSeconds = 15;   ///< after which a server counts as gone
+    bool allowsPlain = false;  ///< somebody decided that nothing need be encrypted on the way
+
+    /// Reads "HOST[:PORT][?tls=no]"; an IPv6 address stands in brackets. Fails when the port is
+    /// none or another word follows.
+    void place(const QString& text);
+    /// The server alone, as place() reads it behind "postgresql:".
+    QString source() const;
+    /// Server and book, as texts of failures name them; never the password.
+    QString shown() const;
+    /// True when anybody on the way to the server can read along.
+    bool isReadable() const { return allowsPlain && !isLocalHost(host); }
+
+    /// What a host's name stands for.
+    struct Found {
+        QByteArray hosts;      ///< for each address the name, parted by commas
+        QByteArray addresses;  ///< empty for a local socket
+        QString error;         ///< why there is none
+        bool isLate = false;   ///< the deadline came first
+    };
+    /// Fails when the operator gives up.
+    Found lookUp(const QDeadlineTimer& deadline) const;
+    /// The same as isReadable() once it is known where the name leads.
+    bool isReadable(const Found& found) const;
+    /// All that the client library needs to know to connect. Without the plain setting a remote
+    /// server must encrypt and must prove that it knows the password; where a root certificate is
+    /// configured it must also show a certificate for its name that this root has signed.
+    std::vector<Option> options(const Found& found) const;
+};
+
+struct ClearResult {
+    void operator()(PGresult* result) const { PQclear(result); }
+};
+using Result = std::unique_ptr<PGresult, ClearResult>;
+/// Parameters as text; nothing for null.
+using Values = std::vector<std::optional<QByteArray>>;
+
+/// A statement with the values of its parameters.
+struct Call {
+    QByteArray text;
+    Values values;
+};
+
+/// One connection to a server. No call waits longer than its time-out, also when the server stops
+/// answering. Failures carry the server's text and its SQLSTATE.
+///
+/// The client library's pipeline is always on: statements are sent one behind the other and make
+/// one transaction up to the next synchronisation.
+class Handle {
+public:
+    enum class Role { Reader, Writer };
+
+    Handle(const Address& address, Role role);
+    ~Handle();
+    Handle(const Handle&) = delete;
+    Handle& operator=(const Handle&) = delete;
+
+    /// A bare connection, for work of another kind than a workstation's; the caller's own.
+    static PGconn* connected(const Address& address);
+
+    /// Seconds that a statement may run or wait for a lock.
+    void setTimeout(int seconds);
+    /// True when the connection is of no use any more.
+    bool isLost();
+
+    /// Runs statements in one round trip and commits them; gives the answer of the last one. They
+    /// stay prepared.
+    Result run(const std::vector<Call>& calls);
+    Result run(const QByteArray& text, const Values& values = {}) {
+        return run(std::vector<Call>{{text, values}});
+    }
+    /// Runs one statement and, once it is answered, commits it: a server that wakes up late finds
+    /// nobody to commit, so that a row added again after a failure stands once. Where only the
+    /// answer to the commit is lost, the failure's text says so.
+    /// @param more  what goes into the same commit, told by the answer; may be nothing
+    using More = std::function<std::optional<Call>(const PGresult* answer)>;
+    Result runThenCommit(const Call& call, const More& more);
+    /// Runs one statement that will hardly come again, and commits it.
+    Result runOnce(const QByteArray& text);
+    /// Sends a statement and commits it, without waiting for the answer, which nobody sees.
+    void send(const Call& call);
+    void send(const QByteArray& text);
+
+    /// Sends statements of an open transaction; answer() waits for the last one's answer. One that
+    /// nobody waited for is dropped. After a failure nothing of the transaction is left.
+    void ask(const std::vector<QByteArray>& texts);
+    Result answer();
+    /// Ends the open transaction, without waiting.
+    void finish();
+
+private:
+    Handle() = default;
+    void connect(const Address& address);
+    void start(const Address& address, const Address::Found& found);
+    bool wantsBarePassword() const;
+    void settle(Role role);
+    /// Both give the number of answers that will come.
+    int dispatch(const QByteArray& text);
+    int dispatch(const Call& call);
+    void forget(const QByteArray& text);
+    void flush();
+    void synchronise();
+    Result drain(int but);
+    PGresult* take();
+    void wait(core::Wait& waiting);
+    int patience() const;
+    void requireConnection();
+    Result answers(int count);
+    Result committed(int count);
+    [[noreturn]] void refuse(const PGresult* result);
+    [[noreturn]] void lose(const QString& text, const QString& code = QStringLiteral("08006"));
+
+    PGconn* connection_ = nullptr;
+    QString place_;
+    QString awaited_;  ///< what the operator reads while an answer is waited for
+    bool lost_ = false;
+    int timeout_ = -1;
+    int unread_ = 0;  ///< synchronisations whose answers nobody has read
+    int asked_ = 0;   ///< statements that answer() waits for
+    QDeadlineTimer deadline_;
+    QHash<QByteArray, QByteArray> prepared_;  ///< names by text
+    int lastPrepared_ = 0;
+};
+
+}  // namespace ado::postgres

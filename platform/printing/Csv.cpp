@@ -1,0 +1,123 @@
+// SPDX-License-Identifier: MIT
+#include <QRegularExpression>
+#include <algorithm>
+
+#include "platform/core/Format.h"
+#include "platform/core/Money.h"
+#include "platform/core/Values.h"
+#include "platform/printing/Output.h"
+#include "platform/printing/SavedFile.h"
+#include "platform/printing/Sections.h"
+
+using namespace Qt::StringLiterals;
+
+namespace printing {
+
+namespace {
+
+/// The columns of a section in the order of its fields, each once.
+QStringList columnsOf(const Section& section) {
+    QStringList columns;
+    for (const Item& item : section.items)
+        if (const auto* field = std::get_if<Field>(&item);
+            field && !columns.contains(field->column, Qt::CaseInsensitive))
+            columns << field->column;
+    return columns;
+}
+
+/// A text that a spreadsheet would run as a formula or read as a date or as a number that has lost
+/// digits ("00123", a bank number, "1E5") is kept a text by a leading apostrophe, the one mark that
+/// none of them runs or reads on. A number that stays as it is needs none.
+QString harmless(const QString& text) {
+    static const QRegularExpression risky(uR"(^[=+\-@\t\r]|^[\d.,][\d.,:/ Ee+\-]*$)"_s);
+    static const QRegularExpression sameNumber(uR"(^-?(0|[1-9]\d{0,9})(,\d{0,3}[1-9])?$)"_s);
+    return risky.match(text).hasMatch() && !sameNumber.match(text).hasMatch() ? u'\'' + text : text;
+}
+
+/// Of a text, whatever it holds, so that no reader takes a sign in it for the end of the cell.
+QString quoted(const QString& text) {
+    return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
+}
+
+/// The names of columns as cells.
+QStringList heading(const QStringList& names) {
+    QStringList cells;
+    for (const QString& name : names) cells << quoted(name);
+    return cells;
+}
+
+/// A computed column comes as a double, with what it lies beside the amount meant.
+QVariant asAmount(const QVariant& value) {
+    if (value.typeId() != QMetaType::Double) return value;
+    return QVariant::fromValue(core::Money::fromDouble(value.toDouble()));
+}
+
+QString cell(const QVariant& value) {
+    if (value.typeId() != QMetaType::QString)
+        return core::formatted(asAmount(value), {}, core::portugueseLocale());
+    return quoted(harmless(value.toString()));
+}
+
+class CsvFile {
+public:
+    explicit CsvFile(const QString& name) : file_(name) {
+        if (!openPrivately(file_)) failToWrite(file_);
+        file_.write("\xEF\xBB\xBF");
+    }
+    void line(const QStringList& cells) { file_.write(cells.join(u';').toUtf8() + "\r\n"); }
+    void close() {
+        if (!file_.commit()) failToWrite(file_);
+    }
+
+private:
+    QSaveFile file_;
+};
+
+/// The columns of one row set.
+class Cells {
+public:
+    Cells(const QStringList& names, ado::Recordset& rows) {
+        for (const QString& name : names) values_.place(name);
+        values_.lookUp(rows);
+    }
+    QStringList of(const ado::Recordset& rows, qint64 row) {
+        values_.read(rows, row);
+        QStringList cells;
+        for (const QVariant& value : values_.values()) cells << cell(value);
+        return cells;
+    }
+
+private:
+    RowValues values_;
+};
+
+void writeGroups(CsvFile& file, const Report& report, ado::Recordset& rows) {
+    Cells group(columnsOf(report.groupHeader), rows);
+    for (qint64 row = 0; row < rows.rowsInMemory(); ++row) {
+        rows.MoveTo(row);
+        const ado::RecordsetPtr children = rows.Chapter(report.chapter);
+        const QStringList head = group.of(rows, row);
+        Cells detail(columnsOf(report.detail), *children);
+        for (qint64 child = 0; child < children->rowsInMemory(); ++child)
+            file.line(head + detail.of(*children, child));
+    }
+}
+
+}  // namespace
+
+void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file) {
+    rows->readAll();
+    CsvFile out(file);
+    const QStringList columns = columnsOf(report.detail);
+    if (!report.chapter.isEmpty()) {
+        out.line(heading(columnsOf(report.groupHeader) + columns));
+        writeGroups(out, report, *rows);
+    } else {
+        out.line(heading(columns));
+        Cells detail(columns, *rows);
+        for (qint64 row = 0; row < rows->rowsInMemory(); ++row) out.line(detail.of(*rows, row));
+    }
+    out.close();
+}
+
+}  // namespace printing

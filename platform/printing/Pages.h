@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <QByteArray>
+#include <QLineF>
+#include <QRectF>
+#include <QString>
+#include <vector>
+
+#include "platform/printing/Report.h"
+
+namespace printing {
+
+/// One line of text at its place, already formatted and cut to its box. Millimetres from the
+/// page's upper left corner.
+struct TextRun {
+    QPointF baseline;  ///< where the first letter stands
+    double width = 0;  ///< of the text as measured
+    QString text;
+    Style style;
+    bool open = false;  ///< the number of pages is still missing: see Pages::resolved
+};
+
+struct Line {
+    QLineF line;
+    double width = 0;
+};
+
+struct Box {
+    QRectF rect;
+    bool shaded = false;
+    bool framed = false;
+};
+
+/// What stands on a page, in painting order: boxes, lines, texts.
+struct Page {
+    std::vector<Box> boxes;
+    std::vector<Line> lines;
+    std::vector<TextRun> texts;
+};
+
+/// The pages laid out so far, packed, so that thousands of them take little memory.
+class Pages {
+public:
+    QString caption;  ///< of the report
+
+    int count() const { return static_cast<int>(pages_.size()); }
+    /// Unpacks a page (a fraction of a millisecond); keep it while working with its texts.
+    Page at(int page) const;
+    /// True when no page is to come; the number of pages is known from then on.
+    bool isComplete() const { return complete_; }
+
+    /// A run with the number of pages filled in ("…" while it is not known), moved as its alignment
+    /// wants. Other runs as they are.
+    TextRun resolved(const TextRun& run) const;
+
+    void add(const Page& page);
+    void complete() { complete_ = true; }
+
+private:
+    std::vector<QByteArray> pages_;
+    bool complete_ = false;
+};
+
+}  // namespace printing

@@ -1,0 +1,93 @@
+// SPDX-License-Identifier: MIT
+// Whole pages against lists that somebody has looked at: text, place and style of everything on
+// them. ZELMARS_WRITE_GOLDEN=1 writes the lists anew; look at what changed.
+#include <QFile>
+#include <QTextStream>
+
+#include "reports/ExtractReports.h"
+#include "tests/printing/Ledger.h"
+
+using namespace Qt::StringLiterals;
+
+namespace {
+
+QString describe(const printing::Pages& pages) {
+    QString shown;
+    QTextStream out(&shown);
+    out.setRealNumberNotation(QTextStream::FixedNotation);
+    out.setRealNumberPrecision(1);
+    for (int at = 0; at < pages.count(); ++at) {
+        out << "page " << at + 1 << " of " << pages.count() << '\n';
+        const printing::Page page = pages.at(at);
+        for (const auto& [rect, shaded, framed] : page.boxes)
+            out << "box " << rect.left() << ' ' << rect.top() << ' ' << rect.width() << ' '
+                << rect.height() << (shaded ? " shaded" : "") << (framed ? " framed\n" : "\n");
+        for (const auto& [line, width] : page.lines)
+            out << "line " << line.x1() << ' ' << line.y1() << ' ' << line.x2() << ' ' << line.y2()
+                << " width " << width << '\n';
+        for (const printing::TextRun& each : page.texts) {
+            const auto& [place, width, text, style, open] = pages.resolved(each);
+            out << place.x() << ' ' << place.y() << " [" << style.points << (style.bold ? "b" : "")
+                << (style.italic ? "i" : "") << "lcr"[static_cast<int>(style.align)] << "] " << text
+                << '\n';
+        }
+    }
+    return shown;
+}
+
+/// What the file holds; what it ought to hold is written there when that is asked for.
+QString golden(const QString& name, const QString& shown) {
+    QFile file(QStringLiteral(GOLDEN_FOLDER "/") + name + u".txt"_s);
+    if (qEnvironmentVariableIsSet("ZELMARS_WRITE_GOLDEN"))
+        if (file.open(QIODevice::WriteOnly)) file.write(shown.toUtf8()), file.close();
+    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll())
+                                          : u"missing: "_s + file.fileName();
+}
+
+TEST_F(Ledger, PrintsStatementsAsTheyWereSeen) {
+    const struct {
+        printing::Report report;
+        const char16_t* name;
+        int rows;
+        int pages;
+    } statements[] = {
+        {reports::rptExtrato2(), u"summary-empty", 0, 1},
+        {reports::rptExtrato2(), u"summary-one", 1, 1},
+        {reports::rptExtrato2(), u"summary-full-page", 39, 1},
+        {reports::rptExtrato2(), u"summary-one-too-many", 40, 2},
+        {reports::rptExtrato2(), u"summary-many", 120, 3},
+        {reports::prtExtrato1(), u"detailed-empty", 0, 1},
+        {reports::prtExtrato1(), u"detailed-one", 1, 1},
+        {reports::prtExtrato1(), u"detailed-full-page", 7, 1},
+        {reports::prtExtrato1(), u"detailed-many", 20, 3},
+    };
+    for (const auto& statement : statements) {
+        const QString name = QString::fromUtf16(statement.name);
+        SCOPED_TRACE(name.toStdString());
+        book.exec(u"delete from tbZelmar_Movimentos"_s);
+        fill(statement.rows);
+        const auto pages = laidOut(statement.report, movements());
+        EXPECT_EQ(pages->count(), statement.pages);
+        const QString shown = describe(*pages);
+        EXPECT_EQ(shown, golden(name, shown));
+    }
+}
+
+TEST_F(Ledger, PrintsGroupsOverSeveralPages) {
+    for (const QString& name : {u"Hospital A"_s, u"Hospital B"_s, u"Hospital sem contas"_s})
+        book.hospital(name.right(1), name);
+    fill(130);
+    const auto pages = laidOut(twoLevels(), open(TwoLevelStatement));
+    const QString shown = describe(*pages);
+    EXPECT_EQ(shown, golden(u"two-levels"_s, shown));
+    // 65 movements of each hospital, each one euro more debit than credit.
+    const QString last = textsOf(*pages, pages->count() - 1);
+    EXPECT_TRUE(
+        last.contains(u"Total:|€ 65,00|Hospital:|Hospital sem contas|Nº|Dívida|Total:|"
+                      "€ 0,00|Registos:|130|Soma:|€ 130,00"_s))
+        << last.toStdString();
+    for (int page = 0; page < pages->count(); ++page)
+        EXPECT_TRUE(textsOf(*pages, page).startsWith(u"Hospital:|Hospital "_s));
+}
+
+}  // namespace
