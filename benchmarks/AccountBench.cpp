@@ -88,9 +88,9 @@ void runBareAnnulment(Bare& bare, const ado::Recordset& shown) {
         value(u"rubrica_id"_s) +
         ", '2026-11-20 00:00:00', 'COR', '1234', '2026-11-20 00:00:00', 40, -28, -28)");
     const QByteArray own =
-        coverage::statements::accumulator(shown.Collect(u"rubrica_id"_s),
-                                          core::toLong(shown.Collect(u"socio_id"_s)),
-                                          core::toText(shown.Collect(u"codABC"_s)))
+        coverage::queries::accumulator(shown.Collect(u"rubrica_id"_s),
+                                       core::toLong(shown.Collect(u"socio_id"_s)),
+                                       core::toText(shown.Collect(u"codABC"_s)))
             .toUtf8();
     writeHeld(bare, own,
               "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac - 28, debito_ac = debito_ac "

@@ -125,7 +125,7 @@ public:
     void run() {
         book_.run(u"select * from tbzelmar_movimentos where movimento_id = 0"_s);
         tryOut();
-        book_.run(coverage::statements::member(job_.socio_id));
+        book_.run(coverage::queries::member(job_.socio_id));
         if (job_.isBill) takeCheque();
         save(drawNumber());
         addToAccumulator();
@@ -133,7 +133,7 @@ public:
 
 private:
     void tryOut() {
-        using namespace coverage::statements;
+        using namespace coverage::queries;
         const Row row = book_.run(rubric(job_.rubrica_id));
         const int main = row[1].toInt();
         const bool hasFranchise = row.last().toDouble() != 0;
@@ -167,7 +167,7 @@ private:
         return u"a%1 %2 %3"_s.arg(job_.socio_id).arg(job_.codABC).arg(job_.rubrica_id).toUtf8();
     }
     QString accumulator() const {
-        return coverage::statements::accumulator(job_.rubrica_id, job_.socio_id, job_.codABC);
+        return coverage::queries::accumulator(job_.rubrica_id, job_.socio_id, job_.codABC);
     }
     Row lookUpAccumulator() { return held(accumulatorKey(), accumulator()); }
 

@@ -49,24 +49,22 @@ ado::RecordsetPtr pendingRow() {
     return rows;
 }
 
-coverage::Entry entryFor(const Case& of, const ado::RecordsetPtr& record) {
-    coverage::Entry entry;
-    entry.record = record;
-    entry.Socio_ID = of.socio_id;
-    entry.caption = u"Medição"_s;
-    entry.Text3 = of.codABC;
-    entry.Text6 = u"40"_s;
-    entry.Text9 = u"0"_s;
-    entry.DataCombo1 = u"rúbrica"_s;
-    entry.rubrica_id = of.rubrica_id;
+coverage::Document documentFor(const Case& of, const ado::RecordsetPtr& record) {
     record->setCollect(u"codABC"_s, of.codABC);
     record->setCollect(u"rubrica_id"_s, of.rubrica_id);
-    return entry;
+    return {.record = record,
+            .socio_id = of.socio_id,
+            .caption = u"Medição"_s,
+            .personCode = of.codABC,
+            .documentValue = u"40"_s,
+            .receivedOrIncidence = u"0"_s,
+            .rubric = u"rúbrica"_s,
+            .rubrica_id = of.rubrica_id};
 }
 
 void runTryOut(const Case& of, const ado::RecordsetPtr& record) {
     coverage::TryOut run;
-    coverage::tryOut(entryFor(of, record), run);
+    coverage::tryOut(documentFor(of, record), run);
 }
 
 /// A lookup of a pessimistic row: it is found, held, read as it is then, and let go.
@@ -80,7 +78,7 @@ void lookUpHeld(Bare& bare, const QByteArray& row, const QString& statement) {
 
 /// The statements and locks of one try-out.
 void runBareTryOut(Bare& bare, const Case& of) {
-    using namespace coverage::statements;
+    using namespace coverage::queries;
     const auto run = [&bare](const QString& statement) { return bare.run(statement.toUtf8()); };
     const double main = bare.run(rubric(of.rubrica_id).toUtf8(), 1);
     const QString own = accumulator(of.rubrica_id, of.socio_id, of.codABC);
@@ -110,7 +108,7 @@ void postBareMovement(Bare& bare, const Case& of, qint64 number) {
 /// What a posting adds to its try-out.
 void runBarePosting(Bare& bare, const Case& of) {
     runBareTryOut(bare, of);
-    bare.run(coverage::statements::member(of.socio_id).toUtf8());
+    bare.run(coverage::queries::member(of.socio_id).toUtf8());
     const QByteArray counter = "SELECT zelmars FROM tbContadores";
     auto number = static_cast<qint64>(bare.run(counter));
     if (bare.hold("counter")) number = static_cast<qint64>(bare.run(counter));
@@ -118,7 +116,7 @@ void runBarePosting(Bare& bare, const Case& of) {
     bare.letGo("counter");
     postBareMovement(bare, of, number);
     const QByteArray own =
-        coverage::statements::accumulator(of.rubrica_id, of.socio_id, of.codABC).toUtf8();
+        coverage::queries::accumulator(of.rubrica_id, of.socio_id, of.codABC).toUtf8();
     bare.run(own);
     if (bare.hold(own)) bare.run(own);
     bare.run(
@@ -130,12 +128,12 @@ void runBarePosting(Bare& bare, const Case& of) {
 }
 
 void runPosting(const Case& of) {
-    coverage::PostingEntry posting;
-    posting.entry = entryFor(of, pendingRow());
-    posting.DataCombo3 = u"TRF - Transferência"_s;
-    posting.modo_pagamento = u"TRF"_s;
-    posting.Text7 = posting.Text1 = u"20-11-2026"_s;
-    posting.Text5 = u"1234"_s;
+    const coverage::Posting posting{.document = documentFor(of, pendingRow()),
+                                    .paymentMode = u"TRF - Transferência"_s,
+                                    .modo_pagamento = u"TRF"_s,
+                                    .movementDate = u"20-11-2026"_s,
+                                    .documentDate = u"20-11-2026"_s,
+                                    .documentNumber = u"1234"_s};
     coverage::TryOut run;
     data::Operation operation;
     coverage::post(posting, run, operation);

@@ -5,7 +5,7 @@
 
 using namespace Qt::StringLiterals;
 
-namespace coverage::statements {
+namespace coverage::queries {
 
 QString rubric(const QVariant& rubrica_id) {
     return u"Select * from tbZelmar_plafonds where rubrica_id ="_s + core::toText(rubrica_id);
@@ -78,4 +78,4 @@ QString member(qint32 socio_id) {
     return u"Select * from tbSocios where socio_id="_s + QString::number(socio_id);
 }
 
-}  // namespace coverage::statements
+}  // namespace coverage::queries

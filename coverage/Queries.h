@@ -4,9 +4,9 @@
 #include <QString>
 #include <QVariant>
 
-/// The statements of the coverage rules. Values are joined in as they stand: numbers bare, texts
+/// The queries of the coverage rules. Values are joined in as they stand: numbers bare, texts
 /// between single quotes with no escaping.
-namespace coverage::statements {
+namespace coverage::queries {
 
 /// One row: a rubric.
 QString rubric(const QVariant& rubrica_id);
@@ -35,4 +35,4 @@ QString franchise(qint32 socio_id, const QVariant& rubrica_id);
 /// One row: a member.
 QString member(qint32 socio_id);
 
-}  // namespace coverage::statements
+}  // namespace coverage::queries

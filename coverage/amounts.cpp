@@ -3,8 +3,6 @@
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/Queries.h"
 #include "coverage/stages.h"
-#include "data/Procedures.h"
-#include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
 
@@ -12,27 +10,17 @@ namespace coverage {
 
 namespace {
 
-/// The first row of a statement on the shaping connection, where the sums run.
-ado::RecordsetPtr openSums(const QString& statement) {
+/// The first row of a query on the shaping connection, where the sums run.
+ado::RecordsetPtr openSums(const QString& query) {
     const ado::RecordsetPtr sums = ado::Recordset::create();
-    sums->Open(statement, environment::dtZelmars::instance().SqlServer());
+    sums->Open(query, environment::dtZelmars::instance().SqlServer());
     return sums;
-}
-
-float single(const Entry& entry, const QString& column) {
-    return core::toSingle(entry.record->Collect(column));
-}
-
-/// Writes a column and gives back what it keeps.
-QVariant write(const Entry& entry, const QString& column, const QVariant& value) {
-    entry.record->setCollect(column, value);
-    return entry.record->Collect(column);
 }
 
 /// The member's balance before this document: debits less credits. No accumulator is 0; a null sum
 /// gives a null balance.
-QVariant balance(const Entry& entry) {
-    const ado::RecordsetPtr sums = openSums(statements::balance(entry.Socio_ID));
+QVariant balance(qint32 socio_id) {
+    const ado::RecordsetPtr sums = openSums(queries::balance(socio_id));
     if (sums->atEnd()) return 0;
     const QVariant debit = sums->Collect(u"tdebito_ac"_s);
     const QVariant credit = sums->Collect(u"tcredito_ac"_s);
@@ -40,64 +28,50 @@ QVariant balance(const Entry& entry) {
     return core::toDouble(debit) - core::toDouble(credit);
 }
 
-float gross(const Entry& entry) {
-    const float share = single(entry, u"comparticipacao"_s);
-    if (entry.bHospital) return share;
-    const double left = core::toDouble(entry.record->Collect(u"incidencia"_s)) -
-                        core::toDouble(entry.record->Collect(u"recebido"_s));
-    return data::MinSingle(share, core::toSingle(left));
+Single gross(const Course& course) {
+    const Single share = course.single(u"comparticipacao"_s);
+    if (course.document.isHospital) return share;
+    return grossAmount(share, core::toDouble(course.value(u"incidencia"_s)),
+                       core::toDouble(course.value(u"recebido"_s)));
 }
 
-/// How much of the franchise the family has spent on this rubric. Can be negative.
-float spentFranchise(const Entry& entry) {
+/// How much of the franchise the family has spent on this rubric.
+Single spent(const Document& document) {
     const ado::RecordsetPtr sums =
-        openSums(statements::franchise(entry.Socio_ID, entry.rubrica_id));
-    if (sums->atEnd()) return 0.0F;
+        openSums(queries::franchise(document.socio_id, document.rubrica_id));
+    if (sums->atEnd()) return {};
     const QVariant net = sums->Collect(u"t_iliquido"_s);
     const QVariant credit = sums->Collect(u"t_credito"_s);
-    if (core::isNull(net) || core::isNull(credit)) return 0.0F;
-    return core::toSingle(core::toDouble(net) - core::toDouble(credit));
+    if (core::isNull(net) || core::isNull(credit)) return {};
+    return spentFranchise(core::toDouble(net), core::toDouble(credit));
 }
 
-/// The net amount less what is left of the franchise, never below 0 by the franchise.
-float creditAfterFranchise(const Entry& entry, float franquia) {
-    const float net = single(entry, u"liquido"_s);
-    if (franquia == 0.0F) return net;
-    const float consumido = spentFranchise(entry);
-    if (!(consumido < franquia)) return net;
-    const float resto =
-        core::toSingle(static_cast<double>(franquia) - static_cast<double>(consumido));
-    return resto < net ? net - resto : 0.0F;
+Single credit(const Course& course) {
+    const Single net = course.single(u"liquido"_s);
+    if (course.franchise == Single()) return net;
+    return creditAmount(net, course.franchise, spent(course.document));
 }
 
 }  // namespace
 
-void setAmounts(const Entry& entry, const Working& working, Progress& progress, TryOut& run) {
-    if (!entry.bHospital)
-        run.show(&Results::SaldoCC, write(entry, u"saldo_acumulado"_s, balance(entry)));
-    progress.advance();
-
-    run.show(&Results::Iliquido, write(entry, u"iliquido"_s, gross(entry)));
-    progress.advance();
-
-    const float net =
-        data::MinSingle(single(entry, u"iliquido"_s), single(entry, u"saldo_plafond"_s));
-    run.show(&Results::Liquido, write(entry, u"liquido"_s, net));
-    progress.advance();
-
-    run.show(&Results::Credito,
-             write(entry, u"credito"_s, creditAfterFranchise(entry, working.franquia)));
-    progress.advance();
-
-    if (entry.bHospital) {
-        write(entry, u"debito"_s, single(entry, u"doc_valor"_s));
-        run.show(&Results::Debito, entry.record->Collect(u"doc_valor"_s));
+void setAmounts(Course& course) {
+    const bool isHospital = course.document.isHospital;
+    if (isHospital)
+        course.progress.advance();
+    else
+        course.reach(Result::SaldoCC, u"saldo_acumulado"_s, balance(course.document.socio_id));
+    course.reach(Result::Iliquido, u"iliquido"_s, gross(course));
+    course.reach(Result::Liquido, u"liquido"_s,
+                 netAmount(course.single(u"iliquido"_s), course.single(u"saldo_plafond"_s)));
+    course.reach(Result::Credito, u"credito"_s, credit(course));
+    if (isHospital) {
+        course.keep(u"debito"_s, course.single(u"doc_valor"_s));
+        // Intentional: the value itself, and not what the column keeps of its 32-bit float.
+        course.reach(Result::Debito, course.value(u"doc_valor"_s));
     } else {
-        run.show(&Results::Debito,
-                 write(entry, u"debito"_s, data::MaxSingle(0.0F, single(entry, u"credito"_s))));
+        course.reach(Result::Debito, u"debito"_s, debitAmount(course.single(u"credito"_s)));
     }
-    progress.advance();
-    progress.finish();
+    course.progress.finish();
 }
 
 }  // namespace coverage

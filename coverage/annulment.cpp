@@ -6,7 +6,7 @@
 #include "coverage/Posting.h"
 #include "coverage/Queries.h"
 #include "coverage/stages.h"
-#include "data/Correction.h"
+#include "data/Annulment.h"
 #include "data/RowSets.h"
 #include "platform/com/Component.h"
 #include "platform/core/Failure.h"
@@ -21,28 +21,30 @@ namespace {
 
 /// An amount of the movement shown, in single precision; a null is left out.
 void take(const ado::Recordset& shown, ado::Recordset& correcting, const QString& column,
-          float factor) {
+          bool isNegated) {
     const QVariant amount = shown.Collect(column);
-    if (!core::isNull(amount)) correcting.setCollect(column, factor * core::toSingle(amount));
+    if (core::isNull(amount)) return;
+    const Single single(amount);
+    correcting.setCollect(column, isNegated ? -single : single);
 }
 
 }  // namespace
 
-/// Neither `liquido` nor `created_by` nor a mode is set: an annulled document therefore raises the
-/// franchise already used. It is meant so.
-void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
+/// Intentional: neither `liquido` nor `created_by` nor a mode is set, so that an annulled document
+/// raises the franchise already used.
+void setCorrectingRow(const ado::Recordset& shown, ado::Recordset& correcting) {
     for (const QString& column : {u"codABC"_s, u"rubrica_id"_s, u"doc_no"_s, u"doc_data"_s})
         correcting.setCollect(column, shown.Collect(column));
-    take(shown, correcting, u"doc_valor"_s, 1);  // keeps its sign
-    take(shown, correcting, u"credito"_s, -1);
-    take(shown, correcting, u"debito"_s, -1);
+    take(shown, correcting, u"doc_valor"_s, false);
+    take(shown, correcting, u"credito"_s, true);
+    take(shown, correcting, u"debito"_s, true);
     const QVariant hospital_id = shown.Collect(u"hospital_id"_s);
     if (!core::isNull(hospital_id)) correcting.setCollect(u"hospital_id"_s, hospital_id);
 }
 
 /// The first row found; a missing one fails.
 void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
-    const ado::RecordsetPtr rows = data::openToWrite(statements::accumulator(
+    const ado::RecordsetPtr rows = data::openToWrite(queries::accumulator(
         shown.Collect(u"rubrica_id"_s), core::toLong(shown.Collect(u"socio_id"_s)),
         core::toText(shown.Collect(u"codABC"_s)), data::twinsOf(shown).accumulators));
     data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));

@@ -16,43 +16,31 @@ namespace coverage {
 
 namespace {
 
-/// Above every ceiling: no ceiling at all.
-constexpr float NoCeiling = 2'000'000'000.0F;
-
 /// A ceiling that is null or empty does not exist.
 bool exists(const QVariant& ceiling) {
     return !core::isNullOrEmpty(ceiling);
 }
 
-QVariant lookup(const QString& statement, const QString& column) {
-    return data::DLookup(statement, environment::dtZelmars::instance().MSAccess()->ConnectionString,
-                         column);
-}
-
-/// What is used up; nothing found is 0.
-float used(const QVariant& found) {
-    return exists(found) ? core::toSingle(found) : 0.0F;
-}
-
 /// What the accumulators say of the member, the person, the rubric and its main rubric.
 struct Accumulated {
-    float creditoAc = 0;
-    qint32 noDocs = 0;
-    float sumAgregado = 0;
-    float sumFamilia = 0;
-    float tAgregadoPessoa = 0;
-    float tAgregadoTotal = 0;
-    float tAgregadoFamilia = 0;
+    Single creditOfPerson;
+    qint32 documents = 0;
+    Single creditOfHousehold;
+    Single creditOfRelatives;
+    Single groupCreditOfPerson;
+    Single groupCreditOfHousehold;
+    Single groupCreditOfRelatives;
 };
 
 /// The row stays also when the operator gives the entry up.
-void addAccumulator(const Entry& entry, const ado::Recordset& rubric) {
-    const ado::RecordsetPtr rows = data::openToWrite(statements::accumulators());
+void addAccumulator(const Course& course) {
+    const ado::RecordsetPtr rows = data::openToWrite(queries::accumulators());
     rows->AddNew();
-    rows->setCollect(u"Socio_ID"_s, entry.Socio_ID);
-    rows->setCollect(u"Rubrica_ID"_s, core::toLong(rubric.Collect(u"Rubrica_ID"_s)));
-    rows->setCollect(u"rubrica_id_main"_s, core::toLong(rubric.Collect(u"rubrica_id_main"_s)));
-    rows->setCollect(u"codABC"_s, entry.Text3);
+    rows->setCollect(u"Socio_ID"_s, course.document.socio_id);
+    rows->setCollect(u"Rubrica_ID"_s, core::toLong(course.rubric->Collect(u"Rubrica_ID"_s)));
+    rows->setCollect(u"rubrica_id_main"_s,
+                     core::toLong(course.rubric->Collect(u"rubrica_id_main"_s)));
+    rows->setCollect(u"codABC"_s, course.document.personCode);
     rows->setCollect(u"credito_ac"_s, 0);
     rows->setCollect(u"debito_ac"_s, 0);
     rows->setCollect(u"No_Docs"_s, 0);
@@ -60,106 +48,105 @@ void addAccumulator(const Entry& entry, const ado::Recordset& rubric) {
     rows->Close();
 }
 
-Accumulated lookUpAccumulated(const Entry& entry, const ado::Recordset& rubric,
-                              Progress& progress) {
-    using namespace statements;
-    const QVariant& rubrica_id = entry.rubrica_id;
-    const qint32 socio_id = entry.Socio_ID;
-    const QVariant main = rubric.Collect(u"rubrica_id_main"_s);
-    const QString ofPerson = accumulator(rubrica_id, socio_id, entry.Text3);
+Accumulated lookUpAccumulated(Course& course) {
+    using namespace queries;
+    const QVariant& rubrica_id = course.document.rubrica_id;
+    const qint32 socio_id = course.document.socio_id;
+    const QString& person = course.document.personCode;
+    const QVariant main = course.rubric->Collect(u"rubrica_id_main"_s);
+    const QString ofPerson = accumulator(rubrica_id, socio_id, person);
+    const QString& connection = environment::dtZelmars::instance().MSAccess()->ConnectionString;
     Accumulated found;
 
-    const QVariant credit = lookup(ofPerson, u"credito_ac"_s);
+    const QVariant credit = data::DLookup(ofPerson, connection, u"credito_ac"_s);
     // A row with a null credit counts as not found, so a second row is added.
-    if (!exists(credit)) addAccumulator(entry, rubric);
-    found.creditoAc = used(credit);
-    progress.advance();
+    if (exists(credit))
+        found.creditOfPerson = Single(credit);
+    else
+        addAccumulator(course);
+    course.progress.advance();
 
-    const QVariant documents = lookup(ofPerson, u"no_docs"_s);
-    found.noDocs = exists(documents) ? core::toLong(documents) : 0;
-    progress.advance();
+    const QVariant documents = data::DLookup(ofPerson, connection, u"no_docs"_s);
+    if (exists(documents)) found.documents = core::toLong(documents);
+    course.progress.advance();
 
-    const auto sum = [&](float& into, const QString& statement, const QString& column) {
-        into = used(lookup(statement, column));
-        progress.advance();
+    const struct {
+        Single& into;
+        QString query;
+        QString column;
+    } sums[] = {
+        {found.creditOfHousehold, creditOfHousehold(rubrica_id, socio_id),
+         u"sum_credito_agregado"_s},
+        {found.creditOfRelatives, creditOfRelatives(rubrica_id, socio_id),
+         u"sum_credito_tfamilia"_s},
+        {found.groupCreditOfPerson, groupCreditOfPerson(main, person, socio_id), u"Tagregado"_s},
+        {found.groupCreditOfHousehold, groupCreditOfHousehold(main, socio_id), u"Tagregado"_s},
+        {found.groupCreditOfRelatives, groupCreditOfRelatives(main, socio_id), u"Tagregado"_s},
     };
-    sum(found.sumAgregado, creditOfHousehold(rubrica_id, socio_id), u"sum_credito_agregado"_s);
-    sum(found.sumFamilia, creditOfRelatives(rubrica_id, socio_id), u"sum_credito_tfamilia"_s);
-    sum(found.tAgregadoPessoa, groupCreditOfPerson(main, entry.Text3, socio_id), u"Tagregado"_s);
-    sum(found.tAgregadoTotal, groupCreditOfHousehold(main, socio_id), u"Tagregado"_s);
-    sum(found.tAgregadoFamilia, groupCreditOfRelatives(main, socio_id), u"Tagregado"_s);
+    for (const auto& [into, query, column] : sums) {
+        const QVariant sum = data::DLookup(query, connection, column);
+        if (exists(sum)) into = Single(sum);
+        course.progress.advance();
+    }
     return found;
 }
 
-/// Lowers `saldo` to the remainder, which is floored at 0.
-void narrow(float& saldo, float remainder) {
-    saldo = data::MinSingle(saldo, data::MaxSingle(0.0F, remainder));
+/// Lowers what is left to what a ceiling leaves, if that ceiling exists; one step of the progress.
+void narrow(Course& course, Single& left, const QVariant& ceiling, Single usedUp) {
+    if (exists(ceiling)) left = data::MinSingle(left, remainder(core::toDouble(ceiling), usedUp));
+    course.progress.advance();
 }
 
-/// The same for a ceiling field, if that ceiling exists.
-void narrowBy(float& saldo, const QVariant& ceiling, float usedUp) {
-    if (exists(ceiling))
-        narrow(saldo, core::toSingle(core::toDouble(ceiling) - static_cast<double>(usedUp)));
+/// A ceiling for relatives alone; for the member there is none.
+QVariant ofRelatives(const Course& course, const ado::Recordset& rubric) {
+    return course.isMembers() ? QVariant() : rubric.Collect(u"total_familia"_s);
 }
 
-/// True when the person has no document left.
-bool documentsUsedUp(const Entry& entry, const ado::Recordset& rubric, qint32 noDocs) {
-    const QVariant maximum =
-        rubric.Collect(isMember(entry) ? u"nomax_recibos_socio"_s : u"nomax_recibos_familiar"_s);
-    return exists(maximum) && core::toDouble(maximum) - static_cast<double>(noDocs) <= 0;
-}
-
-void narrowByGroup(const Entry& entry, const ado::Recordset& rubric, const Accumulated& found,
-                   float& saldo, Progress& progress) {
+void narrowByGroup(Course& course, const Accumulated& found, Single& left) {
     const ado::RecordsetPtr main =
-        data::openToRead(statements::rubric(rubric.Collect(u"rubrica_id_main"_s)));
+        data::openToRead(queries::rubric(course.rubric->Collect(u"rubrica_id_main"_s)));
     if (!main->atEnd()) {
-        narrowBy(saldo, main->Collect(isMember(entry) ? u"socio"_s : u"familiar"_s),
-                 found.tAgregadoPessoa);
-        progress.advance();
-        narrowBy(saldo, main->Collect(u"agregado"_s), found.tAgregadoTotal);
-        progress.advance();
-        if (!isMember(entry))
-            narrowBy(saldo, main->Collect(u"total_familia"_s), found.tAgregadoFamilia);
-        progress.advance();
+        narrow(course, left, main->Collect(course.isMembers() ? u"socio"_s : u"familiar"_s),
+               found.groupCreditOfPerson);
+        narrow(course, left, main->Collect(u"agregado"_s), found.groupCreditOfHousehold);
+        narrow(course, left, ofRelatives(course, *main), found.groupCreditOfRelatives);
     }
     main->Close();
 }
 
 }  // namespace
 
-bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, TryOut& run) {
-    const ado::Recordset& rubric = *working.rubric;
-    const Accumulated found = lookUpAccumulated(entry, rubric, progress);
+bool applyCeilings(Course& course) {
+    const ado::Recordset& rubric = *course.rubric;
+    const Accumulated found = lookUpAccumulated(course);
 
-    float saldo = NoCeiling;
-    narrowBy(saldo, rubric.Collect(u"agregado"_s), found.sumAgregado);
-    progress.advance();
-    if (!isMember(entry)) narrowBy(saldo, rubric.Collect(u"total_familia"_s), found.sumFamilia);
-    progress.advance();
-    // Always, also without a limit: a missing one leaves nothing.
-    narrow(saldo, core::toSingle(static_cast<double>(working.limit - found.creditoAc)));
-    progress.advance();
+    Single left = NoCeiling;
+    narrow(course, left, rubric.Collect(u"agregado"_s), found.creditOfHousehold);
+    narrow(course, left, ofRelatives(course, rubric), found.creditOfRelatives);
+    // Intentional: always, so that a missing limit leaves nothing.
+    narrow(course, left, course.limit, found.creditOfPerson);
 
-    if (documentsUsedUp(entry, rubric, found.noDocs)) {
-        progress.finish();
+    const QVariant documents =
+        rubric.Collect(course.isMembers() ? u"nomax_recibos_socio"_s : u"nomax_recibos_familiar"_s);
+    if (exists(documents) && isUsedUp(core::toDouble(documents), found.documents)) {
+        course.progress.finish();
         core::MsgBox(u"O limite máximo do nº de documentos foi atingido."_s,
-                     core::Icon::Information, entry.caption);
-        working.rubric->Close();
+                     core::Icon::Information, course.document.caption);
+        course.rubric->Close();
         return false;
     }
-    progress.advance();
+    course.progress.advance();
 
-    narrowByGroup(entry, rubric, found, saldo, progress);
+    narrowByGroup(course, found, left);
 
-    const QVariant maximum =
-        rubric.Collect(isMember(entry) ? u"socio_max_lan"_s : u"familiar_max_lan"_s);
-    // The one limit without a floor: a negative maximum gives a negative remainder.
-    if (exists(maximum)) saldo = data::MinSingle(saldo, core::toSingle(maximum));
+    const QVariant most =
+        rubric.Collect(course.isMembers() ? u"socio_max_lan"_s : u"familiar_max_lan"_s);
+    // Intentional: the one limit without a floor; a negative maximum gives a negative remainder.
+    if (exists(most)) left = data::MinSingle(left, Single(most));
 
-    entry.record->setCollect(u"saldo_plafond"_s, saldo);
-    run.show(&Results::SaldoPlafond, entry.record->Collect(u"saldo_plafond"_s));
-    working.rubric->Close();
+    course.keep(u"saldo_plafond"_s, left);
+    course.show(Result::SaldoPlafond, course.value(u"saldo_plafond"_s));
+    course.rubric->Close();
     return true;
 }
 

@@ -2,8 +2,8 @@
 #include "coverage/Posting.h"
 #include "coverage/Queries.h"
 #include "coverage/stages.h"
+#include "data/Annulment.h"
 #include "data/Codes.h"
-#include "data/Correction.h"
 #include "data/NewMovement.h"
 #include "data/Procedures.h"
 #include "data/RowSets.h"
@@ -21,23 +21,24 @@ using core::Icon;
 using core::MsgBox;
 using core::passingOver;
 
-bool entryChecks(const PostingEntry& posting) {
+bool isComplete(const Posting& posting) {
     const auto missing = [&](const QString& text) {
-        MsgBox(text, Icon::Information, posting.entry.caption);
+        MsgBox(text, Icon::Information, posting.document.caption);
         return false;
     };
-    if (posting.DataCombo3.isEmpty()) return missing(u"Tem de indicar um modo de pagamento."_s);
-    if (posting.Text7.isEmpty()) return missing(u"Tem de introduzir a data do registo."_s);
-    if (posting.Text1.isEmpty()) return missing(u"Tem de introduzir a data do documento."_s);
-    if (posting.Text5.isEmpty()) return missing(u"Tem de introduzir o número do documento."_s);
-    if (posting.entry.bHospital && posting.DataCombo2.isEmpty())
+    if (posting.paymentMode.isEmpty()) return missing(u"Tem de indicar um modo de pagamento."_s);
+    if (posting.movementDate.isEmpty()) return missing(u"Tem de introduzir a data do registo."_s);
+    if (posting.documentDate.isEmpty()) return missing(u"Tem de introduzir a data do documento."_s);
+    if (posting.documentNumber.isEmpty())
+        return missing(u"Tem de introduzir o número do documento."_s);
+    if (posting.document.isHospital && posting.hospital.isEmpty())
         return missing(u"Tem de indicar um hospital."_s);
     return true;
 }
 
 /// Made for every mode of payment, cheques included. A member who has left only warns.
 bool bankNumberCheck(qint32 socio_id) {
-    const ado::RecordsetPtr member = data::openToRead(statements::member(socio_id));
+    const ado::RecordsetPtr member = data::openToRead(queries::member(socio_id));
     if (member->atEnd()) {
         MsgBox(u"Este Associado não se encontra na tabela de Activos."_s, Icon::Critical);
         return true;
@@ -56,32 +57,32 @@ bool bankNumberCheck(qint32 socio_id) {
 
 /// A failing statement is passed over; false when one failed. A movement without a number is not
 /// saved: it would be paid without standing in the accumulators.
-bool save(const PostingEntry& posting, data::Operation& operation) {
-    ado::Recordset& record = *posting.entry.record;
+bool save(const Posting& posting, data::Operation& operation) {
+    ado::Recordset& record = *posting.document.record;
     passingOver([&] {
         record.setCollect(u"created_by"_s, data::ObterUtilizador());
         data::numberAndSave(record, operation);
     });
-    return data::savedOrTold(posting.entry.caption);
+    return data::savedOrTold(posting.document.caption);
 }
 
-bool confirmTyped(const Entry& entry, data::Operation& operation) {
+bool confirmTyped(const Document& document, data::Operation& operation) {
     return data::confirmUnusual(
-        *entry.record,
+        *document.record,
         {{u"data"_s, u"A data do registo"_s},
          {u"doc_data"_s, u"A data do documento"_s},
          {u"doc_valor"_s, u"O valor do documento"_s},
-         entry.bHospital ? data::Typed{u"incidencia"_s, u"O valor de incidência"_s}
-                         : data::Typed{u"recebido"_s, u"O valor recebido"_s}},
-        entry.caption, operation);
+         document.isHospital ? data::Typed{u"incidencia"_s, u"O valor de incidência"_s}
+                             : data::Typed{u"recebido"_s, u"O valor recebido"_s}},
+        document.caption, operation);
 }
 
 void addToAccumulators(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const QVariant rubrica_id = movement.Collect(u"rubrica_id"_s);
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
     const ado::RecordsetPtr rows = data::openToWrite(
-        statements::accumulator(rubrica_id, socio_id, core::toText(movement.Collect(u"codABC"_s)),
-                                data::twinsOf(movement).accumulators));
+        queries::accumulator(rubrica_id, socio_id, core::toText(movement.Collect(u"codABC"_s)),
+                             data::twinsOf(movement).accumulators));
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"Socio_ID"_s, socio_id);
@@ -97,26 +98,25 @@ void addToAccumulators(const ado::Recordset& movement, const ado::Accompaniment&
 }  // namespace
 
 const data::MovementRules& documentRules() {
-    static const data::MovementRules rules{addToAccumulators, setCorrection, takeBack};
+    static const data::MovementRules rules{addToAccumulators, setCorrectingRow, takeBack};
     return rules;
 }
 
-bool post(const PostingEntry& posting, TryOut& run, data::Operation& operation) {
-    const Entry& entry = posting.entry;
+bool post(const Posting& posting, TryOut& run, data::Operation& operation) {
+    const Document& document = posting.document;
     if (data::isRegistered(operation))
-        return data::finishPosting(operation, documentRules(), *entry.record, entry.caption);
-    if (!data::confirmPosting(entry.caption) || !confirmTyped(entry, operation)) return false;
-    tryOut(entry, run);
-    // Still true after the boxes of the minimum and of the number of documents: the posting then
-    // goes on with what the row holds. It is meant so.
+        return data::finishPosting(operation, documentRules(), *document.record, document.caption);
+    if (!data::confirmPosting(document.caption) || !confirmTyped(document, operation)) return false;
+    tryOut(document, run);
     if (!run.bEnsaioValido) return false;
-    if (!entryChecks(posting) || !bankNumberCheck(entry.Socio_ID)) return false;
+    if (!isComplete(posting) || !bankNumberCheck(document.socio_id)) return false;
 
-    entry.record->setCollect(u"socio_id"_s, entry.Socio_ID);
+    document.record->setCollect(u"socio_id"_s, document.socio_id);
     core::err().clear();
-    if (core::toText(posting.modo_pagamento) == data::modo::Cheque) posting.askCheque(entry.record);
+    if (core::toText(posting.modo_pagamento) == data::modo::Cheque)
+        posting.askCheque(document.record);
     if (!save(posting, operation)) return false;
-    return data::accumulatedOrTold(operation, *entry.record, documentRules(), entry.caption);
+    return data::accumulatedOrTold(operation, *document.record, documentRules(), document.caption);
 }
 
 }  // namespace coverage

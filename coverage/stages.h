@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "coverage/Calculation.h"
 #include "coverage/Progress.h"
 #include "coverage/TryOut.h"
 
@@ -8,26 +9,52 @@
 /// annulment.
 namespace coverage {
 
-/// Working values that the first stage leaves to the later ones; 32-bit floats, as the whole
-/// calculation is.
-struct Working {
-    ado::RecordsetPtr rubric;  ///< the rubric's row, open until the ceilings are done
-    float limit = 0;           ///< the rubric's yearly limit of this person; a missing one is 0
-    float franquia = 0;        ///< the rubric's franchise; a missing one is 0
-};
+/// A try-out under way: the document, what is known so far, and who is shown it.
+class Course {
+public:
+    Course(const Document& of, TryOut& as) : document(of), run(as) {}
 
-/// True when the entry is for the member himself, and not for a relative.
-bool isMember(const Entry& entry);
+    const Document& document;
+    TryOut& run;
+    Progress progress;
+    ado::RecordsetPtr rubric;  ///< the rubric's row, open until the ceilings are done
+    Single limit;              ///< the rubric's yearly limit of this person; a missing one is 0
+    Single franchise;          ///< the rubric's franchise; a missing one is 0
+
+    /// True when the document is the member's own, and not a relative's.
+    bool isMembers() const;
+    /// A column of the movement.
+    QVariant value(const QString& column) const { return document.record->Collect(column); }
+    Single single(const QString& column) const { return Single(value(column)); }
+
+    /// Writes a column of the movement.
+    void keep(const QString& column, const QVariant& value) {
+        document.record->setCollect(column, value);
+    }
+    void show(Result result, const QVariant& value) {
+        if (run.onShown) run.onShown(result, value);
+    }
+    /// Shows a result and ends its step.
+    void reach(Result result, const QVariant& value) {
+        show(result, value);
+        progress.advance();
+    }
+    /// Writes a result and shows what its column keeps of it.
+    void reach(Result result, const QString& column, const QVariant& value) {
+        keep(column, value);
+        reach(result, this->value(column));
+    }
+};
 
 /// Writes what is left of all ceilings into `saldo_plafond`. False when the number of documents is
 /// used up: the box was shown and the try-out ends.
-bool applyCeilings(const Entry& entry, const Working& working, Progress& progress, TryOut& run);
+bool applyCeilings(Course& course);
 
 /// Writes balance, gross, net, credit and debit.
-void setAmounts(const Entry& entry, const Working& working, Progress& progress, TryOut& run);
+void setAmounts(Course& course);
 
 /// Sets what the correcting row of an annulled document keeps of it.
-void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting);
+void setCorrectingRow(const ado::Recordset& shown, ado::Recordset& correcting);
 /// Takes an annulled document back from its accumulators.
 void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with);
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 // The frame of a try-out: the checks, the rubric, the minimum, the incidence and the plan's share.
 #include "coverage/TryOut.h"
-#include "boundary/environment/dtZelmars.h"
 #include "coverage/Queries.h"
 #include "coverage/stages.h"
 #include "data/Codes.h"
+#include "data/RowSets.h"
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
@@ -23,8 +23,8 @@ bool refuse(const QString& text, Icon icon = Icon::None, const QString& title = 
     return false;
 }
 
-/// On a normal entry `incidencia` is filled by the calculation, so the first test bites from the
-/// second run on only. It is meant so. A comparison with a null field does not hold.
+/// Intentional: outside hospitals `incidencia` is filled by the calculation, so the first test
+/// bites from the second run on only. A comparison with a null field does not hold.
 bool amountsAreSound(const ado::Recordset& record) {
     if (core::compareNumbers(record.Collect(u"recebido"_s), record.Collect(u"incidencia"_s)) > 0)
         return refuse(u"O valor recebido é maior que o valor do documento."_s);
@@ -35,95 +35,83 @@ bool amountsAreSound(const ado::Recordset& record) {
     return true;
 }
 
-bool entryIsComplete(const Entry& entry) {
+bool isComplete(const Document& document) {
     const auto missing = [&](const QString& text) {
-        return refuse(text, Icon::Information, entry.caption);
+        return refuse(text, Icon::Information, document.caption);
     };
-    if (entry.bErroEntrada)
+    if (document.bErroEntrada)
         return refuse(
             u"Surgiu um erro grave durante a introdução dos dados no formulário, é "
             "aconcelhável que recomece outro registo."_s,
-            Icon::Critical, entry.caption);
-    if (entry.DataCombo1.isEmpty()) return missing(u"Tem de Indicar uma rubrica!"_s);
-    if (entry.Text3.isEmpty()) return missing(u"Não foi atribuido nenhum código de familiar!"_s);
-    if (entry.bHospital && core::isNullOrEmpty(entry.record->Collect(u"incidencia"_s)))
+            Icon::Critical, document.caption);
+    if (document.rubric.isEmpty()) return missing(u"Tem de Indicar uma rubrica!"_s);
+    if (document.personCode.isEmpty())
+        return missing(u"Não foi atribuido nenhum código de familiar!"_s);
+    if (document.isHospital && core::isNullOrEmpty(document.record->Collect(u"incidencia"_s)))
         return missing(u"Tem de indicar o valor de incidência!"_s);
-    if (entry.Text6.isEmpty()) return missing(u"Tem de indicar um valor para o documento!"_s);
-    if (entry.Text9.isEmpty()) return missing(u"Tem de indicar um valor para o campo Recebido!"_s);
+    if (document.documentValue.isEmpty())
+        return missing(u"Tem de indicar um valor para o documento!"_s);
+    if (document.receivedOrIncidence.isEmpty())
+        return missing(u"Tem de indicar um valor para o campo Recebido!"_s);
     return true;
 }
 
 /// A field of the rubric as a working value; null gives 0.
-float singleOrZero(const QVariant& value) {
-    return core::isNullOrEmpty(value) ? 0.0F : core::toSingle(value);
+Single singleOrZero(const QVariant& value) {
+    return core::isNullOrEmpty(value) ? Single() : Single(value);
 }
 
 /// False when the document lies below the rubric's minimum.
-bool reachesMinimum(const Entry& entry, const ado::Recordset& rubric, Progress& progress) {
+bool reachesMinimum(Course& course) {
     const QVariant minimum =
-        rubric.Collect(isMember(entry) ? u"socio_min_lan"_s : u"familiar_min_lan"_s);
+        course.rubric->Collect(course.isMembers() ? u"socio_min_lan"_s : u"familiar_min_lan"_s);
     if (core::isNullOrEmpty(minimum) ||
-        !(core::compareNumbers(minimum, entry.record->Collect(u"doc_valor"_s)) > 0))
+        !(core::compareNumbers(minimum, course.value(u"doc_valor"_s)) > 0))
         return true;
-    progress.finish();
+    course.progress.finish();
     return refuse(u"Este lançamento tem um limite minimo de "_s +
                   core::formatted(minimum, core::format::Money));
 }
 
-void setIncidence(const Entry& entry, TryOut& run) {
-    if (!entry.bHospital)
-        entry.record->setCollect(u"incidencia"_s, entry.record->Collect(u"doc_valor"_s));
-    run.show(&Results::Incidencia, entry.record->Collect(u"incidencia"_s));
-}
+/// Limit, incidence and the plan's share. False when the try-out ends here: the box was shown.
+bool workOutShare(Course& course) {
+    const ado::Recordset& rubric = *course.rubric;
+    course.limit = singleOrZero(rubric.Collect(course.isMembers() ? u"socio"_s : u"familiar"_s));
+    course.reach(Result::LimiteAplicavel, course.limit);
+    if (!reachesMinimum(course)) return false;
 
-/// The share before franchise and ceilings: incidence times the percentage, a fraction.
-void setShare(const Entry& entry, const QVariant& percent, TryOut& run) {
-    const double share = core::toDouble(entry.record->Collect(u"incidencia"_s)) *
-                         static_cast<double>(core::toSingle(percent));
-    entry.record->setCollect(u"comparticipacao"_s, share);
-    run.show(&Results::Comparticipacao, entry.record->Collect(u"comparticipacao"_s));
+    course.franchise = singleOrZero(rubric.Collect(u"franquia"_s));
+    if (!course.document.isHospital) course.keep(u"incidencia"_s, course.value(u"doc_valor"_s));
+    course.reach(Result::Incidencia, course.value(u"incidencia"_s));
+
+    const QVariant percent = rubric.Collect(u"Percent"_s);
+    if (core::isNull(percent)) {
+        course.progress.finish();
+        course.run.bEnsaioValido = refuse(
+            u"Erro: não foi possível calcular a comparticipação, porque não existe valor para a "
+            "percentagem."_s);
+        return false;
+    }
+    course.reach(Result::Comparticipacao, u"comparticipacao"_s,
+                 share(core::toDouble(course.value(u"incidencia"_s)), Single(percent)));
+    return true;
 }
 
 }  // namespace
 
-bool isMember(const Entry& entry) {
-    return entry.Text3 == data::person::Member;
+bool Course::isMembers() const {
+    return document.personCode == data::person::Member;
 }
 
-void tryOut(const Entry& entry, TryOut& run) {
+void tryOut(const Document& document, TryOut& run) {
     run.bEnsaioValido = false;
-    Progress progress;
-    if (!amountsAreSound(*entry.record) || !entryIsComplete(entry)) return;
+    Course course(document, run);
+    if (!amountsAreSound(*document.record) || !isComplete(document)) return;
 
     run.bEnsaioValido = true;
-    progress.start();
-    Working working;
-    working.rubric = ado::Recordset::create();
-    working.rubric->Open(statements::rubric(entry.rubrica_id),
-                         environment::dtZelmars::instance().MSAccess());
-    const ado::Recordset& rubric = *working.rubric;
-
-    working.limit = singleOrZero(rubric.Collect(isMember(entry) ? u"socio"_s : u"familiar"_s));
-    run.show(&Results::LimiteAplicavel, working.limit);
-    progress.advance();
-    if (!reachesMinimum(entry, rubric, progress)) return;
-
-    working.franquia = singleOrZero(rubric.Collect(u"franquia"_s));
-    setIncidence(entry, run);
-    progress.advance();
-
-    const QVariant percent = rubric.Collect(u"Percent"_s);
-    if (core::isNull(percent)) {
-        progress.finish();
-        run.bEnsaioValido = refuse(
-            u"Erro: não foi possível calcular a comparticipação, porque não existe valor para a "
-            "percentagem."_s);
-        return;
-    }
-    setShare(entry, percent, run);
-    progress.advance();
-
-    if (applyCeilings(entry, working, progress, run)) setAmounts(entry, working, progress, run);
+    course.progress.start();
+    course.rubric = data::openToRead(queries::rubric(document.rubrica_id));
+    if (workOutShare(course) && applyCeilings(course)) setAmounts(course);
 }
 
 }  // namespace coverage

@@ -38,7 +38,7 @@ QString ownName() {
 
 QVariant stepText(Step step) {
     switch (step) {
-        case Step::Correction:
+        case Step::CorrectingRow:
             return AwaitsCorrection;
         case Step::Accumulator:
             return AwaitsAccumulator;
@@ -77,7 +77,7 @@ Operation operationOf(const ado::Recordset& row) {
     operation.id = text(u"operacao_id"_s);
     operation.kind =
         text(u"operacao"_s) == Annulment ? Operation::Kind::Annulment : Operation::Kind::Posting;
-    operation.missing = step == AwaitsCorrection    ? Step::Correction
+    operation.missing = step == AwaitsCorrection    ? Step::CorrectingRow
                         : step == AwaitsAccumulator ? Step::Accumulator
                                                     : Step::Nothing;
     operation.isRegistered = true;

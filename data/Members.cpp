@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "data/Members.h"
 
+#include "boundary/environment/LoginState.h"
 #include "data/RowSets.h"
 #include "data/modDlookup.h"
 #include "platform/core/MsgBox.h"
@@ -27,7 +28,7 @@ ado::RecordsetPtr openMemberByNumber(const QString& typed) {
     const QString no_kor = typed.trimmed();
     ado::RecordsetPtr member = openToRead(memberQuery(no_kor));
     if (member->atEnd()) return nullptr;
-    // A quote in the text changes the statement, which then finds anybody.
+    // A quote in the text changes the query, which then finds anybody.
     const bool isHis = core::toText(member->Collect(u"no_kor"_s)).trimmed() == no_kor;
     return isHis ? member : nullptr;
 }
@@ -63,6 +64,17 @@ ado::RecordsetPtr openEnrolledMember(qint32 socio_id) {
     else if (checkEnrolled(*member))
         return member;
     return nullptr;
+}
+
+com::Object openSearch() {
+    const environment::LoginState& login = environment::loginState();
+    const com::Object search = com::createObject(u"Lumbra.General"_s);
+    search.call(u"Login"_s, {login.dtUser, login.dtPassword});
+    return search;
+}
+
+qint32 chooseMember(const com::Object& search) {
+    return core::toLong(search.call(u"appShow"_s, {u"SOC01"_s, false}));
 }
 
 }  // namespace data

@@ -4,6 +4,7 @@
 #include <QVariant>
 
 #include "platform/ado/Recordset.h"
+#include "platform/com/Component.h"
 
 /// Active members, as the screens find them. Values are joined into the statements as they stand.
 namespace data {
@@ -33,5 +34,11 @@ bool checkEnrolled(const ado::Recordset& member);
 /// The row of a member who was searched for; null when he has left or is not enrolled, which the
 /// operator is told.
 ado::RecordsetPtr openEnrolledMember(qint32 socio_id);
+
+/// The search component over the member file, logged in. Fails when there is none.
+com::Object openSearch();
+
+/// Lets the operator look for a member: his key, 0 when he gave up.
+qint32 chooseMember(const com::Object& search);
 
 }  // namespace data

@@ -5,7 +5,6 @@
 
 #include "boundary/environment/dtZelmars.h"
 #include "data/Codes.h"
-#include "data/MovementNumber.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -23,6 +22,23 @@ ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL) {
     rows->Open(strSQL, environment::dtZelmars::instance().Connections(strConMember),
                ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
     return rows;
+}
+
+qint32 drawMovementNumber() {
+    qint32 number = 1;
+    const ado::RecordsetPtr counter = ado::Recordset::create();
+    counter->Open(CounterQuery.toString(), environment::dtZelmars::instance().MSAccess(),
+                  ado::adOpenDynamic, ado::adLockPessimistic, ado::adCmdUnknown);
+    if (counter->atEnd()) {
+        counter->AddNew();
+        counter->setCollect(u"zelmars"_s, 1);
+    } else {
+        number = core::toLong(counter->Collect(u"zelmars"_s));
+        counter->setCollect(u"zelmars"_s, static_cast<qint64>(number) + 1);
+    }
+    counter->Update();
+    counter->Close();
+    return number;
 }
 
 bool confirmPosting(const QString& caption) {

@@ -14,7 +14,17 @@ inline constexpr QStringView NoMovementQuery =
 /// connection "MSAccess" and the statement that returns no movement. Fails as opening does.
 ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL);
 
-/// Asks whether to finish the entry.
+/// One row: the counters.
+inline constexpr QStringView CounterQuery = u"select * from tbContadores";
+
+/// Draws the next movement number from the counter, whose row is held meanwhile, so that no other
+/// workstation is given the same. Fails when what follows it cannot be stored.
+///
+/// A counter without a row gives the number 1 and stores 1, so the next draw gives 1 once more.
+/// This repetition is meant to stay.
+qint32 drawMovementNumber();
+
+/// Asks whether to finish the posting.
 bool confirmPosting(const QString& caption);
 
 /// A typed value that may be a slip of the keyboard.

@@ -93,7 +93,7 @@ bool accumulatedOrTold(Operation& operation, const ado::Recordset& movement,
 
 QString missingText(const Operation& operation) {
     if (operation.kind == Operation::Kind::Posting) return u"falta somar aos acumulados"_s;
-    return operation.missing == Step::Correction
+    return operation.missing == Step::CorrectingRow
                ? u"falta o movimento de correção e tirar dos acumulados"_s
                : u"falta tirar dos acumulados"_s;
 }

@@ -15,7 +15,7 @@ namespace data {
 /// What is missing of an operation, from where on.
 enum class Step {
     Nothing,
-    Correction,  ///< the correcting row of an annulment, and then the accumulator
+    CorrectingRow,  ///< the correcting row of an annulment, and then the accumulator
     Accumulator,
 };
 
@@ -25,7 +25,7 @@ struct MovementRules {
     void (*accumulate)(const ado::Recordset& movement, const ado::Accompaniment& with);
     /// Sets the columns of a correcting row beyond day, type, member and number; null where the
     /// type is not annulled.
-    void (*setCorrection)(const ado::Recordset& shown, ado::Recordset& correcting) = nullptr;
+    void (*setCorrectingRow)(const ado::Recordset& shown, ado::Recordset& correcting) = nullptr;
     /// Takes an annulled movement back from the accumulators.
     void (*takeBack)(const ado::Recordset& shown, const ado::Accompaniment& with) = nullptr;
 };

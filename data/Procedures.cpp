@@ -17,12 +17,4 @@ QString ObterUtilizador() {
     return QString::fromUtf8(buffer, static_cast<const char*>(end) - buffer);
 }
 
-float MinSingle(float a, float b) {
-    return static_cast<double>(a) < static_cast<double>(b) ? a : b;
-}
-
-float MaxSingle(float a, float b) {
-    return static_cast<double>(a) < static_cast<double>(b) ? b : a;
-}
-
 }  // namespace data

@@ -3,6 +3,8 @@
 
 #include <QString>
 
+#include "platform/core/Single.h"
+
 namespace data {
 
 /// The name under which the operating system's user logged in; empty when the system knows none,
@@ -10,8 +12,12 @@ namespace data {
 QString ObterUtilizador();
 
 /// The smaller of two numbers: `a` if it is less than `b`, otherwise `b`.
-float MinSingle(float a, float b);
+inline core::Single MinSingle(core::Single a, core::Single b) {
+    return a < b ? a : b;
+}
 /// The larger of two numbers: `b` if `a` is less than `b`, otherwise `a`.
-float MaxSingle(float a, float b);
+inline core::Single MaxSingle(core::Single a, core::Single b) {
+    return a < b ? b : a;
+}
 
 }  // namespace data

@@ -2,7 +2,6 @@
 #include "entry/Beneficiary.h"
 
 #include "data/Codes.h"
-#include "data/MemberSearch.h"
 #include "data/Members.h"
 #include "data/RowSets.h"
 #include "platform/core/Clock.h"

@@ -5,8 +5,8 @@
 
 namespace entry {
 
-double vatOf(float value, double rate) {
-    const double gross = static_cast<double>(value);
+double vatOf(core::Single value, double rate) {
+    const double gross = value.toDouble();
     const double vat = gross - gross / (1.0 + rate / 100.0);
     return core::toLong(vat * 100.0) / 100.0;
 }

@@ -104,9 +104,7 @@ void frmMovimentos::forgetEntry() {
     No_Kor->Clear();
     clearMember();
     operation_ = {};
-    for (forms::TextBox* result : {Incidencia, Comparticipacao, LimiteAplicavel, SaldoCC, Iliquido,
-                                   SaldoPlafond, Credito, Debito, Liquido})
-        result->Clear();
+    for (const ResultBox& result : resultBoxes()) result.box->Clear();
 }
 
 void frmMovimentos::setMember(qint32 id, const QString& number, const QString& name) {
@@ -155,19 +153,13 @@ void frmMovimentos::showReadOnly(const QString& tipo) {
     Label12->hide();
 
     const std::pair<forms::Bound*, QString> bindings[] = {
-        {Incidencia, u"incidencia"_s},
-        {Comparticipacao, u"comparticipacao"_s},
-        {SaldoCC, u"saldo_acumulado"_s},
-        {Iliquido, u"iliquido"_s},
-        {SaldoPlafond, u"saldo_plafond"_s},
-        {Credito, u"credito"_s},
-        {Debito, u"debito"_s},
-        {Liquido, u"liquido"_s},
         {No_Kor, u"no_kor"_s},
         {Text2, u"nome"_s},
         {Text4, u"familiar"_s},
     };
     for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
+    for (const ResultBox& result : resultBoxes())
+        if (!result.column.isEmpty()) result.box->bind(Adodc1, result.column);
 
     forms::setBackColor({Text2, Text3, Text4}, BackColor::Window);
     for (forms::TextBox* box : {No_Kor, Text2, Text3, Text4, Text1, Text5, Text6})
@@ -255,42 +247,61 @@ void frmMovimentos::workOutVat() {
     const std::optional<double> value = numberIn(Text6);
     const std::optional<double> rate = numberIn(Text11);
     if (!value || !rate) return;
-    Text10->setValue(vatOf(core::toSingle(*value), *rate));
+    Text10->setValue(vatOf(core::Single(*value), *rate));
 }
 
 // --- Try-out, posting, giving up, annulment
 
-coverage::Entry frmMovimentos::entry() const {
-    coverage::Entry entry;
-    entry.record = Adodc1->Recordset();
-    entry.Socio_ID = Socio_ID;
-    entry.bHospital = bHospital;
-    entry.caption = Caption();
-    entry.Text3 = Text3->Text();
-    entry.Text6 = Text6->Text();
-    entry.Text9 = Text9->Text();
-    entry.DataCombo1 = DataCombo1->Text();
-    entry.rubrica_id = DataCombo1->BoundText();
-    return entry;
+coverage::Document frmMovimentos::document() const {
+    return {.record = Adodc1->Recordset(),
+            .socio_id = Socio_ID,
+            .isHospital = bHospital,
+            .caption = Caption(),
+            .personCode = Text3->Text(),
+            .documentValue = Text6->Text(),
+            .receivedOrIncidence = Text9->Text(),
+            .rubric = DataCombo1->Text(),
+            .rubrica_id = DataCombo1->BoundText()};
+}
+
+std::vector<frmMovimentos::ResultBox> frmMovimentos::resultBoxes() const {
+    using coverage::Result;
+    return {{Result::LimiteAplicavel, LimiteAplicavel, {}},
+            {Result::Incidencia, Incidencia, u"incidencia"_s},
+            {Result::Comparticipacao, Comparticipacao, u"comparticipacao"_s},
+            {Result::SaldoPlafond, SaldoPlafond, u"saldo_plafond"_s},
+            {Result::SaldoCC, SaldoCC, u"saldo_acumulado"_s},
+            {Result::Iliquido, Iliquido, u"iliquido"_s},
+            {Result::Liquido, Liquido, u"liquido"_s},
+            {Result::Credito, Credito, u"credito"_s},
+            {Result::Debito, Debito, u"debito"_s}};
+}
+
+/// A run whose results stand on the screen as soon as they are reached.
+coverage::TryOut frmMovimentos::tryOutShown() {
+    coverage::TryOut run;
+    run.onShown = [boxes = resultBoxes()](coverage::Result result, const QVariant& value) {
+        for (const ResultBox& each : boxes)
+            if (each.result == result) each.box->setValue(value);
+    };
+    return run;
 }
 
 void frmMovimentos::Command5_Click() {
-    coverage::TryOut run;
-    run.onShown = [this](const coverage::Results& results) { showResults(results); };
-    coverage::tryOut(entry(), run);
+    coverage::TryOut run = tryOutShown();
+    coverage::tryOut(document(), run);
 }
 
 void frmMovimentos::post() {
-    const coverage::PostingEntry posting{entry(),
-                                         DataCombo3->Text(),
-                                         DataCombo3->BoundText(),
-                                         Text7->Text(),
-                                         Text1->Text(),
-                                         Text5->Text(),
-                                         DataCombo2->Text(),
-                                         &payments::frmPagamentoCheque::ask};
-    coverage::TryOut run;
-    run.onShown = [this](const coverage::Results& results) { showResults(results); };
+    const coverage::Posting posting{.document = document(),
+                                    .paymentMode = DataCombo3->Text(),
+                                    .modo_pagamento = DataCombo3->BoundText(),
+                                    .movementDate = Text7->Text(),
+                                    .documentDate = Text1->Text(),
+                                    .documentNumber = Text5->Text(),
+                                    .hospital = DataCombo2->Text(),
+                                    .askCheque = &payments::frmPagamentoCheque::ask};
+    coverage::TryOut run = tryOutShown();
     if (coverage::post(posting, run, operation_))
         return leaveEntry(u"Lançado com o nº %1"_s.arg(operation_.movimento_no));
     if (operation_.isRegistered) lockFields();
@@ -309,22 +320,10 @@ void frmMovimentos::leaveEntry(const QString& outcome) {
 }
 
 void frmMovimentos::Command6_Click() {
-    if (coverage::annul({Adodc1->Recordset(), Caption(), CallbackClass}, operation_)) Unload();
-}
-
-void frmMovimentos::showResults(const coverage::Results& results) {
-    const auto put = [](forms::TextBox* box, const std::optional<QVariant>& value) {
-        if (value) box->setValue(*value);
-    };
-    put(LimiteAplicavel, results.LimiteAplicavel);
-    put(Incidencia, results.Incidencia);
-    put(Comparticipacao, results.Comparticipacao);
-    put(SaldoPlafond, results.SaldoPlafond);
-    put(SaldoCC, results.SaldoCC);
-    put(Iliquido, results.Iliquido);
-    put(Liquido, results.Liquido);
-    put(Credito, results.Credito);
-    put(Debito, results.Debito);
+    if (coverage::annul(
+            {.shown = Adodc1->Recordset(), .caption = Caption(), .CallbackClass = CallbackClass},
+            operation_))
+        Unload();
 }
 
 }  // namespace entry

@@ -113,8 +113,16 @@ private:
     void rateHoldsAValue();
     QWidget* fieldNamedBy(const QString& text) const;
     void leaveEntry(const QString& outcome);
-    coverage::Entry entry() const;
-    void showResults(const coverage::Results& results);
+    coverage::Document document() const;
+    coverage::TryOut tryOutShown();
+
+    /// A result of the try-out: its control, and the column that keeps it.
+    struct ResultBox {
+        coverage::Result result;
+        forms::TextBox* box;
+        QString column;  ///< empty for none
+    };
+    std::vector<ResultBox> resultBoxes() const;
 
     com::Object search_;  ///< the last search component; keeps its premium statement open
     QString memberNumber_;

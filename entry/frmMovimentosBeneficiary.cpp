@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
 // Who the document is for: the member by number or by search, and the person of his family.
-#include "data/MemberSearch.h"
 #include "data/Members.h"
 #include "entry/Beneficiary.h"
 #include "entry/frmMovimentos.h"

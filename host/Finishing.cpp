@@ -2,8 +2,8 @@
 #include "host/Finishing.h"
 
 #include "coverage/Posting.h"
+#include "data/Annulment.h"
 #include "data/Codes.h"
-#include "data/Correction.h"
 #include "platform/core/Failure.h"
 #include "receipts/receipt.h"
 #include "receipts/reposition.h"
@@ -22,7 +22,8 @@ const data::MovementRules& rulesOf(const QString& type) {
 
 void finishSteps(const ado::Recordset& movement, data::Operation& operation) {
     const data::MovementRules& rules = rulesOf(operation.tipo);
-    if (operation.missing == data::Step::Correction) data::correct(movement, rules, operation);
+    if (operation.missing == data::Step::CorrectingRow)
+        data::addCorrectingRow(movement, rules, operation);
     const auto write =
         operation.kind == data::Operation::Kind::Posting ? rules.accumulate : rules.takeBack;
     write(movement, data::journal::finishedLater(operation));

@@ -5,7 +5,6 @@
 #include <QLabel>
 
 #include "data/Codes.h"
-#include "data/MemberSearch.h"
 #include "data/Members.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
@@ -89,10 +88,13 @@ void frmRecebimento::Command1_Click() {
 }
 
 void frmRecebimento::post() {
-    if (postReceipt({Adodc1->Recordset(), Socio_ID, Caption(), DataCombo3->Text(), No_Kor->Text(),
-                     Credito->Text()},
-                    operation))
-        return Unload();
+    const Receipt receipt{.record = Adodc1->Recordset(),
+                          .socio_id = Socio_ID,
+                          .caption = Caption(),
+                          .paymentMode = DataCombo3->Text(),
+                          .memberNumber = No_Kor->Text(),
+                          .credit = Credito->Text()};
+    if (postReceipt(receipt, operation)) return Unload();
     if (operation.isRegistered) lockFields();
 }
 

@@ -163,11 +163,15 @@ void frmReposicao::DataCombo1_LostFocus() {
 }
 
 void frmReposicao::post() {
-    if (postReposition(
-            {Adodc1->Recordset(), Socio_ID, Caption(), DataCombo1->Text(), DataCombo1->BoundText(),
-             Text3->Text(), No_Kor->Text(), Debito->Text(), Credito->Text()},
-            operation))
-        return Unload();
+    const Reposition reposition{.record = Adodc1->Recordset(),
+                                .socio_id = Socio_ID,
+                                .caption = Caption(),
+                                .rubric = DataCombo1->Text(),
+                                .personCode = Text3->Text(),
+                                .memberNumber = No_Kor->Text(),
+                                .debit = Debito->Text(),
+                                .credit = Credito->Text()};
+    if (postReposition(reposition, operation)) return Unload();
     if (operation.isRegistered) lockFields();
 }
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "receipts/receipt.h"
 
-#include "data/Correction.h"
+#include "data/Annulment.h"
 #include "data/NewMovement.h"
 #include "data/RowSets.h"
 #include "platform/core/Failure.h"
@@ -17,15 +17,15 @@ namespace {
 using core::Icon;
 using core::MsgBox;
 
-bool receiptChecks(const ReceiptEntry& receipt) {
+bool receiptChecks(const Receipt& receipt) {
     const auto missing = [&](const QString& text) {
         MsgBox(text, Icon::Information, receipt.caption);
         return false;
     };
-    if (receipt.DataCombo3.isEmpty()) return missing(u"Tem de indicar um modo de pagamento!"_s);
-    if (receipt.No_Kor.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
-    if (receipt.Credito.isEmpty()) return missing(u"Tem de indicar um valor para o crédito!"_s);
-    // Below 0 is let through, and lowers the account.
+    if (receipt.paymentMode.isEmpty()) return missing(u"Tem de indicar um modo de pagamento!"_s);
+    if (receipt.memberNumber.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
+    if (receipt.credit.isEmpty()) return missing(u"Tem de indicar um valor para o crédito!"_s);
+    // Intentional: below 0 is let through, and lowers the account.
     if (core::compareNumbers(receipt.record->Collect(u"credito"_s), 0) == 0)
         return missing(u"Tem de indicar um valor diferente de 0(zero) para o crédito !"_s);
     return data::checkDated(*receipt.record, receipt.caption);
@@ -35,7 +35,7 @@ bool receiptChecks(const ReceiptEntry& receipt) {
 void addToAccount(const ado::Recordset& movement, const ado::Accompaniment& with) {
     const qint32 socio_id = core::toLong(movement.Collect(u"socio_id"_s));
     const ado::RecordsetPtr rows =
-        data::openToWrite(accountStatement(data::twinsOf(movement).accumulators, socio_id));
+        data::openToWrite(accountQuery(data::twinsOf(movement).accumulators, socio_id));
     if (rows->atEnd()) {
         rows->AddNew();
         rows->setCollect(u"rubrica_id_main"_s, 0);
@@ -48,17 +48,17 @@ void addToAccount(const ado::Recordset& movement, const ado::Accompaniment& with
     rows->Close();
 }
 
-void setCorrection(const ado::Recordset& shown, ado::Recordset& correcting) {
+void setCorrectingRow(const ado::Recordset& shown, ado::Recordset& correcting) {
     const QVariant credito = shown.Collect(u"credito"_s);
     if (!core::isNull(credito)) correcting.setCollect(u"credito"_s, -core::toDouble(credito));
     correcting.setCollect(u"debito"_s, 0);
 }
 
-/// Not the account-level row that the posting added to, but the first of the member's rows,
-/// whichever it is. A row that has to be added is nobody's and keeps null sums. It is meant so.
+/// Intentional: not the account-level row that the posting added to, but the first of the member's
+/// rows, whichever it is; and a row that has to be added is nobody's and keeps null sums.
 void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
     const ado::RecordsetPtr rows = data::openToWrite(
-        accumulatorsStatement(data::twinsOf(shown).accumulators, shown.Collect(u"socio_id"_s)));
+        accumulatorsQuery(data::twinsOf(shown).accumulators, shown.Collect(u"socio_id"_s)));
     if (rows->atEnd()) rows->AddNew();
     data::subtract(*rows, u"credito_ac"_s, shown.Collect(u"credito"_s));
     data::subtract(*rows, u"debito_ac"_s, shown.Collect(u"debito"_s));
@@ -68,21 +68,21 @@ void takeBack(const ado::Recordset& shown, const ado::Accompaniment& with) {
 
 }  // namespace
 
-QString accountStatement(const QString& table, qint32 socio_id) {
+QString accountQuery(const QString& table, qint32 socio_id) {
     return u"Select * from "_s + table + u" WHERE (socio_id="_s + QString::number(socio_id) +
            u") and (rubrica_id_main=0)"_s;
 }
 
-QString accumulatorsStatement(const QString& table, const QVariant& socio_id) {
+QString accumulatorsQuery(const QString& table, const QVariant& socio_id) {
     return u"Select * from "_s + table + u" WHERE (socio_id="_s + core::toText(socio_id) + u")"_s;
 }
 
 const data::MovementRules& receiptRules() {
-    static const data::MovementRules rules{addToAccount, setCorrection, takeBack};
+    static const data::MovementRules rules{addToAccount, setCorrectingRow, takeBack};
     return rules;
 }
 
-bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation) {
+bool postReceipt(const Receipt& receipt, data::Operation& operation) {
     if (data::isRegistered(operation))
         return data::finishPosting(operation, receiptRules(), *receipt.record, receipt.caption);
     if (!data::confirmPosting(receipt.caption) || !receiptChecks(receipt)) return false;
@@ -92,7 +92,7 @@ bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation) {
             receipt.caption, operation))
         return false;
     receipt.record->setCollect(u"debito"_s, 0);
-    data::readyWithoutDocument(*receipt.record, receipt.Socio_ID);
+    data::readyWithoutDocument(*receipt.record, receipt.socio_id);
     // Not passed over, unlike on the other screens: a failure goes up with the engine's text.
     data::numberAndSave(*receipt.record, operation);
     if (!data::savedOrTold(receipt.caption)) return false;

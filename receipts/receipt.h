@@ -5,21 +5,21 @@
 
 namespace receipts {
 
-/// What the screen of a new receipt hands over. The texts are looked at for emptiness only.
-struct ReceiptEntry {
-    ado::RecordsetPtr record;  ///< its current row is the pending movement
-    qint32 Socio_ID = 0;       ///< the member; 0 for none
-    QString caption;           ///< the screen's; title of the boxes
-    QString DataCombo3;        ///< mode of payment
-    QString No_Kor;            ///< the member's number
-    QString Credito;           ///< the amount
+/// A receipt that is to be posted. The texts are looked at for emptiness only.
+struct Receipt {
+    ado::RecordsetPtr record = {};  ///< its current row is the pending movement
+    qint32 socio_id = 0;            ///< the member; 0 for none
+    QString caption = {};           ///< the screen's; title of the boxes
+    QString paymentMode = {};
+    QString memberNumber = {};
+    QString credit = {};
 };
 
-// Statements. `table` is that of the active members, or of those who have left.
+// Queries. `table` is that of the active members, or of those who have left.
 /// The account-level accumulator of a member, to which receipts are added.
-QString accountStatement(const QString& table, qint32 socio_id);
+QString accountQuery(const QString& table, qint32 socio_id);
 /// All accumulators of a member.
-QString accumulatorsStatement(const QString& table, const QVariant& socio_id);
+QString accumulatorsQuery(const QString& table, const QVariant& socio_id);
 
 /// Asks, checks, draws the number, saves the row and adds to the member's account-level
 /// accumulator. True when all of it is done; false when it was refused or something is missing (the
@@ -29,7 +29,7 @@ QString accumulatorsStatement(const QString& table, const QVariant& socio_id);
 /// the first two goes up, and a number drawn is lost.
 /// @param operation  of this screen from its first press of "&OK" to its last: on a receipt that an
 /// earlier press registered only what is missing is done, and nothing is asked
-bool postReceipt(const ReceiptEntry& receipt, data::Operation& operation);
+bool postReceipt(const Receipt& receipt, data::Operation& operation);
 
 /// Asks, marks the receipt, writes its correcting row and takes the amount back from an
 /// accumulator. True when the screen may go, also when somebody else had annulled it; false when

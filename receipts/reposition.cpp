@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "receipts/reposition.h"
 
-#include "data/Correction.h"
+#include "data/Annulment.h"
 #include "data/NewMovement.h"
 #include "data/RowSets.h"
 #include "platform/core/Failure.h"
@@ -16,7 +16,7 @@ namespace {
 
 using core::passingOver;
 
-bool repositionChecks(const RepositionEntry& reposition) {
+bool repositionChecks(const Reposition& reposition) {
     const auto missing = [&](const QString& text) {
         core::MsgBox(text, core::Icon::Information, reposition.caption);
         return false;
@@ -25,10 +25,10 @@ bool repositionChecks(const RepositionEntry& reposition) {
         return core::compareNumbers(reposition.record->Collect(column), 0) == 0;
     };
     const QString noAmount = u"Tem de indicar um valor para o crédito ou para o débito!"_s;
-    if (reposition.DataCombo1.isEmpty() != reposition.Text3.isEmpty())
+    if (reposition.rubric.isEmpty() != reposition.personCode.isEmpty())
         return missing(u"Uma rubrica tem de estar associada a um familiar."_s);
-    if (reposition.No_Kor.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
-    if (reposition.Debito.isEmpty() || reposition.Credito.isEmpty()) return missing(noAmount);
+    if (reposition.memberNumber.isEmpty()) return missing(u"Tem de indicar um Sócio!"_s);
+    if (reposition.debit.isEmpty() || reposition.credit.isEmpty()) return missing(noAmount);
     if (isZero(u"debito"_s) && isZero(u"credito"_s)) return missing(noAmount);
     return data::checkDated(*reposition.record, reposition.caption);
 }
@@ -40,7 +40,7 @@ void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& 
     // A rubric that was wiped is held as 0.
     if (core::compareNumbers(rubrica_id, 0) == 0) rubrica_id = {};
     const ado::RecordsetPtr rows = data::openToWrite(
-        accumulatorStatement(data::twinsOf(movement).accumulators, socio_id, rubrica_id, codABC));
+        accumulatorQuery(data::twinsOf(movement).accumulators, socio_id, rubrica_id, codABC));
     if (rows->atEnd()) rows->AddNew();
     rows->setCollect(u"Socio_ID"_s, socio_id);
     rows->setCollect(u"Rubrica_ID"_s, core::isNull(rubrica_id) ? QVariant(0) : rubrica_id);
@@ -56,8 +56,8 @@ void addToAccumulator(const ado::Recordset& movement, const ado::Accompaniment& 
 
 }  // namespace
 
-QString accumulatorStatement(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
-                             const QString& codABC) {
+QString accumulatorQuery(const QString& table, qint32 socio_id, const QVariant& rubrica_id,
+                         const QString& codABC) {
     const QString rubric = core::isNull(rubrica_id)
                                ? u" AND (rubrica_id = 0 )"_s
                                : u" AND (rubrica_id ="_s + core::toText(rubrica_id) + u")"_s;
@@ -72,7 +72,7 @@ const data::MovementRules& repositionRules() {
     return rules;
 }
 
-bool postReposition(const RepositionEntry& reposition, data::Operation& operation) {
+bool postReposition(const Reposition& reposition, data::Operation& operation) {
     const QString& caption = reposition.caption;
     if (data::isRegistered(operation))
         return data::finishPosting(operation, repositionRules(), *reposition.record, caption);
@@ -83,7 +83,7 @@ bool postReposition(const RepositionEntry& reposition, data::Operation& operatio
                                {u"credito"_s, u"O valor do crédito"_s}},
                               caption, operation))
         return false;
-    data::readyWithoutDocument(*reposition.record, reposition.Socio_ID);
+    data::readyWithoutDocument(*reposition.record, reposition.socio_id);
     passingOver([&] { data::numberAndSave(*reposition.record, operation); });
     if (!data::savedOrTold(caption)) return false;
     return data::accumulatedOrTold(operation, *reposition.record, repositionRules(), caption);

@@ -5,7 +5,6 @@
 #include <QLabel>
 #include <QScopeGuard>
 
-#include "data/MemberSearch.h"
 #include "data/Members.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"

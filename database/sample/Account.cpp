@@ -9,8 +9,12 @@ namespace {
 
 using core::Money;
 
-float single(const Amount& amount) {
-    return static_cast<float>(amount->toDouble());
+Single single(const Amount& amount) {
+    return Single(amount->toDouble());
+}
+
+Money money(Single amount) {
+    return Money::fromDouble(amount.toDouble());
 }
 
 bool isMember(const QByteArray& codABC) {
@@ -21,20 +25,19 @@ int limitOf(const Movement& document, int Rubric::*member, int Rubric::*relative
     return isMember(document.codABC) ? document.rubric->*member : document.rubric->*relative;
 }
 
-void addTo(float& sum, const Amount& amount) {
-    sum = static_cast<float>(static_cast<double>(sum) + amount->toDouble());
+void addTo(Single& sum, const Amount& amount) {
+    sum = Single(sum.toDouble() + amount->toDouble());
 }
 
-void takeFrom(float& sum, const Amount& amount) {
-    sum = static_cast<float>(static_cast<double>(sum) - amount->toDouble());
+void takeFrom(Single& sum, const Amount& amount) {
+    sum = Single(sum.toDouble() - amount->toDouble());
 }
 
 }  // namespace
 
 Account::Account(Money opening) : balance_(opening) {
     // The year close leaves a row with the sums and nothing else.
-    if (opening > Money())
-        rows_.push_back({{}, {}, {}, static_cast<float>(opening.toDouble()), 0, {}});
+    if (opening > Money()) rows_.push_back({{}, {}, {}, Single(opening.toDouble()), {}, {}});
 }
 
 bool Account::tryOut(Movement& document) const {
@@ -46,44 +49,40 @@ bool Account::tryOut(Movement& document) const {
     if (most != None)
         for (const Accumulated& row : rows_)
             if (row.codABC == document.codABC && row.rubrica_id == idOf(rubric) &&
-                most - row.no_docs.value_or(0) <= 0)
+                coverage::isUsedUp(most, row.no_docs.value_or(0)))
                 return false;
 
     const bool hospital = isHospital(rubric);
-    document.comparticipacao = Money::fromDouble(document.incidencia->toDouble() *
-                                                 static_cast<double>(float(rubric.percent)));
-    document.saldo_plafond = Money::fromDouble(static_cast<double>(remainder(document)));
+    const double incidence = document.incidencia->toDouble();
+    document.comparticipacao =
+        Money::fromDouble(coverage::share(incidence, Single(rubric.percent)));
+    document.saldo_plafond = money(left(document));
     if (!hospital) {
         double sum = 0;
         for (const Accumulated& row : rows_)
-            sum += static_cast<double>(row.debito_ac) - static_cast<double>(row.credito_ac);
+            sum += row.debito_ac.toDouble() - row.credito_ac.toDouble();
         document.saldo_acumulado = Money::fromDouble(sum);
     }
-    const float gross =
-        hospital
-            ? single(document.comparticipacao)
-            : std::min(single(document.comparticipacao),
-                       static_cast<float>((*document.incidencia - *document.recebido).toDouble()));
-    document.iliquido = Money::fromDouble(static_cast<double>(gross));
-    document.liquido = Money::fromDouble(
-        static_cast<double>(std::min(single(document.iliquido), single(document.saldo_plafond))));
-    const float net = single(document.liquido);
-    const float credit = std::max(0.0F, net - franchiseLeft(rubric));
-    document.credito = Money::fromDouble(static_cast<double>(credit));
-    document.debito = hospital ? document.doc_valor : document.credito;
+    const Single share = single(document.comparticipacao);
+    document.iliquido = money(
+        hospital ? share : coverage::grossAmount(share, incidence, document.recebido->toDouble()));
+    document.liquido =
+        money(coverage::netAmount(single(document.iliquido), single(document.saldo_plafond)));
+    document.credito = money(creditBehindFranchise(document));
+    document.debito =
+        hospital ? document.doc_valor : money(coverage::debitAmount(single(document.credito)));
     return true;
 }
 
 /// The lowest of what all ceilings leave.
-float Account::remainder(const Movement& document) const {
+Single Account::left(const Movement& document) const {
     const Rubric& rubric = *document.rubric;
     const Rubric& main = mainOf(rubric);
     const QByteArray* person = &document.codABC;
     const bool relative = !isMember(*person);
-    float left = 2000000000.0F;
-    const auto narrow = [&](int ceiling, double used) {
-        if (ceiling == None) return;
-        left = std::min(left, std::max(0.0F, static_cast<float>(ceiling - used)));
+    Single left = coverage::NoCeiling;
+    const auto narrow = [&](int ceiling, Single used) {
+        if (ceiling != None) left = std::min(left, coverage::remainder(ceiling, used));
     };
     narrow(rubric.agregado, creditOf(nullptr, false, idOf(rubric), false));
     if (relative) narrow(rubric.total_familia, creditOf(nullptr, true, idOf(rubric), false));
@@ -93,30 +92,32 @@ float Account::remainder(const Movement& document) const {
     narrow(main.agregado, creditOf(nullptr, false, idOf(main), true));
     if (relative) narrow(main.total_familia, creditOf(nullptr, true, idOf(main), true));
     const int most = relative ? rubric.familiar_max_lan : rubric.socio_max_lan;
-    if (most != None) left = std::min(left, static_cast<float>(most));
-    return left;
+    return most == None ? left : std::min(left, Single(static_cast<double>(most)));
 }
 
 /// Credit used: of one person, of the relatives or of all; of a rubric or of a main one's group.
-double Account::creditOf(const QByteArray* codABC, bool relativesOnly, int rubrica_id,
+Single Account::creditOf(const QByteArray* codABC, bool relativesOnly, int rubrica_id,
                          bool group) const {
     double sum = 0;
     for (const Accumulated& row : rows_) {
         if ((group ? row.rubrica_id_main : row.rubrica_id) != rubrica_id) continue;
         if (codABC && row.codABC != *codABC) continue;
         if (relativesOnly && isMember(row.codABC)) continue;
-        sum += static_cast<double>(row.credito_ac);
+        sum += row.credito_ac.toDouble();
     }
-    return sum;
+    return Single(sum);
 }
 
-/// Shared by the family: net less credit of the rubric's movements has been spent already.
-float Account::franchiseLeft(const Rubric& rubric) const {
-    if (rubric.franquia == None) return 0;
-    float spent = 0;
+/// The family shares the franchise: what its movements of the rubric have spent.
+Single Account::creditBehindFranchise(const Movement& document) const {
+    const Rubric& rubric = *document.rubric;
+    const Single net = single(document.liquido);
+    if (rubric.franquia == None) return net;
+    Single spent;
     for (const Franchise& each : franchises_)
-        if (each.rubric == &rubric) spent = static_cast<float>((each.net - each.credit).toDouble());
-    return std::max(0.0F, static_cast<float>(rubric.franquia) - spent);
+        if (each.rubric == &rubric)
+            spent = coverage::spentFranchise(each.net.toDouble(), each.credit.toDouble());
+    return coverage::creditAmount(net, Single(static_cast<double>(rubric.franquia)), spent);
 }
 
 void Account::post(const Movement& movement) {
@@ -164,7 +165,7 @@ bool Account::hasRow(const QByteArray& codABC, const Rubric& rubric) const {
 Accumulated& Account::row(const QByteArray& codABC, const Rubric& rubric) {
     for (Accumulated& each : rows_)
         if (each.codABC == codABC && each.rubrica_id == idOf(rubric)) return each;
-    rows_.push_back({codABC, idOf(rubric), idOf(mainOf(rubric)), 0, 0, 0});
+    rows_.push_back({codABC, idOf(rubric), idOf(mainOf(rubric)), {}, {}, 0});
     return rows_.back();
 }
 
@@ -172,7 +173,7 @@ Accumulated& Account::row(const QByteArray& codABC, const Rubric& rubric) {
 Accumulated& Account::memberRow() {
     for (Accumulated& each : rows_)
         if (each.rubrica_id_main == 0) return each;
-    rows_.push_back({{}, {}, 0, 0, 0, {}});
+    rows_.push_back({{}, {}, 0, {}, {}, {}});
     return rows_.back();
 }
 

@@ -6,12 +6,14 @@
 #include <optional>
 #include <vector>
 
+#include "coverage/Calculation.h"
 #include "database/sample/Rubrics.h"
 #include "platform/core/Money.h"
 
 namespace database::sample {
 
 using Amount = std::optional<core::Money>;
+using core::Single;
 
 /// A movement; what is not set is null in the book.
 struct Movement {
@@ -47,8 +49,8 @@ struct Accumulated {
     QByteArray codABC;
     std::optional<int> rubrica_id;
     std::optional<int> rubrica_id_main;
-    float debito_ac = 0;
-    float credito_ac = 0;
+    Single debito_ac;
+    Single credito_ac;
     std::optional<int> no_docs;
 };
 
@@ -82,9 +84,9 @@ private:
     };
     Accumulated& row(const QByteArray& codABC, const Rubric& rubric);
     Accumulated& memberRow();
-    double creditOf(const QByteArray* codABC, bool relativesOnly, int rubrica_id, bool group) const;
-    float remainder(const Movement& document) const;
-    float franchiseLeft(const Rubric& rubric) const;
+    Single creditOf(const QByteArray* codABC, bool relativesOnly, int rubrica_id, bool group) const;
+    Single left(const Movement& document) const;
+    Single creditBehindFranchise(const Movement& document) const;
 
     std::vector<Accumulated> rows_;
     std::vector<Franchise> franchises_;

@@ -36,7 +36,7 @@ Money percentOf(Money amount, int percent) {
 }
 
 Money negatedSingle(const Amount& amount) {
-    return Money::fromDouble(-static_cast<double>(static_cast<float>(amount->toDouble())));
+    return Money::fromDouble(-Single(amount->toDouble()).toDouble());
 }
 
 }  // namespace

@@ -127,8 +127,7 @@ private:
     /// What crosses into the next year, as the close stores it.
     static Money debtAfter(const Account& account) {
         if (account.balance() <= SmallestDebt) return {};
-        const auto debt = static_cast<float>(account.balance().toDouble());
-        return Money::fromDouble(static_cast<double>(debt));
+        return Money::fromDouble(Single(account.balance().toDouble()).toDouble());
     }
 
     void writeOpening(const Household& household, Money debt, qint64 number,
@@ -165,8 +164,8 @@ private:
         for (const Accumulated& row : account.rows()) {
             writer_.add(tables::accumulators(household.left),
                         {qint64{household.socio_id}, text(row.codABC), whole(row.rubrica_id),
-                         whole(row.rubrica_id_main), static_cast<double>(row.debito_ac),
-                         static_cast<double>(row.credito_ac), whole(row.no_docs)});
+                         whole(row.rubrica_id_main), row.debito_ac.toDouble(),
+                         row.credito_ac.toDouble(), whole(row.no_docs)});
             ++accumulators_;
         }
     }

@@ -42,7 +42,7 @@ Desk::~Desk() {
     core::setToday({});
 }
 
-coverage::Entry Desk::enter(const Document& document) const {
+coverage::Document Desk::enter(const Document& document) const {
     const ado::RecordsetPtr row = ado::Recordset::create();
     row->Open(data::NoMovementQuery.toString(), environment::dtZelmars::instance().MSAccess(),
               ado::adOpenStatic, ado::adLockPessimistic, ado::adCmdUnknown);
@@ -58,28 +58,28 @@ coverage::Entry Desk::enter(const Document& document) const {
     };
     for (const auto& [column, value] : columns) row->setCollect(column, value);
     return {.record = row,
-            .Socio_ID = socio,
-            .bHospital = document.hospital,
+            .socio_id = socio,
+            .isHospital = document.hospital,
             .caption = caption,
-            .Text3 = document.codABC,
-            .Text6 = core::toText(document.doc_valor),
-            .Text9 = core::toText(ninth),
-            .DataCombo1 = u"01  -  Consultas"_s,
+            .personCode = document.codABC,
+            .documentValue = core::toText(document.doc_valor),
+            .receivedOrIncidence = core::toText(ninth),
+            .rubric = u"01  -  Consultas"_s,
             .rubrica_id = document.rubrica_id};
 }
 
-coverage::PostingEntry Desk::posting(const coverage::Entry& entry) {
-    return {.entry = entry,
-            .DataCombo3 = u"TRF - Transferência"_s,
+coverage::Posting Desk::posting(const coverage::Document& entry) {
+    return {.document = entry,
+            .paymentMode = u"TRF - Transferência"_s,
             .modo_pagamento = u"TRF"_s,
-            .Text7 = u"15-05-2026"_s,
-            .Text1 = u"12-05-2026"_s,
-            .Text5 = u"FT 1/77"_s,
-            .DataCombo2 = entry.bHospital ? u"H01 - Hospital da Luz Nova"_s : QString(),
+            .movementDate = u"15-05-2026"_s,
+            .documentDate = u"12-05-2026"_s,
+            .documentNumber = u"FT 1/77"_s,
+            .hospital = entry.isHospital ? u"H01 - Hospital da Luz Nova"_s : QString(),
             .askCheque = [](const ado::RecordsetPtr&) { ADD_FAILURE() << "no cheque wanted"; }};
 }
 
-bool Desk::post(const coverage::PostingEntry& posting, const QList<support::Operator::Box>& boxes) {
+bool Desk::post(const coverage::Posting& posting, const QList<support::Operator::Box>& boxes) {
     person.expectBox({.text = u"Deseja finalizar o registo?"_s,
                       .answer = core::Answer::Yes,
                       .icon = core::Icon::Question,
@@ -119,7 +119,7 @@ void Desk::setRubric(qint64 rubrica_id, const char* column, const QVariant& valu
             .arg(rubrica_id));
 }
 
-std::string Desk::kept(const coverage::Entry& entry, const char* column) {
+std::string Desk::kept(const coverage::Document& entry, const char* column) {
     const QVariant value = entry.record->Collect(QString::fromLatin1(column));
     return core::isNull(value) ? "null" : core::toText(value).toStdString();
 }

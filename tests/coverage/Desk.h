@@ -43,15 +43,14 @@ protected:
     }
 
     /// Opens the pending row of a new movement, as the entry screen does, and keys the document in.
-    coverage::Entry enter(const Document& document) const;
+    coverage::Document enter(const Document& document) const;
     /// Tries out; the outcome is in `run`.
-    void tryOut(const coverage::Entry& entry) { coverage::tryOut(entry, run); }
+    void tryOut(const coverage::Document& entry) { coverage::tryOut(entry, run); }
     /// A posting with nothing missing, by bank transfer.
-    static coverage::PostingEntry posting(const coverage::Entry& entry);
+    static coverage::Posting posting(const coverage::Document& entry);
     /// Posts, the operator saying yes; then the boxes come.
-    bool post(const coverage::PostingEntry& posting,
-              const QList<support::Operator::Box>& boxes = {});
-    bool post(const coverage::Entry& entry) { return post(posting(entry)); }
+    bool post(const coverage::Posting& posting, const QList<support::Operator::Box>& boxes = {});
+    bool post(const coverage::Document& entry) { return post(posting(entry)); }
 
     /// Adds an accumulator row of the member.
     void accumulated(const QString& codABC, qint64 rubrica_id, double credit, int documents = 1);
@@ -61,7 +60,7 @@ protected:
     void setRubric(qint64 rubrica_id, const char* column, const QVariant& value);
 
     /// A column of the pending row as plain text, all decimals kept; "null" for null.
-    static std::string kept(const coverage::Entry& entry, const char* column);
+    static std::string kept(const coverage::Document& entry, const char* column);
     /// A query's rows as text.
     std::string stored(const char* query) {
         return book.text(QString::fromUtf8(query)).toStdString();

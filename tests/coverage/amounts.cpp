@@ -35,12 +35,12 @@ constexpr Ceiling GroupHousehold{"agregado", "agregado", true, 63, 63};
 
 class Limits : public Desk {
 protected:
-    coverage::Entry triedOut(const Way& way, qint64 rubric, int value) {
-        const coverage::Entry entry = enter({.rubrica_id = rubric,
-                                             .codABC = way.code,
-                                             .doc_valor = value,
-                                             .hospital = way.hospital,
-                                             .incidencia = value});
+    coverage::Document triedOut(const Way& way, qint64 rubric, int value) {
+        const coverage::Document entry = enter({.rubrica_id = rubric,
+                                                .codABC = way.code,
+                                                .doc_valor = value,
+                                                .hospital = way.hospital,
+                                                .incidencia = value});
         tryOut(entry);
         return entry;
     }
@@ -93,7 +93,7 @@ TEST_F(Ceilings, TheLowestRemainderBinds) {
                 leave(ceiling, way, left);
                 const bool binds = ceiling.bindsMember || !way.ofMember();
                 const int expected = binds ? std::clamp(left, ceiling.lowest, 70) : 70;
-                const coverage::Entry entry = triedOut(way, rubric, 1000);
+                const coverage::Document entry = triedOut(way, rubric, 1000);
                 for (const char* column : {"saldo_plafond", "liquido", "credito"})
                     EXPECT_EQ(kept(entry, column), std::to_string(expected)) << column;
                 EXPECT_EQ(kept(entry, "debito"),
@@ -133,7 +133,7 @@ TEST_F(Limits, OfThePersonsOwnEndTheRunOrLetItPass) {
             accumulated(u"C9"_s, rubric, 0, 9);
             if (row.box == minimum) expectBox(minimum);
             if (row.box == documents) expectBox(documents, core::Icon::Information, caption);
-            const coverage::Entry entry = triedOut(way, rubric, 100);
+            const coverage::Document entry = triedOut(way, rubric, 100);
             EXPECT_TRUE(run.bEnsaioValido);
             EXPECT_EQ(kept(entry, "comparticipacao"), row.share);
             EXPECT_EQ(kept(entry, "credito"), row.credit);
@@ -165,7 +165,7 @@ TEST_F(Limits, WhatIsLeftOfTheFamilysFranchiseComesOffTheCredit) {
             const qint64 rubric = book.childRubric({.franquia = row.franchise});
             for (const Movement& movement : row.earlier)
                 moved(rubric, movement.net, movement.credit, QString::fromLatin1(movement.type));
-            const coverage::Entry entry = triedOut(way, rubric, 100);
+            const coverage::Document entry = triedOut(way, rubric, 100);
             EXPECT_EQ(kept(entry, "liquido"), "80");
             EXPECT_EQ(kept(entry, "credito"), std::to_string(row.credit));
             EXPECT_EQ(kept(entry, "debito"), std::to_string(way.hospital ? 100 : row.credit));
@@ -175,12 +175,12 @@ TEST_F(Limits, WhatIsLeftOfTheFamilysFranchiseComesOffTheCredit) {
 
 class Amounts : public Desk {
 protected:
-    coverage::Entry triedOut(const Document& document) {
-        const coverage::Entry entry = enter(document);
+    coverage::Document triedOut(const Document& document) {
+        const coverage::Document entry = enter(document);
         tryOut(entry);
         return entry;
     }
-    static void expectAmounts(const coverage::Entry& entry,
+    static void expectAmounts(const coverage::Document& entry,
                               std::initializer_list<std::pair<const char*, const char*>> amounts) {
         for (const auto& [column, amount] : amounts)
             EXPECT_EQ(kept(entry, column), amount) << column;

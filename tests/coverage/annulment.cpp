@@ -93,8 +93,8 @@ protected:
 TEST_F(Annulment, MarksTheMovementCorrectsItTakesTheTotalsBackAndRaisesTheFranchiseUsed) {
     const qint64 key = document();
     const qint64 bill = movement(u"_Inactivos"_s, u"HOS"_s, u"5"_s);
-    const QString franchise = u"select t_iliquido - t_credito from (%1) f"_s.arg(
-        coverage::statements::franchise(socio, 7));
+    const QString franchise =
+        u"select t_iliquido - t_credito from (%1) f"_s.arg(coverage::queries::franchise(socio, 7));
     EXPECT_FALSE(annul(key, core::Answer::No));
     EXPECT_EQ(totals(), "150|90.5|3");
     EXPECT_EQ(book.value(franchise).toDouble(), 9.75);

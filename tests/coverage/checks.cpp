@@ -14,16 +14,16 @@ namespace {
 class Checks : public Desk {};
 
 TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
-    coverage::PostingEntry bill = posting(enter(
+    coverage::Posting bill = posting(enter(
         {.rubrica_id = book.childRubric({}), .doc_valor = -1, .hospital = true, .incidencia = 4}));
-    coverage::Entry& entry = bill.entry;
+    coverage::Document& entry = bill.document;
     const auto put = [&](const QString& column, const QVariant& value) {
         entry.record->setCollect(column, value);
     };
     put(u"recebido"_s, 5);
-    for (QString* text :
-         {&entry.DataCombo1, &entry.Text3, &entry.Text6, &entry.Text9, &bill.DataCombo3,
-          &bill.Text7, &bill.Text1, &bill.Text5, &bill.DataCombo2})
+    for (QString* text : {&entry.rubric, &entry.personCode, &entry.documentValue,
+                          &entry.receivedOrIncidence, &bill.paymentMode, &bill.movementDate,
+                          &bill.documentDate, &bill.documentNumber, &bill.hospital})
         text->clear();
     book.exec(u"update tbSocios set nib = null"_s);
     const QString none = core::DefaultTitle.toString();
@@ -39,16 +39,17 @@ TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
         {u"O valor recebido é inferior a 0."_s, [&] { put(u"recebido"_s, {}); }, Icon::None, none},
         {u"O valor do documento é inferior a 0."_s, [&] { put(u"doc_valor"_s, 0); }, Icon::None,
          none},
-        {u"Tem de Indicar uma rubrica!"_s, [&] { entry.DataCombo1 = u"01"_s; }},
-        {u"Não foi atribuido nenhum código de familiar!"_s, [&] { entry.Text3 = u"A"_s; }},
+        {u"Tem de Indicar uma rubrica!"_s, [&] { entry.rubric = u"01"_s; }},
+        {u"Não foi atribuido nenhum código de familiar!"_s, [&] { entry.personCode = u"A"_s; }},
         {u"Tem de indicar o valor de incidência!"_s, [&] { put(u"incidencia"_s, 100); }},
-        {u"Tem de indicar um valor para o documento!"_s, [&] { entry.Text6 = u"0"_s; }},
-        {u"Tem de indicar um valor para o campo Recebido!"_s, [&] { entry.Text9 = u"100"_s; }},
-        {u"Tem de indicar um modo de pagamento."_s, [&] { bill.DataCombo3 = u"TRF"_s; }},
-        {u"Tem de introduzir a data do registo."_s, [&] { bill.Text7 = u"15-05-2026"_s; }},
-        {u"Tem de introduzir a data do documento."_s, [&] { bill.Text1 = u"12-05-2026"_s; }},
-        {u"Tem de introduzir o número do documento."_s, [&] { bill.Text5 = u"1"_s; }},
-        {u"Tem de indicar um hospital."_s, [&] { bill.DataCombo2 = u"H01"_s; }},
+        {u"Tem de indicar um valor para o documento!"_s, [&] { entry.documentValue = u"0"_s; }},
+        {u"Tem de indicar um valor para o campo Recebido!"_s,
+         [&] { entry.receivedOrIncidence = u"100"_s; }},
+        {u"Tem de indicar um modo de pagamento."_s, [&] { bill.paymentMode = u"TRF"_s; }},
+        {u"Tem de introduzir a data do registo."_s, [&] { bill.movementDate = u"15-05-2026"_s; }},
+        {u"Tem de introduzir a data do documento."_s, [&] { bill.documentDate = u"12-05-2026"_s; }},
+        {u"Tem de introduzir o número do documento."_s, [&] { bill.documentNumber = u"1"_s; }},
+        {u"Tem de indicar um hospital."_s, [&] { bill.hospital = u"H01"_s; }},
         {u"Este Associado não tem NIB!"_s,
          [&] { book.exec(u"update tbSocios set nib = 'não é um número 1234'"_s); }, Icon::Critical,
          none},
@@ -73,7 +74,7 @@ TEST_F(Checks, TheFirstOfSeveralFaultsIsToldAndNothingIsPosted) {
 
 // The incidence of a document is filled by the run itself, so the first run cannot compare with it.
 TEST_F(Checks, MoreReceivedThanTheDocumentIsWorthIsRefusedFromTheSecondRunOn) {
-    const coverage::Entry more = enter({.rubrica_id = book.childRubric({}), .recebido = 120});
+    const coverage::Document more = enter({.rubrica_id = book.childRubric({}), .recebido = 120});
     tryOut(more);
     EXPECT_TRUE(run.bEnsaioValido);
     EXPECT_EQ(kept(more, "credito"), "-20");

@@ -24,10 +24,10 @@ TEST_F(GroupCeilings, AreUsedUpByWhatWasPostedOnTheOtherRubricsOfTheGroup) {
         const qint64 rubric = book.childRubric({.rubrica_id_main = group});
         const qint64 sister = book.childRubric({.rubrica_id_main = group});
         setRubric(group, row.ceiling, 100);
-        const coverage::Entry first = enter({.rubrica_id = rubric, .codABC = row.first});
+        const coverage::Document first = enter({.rubrica_id = rubric, .codABC = row.first});
         EXPECT_TRUE(post(first));
         EXPECT_EQ(kept(first, "credito"), "80");
-        const coverage::Entry second = enter({.rubrica_id = sister, .codABC = row.second});
+        const coverage::Document second = enter({.rubrica_id = sister, .codABC = row.second});
         EXPECT_TRUE(post(second));
         EXPECT_EQ(kept(second, "saldo_plafond"), "20");
         EXPECT_EQ(kept(second, "credito"), "20");

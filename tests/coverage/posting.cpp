@@ -41,9 +41,9 @@ TEST_F(Posting, WritesTheMovementItsNumberAndTheTotals) {
 }
 
 TEST_F(Posting, AsksAboutUnusualValuesBeforeItTriesOutAndNotAgain) {
-    const coverage::PostingEntry entry =
+    const coverage::Posting entry =
         posting(enter({.rubrica_id = rubric, .doc_valor = 1'000'000.5}));
-    entry.entry.record->setCollect(u"doc_data"_s, core::fromDate({1926, 5, 12}));
+    entry.document.record->setCollect(u"doc_data"_s, core::fromDate({1926, 5, 12}));
     const auto asks = [&](const QString& text, core::Answer answer) {
         person.expectBox({.text = text, .answer = answer, .icon = Icon::Question});
     };
@@ -71,8 +71,8 @@ TEST_F(Posting, OnAnEmptyCounterGivesTheNumberOneTwice) {
 
 // Counter, movement and accumulator are three writes.
 TEST_F(Posting, ThatFailsToWriteTheCounterSavesNothing) {
-    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
-    tryOut(entry.entry);
+    const coverage::Posting entry = posting(enter({.rubrica_id = rubric}));
+    tryOut(entry.document);
     const auto failToPost = [&](const QString& description) {
         EXPECT_FALSE(
             post(entry,
@@ -101,8 +101,8 @@ const char* const Journal =
     "quem like '%@%' and quando is not null from tbOperacoes";
 
 TEST_F(Posting, ThatLacksTheAccumulatorIsFinishedByTheNextPressWhichAsksAndStoresNothingTwice) {
-    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
-    tryOut(entry.entry);
+    const coverage::Posting entry = posting(enter({.rubrica_id = rubric}));
+    tryOut(entry.document);
     refuse(u"update on tbSocios_Acumulados"_s);
     const support::Operator::Box missing{
         .text =
@@ -113,7 +113,7 @@ TEST_F(Posting, ThatLacksTheAccumulatorIsFinishedByTheNextPressWhichAsksAndStore
     EXPECT_FALSE(post(entry, {missing}));
     EXPECT_EQ(stored(Journal), "LAN|ACU|ACTIVO|1|DOC|1|1|1");
     // Neither what is typed since nor another press without success changes anything.
-    entry.entry.record->setCollect(u"credito"_s, 1);
+    entry.document.record->setCollect(u"credito"_s, 1);
     person.expectBox(missing);
     EXPECT_FALSE(coverage::post(entry, run, begun));
     expectState("2|1|0|0|0");
@@ -127,11 +127,11 @@ TEST_F(Posting, ThatLacksTheAccumulatorIsFinishedByTheNextPressWhichAsksAndStore
 
 // The row is written, but the program does not learn it.
 TEST_F(Posting, WhoseAnswerWasLostIsFoundAgainByTheNextPress) {
-    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    const coverage::Posting entry = posting(enter({.rubrica_id = rubric}));
     refuse(u"update on tbSocios_Acumulados"_s);
     EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
     book.refuseNoMore();
-    const coverage::PostingEntry again = posting(enter({.rubrica_id = rubric}));
+    const coverage::Posting again = posting(enter({.rubrica_id = rubric}));
     data::Operation unaware;
     unaware.id = begun.id;
     EXPECT_TRUE(coverage::post(again, run, unaware));
@@ -139,7 +139,7 @@ TEST_F(Posting, WhoseAnswerWasLostIsFoundAgainByTheNextPress) {
 }
 
 TEST_F(Posting, FinishedBySomebodyElseMeanwhileIsNotAddedTwice) {
-    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    const coverage::Posting entry = posting(enter({.rubrica_id = rubric}));
     refuse(u"update on tbSocios_Acumulados"_s);
     EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
     book.refuseNoMore();
@@ -155,7 +155,7 @@ TEST_F(Posting, FinishedBySomebodyElseMeanwhileIsNotAddedTwice) {
 
 TEST_F(Posting, InABookOfAnOlderProgramWorksWithoutAJournal) {
     book.exec(u"drop table tbOperacoes"_s);
-    const coverage::PostingEntry entry = posting(enter({.rubrica_id = rubric}));
+    const coverage::Posting entry = posting(enter({.rubrica_id = rubric}));
     refuse(u"update on tbSocios_Acumulados"_s);
     EXPECT_FALSE(post(entry, {{.text = u"falta somar"_s, .partly = true}}));
     book.refuseNoMore();

@@ -60,11 +60,11 @@ protected:
                 .incidencia = value * (1 + below(10)) / 10};
     }
 
-    static double number(const coverage::Entry& entry, const QString& column) {
+    static double number(const coverage::Document& entry, const QString& column) {
         return core::toDouble(entry.record->Collect(column));
     }
 
-    void expectSoundAmounts(const coverage::Entry& entry) {
+    void expectSoundAmounts(const coverage::Document& entry) {
         const double credit = number(entry, u"credito"_s);
         EXPECT_GE(number(entry, u"saldo_plafond"_s), 0);
         EXPECT_LE(number(entry, u"liquido"_s), number(entry, u"saldo_plafond"_s));
@@ -72,18 +72,18 @@ protected:
         EXPECT_LE(number(entry, u"iliquido"_s), number(entry, u"comparticipacao"_s) + 0.0001);
         EXPECT_LE(credit, std::max(0.0, number(entry, u"liquido"_s)));
         EXPECT_NEAR(number(entry, u"debito"_s),
-                    entry.bHospital ? number(entry, u"doc_valor"_s) : std::max(0.0, credit),
+                    entry.isHospital ? number(entry, u"doc_valor"_s) : std::max(0.0, credit),
                     0.0001);
     }
 
-    std::string everything(const coverage::Entry& entry) {
+    std::string everything(const coverage::Document& entry) {
         std::string all = stored("select * from tbSocios_Acumulados order by 1, 2, 3");
         for (int column = 0; column < entry.record->columnCount(); ++column)
             all += '|' + core::toText(entry.record->value(column)).toStdString();
         return all;
     }
     /// Two runs in a row leave the same row and the same book.
-    void expectSecondRunToChangeNothing(const coverage::Entry& entry) {
+    void expectSecondRunToChangeNothing(const coverage::Document& entry) {
         tryOut(entry);
         const std::string first = everything(entry);
         tryOut(entry);
@@ -100,7 +100,7 @@ TEST_F(RandomDocuments, NeverCreditMoreThanTheCeilingsLeaveAndAddUp) {
         SCOPED_TRACE(i);
         const Document document = anyDocument();
         socio = members[static_cast<std::size_t>(below(Members))];
-        const coverage::Entry entry = enter(document);
+        const coverage::Document entry = enter(document);
         if (i % 3 == 0) expectSecondRunToChangeNothing(entry);
         begun = {};
         ASSERT_TRUE(coverage::post(posting(entry), run, begun));

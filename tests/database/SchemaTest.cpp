@@ -61,7 +61,7 @@ TEST(MovementsInForce, AnIdNamesOneMovementInBothTables) {
 
 /// What people wait for at the keyboard; each is reached by a key, however large the book.
 TEST(Schema, DailyStatementsDoNotReadWholeTables) {
-    using namespace coverage::statements;
+    using namespace coverage::queries;
     // Rows of one table are read in the order of their insertion.
     const auto rows = [](const QString& statement) { return statement + u" %1"_s; };
     const QStringList statements{

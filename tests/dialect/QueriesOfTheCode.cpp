@@ -4,9 +4,8 @@
 #include "boundary/Registo.h"
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/Queries.h"
-#include "data/Correction.h"
+#include "data/Annulment.h"
 #include "data/Members.h"
-#include "data/MovementNumber.h"
 #include "data/NewMovement.h"
 #include "entry/Beneficiary.h"
 #include "payments/ChequeNumber.h"
@@ -56,7 +55,7 @@ QList<Listed> ofMovementsAndMembers() {
 }
 
 QList<Listed> ofAccumulators() {
-    using namespace coverage::statements;
+    using namespace coverage::queries;
     const QString left = u"tbSocios_Acumulados_Inactivos"_s;
     const QString own = u"A"_s;
     const QString active = u"tbSocios_Acumulados"_s;
@@ -74,14 +73,12 @@ QList<Listed> ofAccumulators() {
         {u"credit of the group, relatives"_s, groupCreditOfRelatives(MainRubric, Member)},
         {u"balance"_s, balance(Member)},
         {u"franchise"_s, franchise(Member, Rubric)},
-        {u"account-level accumulator"_s, receipts::accountStatement(active, 12)},
-        {u"accumulators of a member"_s, receipts::accumulatorsStatement(active, Member)},
-        {u"accumulators of a member who left"_s,
-         receipts::accumulatorsStatement(left, MemberWhoLeft)},
-        {u"accumulator of a reposition"_s,
-         receipts::accumulatorStatement(active, Member, Rubric, own)},
+        {u"account-level accumulator"_s, receipts::accountQuery(active, 12)},
+        {u"accumulators of a member"_s, receipts::accumulatorsQuery(active, Member)},
+        {u"accumulators of a member who left"_s, receipts::accumulatorsQuery(left, MemberWhoLeft)},
+        {u"accumulator of a reposition"_s, receipts::accumulatorQuery(active, Member, Rubric, own)},
         {u"accumulator of a reposition without a rubric"_s,
-         receipts::accumulatorStatement(active, Member, {}, {}), false},
+         receipts::accumulatorQuery(active, Member, {}, {}), false},
     };
 }
 

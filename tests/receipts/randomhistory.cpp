@@ -64,12 +64,12 @@ protected:
 
     void postDocument(bool hospital) {
         const double value = amount();
-        const coverage::Entry entry = enter({.rubrica_id = anyRubric(),
-                                             .codABC = anyPerson(),
-                                             .doc_valor = value,
-                                             .recebido = below(3) ? 0 : value / 4,
-                                             .hospital = hospital,
-                                             .incidencia = value * 3 / 4});
+        const coverage::Document entry = enter({.rubrica_id = anyRubric(),
+                                                .codABC = anyPerson(),
+                                                .doc_valor = value,
+                                                .recebido = below(3) ? 0 : value / 4,
+                                                .hospital = hospital,
+                                                .incidencia = value * 3 / 4});
         coverage::TryOut once;
         begun = {};
         ASSERT_TRUE(coverage::post(posting(entry), once, begun));
@@ -85,7 +85,13 @@ protected:
         const ado::RecordsetPtr row = newRow(u"PAG"_s);
         row->setCollect(u"credito"_s, amount());
         begun = {};
-        ASSERT_TRUE(receipts::postReceipt({row, socio, caption, u"CHQ"_s, u"1"_s, u"1"_s}, begun));
+        ASSERT_TRUE(receipts::postReceipt({.record = row,
+                                           .socio_id = socio,
+                                           .caption = caption,
+                                           .paymentMode = u"CHQ"_s,
+                                           .memberNumber = u"1"_s,
+                                           .credit = u"1"_s},
+                                          begun));
         count(*row, 1);
     }
     void postReposition() {
@@ -100,8 +106,14 @@ protected:
             row->setCollect(u"codABC"_s, whom);
         }
         begun = {};
-        ASSERT_TRUE(receipts::postReposition({row, socio, caption, withRubric ? u"01"_s : QString(),
-                                              rubric, whom, u"1"_s, u"1"_s, u"1"_s},
+        ASSERT_TRUE(receipts::postReposition({.record = row,
+                                              .socio_id = socio,
+                                              .caption = caption,
+                                              .rubric = withRubric ? u"01"_s : QString(),
+                                              .personCode = whom,
+                                              .memberNumber = u"1"_s,
+                                              .debit = u"1"_s,
+                                              .credit = u"1"_s},
                                              begun));
         count(*row, 1);
     }
@@ -120,7 +132,7 @@ protected:
         if (core::toText(row->Collect(u"tipo"_s)) == u"PAG"_s)
             ASSERT_TRUE(receipts::annulReceipt(row, caption, begun));
         else
-            ASSERT_TRUE(coverage::annul({row, caption}, begun));
+            ASSERT_TRUE(coverage::annul({.shown = row, .caption = caption}, begun));
         count(*row, -1);
         ++annulled;
     }

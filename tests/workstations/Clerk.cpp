@@ -56,7 +56,12 @@ bool postReceipt(qint32 socio_id, const QString& amount) {
     row->setCollect(u"tipo"_s, data::tipo::Receipt.toString());
     row->setCollect(u"credito"_s, amount);
     data::Operation operation;
-    return receipts::postReceipt({row, socio_id, {}, u"CHQ"_s, u"1"_s, u"1"_s}, operation);
+    return receipts::postReceipt({.record = row,
+                                  .socio_id = socio_id,
+                                  .paymentMode = u"CHQ"_s,
+                                  .memberNumber = u"1"_s,
+                                  .credit = u"1"_s},
+                                 operation);
 }
 
 bool finishAll() {

@@ -75,20 +75,23 @@ void takeCheque(const ado::RecordsetPtr& movement) {
 }
 
 bool post(const office::Job& job, const QString& number) {
-    coverage::PostingEntry posting;
-    coverage::Entry& entry = posting.entry;
-    entry.record = keyIn(job, number);
-    entry.Socio_ID = job.socio_id;
-    entry.bHospital = job.isBill;
-    entry.caption = u"Lançamento (Plano de Saúde)"_s;
-    entry.Text3 = job.codABC;
-    entry.Text6 = entry.Text9 = u"1"_s;  // only looked at for being there
-    entry.DataCombo1 = u"01  -  Consultas"_s;
-    entry.rubrica_id = job.rubrica_id;
-    posting.DataCombo3 = posting.Text7 = posting.Text1 = posting.Text5 = posting.DataCombo2 =
-        u"1"_s;
-    posting.modo_pagamento = job.isBill ? u"CHQ"_s : u"TRF"_s;
-    posting.askCheque = takeCheque;
+    const QString typed = u"1"_s;  // what is only looked at for being there
+    const coverage::Posting posting{.document = {.record = keyIn(job, number),
+                                                 .socio_id = job.socio_id,
+                                                 .isHospital = job.isBill,
+                                                 .caption = u"Lançamento (Plano de Saúde)"_s,
+                                                 .personCode = job.codABC,
+                                                 .documentValue = typed,
+                                                 .receivedOrIncidence = typed,
+                                                 .rubric = typed,
+                                                 .rubrica_id = job.rubrica_id},
+                                    .paymentMode = typed,
+                                    .modo_pagamento = job.isBill ? u"CHQ"_s : u"TRF"_s,
+                                    .movementDate = typed,
+                                    .documentDate = typed,
+                                    .documentNumber = typed,
+                                    .hospital = typed,
+                                    .askCheque = takeCheque};
     coverage::TryOut run;
     data::Operation operation;
     return coverage::post(posting, run, operation);

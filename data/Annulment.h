@@ -41,6 +41,7 @@ Annulled annul(const ado::Recordset& shown, const QString& caption, const Moveme
 
 /// Writes the correcting row of a movement that is marked. Fails with NotAccompanied, and writes
 /// nothing, when somebody else did it meanwhile.
-void correct(const ado::Recordset& shown, const MovementRules& rules, Operation& annulment);
+void addCorrectingRow(const ado::Recordset& shown, const MovementRules& rules,
+                      Operation& annulment);
 
 }  // namespace data

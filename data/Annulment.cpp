@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-#include "data/Correction.h"
+#include "data/Annulment.h"
 
 #include "data/Codes.h"
-#include "data/MovementNumber.h"
+#include "data/NewMovement.h"
 #include "data/RowSets.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
@@ -64,19 +64,19 @@ bool mark(ado::Recordset& movement, Operation& annulment) {
     if (core::toText(movement.Collect(u"tipo"_s)) == tipo::Annulled) return false;
     movement.setCollect(u"tipo"_s, tipo::Annulled.toString());
     movement.setCollect(u"modo_pagamento"_s, modo::Annulled.toString());
-    annulment.missing = Step::Correction;
+    annulment.missing = Step::CorrectingRow;
     movement.Update(journal::begun(annulment));
     annulment.isRegistered = true;
     return true;
 }
 
-void addCorrection(const ado::Recordset& shown, ado::Recordset& rows, const MovementRules& rules,
-                   Operation& annulment) {
+void addCorrectingRowTo(ado::Recordset& rows, const ado::Recordset& shown,
+                        const MovementRules& rules, Operation& annulment) {
     rows.AddNew();
     rows.setCollect(u"data"_s, core::fromDate(core::today()));
     rows.setCollect(u"tipo"_s, tipo::Correcting.toString());
     rows.setCollect(u"socio_id"_s, shown.Collect(u"socio_id"_s));
-    rules.setCorrection(shown, rows);
+    rules.setCorrectingRow(shown, rows);
     Operation done = annulment;
     done.correcao_no = drawMovementNumber();
     rows.setCollect(u"movimento_no"_s, done.correcao_no);
@@ -94,14 +94,15 @@ void addCorrection(const ado::Recordset& shown, ado::Recordset& rows, const Move
 
 }  // namespace
 
-void correct(const ado::Recordset& shown, const MovementRules& rules, Operation& annulment) {
-    addCorrection(shown, *openMarkable(shown), rules, annulment);
+void addCorrectingRow(const ado::Recordset& shown, const MovementRules& rules,
+                      Operation& annulment) {
+    addCorrectingRowTo(*openMarkable(shown), shown, rules, annulment);
 }
 
 Annulled annul(const ado::Recordset& shown, const QString& caption, const MovementRules& rules,
                Operation& annulment) {
     const bool isRetry = annulment.isRegistered;
-    if (isRetry && annulment.missing != Step::Correction) return Annulled::Corrected;
+    if (isRetry && annulment.missing != Step::CorrectingRow) return Annulled::Corrected;
     if (!isRetry) beginAnnulment(shown, annulment);
     const ado::RecordsetPtr rows = openMarkable(shown);
     if (isRetry) {
@@ -115,12 +116,12 @@ Annulled annul(const ado::Recordset& shown, const QString& caption, const Moveme
         return Annulled::Elsewhere;
     }
     try {
-        addCorrection(shown, *rows, rules, annulment);
+        addCorrectingRowTo(*rows, shown, rules, annulment);
     } catch (const core::Failure& failure) {
         if (!annulment.isRegistered) throw;
         if (failure.number() == core::NotAccompanied) {
             catchUp(annulment);
-            if (annulment.missing != Step::Correction) return Annulled::Corrected;
+            if (annulment.missing != Step::CorrectingRow) return Annulled::Corrected;
         }
         tellUnfinished(annulment, failure.text(), caption);
         return Annulled::Unfinished;
