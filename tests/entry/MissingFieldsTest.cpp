@@ -11,13 +11,14 @@ namespace {
 class MissingFields : public EntryTest {};
 
 TEST_F(MissingFields, AreNamedByTheFieldThatWasLeftEmpty) {
-    openNew();
+    openNew(true);
     typeDocument(u"100"_s);
     const struct {
         QString field, text, refusal;
     } rows[] = {
         {u"Text1"_s, u"10-03-2026"_s, u"Tem de introduzir a data do documento."_s},
         {u"Text5"_s, u"FT 2026/17"_s, u"Tem de introduzir o número do documento."_s},
+        {u"DataCombo2"_s, u"H01"_s, u"Tem de indicar um hospital."_s},
     };
     for (const auto& row : rows) {
         person.fill(row.field, QString());
