@@ -14,7 +14,7 @@
 #include <string_view>
 
 #include "coverage/Queries.h"
-#include "platform/registry/Registry.h"
+#include "platform/registry/LoginValues.h"
 #include "tests/workstations/Jobs.h"
 
 using namespace Qt::StringLiterals;
@@ -104,16 +104,12 @@ private:
 
 /// The book that the registry names.
 std::unique_ptr<BareBook> openBook() {
-    const auto key =
-        registry::Key::open(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s);
-    if (!key) stop("no registry");
-    const QString source = key->value(u"dtDataSource"_s).value_or(QString());
-    const QString catalogue = key->value(u"dtInitialCatalog"_s).value_or(QString());
-    const QString place = source.section(u':', 1);
-    if (source.startsWith(u"sqlite:"_s))
-        return std::make_unique<SqliteBook>(place + u'/' + catalogue + u".db"_s);
-    return std::make_unique<ServerBook>(place, catalogue,
-                                        key->value(u"dtUser"_s).value_or(QString()));
+    registry::LoginValues values;
+    if (!values.take().isEmpty()) stop("no registry");
+    const QString place = values.dtDataSource.section(u':', 1);
+    if (values.dtDataSource.startsWith(u"sqlite:"_s))
+        return std::make_unique<SqliteBook>(place + u'/' + values.dtInitialCatalog + u".db"_s);
+    return std::make_unique<ServerBook>(place, values.dtInitialCatalog, values.dtUser);
 }
 
 /// One posting.

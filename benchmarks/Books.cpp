@@ -11,6 +11,7 @@
 #include "benchmarks/BenchServer.h"
 #include "boundary/Login.h"
 #include "database/Book.h"
+#include "platform/registry/LoginValues.h"
 
 using namespace Qt::StringLiterals;
 
@@ -168,10 +169,10 @@ void use(const Book& book) {
     if (book.engine == Engine::Sqlite)
         database::writeSettings(book.folder, Catalogue);
     else
-        database::writeSettings({QString::fromLatin1(BenchServer::User),
-                                 {},
-                                 book.catalogue,
-                                 u"postgresql:"_s + book.folder});
+        registry::LoginValues{.dtUser = QString::fromLatin1(BenchServer::User),
+                              .dtInitialCatalog = book.catalogue,
+                              .dtDataSource = u"postgresql:"_s + book.folder}
+            .write();
     boundary::Login();
 }
 

@@ -19,6 +19,7 @@
 #include "platform/ado/ConnectionSettings.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
+#include "platform/registry/LoginValues.h"
 #include "platform/registry/Registry.h"
 
 using namespace Qt::StringLiterals;
@@ -156,18 +157,11 @@ void createBook(const QString& folder, const QString& catalogue,
     cleanup.dismiss();
 }
 
-void writeSettings(const LoginValues& values) {
-    registry::writeValues(registry::Hive::LocalMachine, u"SOFTWARE\\Norvanta\\Corvenda"_s,
-                          {{u"dtSecurityInfo"_s, u"True"_s},
-                           {u"dtUser"_s, values.user},
-                           {u"dtPassword"_s, values.password},
-                           {u"dtInitialCatalog"_s, values.catalogue},
-                           {u"dtDataSource"_s, values.dataSource}});
-}
-
 void writeSettings(const QString& folder, const QString& catalogue) {
     refuseUnnameable(folder);
-    writeSettings({u"zelmars"_s, {}, catalogue, dataSource(folder)});
+    registry::LoginValues{
+        .dtUser = u"zelmars"_s, .dtInitialCatalog = catalogue, .dtDataSource = dataSource(folder)}
+        .write();
     const QString file = bookFile(folder, catalogue);
     if (isUnfinished(file)) QFile::remove(stagedFile(file));
 }

@@ -61,15 +61,6 @@ void fillSample(const QString& folder, const QString& catalogue, const BookSizes
                 QDate asOf = {});
 // clang-format on
 
-/// Four of the five values that every login reads; the fifth is always the same.
-struct LoginValues {
-    QString user;
-    QString password;
-    QString catalogue;
-    QString dataSource;
-};
-/// Writes the five values.
-void writeSettings(const LoginValues& values);
 /// Writes the five values so that they name this book. Fails when they cannot carry the folder.
 void writeSettings(const QString& folder, const QString& catalogue);
 

@@ -9,6 +9,7 @@
 #include "platform/ado/Connection.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
+#include "platform/registry/LoginValues.h"
 
 namespace database {
 
@@ -61,7 +62,11 @@ public:
             makeBook(sample);
         }
         enterAsOperator();
-        writeSettings({worker_.user, worker_.password, catalogue_.name, catalogue_.dataSource()});
+        registry::LoginValues{.dtUser = worker_.user,
+                              .dtPassword = worker_.password,
+                              .dtInitialCatalog = catalogue_.name,
+                              .dtDataSource = catalogue_.dataSource()}
+            .write();
         undo.dismiss();
         postgres::Database(catalogue_).run("COMMENT ON TABLE public.tbcontadores IS NULL");
     }

@@ -1,17 +1,12 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QString>
+#include "platform/registry/LoginValues.h"
 
 namespace host {
 
-/// The five values that name the book and its user, as the component reads them at each login.
-struct BookSettings {
-    QString securityInfo;
-    QString user;
-    QString password;
-    QString catalogue;
-    QString dataSource;
+/// The five values that name the book and its user, as a window shows them.
+struct BookSettings : registry::LoginValues {
     bool isComplete = false;  ///< none of the five is missing; an empty one is not missing
     QString unreadable = {};  ///< why the settings cannot be read; empty when they can
 
@@ -20,7 +15,6 @@ struct BookSettings {
     /// The same for a window, which tells of the failure where the book should stand.
     static BookSettings readOrTell();
 
-    QString connectionString() const;
     /// Where the book lies, for people; without the password.
     QString bookText() const;
 };

@@ -143,12 +143,9 @@ TEST_F(Program, LogsInThroughTheRegisteredComponent) {
 
 TEST_F(Program, CarriesABookToAServerAndWorksThere) {
     ASSERT_EQ(run({u"init"_s, u"--sample"_s, book()}), 0);
-    const host::BookSettings sample{.securityInfo = u"True"_s,
-                                    .user = u"zelmars"_s,
-                                    .password = {},
-                                    .catalogue = u"zelmars"_s,
-                                    .dataSource = u"sqlite:"_s + book(),
-                                    .isComplete = true};
+    const host::BookSettings sample{{.dtUser = u"zelmars"_s,
+                                     .dtInitialCatalog = u"zelmars"_s,
+                                     .dtDataSource = u"sqlite:"_s + book()}};
     EXPECT_TRUE(host::MovementBook(sample).isSample());
     const QString server = u"postgresql:"_s + support::Server::instance().folder();
     const QString admin = QString::fromLatin1(support::Server::User);

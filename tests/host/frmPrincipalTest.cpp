@@ -20,6 +20,7 @@
 #include "platform/com/Component.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
+#include "platform/registry/LoginValues.h"
 #include "tests/support/Book.h"
 #include "tests/support/Operator.h"
 
@@ -403,7 +404,11 @@ TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
     // Of another machine, whether others can read along on the way there.
     for (const QString& word : {QString(), u"?tls=no"_s}) {
         const QString source = u"postgresql:127.1:1"_s + word;
-        database::writeSettings({u"ana"_s, u"x"_s, u"livro"_s, source});
+        registry::LoginValues{.dtUser = u"ana"_s,
+                              .dtPassword = u"x"_s,
+                              .dtInitialCatalog = u"livro"_s,
+                              .dtDataSource = source}
+            .write();
         person_.press(Qt::Key_F5);
         EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(),
                   u"Livro: livro (%1%2)"_s.arg(
