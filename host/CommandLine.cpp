@@ -113,12 +113,6 @@ CommandLine registerLine(const QStringList& all) {
     return words.ended(line);
 }
 
-CommandLine tourLine(const QStringList& all) {
-    Words words(all);
-    return words.ended(
-        {.task = CommandLine::Task::Tour, .folder = words.next(u"a pasta das imagens"_s)});
-}
-
 CommandLine operationLine(const QStringList& words) {
     if (const auto call = Operations::parsed(words))
         return {.task = CommandLine::Task::Operation, .call = *call};
@@ -136,7 +130,6 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     if (first == "init"_L1) return initLine(words);
     if (first == "copy"_L1) return copyLine(words);
     if (first == "register"_L1) return registerLine(words);
-    if (first == "tour"_L1) return tourLine(words);
     if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
     if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});
     return operationLine(words);
@@ -144,7 +137,7 @@ CommandLine CommandLine::parsed(const QStringList& words) {
 
 bool CommandLine::needsScreen() const {
     const bool onlyLogsIn = task == Task::Operation && call.operation == "Login"_L1;
-    return task == Task::Window || task == Task::Tour || (task == Task::Operation && !onlyLogsIn);
+    return task == Task::Window || (task == Task::Operation && !onlyLogsIn);
 }
 
 QString helpText() {

@@ -9,22 +9,11 @@ namespace host {
 
 /// What a command line asks for.
 struct CommandLine {
-    enum class Task {
-        Window,
-        Operation,
-        Init,
-        InitServer,
-        Copy,
-        Register,
-        Tour,
-        Help,
-        Version,
-        Wrong
-    };
+    enum class Task { Window, Operation, Init, InitServer, Copy, Register, Help, Version, Wrong };
     Task task = Task::Window;
     QString wrong = {};       ///< of Wrong: the word that is wrong or lacks, in a sentence
     OperationCall call = {};  ///< of Operation
-    QString folder = {};      ///< of Init and Tour
+    QString folder = {};      ///< of Init
     QString group = {};       ///< of Init: whose members share the book; empty for nobody
     QString server = {};      ///< of InitServer: "postgresql:HOST[:PORT]"
     QString catalogue = {};   ///< of InitServer

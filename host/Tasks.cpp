@@ -5,7 +5,6 @@
 #include <QTextStream>
 
 #include "host/BookTasks.h"
-#include "host/Tour.h"
 #include "host/frmPrincipal.h"
 #include "platform/com/Place.h"
 #include "platform/core/Failure.h"
@@ -92,8 +91,6 @@ int performUntrapped(const CommandLine& line) {
         case Task::Register:
             registerComponents(line.undo);
             return Done;
-        case Task::Tour:
-            return playTour(line.folder);
         case Task::Help:
             say(helpText().trimmed());
             return Done;

@@ -18,7 +18,6 @@ TEST(CommandLine, NamesOneTask) {
     const std::pair<QString, Task> cases[] = {
         {u""_s, Task::Window},
         {u"--help"_s, Task::Help},
-        {u"tour out"_s, Task::Tour},
         {u"register"_s, Task::Register},
         {u"init pasta"_s, Task::Init},
         {u"init --sample --if-needed --group saude pasta"_s, Task::Init},
@@ -48,7 +47,7 @@ TEST(CommandLine, NamesTheWordThatIsWrongAndDoesNothing) {
         {u"init --catalog livro pasta"_s, u"«--catalog»"_s},
         {u"copy sqlite:pasta/livro"_s, u"para onde se copia"_s},
         {u"copy --force sqlite:pasta/livro"_s, u"«--force»"_s},
-        {u"tour --sample"_s, u"«--sample»"_s},
+        {u"register --sample"_s, u"«--sample»"_s},
         {u"Despesas"_s, u"«Despesas»"_s},
         {u"NewMovimento talvez"_s, u"«talvez»"_s},
         {u"Registo"_s, u"«Registo»"_s},

@@ -8,16 +8,16 @@
 #include <functional>
 #include <vector>
 
-namespace host {
+namespace tour {
 
 /// Plays a script through the screens of this process: waits for the screen that a step names to
 /// come to the front, takes its picture, and then acts as a person at the keyboard would. Message
 /// boxes are screens too.
-class TourPlayer : public QObject {
+class Player : public QObject {
     Q_OBJECT
 public:
     /// @param folder  where the pictures go
-    explicit TourPlayer(const QString& folder);
+    explicit Player(const QString& folder);
 
     /// @param screen   objectName of the screen; for a message box "box:" and what its text begins
     ///                 with
@@ -57,4 +57,4 @@ private:
     std::function<void()> finished_;
 };
 
-}  // namespace host
+}  // namespace tour

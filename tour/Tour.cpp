@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "host/Tour.h"
+#include "tour/Tour.h"
 
 #include <QAbstractButton>
 #include <QDir>
@@ -12,18 +12,19 @@
 #include "database/Book.h"
 #include "host/Operations.h"
 #include "host/Tasks.h"
-#include "host/TourPlayer.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
+#include "tour/Player.h"
 
 using namespace Qt::StringLiterals;
 
-namespace host {
+namespace tour {
 
 namespace {
 
+using host::Operations;
 using Keys = QStringList;
 
 // Members of the sample book: one with everything in order, one without a bank number.
@@ -31,7 +32,7 @@ const QString GoodMember = u"100015"_s;
 const QString MemberWithoutNib = u"100023"_s;
 
 std::function<void(QWidget*)> typing(const Keys& keys) {
-    return [keys](QWidget* screen) { TourPlayer::type(screen, keys); };
+    return [keys](QWidget* screen) { Player::type(screen, keys); };
 }
 
 /// A field of the screen shows something.
@@ -79,7 +80,7 @@ std::function<bool(QWidget*)> listBeginsWith(const QString& text) {
 /// The script of the tour, road by road.
 class Script {
 public:
-    explicit Script(TourPlayer& player) : player_(player) {}
+    explicit Script(Player& player) : player_(player) {}
 
     void document() {
         open(u"01-janela-principal"_s, Operations::newDocument(false));
@@ -163,7 +164,7 @@ public:
     }
 
 private:
-    void open(const QString& picture, const OperationCall& call) {
+    void open(const QString& picture, const host::OperationCall& call) {
         player_.step(u"frmPrincipal"_s, picture,
                      [this, call](QWidget*) { operations_.call(call); });
     }
@@ -192,7 +193,7 @@ private:
 
     void leave() { player_.step(u"frmMovimentosF"_s, {}, typing({u"<Alt+S>"_s, u"<Return>"_s})); }
 
-    TourPlayer& player_;
+    Player& player_;
     Operations operations_;
 };
 
@@ -202,21 +203,21 @@ void say(const QString& text) {
 
 }  // namespace
 
-int playTour(const QString& folder) {
+bool play(const QString& folder) {
     forms::install();
     const QTemporaryDir own;
     if (!own.isValid() || !QDir().mkpath(folder))
         throw core::Failure(core::InvalidCall, u"A pasta %1 não pode ser feita."_s.arg(folder));
     qputenv("ZELMARS_REGISTRY", own.filePath(u"registry"_s).toUtf8());
     database::initBook(own.filePath(u"livro"_s), true);
-    registerComponents(false);
+    host::registerComponents(false);
     say(u"Um documento médico, uma conta de hospital e as janelas do caminho, num livro de exemplo "
         "que não fica:"_s);
 
-    frmPrincipal principal;
+    host::frmPrincipal principal;
     principal.resize(1280, 800);
     principal.show();
-    TourPlayer player(folder);
+    Player player(folder);
     Script script(player);
     script.document();
     script.hospitalBill();
@@ -227,7 +228,7 @@ int playTour(const QString& folder) {
     script.statement(statement);
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
-    return played ? Done : Failed;
+    return played;
 }
 
-}  // namespace host
+}  // namespace tour

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "host/TourPlayer.h"
+#include "tour/Player.h"
 
 #include <QApplication>
 #include <QDir>
@@ -10,7 +10,7 @@
 
 using namespace Qt::StringLiterals;
 
-namespace host {
+namespace tour {
 
 namespace {
 
@@ -56,18 +56,18 @@ void send(const QPointer<QWindow>& window, const std::function<void(QTest::KeyAc
 
 }  // namespace
 
-TourPlayer::TourPlayer(const QString& folder) : folder_(folder) {
+Player::Player(const QString& folder) : folder_(folder) {
     clock_.setSingleShot(true);
-    connect(&clock_, &QTimer::timeout, this, &TourPlayer::tick);
+    connect(&clock_, &QTimer::timeout, this, &Player::tick);
 }
 
-void TourPlayer::step(const QString& screen, const QString& picture,
-                      const std::function<void(QWidget*)>& act,
-                      const std::function<bool(QWidget*)>& ready) {
+void Player::step(const QString& screen, const QString& picture,
+                  const std::function<void(QWidget*)>& act,
+                  const std::function<bool(QWidget*)>& ready) {
     steps_.push_back({screen, picture, act, ready});
 }
 
-bool TourPlayer::play() {
+bool Player::play() {
     QEventLoop loop;
     finished_ = [&loop] { loop.quit(); };
     clock_.start(TickMilliseconds);
@@ -76,12 +76,12 @@ bool TourPlayer::play() {
     return !failed_;
 }
 
-bool TourPlayer::fits(const Step& step, QWidget* front) const {
+bool Player::fits(const Step& step, QWidget* front) const {
     return front && front->isVisible() && described(front).startsWith(step.screen) &&
            (!step.ready || step.ready(front));
 }
 
-void TourPlayer::tick() {
+void Player::tick() {
     // A step that opens a modal screen is still on the stack while the next ones are played; a
     // timer never fires inside its own handler, so each tick starts the next one.
     clock_.start(TickMilliseconds);
@@ -110,14 +110,14 @@ void TourPlayer::tick() {
 }
 
 /// Closes what is modal, one after the other, so that their callers come back.
-void TourPlayer::giveUp() {
+void Player::giveUp() {
     if (QWidget* modal = QApplication::activeModalWidget())
         modal->close();
     else
         finished_();
 }
 
-void TourPlayer::take(const QString& picture, QWidget* screen) {
+void Player::take(const QString& picture, QWidget* screen) {
     const QString file = QDir(folder_).filePath(picture + u".png"_s);
     if (screen->grab().save(file)) {
         say(u"  "_s + file);
@@ -127,7 +127,7 @@ void TourPlayer::take(const QString& picture, QWidget* screen) {
     }
 }
 
-void TourPlayer::type(QWidget* screen, const QStringList& keys) {
+void Player::type(QWidget* screen, const QStringList& keys) {
     // A key may close the window that it is typed into, and is released nowhere then.
     const QPointer<QWindow> window = screen->windowHandle();
     for (const QString& key : keys) {
@@ -146,4 +146,4 @@ void TourPlayer::type(QWidget* screen, const QStringList& keys) {
     }
 }
 
-}  // namespace host
+}  // namespace tour
