@@ -4,10 +4,10 @@
 #include <QApplication>
 #include <numeric>
 
+#include "host/LeftForLater.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
-#include "platform/core/Wait.h"
 
 using namespace Qt::StringLiterals;
 
@@ -62,8 +62,14 @@ constexpr int MostRowsKept = 4096;
 
 }  // namespace
 
+MovementList::MovementList(QObject* parent) : QAbstractTableModel(parent) {
+    reader_.setSingleShot(true);
+    connect(&reader_, &QTimer::timeout, this, &MovementList::readWanted);
+}
+
 void MovementList::setBook(std::shared_ptr<MovementBook> book,
                            std::shared_ptr<MovementSearch> search) {
+    if (book_ != book) read_.clear();
     book_ = std::move(book);
     search_ = std::move(search);
     order_.clear();
@@ -82,10 +88,8 @@ void MovementList::setOrder(const std::vector<quint32>& positions) {
 
 int MovementList::takeNewer() {
     const int count = book_ && search_ ? book_->takeNewer(*search_) : 0;
-    if (count == 0) {
-        forgetRows();
-        return 0;
-    }
+    forgetRows();
+    if (count == 0) return 0;
     if (!order_.empty()) {
         for (quint32& position : order_) position += quint32(count);
         std::vector<quint32> newer(static_cast<std::size_t>(count));
@@ -96,14 +100,15 @@ int MovementList::takeNewer() {
     return count;
 }
 
+/// Reads the shown rows afresh the next time they are looked at.
 void MovementList::forgetRows() {
-    read_.clear();
+    ++reading_;
     if (rowCount() > 0) emit dataChanged(index(0, 0), index(rowCount() - 1, columnCount() - 1));
 }
 
 void MovementList::refilter() {
     beginResetModel();
-    read_.clear();
+    wanted_.clear();
     found_ = search_ ? inOrder(search_->find(filter_)) : std::vector<quint32>();
     endResetModel();
 }
@@ -123,12 +128,9 @@ qint32 MovementList::movimento_id(int row) const {
     return search_->movimento_id(found_[std::size_t(row)]);
 }
 
-QString MovementList::number(int row) const {
-    return core::toText(rowAt(row).values[MovementRow::Number]);
-}
-
-QString MovementList::tipo(int row) const {
-    return core::toText(rowAt(row).values[MovementRow::Type]);
+QString MovementList::text(int row, int column) {
+    read(row);
+    return core::formatted(read_.value(movimento_id(row)).row.values[column], look(column).format);
 }
 
 int MovementList::rowOf(qint32 movimento_id) const {
@@ -149,7 +151,8 @@ QVariant MovementList::data(const QModelIndex& index, int role) const {
     if (role == Qt::TextAlignmentRole)
         return int(look(index.column()).alignment | Qt::AlignVCenter);
     if (role != Qt::DisplayRole && role != Qt::ForegroundRole && role != Qt::FontRole) return {};
-    const MovementRow& row = rowAt(index.row());
+    if (!isKnown(index.row())) want(index.row());
+    const MovementRow row = read_.value(movimento_id(index.row())).row;
     if (role == Qt::DisplayRole)
         return core::formatted(row.values[index.column()], look(index.column()).format);
     return lookOfType(row.values[MovementRow::Type].toString(), role);
@@ -162,31 +165,45 @@ QVariant MovementList::headerData(int section, Qt::Orientation orientation, int 
     return {};
 }
 
-const MovementRow& MovementList::rowAt(int row) const {
-    const qint32 key = movimento_id(row);
-    if (!read_.contains(key)) {
-        // Painted while something else is waited for: the row is read when that is over.
-        static const MovementRow unread;
-        if (core::isWaiting()) return unread;
-        readBlock(row);
-    }
-    return read_[key];
+bool MovementList::isKnown(int row) const {
+    const auto found = read_.constFind(movimento_id(row));
+    return found != read_.constEnd() && found->reading == reading_;
 }
 
-/// Reads the rows around one that is looked at. A row that is gone, or a failure, leaves them
-/// empty.
-void MovementList::readBlock(int row) const {
+void MovementList::want(int row) const {
+    wanted_.insert(row / BlockSize);
+    if (!reader_.isActive()) reader_.start(0);
+}
+
+void MovementList::readWanted() {
+    if (leftForLater(this, [this] { readWanted(); })) return;
+    while (!wanted_.empty()) readBlock(wanted_.extract(wanted_.begin()).value());
+}
+
+void MovementList::read(int row) {
+    if (row < rowCount() && !isKnown(row) && !core::isWaiting()) readBlock(row / BlockSize);
+}
+
+/// A row that is gone, or a failure, leaves the rows empty. The list may change while the book is
+/// waited for.
+void MovementList::readBlock(int block) {
     if (read_.size() > MostRowsKept) read_.clear();
     std::vector<qint32> keys;
-    const int first = row / BlockSize * BlockSize;
-    for (int each = first; each < std::min(first + BlockSize, rowCount()); ++each)
-        keys.push_back(movimento_id(each));
-    for (const qint32 key : keys) read_.insert(key, {});
+    const int first = block * BlockSize;
+    for (int row = first; row < std::min(first + BlockSize, rowCount()); ++row)
+        keys.push_back(movimento_id(row));
+    // What is painted while the book is waited for does not ask for them again.
+    for (const qint32 key : keys) read_[key].reading = reading_;
+    QHash<qint32, MovementRow> found;
     try {
-        for (const MovementRow& read : book_->rows(keys)) read_.insert(read.movimento_id, read);
+        const std::shared_ptr<MovementBook> book = book_;
+        for (const MovementRow& row : book->rows(keys)) found.insert(row.movimento_id, row);
     } catch (const core::Failure& failure) {
         emit failed(failure.text());
     }
+    for (const qint32 key : keys) read_[key].row = found.value(key);
+    const int last = std::min(first + BlockSize, rowCount()) - 1;
+    if (first <= last) emit dataChanged(index(first, 0), index(last, columnCount() - 1));
 }
 
 }  // namespace host

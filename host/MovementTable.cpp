@@ -7,7 +7,7 @@
 #include <QKeyEvent>
 #include <QLabel>
 
-#include "host/MovementBook.h"
+#include "host/MovementList.h"
 
 using namespace Qt::StringLiterals;
 
@@ -31,7 +31,7 @@ QLabel* centredLabel(const QString& name) {
 
 }  // namespace
 
-MovementTable::MovementTable(QAbstractItemModel* movements) {
+MovementTable::MovementTable(MovementList* movements) : movements_(movements) {
     setObjectName(u"Lista"_s);
     setAccessibleName(u"Movimentos"_s);
     setModel(movements);
@@ -157,8 +157,8 @@ void MovementTable::copyRows() {
     for (const QItemSelectionRange& range : ranges)
         for (int row = range.top(); row <= range.bottom() && lines.size() < MostCopied; ++row) {
             QStringList cells;
-            for (int column = 0; column < model()->columnCount(); ++column)
-                cells << model()->index(row, column).data().toString().simplified();
+            for (int column = 0; column < movements_->columnCount(); ++column)
+                cells << movements_->text(row, column).simplified();
             lines << cells.join('\t'_L1);
         }
     if (lines.isEmpty()) return;

@@ -7,12 +7,14 @@ class QLabel;
 
 namespace host {
 
+class MovementList;
+
 /// The table of movements: columns as wide as the person made them, what is left of the window to
 /// the names; Ctrl+C copies whole rows; a text in the middle while there are none.
 class MovementTable : public QTableView {
     Q_OBJECT
 public:
-    explicit MovementTable(QAbstractItemModel* movements);
+    explicit MovementTable(MovementList* movements);
 
     /// Selects a row alone, whatever keys are held; rows chosen with it stay so.
     void standOn(int row);
@@ -37,6 +39,7 @@ private:
     void copyRows();
     void giveFreeSpace(int kept, int mostTaken);
 
+    MovementList* movements_;
     QLabel* empty_;
     QLabel* hint_;
     bool isFitting_ = false;

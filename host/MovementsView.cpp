@@ -97,7 +97,7 @@ void MovementsView::connectParts() {
     list_->setSortingEnabled(true);
     connect(sorter_, &MovementSorter::finished, this, &MovementsView::takeSorted);
     connect(loader_, &MovementLoader::failed, this, &MovementsView::showUnreadable);
-    // Rows are read while they are painted: what failed is shown afterwards.
+    // Shown when what reads the rows has done the rest of its work.
     connect(movements_, &MovementList::failed, this, &MovementsView::showUnreadable,
             Qt::QueuedConnection);
 }
@@ -121,6 +121,7 @@ void MovementsView::open(const BookSettings& settings) {
         loader_->start(settings);
         stack_->setCurrentIndex(0);
         list_->standOn(0);
+        movements_->read(0);
         sortAgain();
         showCount();
     } catch (const core::Failure& failure) {
@@ -140,6 +141,7 @@ void MovementsView::keepingPlace(Change&& change) {
     const int row = current.row() <= 0 ? 0 : std::max(movements_->rowOf(key), 0);
     list_->standOn(row);
     list_->verticalScrollBar()->setValue(above == 0 ? 0 : row - rowsAbove);
+    movements_->read(list_->verticalScrollBar()->value());
 }
 
 /// Changes the list as reading from the book does, which may fail.
@@ -253,17 +255,18 @@ bool MovementsView::keyInList(const QKeyEvent& key) {
 void MovementsView::chooseCurrent() {
     const QModelIndex current = list_->currentIndex();
     if (!current.isValid() || stack_->currentIndex() != 0) return;
-    const QString tipo = movements_->tipo(current.row());
+    const QString tipo = movements_->text(current.row(), MovementRow::Type);
     const QString reason = reasonNotToOpen(tipo);
     if (reason.isEmpty()) return emit chosen(movements_->movimento_id(current.row()));
-    emit told(
-        u"O movimento nº %1 não se abre: %2"_s.arg(movements_->number(current.row()), reason));
+    emit told(u"O movimento nº %1 não se abre: %2"_s.arg(
+        movements_->text(current.row(), MovementRow::Number), reason));
 }
 
 void MovementsView::filterChanged(const QString& text) {
     movements_->setFilter(text);
     list_->scrollToTop();
     list_->standOn(0);
+    movements_->read(0);
     showCount();
 }
 
