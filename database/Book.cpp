@@ -16,7 +16,7 @@
 #include "database/Sqlite.h"
 #include "database/SqliteBookWriter.h"
 #include "database/sample/SampleBook.h"
-#include "platform/ado/ConnectionSettings.h"
+#include "platform/ado/engine/ConnectionSettings.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/LoginValues.h"

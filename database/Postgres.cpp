@@ -5,7 +5,7 @@
 
 #include <memory>
 
-#include "platform/ado/engine/EngineTexts.h"
+#include "platform/ado/postgres/Failures.h"
 #include "platform/ado/postgres/Handle.h"
 
 namespace database {
@@ -150,8 +150,8 @@ void Database::fail(const PGresult* result) const {
         if (const char* text = PQresultErrorField(result, part)) lines << QString::fromUtf8(text);
     if (lines.isEmpty()) lines << QString::fromUtf8(PQerrorMessage(connection_)).simplified();
     const char* code = PQresultErrorField(result, PG_DIAG_SQLSTATE);
-    throw ado::postgresFailure(QString::fromLatin1(code ? code : ConnectionLost),
-                               lines.join(u'\n'));
+    throw ado::postgres::failure(QString::fromLatin1(code ? code : ConnectionLost),
+                                 lines.join(u'\n'));
 }
 
 Transaction::~Transaction() {

@@ -5,7 +5,7 @@
 
 #include <charconv>
 
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/postgres/Dialect.h"
 #include "platform/ado/postgres/Types.h"
 #include "platform/core/Failure.h"
 
@@ -74,7 +74,7 @@ std::vector<TableShape> PostgresBookReader::tables() {
         const QByteArray column = textAt(row, 1);
         if (shapes.empty() || shapes.back().table.name != table)
             shapes.push_back({{table, {}}, {}});
-        const bool isHidden = column == ado::HiddenIdentity;
+        const bool isHidden = column == ado::postgres::HiddenIdentity;
         if (isHidden || (textAt(row, 4) == "t" && !order_.contains(table))) order_[table] = column;
         if (isHidden) return;
         shapes.back().table.columns.push_back(column);

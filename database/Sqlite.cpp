@@ -3,7 +3,7 @@
 
 #include <sqlite3.h>
 
-#include "platform/ado/engine/EngineTexts.h"
+#include "platform/ado/sqlite/Failures.h"
 
 namespace database::sqlite {
 
@@ -11,8 +11,8 @@ namespace {
 
 [[noreturn]] void fail(sqlite3* handle, int result) {
     const char* text = handle ? sqlite3_errmsg(handle) : sqlite3_errstr(result);
-    throw ado::sqliteFailure(handle ? sqlite3_extended_errcode(handle) : result,
-                             QString::fromUtf8(text));
+    throw ado::sqlite::failure(handle ? sqlite3_extended_errcode(handle) : result,
+                               QString::fromUtf8(text));
 }
 
 }  // namespace
@@ -22,7 +22,7 @@ Database::Database(const QString& file, Mode mode) {
     const int result = sqlite3_open_v2(file.toUtf8().constData(), &handle_, flags, nullptr);
     if (result == SQLITE_OK) return;
     const core::Failure failure =
-        ado::sqliteFailure(result, QString::fromUtf8(sqlite3_errmsg(handle_)));
+        ado::sqlite::failure(result, QString::fromUtf8(sqlite3_errmsg(handle_)));
     sqlite3_close(handle_);
     throw failure;
 }

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "host/BookSettings.h"
 
-#include "platform/ado/ConnectionSettings.h"
+#include "platform/ado/Connection.h"
 #include "platform/core/Failure.h"
 
 using namespace Qt::StringLiterals;

@@ -46,4 +46,8 @@ private:
 
 using ConnectionPtr = std::shared_ptr<Connection>;
 
+/// True when a `Data Source` leads to a server on another machine and gives encryption up
+/// ("?tls=no"), so that anybody on the way can read along. False for a source that leads nowhere.
+bool isReadableOnTheWay(const QString& dataSource);
+
 }  // namespace ado

@@ -4,7 +4,8 @@
 
 #include <QHash>
 
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/postgres/Dialect.h"
+#include "platform/ado/sqlite/Dialect.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Lines.h"
 
@@ -15,7 +16,7 @@ namespace {
 /// tbA has a key of its own, tbB an identity that the server generates, vwA is a view of tbA.
 class SmallSchema : public ado::Schema {
 public:
-    explicit SmallSchema(ado::Dialect dialect) : dialect_(dialect) {}
+    explicit SmallSchema(bool isServer) : isServer_(isServer) {}
     bool isTable(QStringView name) override {
         return QStringList({u"tbA"_s, u"tbB"_s}).contains(name, Qt::CaseInsensitive);
     }
@@ -29,15 +30,16 @@ public:
         return known && type != types.constEnd() ? std::optional(*type) : std::nullopt;
     }
     QString identity(QStringView table) override {
-        if (dialect_ == ado::Dialect::Sqlite || !isTable(table)) return Schema::identity(table);
+        if (!isTable(table)) return {};
+        if (!isServer_) return QString::fromLatin1(ado::sqlite::Identity);
         return table.endsWith(u'A') ? u"id"_s : u"_linha"_s;
     }
 
 private:
-    ado::Dialect dialect_;
+    bool isServer_;
 };
 
-/// A rule of the list: four lines, its name, the statement as authors write it, for SQLite, for
+/// A rule of the list: four lines, its name, the query as authors write it, for SQLite, for
 /// PostgreSQL.
 struct Rule {
     QString name, before, sqlite, postgresql;
@@ -55,23 +57,23 @@ class Translator : public testing::TestWithParam<Rule> {};
 
 TEST_P(Translator, Keeps) {
     const Rule& rule = GetParam();
-    for (const auto& [dialect, after] : {std::pair(ado::Dialect::Sqlite, rule.sqlite),
-                                         {ado::Dialect::Postgres, rule.postgresql}}) {
-        SmallSchema schema(dialect);
-        EXPECT_EQ(ado::translate(ado::Query(rule.before), schema, false, dialect), after);
-    }
+    const ado::Query query(rule.before);
+    SmallSchema file(false);
+    EXPECT_EQ(ado::sqlite::translate(query, file, false), rule.sqlite);
+    SmallSchema server(true);
+    EXPECT_EQ(ado::postgres::translate(query, server, false), rule.postgresql);
 }
 
 INSTANTIATE_TEST_SUITE_P(Rule, Translator, testing::ValuesIn(rules()),
                          [](const auto& rule) { return rule.param.name.toStdString(); });
 
-TEST(Statement, IsReadWithItsIdentityBeforeTheColumns) {
-    const ado::Query statement(u"select * from tbB where id=1;"_s);
-    SmallSchema file(ado::Dialect::Sqlite);
-    EXPECT_EQ(ado::translate(statement, file, true),
+TEST(Query, IsReadWithItsIdentityBeforeTheColumns) {
+    const ado::Query query(u"select * from tbB where id=1;"_s);
+    SmallSchema file(false);
+    EXPECT_EQ(ado::sqlite::translate(query, file, true),
               u"select _rowid_,* from tbB where id=1 ORDER BY \"tbB\"._rowid_"_s);
-    SmallSchema server(ado::Dialect::Postgres);
-    EXPECT_EQ(ado::translate(statement, server, true, ado::Dialect::Postgres),
+    SmallSchema server(true);
+    EXPECT_EQ(ado::postgres::translate(query, server, true),
               u"select _linha,* from tbB where id=1 ORDER BY \"tbb\"._linha"_s);
 }
 

@@ -10,7 +10,7 @@
 
 #include "database/ServerBook.h"
 #include "platform/ado/Connection.h"
-#include "platform/ado/ConnectionSettings.h"
+#include "platform/ado/Connection.h"
 #include "platform/ado/postgres/Handle.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Server.h"

@@ -1,10 +1,25 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <optional>
+
 #include "platform/ado/dialect/Edits.h"
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/dialect/Query.h"
+#include "platform/ado/engine/Session.h"
 
 namespace ado {
+
+/// What the translator asks about the book.
+class Schema {
+public:
+    virtual ~Schema() = default;
+    /// True for an existing table whose rows have an identity; false for a view.
+    virtual bool isTable(QStringView name) = 0;
+    /// The declared type of a column of a table or view; nothing when there is no such column.
+    virtual std::optional<ColumnType> columnType(QStringView table, QStringView column) = 0;
+    /// The column that is a table's row identity; empty for anything but a table.
+    virtual QString identity(QStringView table) = 0;
+};
 
 /// A table of a FROM or JOIN: its name, and the name by which columns are qualified.
 struct Source {
@@ -18,19 +33,40 @@ struct ColumnName {
     QString name;
 };
 
-/// The translation of one statement: rules that act on its tokens and note edits of its text.
-/// Values and sums are translated in StatementTranslator.cpp, orders in StatementOrder.cpp.
+/// The translation of one query into the language of an engine: rules that act on its tokens and
+/// note edits of its text. What no rule knows is passed on as it stands. Here stands what engines
+/// have in common; what one of them does in another way it overrides.
 class Translation {
 public:
-    Translation(const Query& statement, Schema& schema, Dialect dialect)
-        : s(statement), schema_(schema), isServer_(dialect == Dialect::Postgres) {
-        survey();
-    }
+    Translation(const Query& query, Schema& schema) : s(query), schema_(schema) { survey(); }
+    virtual ~Translation() = default;
 
-    /// The statement in the engine's dialect.
+    /// The query in the engine's language. With `withIdentity` (only for a `SELECT *` over one
+    /// table) the row identity stands before the columns.
     QString run(bool withIdentity);
 
-private:
+protected:
+    /// Fails where the query reaches for more than tables and plain functions.
+    virtual void refuse() const {}
+    /// A name in quotes.
+    virtual QString quoted(const QString& name) const;
+    /// The token is a name in brackets or quotes.
+    virtual void name(int i);
+    /// There are sums, or there is other arithmetic, which may want to be exact.
+    virtual void sums() {}
+    virtual void amounts() {}
+    /// Columns may be compared with values of another type.
+    virtual void comparisons() {}
+    /// What stands behind a text in an order, so that texts sort as a Portuguese reader expects.
+    virtual QString orderOfTexts() const { return {}; }
+    /// What stands behind a value in an order, so that nulls come before all values.
+    virtual QString orderOfNulls(bool descends) const;
+    /// Whether the rows of joins in brackets can be ordered by the identity of the first table.
+    virtual bool seesIdentityInBrackets() const { return true; }
+
+    const Query& s;
+    Edits edits_;
+
     /// Calls `term(first, behind)` for each of the terms that commas part, from token `first` on to
     /// token `end`.
     template <class Term>
@@ -45,6 +81,13 @@ private:
         }
     }
 
+    ColumnName columnAt(int i) const;
+    /// The token behind the column that begins at a token.
+    int columnEnd(int i) const;
+    /// The declared type; nothing when no source has such a column.
+    std::optional<ColumnType> typeOf(const ColumnName& column);
+
+private:
     void survey();
     void noteSource(int i);
     void noteClause(int i);
@@ -52,20 +95,11 @@ private:
     bool isKeyword(int i) const;
     bool touchesNumber(int i) const;
 
-    void refuseServerFunctions() const;
     void literals();
-    QString quoted(const QString& name) const;
     void convert(int i);
     void joins();
     int operandBefore(int plus) const;
     int operandBehind(int plus) const;
-    void amountSums();
-    void amountItems();
-    void amountItem(int first, int behind);
-    bool sumsMoney(int open, int behind);
-    void floatSums();
-    bool sumsSingles(int open, int behind);
-    void numbersBesideTexts();
     void orders();
     void orderTerms();
     void orderTerm(int first, int behind);
@@ -76,18 +110,12 @@ private:
     QString orderOfInsertion();
     bool isOrderedByIdentity();
 
-    ColumnName columnAt(int i) const;
-    int columnEnd(int i) const;
-    std::optional<ColumnType> typeOf(const ColumnName& column);
     bool isText(int first, int behind);
     int selectItem(int behind) const;
     int itemOf(const QString& alias, int& behind) const;
     QString aliasOf(const ColumnName& column) const;
 
-    const Query& s;
     Schema& schema_;
-    Edits edits_;
-    bool isServer_;  ///< for PostgreSQL
     std::vector<Source> sources_;
     std::size_t outer_ = 0;  ///< the first SELECT's first source
     int from_ = -1;          ///< FROM of the first SELECT

@@ -9,14 +9,14 @@ void Translation::orderTerms() {
     // The engine takes an order of its own kind behind a UNION of groups only from around it.
     if (compound_) {
         edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
-        edits_.insert(s.token(order_).at, isServer_ ? u") AS uniao "_s : u") "_s);
+        edits_.insert(s.token(order_).at, u") AS uniao "_s);
     }
     eachTerm(order_ + 2, limit_ > order_ ? limit_ : s.count(),
              [&](int first, int behind) { orderTerm(first, behind); });
 }
 
 void Translation::orderTerm(int first, int behind) {
-    if (isServer_ && first < behind) orderNulls(first, behind);
+    if (first < behind) orderNulls(first, behind);
     if (s.is(behind - 1, "asc"_L1) || s.is(behind - 1, "desc"_L1)) --behind;
     if (first >= behind || !s.isWord(first) || columnEnd(first) != behind) return;
     const ColumnName column = columnAt(first);
@@ -25,8 +25,8 @@ void Translation::orderTerm(int first, int behind) {
     // Behind a UNION only the columns of the result have names.
     if (compound_ && !column.qualifier.isEmpty())
         edits_.replace(s.token(first).at, end - s.token(first).at, aliasOf(column));
-    if (!isServer_ && isText(first, behind))
-        edits_.insert(end, u" COLLATE "_s + QLatin1StringView(Collation));
+    if (const QString order = orderOfTexts(); !order.isEmpty() && isText(first, behind))
+        edits_.insert(end, order);
 }
 
 // Nulls come before all values. A table's identity has none and is found in its order as it is.
@@ -35,7 +35,7 @@ void Translation::orderNulls(int first, int behind) {
     const int end = descends || s.is(behind - 1, "asc"_L1) ? behind - 1 : behind;
     if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return;
     const Token& last = s.token(behind - 1);
-    edits_.insert(last.at + last.length, descends ? u" NULLS LAST"_s : u" NULLS FIRST"_s);
+    edits_.insert(last.at + last.length, orderOfNulls(descends));
 }
 
 bool Translation::isIdentity(const ColumnName& column) {
@@ -101,8 +101,7 @@ QString Translation::orderOfUnion() const {
     bool listed = true;
     eachTerm(1, from_, [&](int, int behind) {
         if (s.is(behind - 1, "*"_L1)) listed = false;
-        positions << QString::number(positions.size() + 1) +
-                         (isServer_ ? u" NULLS FIRST"_s : u""_s);
+        positions << QString::number(positions.size() + 1) + orderOfNulls(false);
     });
     if (!listed) return {};
     return positions.join(u',');
@@ -118,11 +117,9 @@ QString Translation::orderOfGroups() {
         if (!s.isWord(first) || columnEnd(first) != behind || isKeyword(behind - 1)) return;
         const Token& last = s.token(behind - 1);
         QString term = s.text().mid(s.token(first).at, last.at + last.length - s.token(first).at);
-        if (isServer_)
-            term += u" NULLS FIRST"_s;
-        else if (isText(first, behind))
-            term += u" COLLATE "_s + QLatin1StringView(Collation);
-        terms << term;
+        if (const QString order = orderOfTexts(); !order.isEmpty() && isText(first, behind))
+            term += order;
+        terms << term + orderOfNulls(false);
     });
     return terms.join(u',');
 }
@@ -131,8 +128,7 @@ QString Translation::orderOfGroups() {
 QString Translation::orderOfInsertion() {
     if (grouped_ || from_ < 0 || outer_ >= sources_.size()) return {};
     const Source& first = sources_[outer_];
-    // SQLite passes through the first of joins in brackets as it does without them.
-    if (!isServer_ && s.is(from_ + 1, "("_L1)) return {};
+    if (s.is(from_ + 1, "("_L1) && !seesIdentityInBrackets()) return {};
     const QString identity = schema_.identity(first.table);
     if (identity.isEmpty() || isOrderedByIdentity()) return {};
     return quoted(first.alias) + u'.' + identity;

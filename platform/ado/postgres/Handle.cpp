@@ -8,8 +8,8 @@
 #include <QtEndian>
 #include <utility>
 
-#include "platform/ado/engine/EngineTexts.h"
 #include "platform/ado/engine/RowHolders.h"
+#include "platform/ado/postgres/Failures.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Wait.h"
 
@@ -125,7 +125,7 @@ void Handle::connect(const Address& address) {
             const Said said = withoutCode(oneLine(PQerrorMessage(connection_)));
             const QString code =
                 said.code.isEmpty() ? QString::fromLatin1(CannotConnect) : said.code;
-            throw fail(postgresFailure(code, said.text).text(), code);
+            throw fail(failure(code, said.text).text(), code);
         }
         if (!await(connection_, next == PGRES_POLLING_READING ? POLLIN : POLLOUT, deadline,
                    waiting))
@@ -412,7 +412,7 @@ void Handle::refuse(const PGresult* result) {
         text += u'\n' + oneLine(detail);
     if (text.isEmpty()) text = oneLine(PQresultErrorMessage(result));
     if (code.startsWith(Ending)) lose(text, code);
-    throw postgresFailure(code, text);
+    throw failure(code, text);
 }
 
 void Handle::lose(const QString& text, const QString& code) {

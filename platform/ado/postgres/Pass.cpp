@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/postgres/Pass.h"
 
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/postgres/Dialect.h"
 #include "platform/ado/postgres/Types.h"
 #include "platform/core/Failure.h"
 

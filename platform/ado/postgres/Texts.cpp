@@ -62,7 +62,7 @@ Values valuesOf(const LiftedQuery& lifted) {
 }  // namespace
 
 QByteArray Texts::whole(const Query& statement, bool withIdentity) {
-    return translate(statement, schema_, withIdentity, Dialect::Postgres).toUtf8();
+    return translate(statement, schema_, withIdentity).toUtf8();
 }
 
 std::optional<Call> Texts::lifted(const Query& statement, bool withIdentity) {
@@ -72,8 +72,7 @@ std::optional<Call> Texts::lifted(const Query& statement, bool withIdentity) {
     auto text = texts_.constFind(key);
     if (text == texts_.constEnd()) {
         if (texts_.size() >= KeptTexts) texts_.clear();
-        const QString translated =
-            translate(Query(lifted->text), schema_, withIdentity, Dialect::Postgres);
+        const QString translated = translate(Query(lifted->text), schema_, withIdentity);
         text = texts_.insert(key, numbered(translated, lifted->values));
     }
     if (text->isEmpty()) return std::nullopt;

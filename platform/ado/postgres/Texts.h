@@ -5,7 +5,7 @@
 #include <optional>
 
 #include "platform/ado/dialect/LiftedQuery.h"
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/postgres/Dialect.h"
 #include "platform/ado/postgres/Handle.h"
 
 namespace ado::postgres {

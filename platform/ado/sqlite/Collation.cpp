@@ -7,7 +7,7 @@
 #include <QLocale>
 #include <cstring>
 
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/sqlite/Dialect.h"
 
 namespace ado::sqlite {
 

@@ -4,9 +4,9 @@
 #include <QThread>
 #include <utility>
 
-#include "platform/ado/engine/EngineTexts.h"
 #include "platform/ado/sqlite/BookFile.h"
 #include "platform/ado/sqlite/Collation.h"
+#include "platform/ado/sqlite/Failures.h"
 #include "platform/core/Failure.h"
 
 namespace ado::sqlite {
@@ -223,7 +223,7 @@ void Handle::fail() {
             core::DatabaseFailure,
             withDetails(noRightText(QString::fromUtf8(sqlite3_db_filename(db_, "main"))), words),
             QString::number(code));
-    throw sqliteFailure(code, words);
+    throw failure(code, words);
 }
 
 }  // namespace ado::sqlite

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "platform/ado/dialect/Translator.h"
 #include "platform/ado/sqlite/BookFile.h"
+#include "platform/ado/sqlite/Dialect.h"
 #include "platform/ado/sqlite/Handle.h"
 #include "platform/ado/sqlite/Locks.h"
 
@@ -32,6 +32,9 @@ public:
     const QString& book() const override { return file_.path(); }
 
     std::optional<ColumnType> columnType(QStringView table, QStringView column) override;
+    QString identity(QStringView table) override {
+        return isTable(table) ? QString::fromLatin1(Identity) : QString();
+    }
 
     // For the passes: a reader that nobody else steps on, and its way back.
     std::shared_ptr<Handle> takeReader();

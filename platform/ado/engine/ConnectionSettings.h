@@ -18,8 +18,4 @@ private:
     QHash<QString, QString> values_;
 };
 
-/// True when a `Data Source` leads to a server on another machine and gives encryption up
-/// ("?tls=no"), so that anybody on the way can read along. False for a source that leads nowhere.
-bool isReadableOnTheWay(const QString& dataSource);
-
 }  // namespace ado

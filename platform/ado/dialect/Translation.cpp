@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "platform/ado/dialect/Translator.h"
+#include "platform/ado/dialect/Translation.h"
 
 #include <QDateTime>
 
@@ -39,12 +39,12 @@ bool isAny(const Query& s, int i, const Words& words) {
 }  // namespace
 
 QString Translation::run(bool withIdentity) {
-    if (isServer_) refuseServerFunctions();
+    refuse();
     if (has_.literal) literals();
     if (has_.plus) joins();
-    if (has_.sum) isServer_ ? floatSums() : amountSums();
-    if (has_.arithmetic && !isServer_) amountItems();
-    if (isServer_) numbersBesideTexts();
+    if (has_.sum) sums();
+    if (has_.arithmetic) amounts();
+    comparisons();
     orders();
     if (withIdentity) edits_.insert(s.token(1).at, schema_.identity(sources_.front().table) + u',');
     if (s.end() < s.text().size()) edits_.replace(s.end(), s.text().size() - s.end(), {});
@@ -99,18 +99,6 @@ bool Translation::isKeyword(int i) const {
     return isAny(s, i, Keywords);
 }
 
-// What a server has besides tables and plain functions waits, locks, stops others, reads files.
-void Translation::refuseServerFunctions() const {
-    for (int i = 0; i < s.count(); ++i) {
-        QStringView name = s.word(i);
-        if (s.kind(i) == TokenKind::Name) name = name.mid(1);
-        if (name.startsWith("pg_"_L1, Qt::CaseInsensitive))
-            throw core::Failure(
-                core::InvalidCall,
-                u"A consulta usa «%1», que é do servidor, e não foi executada."_s.arg(s.name(i)));
-    }
-}
-
 /// True for a word directly behind a number.
 bool Translation::touchesNumber(int i) const {
     if (i < 1 || s.kind(i - 1) != TokenKind::Number) return false;
@@ -139,8 +127,8 @@ void Translation::literals() {
         } else if (token.kind == TokenKind::DoubleText) {
             edits_.replace(token.at, token.length,
                            u"'%1'"_s.arg(s.name(i).replace(u"'"_s, u"''"_s)));
-        } else if (token.kind == TokenKind::Name && isServer_) {
-            edits_.replace(token.at, token.length, quoted(s.name(i)));
+        } else if (token.kind == TokenKind::Name) {
+            name(i);
         } else if (token.kind == TokenKind::Word && s.is(i, "convert"_L1)) {
             convert(i);
         } else if (token.kind == TokenKind::Word && s.is(i - 1, "."_L1)) {
@@ -151,10 +139,16 @@ void Translation::literals() {
     }
 }
 
-/// A name in quotes; the server's unquoted names are lower case.
 QString Translation::quoted(const QString& name) const {
-    const QString text = isServer_ ? name.toLower() : name;
-    return u'"' + QString(text).replace(u"\""_s, u"\"\""_s) + u'"';
+    return u'"' + QString(name).replace(u"\""_s, u"\"\""_s) + u'"';
+}
+
+void Translation::name(int i) {
+    edits_.replace(s.token(i).at, s.token(i).length, quoted(s.name(i)));
+}
+
+QString Translation::orderOfNulls(bool descends) const {
+    return descends ? u" NULLS LAST"_s : u" NULLS FIRST"_s;
 }
 
 // CONVERT(DATETIME, 'text'[, style]): whatever the style says, the text is month/day/year.
@@ -220,115 +214,6 @@ void Translation::joins() {
     for (const int plus : joining) edits_.replace(s.token(plus).at, 1, u"||"_s);
 }
 
-// SQLite stores amounts in binary; a sum of them, and a sum of such sums, is brought back to the
-// four decimals that the amounts have, so that 0.4 - 0.3 is not above 0.1.
-void Translation::amountSums() {
-    for (int i = 0; i < s.count(); ++i) {
-        if (!s.is(i, "sum"_L1) || !s.is(i + 1, "("_L1)) continue;
-        int behind = s.behindBracket(i + 1);
-        bool money = sumsMoney(i + 1, behind);
-        while ((s.is(behind, "-"_L1) || s.is(behind, "+"_L1)) && s.is(behind + 1, "sum"_L1) &&
-               s.is(behind + 2, "("_L1)) {
-            const int open = behind + 2;
-            behind = s.behindBracket(open);
-            money = sumsMoney(open, behind) && money;
-        }
-        if (money) {
-            const Token& last = s.token(behind - 1);
-            edits_.insert(s.token(i).at, u"ROUND("_s);
-            edits_.insert(last.at + last.length, u",4)"_s);
-        }
-        i = behind - 1;
-    }
-}
-
-// The same for what is worked out of amounts by itself. A product has the decimals of its factors.
-void Translation::amountItems() {
-    for (int i = 0; i < s.count(); ++i) {
-        if (!s.is(i, "select"_L1)) continue;
-        int depth = 0;
-        int from = i + 1;
-        for (; from < s.count() && (depth > 0 || !s.is(from, "from"_L1)); ++from) {
-            if (s.is(from, "("_L1)) ++depth;
-            if (s.is(from, ")"_L1)) --depth;
-        }
-        eachTerm(i + 1, from, [&](int first, int behind) {
-            if (s.is(behind - 2, "as"_L1)) behind -= 2;
-            amountItem(first, behind);
-        });
-    }
-}
-
-void Translation::amountItem(int first, int behind) {
-    bool money = false;
-    bool worked = false;
-    qsizetype decimals = 4;
-    for (int i = first; i < behind; ++i) {
-        if (s.isWord(i)) {
-            if (typeOf(columnAt(i)) != ColumnType::Money) return;
-            money = true;
-            i = columnEnd(i) - 1;
-        } else if (s.kind(i) == TokenKind::Number) {
-            const qsizetype point = s.word(i).indexOf(u'.');
-            if (point >= 0) decimals += s.word(i).size() - point - 1;
-        } else if (s.is(i, "+"_L1) || s.is(i, "-"_L1) || s.is(i, "*"_L1)) {
-            worked = true;
-        } else if (!s.is(i, "("_L1) && !s.is(i, ")"_L1)) {
-            return;
-        }
-    }
-    if (!money || !worked) return;
-    const Token& last = s.token(behind - 1);
-    edits_.insert(s.token(first).at, u"ROUND("_s);
-    edits_.insert(last.at + last.length, u",%1)"_s.arg(decimals));
-}
-
-/// True when amounts are among the columns between the brackets and no other kind of number.
-bool Translation::sumsMoney(int open, int behind) {
-    bool money = false;
-    for (int i = open + 1; i < behind - 1; ++i) {
-        if (!s.isWord(i)) continue;
-        const auto type = typeOf(columnAt(i));
-        i = columnEnd(i) - 1;
-        if (type == ColumnType::Single || type == ColumnType::Double) return false;
-        money = money || type == ColumnType::Money;
-    }
-    return money;
-}
-
-// The server would sum 32-bit floats into one of their kind, and digits would go with every row.
-void Translation::floatSums() {
-    for (int i = 0; i < s.count(); ++i) {
-        if (!s.is(i, "sum"_L1) || !s.is(i + 1, "("_L1)) continue;
-        const int behind = s.behindBracket(i + 1);
-        if (!sumsSingles(i + 1, behind)) continue;
-        edits_.insert(s.token(i + 1).at + 1, u"CAST("_s);
-        edits_.insert(s.token(behind - 1).at, u" AS double precision)"_s);
-    }
-}
-
-bool Translation::sumsSingles(int open, int behind) {
-    for (int i = open + 1; i < behind - 1; ++i) {
-        if (!s.isWord(i)) continue;
-        if (typeOf(columnAt(i)) == ColumnType::Single) return true;
-        i = columnEnd(i) - 1;
-    }
-    return false;
-}
-
-// The server compares a text with texts only; people also write staff numbers bare.
-void Translation::numbersBesideTexts() {
-    for (int i = 2; i < s.count(); ++i) {
-        if (s.kind(i) != TokenKind::Number) continue;
-        int before = i - 1;
-        while (s.is(before, "="_L1) || s.is(before, "<"_L1) || s.is(before, ">"_L1)) --before;
-        if (before == i - 1 || before < 0 || !s.isWord(before)) continue;
-        const int column = s.is(before - 1, "."_L1) ? before - 2 : before;
-        if (typeOf(columnAt(column)) == ColumnType::Text)
-            edits_.replace(s.token(i).at, s.token(i).length, u"'%1'"_s.arg(s.word(i)));
-    }
-}
-
 ColumnName Translation::columnAt(int i) const {
     if (s.is(i + 1, "."_L1)) return {s.name(i), s.name(i + 2)};
     return {{}, s.name(i)};
@@ -346,10 +231,6 @@ std::optional<ColumnType> Translation::typeOf(const ColumnName& column) {
         if (const auto type = schema_.columnType(source.table, column.name)) return type;
     }
     return std::nullopt;
-}
-
-QString translate(const Query& statement, Schema& schema, bool withIdentity, Dialect dialect) {
-    return Translation(statement, schema, dialect).run(withIdentity);
 }
 
 }  // namespace ado

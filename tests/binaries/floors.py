@@ -1,0 +1,79 @@
+#!/usr/bin/env python3
+# SPDX-License-Identifier: MIT
+"""A folder includes only what lies below it: floors.py ROOT
+
+Reads the includes of all sources under ROOT and prints those that go up, or out of an engine's
+folder.
+"""
+import pathlib
+import re
+import sys
+
+GROUND = {
+    "platform/core": "",
+    "platform/registry": "platform/core",
+    "platform/com": "platform/core platform/registry",
+    "platform/ado/engine": "platform/core",
+    "platform/ado/dialect": "platform/core platform/ado/engine",
+    "platform/ado/sqlite": "platform/core platform/ado/engine platform/ado/dialect",
+    "platform/ado/postgres": "platform/core platform/ado/engine platform/ado/dialect",
+    "platform/ado": "platform/core platform/ado/engine platform/ado/dialect platform/ado/sqlite "
+                    "platform/ado/postgres",
+    "platform/forms": "platform/core platform/ado platform/ado/engine",
+    "platform/printing": "platform/core platform/ado platform/ado/engine platform/forms",
+}
+BASE = "platform/core platform/registry platform/com platform/ado platform/ado/engine"
+ROOM = BASE + " platform/forms platform/printing boundary/environment data"
+FLOORS = GROUND | {
+    "boundary/environment": BASE,
+    "data": BASE + " boundary/environment",
+    "coverage": ROOM,
+    "payments": ROOM,
+    "reports": ROOM,
+    "receipts": ROOM,
+    "entry": ROOM + " coverage payments reports",
+    "boundary": ROOM + " coverage payments reports receipts entry",
+    "companions": BASE + " platform/forms",
+    "database": BASE + " platform/ado/sqlite platform/ado/postgres",
+    "host": ROOM + " coverage receipts database",
+    "tour": ROOM + " database host",
+}
+# The plan's arithmetic, on plain values, serves rules and sample books.
+BELOW_ALL = {"coverage/Calculation.h"}
+CLIENT_LIBRARIES = {"sqlite3.h", "libpq-fe.h"}
+# Until set-up works on the engines' own handles.
+OWN_CLIENTS = {"platform/ado/sqlite", "platform/ado/postgres", "database"}
+INCLUDE = re.compile(r'^#include ["<]([^">]+)[">]', re.MULTILINE)
+
+
+def floor(path):
+    """The folder of the table that a file lies in; the deepest one."""
+    folders = [folder for folder in FLOORS if path.startswith(folder + "/")]
+    return max(folders, key=len, default=None)
+
+
+def faults(path, text):
+    """What a file includes and must not."""
+    own = floor(path)
+    for included in INCLUDE.findall(text):
+        other = floor(included)
+        if included in CLIENT_LIBRARIES and own not in OWN_CLIENTS:
+            yield f"{path} includes {included}"
+        if other not in (None, own) and included not in BELOW_ALL and \
+                other not in FLOORS[own].split():
+            yield f"{path} includes {included}"
+
+
+def main(root):
+    """Prints the faults; 1 when there are any or nothing was looked at."""
+    root = pathlib.Path(root)
+    sources = [path.relative_to(root).as_posix() for folder in {f.split("/")[0] for f in FLOORS}
+               for ending in ("*.h", "*.cpp") for path in (root / folder).rglob(ending)]
+    found = [fault for path in sources if floor(path)
+             for fault in faults(path, (root / path).read_text(encoding="utf-8"))]
+    print(*found, f"{len(sources)} files, {len(found)} faults", sep="\n")
+    return 1 if found or len(sources) < 100 else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main(sys.argv[1]))
