@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Receipts and annulments at the level of the rules, against the bare engine that runs the same
-// statements with the same locks.
+// queries with the same locks.
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
 #include "boundary/environment/dtZelmars.h"
@@ -34,8 +34,8 @@ ado::RecordsetPtr documents() {
 
 void runReceipt(qint32 socio_id) {
     QString connection;
-    QString statement;
-    const ado::RecordsetPtr row = data::openNewMovement(connection, statement);
+    QString query;
+    const ado::RecordsetPtr row = data::openNewMovement(connection, query);
     row->AddNew();
     row->setCollect(u"data"_s, QDateTime(QDate(2026, 11, 20), QTime(0, 0), Qt::UTC));
     row->setCollect(u"tipo"_s, u"PAG"_s);
@@ -45,7 +45,8 @@ void runReceipt(qint32 socio_id) {
     receipts::postReceipt({row, socio_id, u"Medição"_s, u"CHQ"_s, u"1"_s, u"40"_s}, operation);
 }
 
-/// A row is found, held, read as it is then, written and let go. Its first column as it was.
+/// Finds a row, holds it, reads it as it is then, writes it and lets it go. Gives its first column
+/// as it was before.
 double writeHeld(Bare& bare, const QByteArray& select, const QByteArray& update) {
     double first = bare.run(select);
     if (bare.hold(select)) first = bare.run(select);

@@ -13,7 +13,7 @@ namespace benchmarks {
 /// Texts must live as long as the call.
 using BareValue = std::variant<qint64, double, const char*>;
 
-/// Rows of a statement, one after the other.
+/// Rows of a query, one after the other.
 class BareRows {
 public:
     virtual ~BareRows() = default;
@@ -28,18 +28,18 @@ class Bare {
 public:
     virtual ~Bare() = default;
 
-    /// Prepares, runs and drops one statement; reads `column` of its first row.
-    virtual double run(const QByteArray& statement, int column = 0) = 0;
+    /// Prepares, runs and drops one query; reads `column` of its first row.
+    virtual double run(const QByteArray& query, int column = 0) = 0;
     /// Runs and commits a write that stays prepared; its values are $1 and so on.
-    virtual void write(const QByteArray& statement, const std::vector<BareValue>& values) = 0;
-    /// A pass over a statement, on a connection of its own.
-    virtual std::unique_ptr<BareRows> rows(const QByteArray& statement) = 0;
+    virtual void write(const QByteArray& query, const std::vector<BareValue>& values) = 0;
+    /// A pass over a query, on a connection of its own.
+    virtual std::unique_ptr<BareRows> rows(const QByteArray& query) = 0;
 
-    // A row held against other workstations. On SQLite nothing is held, which costs no statement.
+    // A row held against other workstations. On SQLite nothing is held, which costs no query.
     virtual bool hold(const QByteArray&) { return false; }
     virtual void letGo(const QByteArray&) {}
     /// Holds a row, reads it and lets it go again, all in one round trip.
-    virtual void touch(const QByteArray&, const QByteArray& /*statement*/) {}
+    virtual void touch(const QByteArray&, const QByteArray& /*query*/) {}
 };
 
 std::unique_ptr<Bare> bareSqlite(const Book& book);

@@ -11,8 +11,8 @@ namespace benchmarks {
 
 namespace {
 
-[[noreturn]] void stop(PGconn* connection, const QByteArray& statement) {
-    std::fprintf(stderr, "%s: %s\n", PQerrorMessage(connection), statement.constData());
+[[noreturn]] void stop(PGconn* connection, const QByteArray& query) {
+    std::fprintf(stderr, "%s: %s\n", PQerrorMessage(connection), query.constData());
     std::exit(1);
 }
 
@@ -25,21 +25,21 @@ PGconn* connect(const Book& book) {
     return connection;
 }
 
-PGresult* checked(PGconn* connection, PGresult* result, const QByteArray& statement) {
+PGresult* checked(PGconn* connection, PGresult* result, const QByteArray& query) {
     const ExecStatusType status = PQresultStatus(result);
-    if (status != PGRES_COMMAND_OK && status != PGRES_TUPLES_OK) stop(connection, statement);
+    if (status != PGRES_COMMAND_OK && status != PGRES_TUPLES_OK) stop(connection, query);
     return result;
 }
 
-PGresult* run(PGconn* connection, const QByteArray& statement) {
-    return checked(connection, PQexec(connection, statement.constData()), statement);
+PGresult* run(PGconn* connection, const QByteArray& query) {
+    return checked(connection, PQexec(connection, query.constData()), query);
 }
 
 class BarePostgresRows final : public BareRows {
 public:
-    BarePostgresRows(const Book& book, const QByteArray& statement) : connection_(connect(book)) {
+    BarePostgresRows(const Book& book, const QByteArray& query) : connection_(connect(book)) {
         PQclear(run(connection_, "BEGIN"));
-        PQclear(run(connection_, "DECLARE c NO SCROLL CURSOR FOR " + statement));
+        PQclear(run(connection_, "DECLARE c NO SCROLL CURSOR FOR " + query));
     }
     ~BarePostgresRows() override {
         PQclear(batch_);
@@ -68,16 +68,16 @@ public:
     explicit BarePostgres(const Book& book) : book_(book), connection_(connect(book)) {}
     ~BarePostgres() override { PQfinish(connection_); }
 
-    double run(const QByteArray& statement, int column) override {
-        PGresult* result = benchmarks::run(connection_, statement);
+    double run(const QByteArray& query, int column) override {
+        PGresult* result = benchmarks::run(connection_, query);
         const double value =
             PQntuples(result) > 0 ? std::strtod(PQgetvalue(result, 0, column), nullptr) : 0;
         PQclear(result);
         return value;
     }
 
-    void write(const QByteArray& statement, const std::vector<BareValue>& values) override {
-        const QByteArray name = prepared(statement);
+    void write(const QByteArray& query, const std::vector<BareValue>& values) override {
+        const QByteArray name = prepared(query);
         std::vector<QByteArray> texts;
         for (const BareValue& value : values) texts.push_back(textOf(value));
         std::vector<const char*> pointers;
@@ -86,11 +86,11 @@ public:
             checked(connection_,
                     PQexecPrepared(connection_, name.constData(), static_cast<int>(pointers.size()),
                                    pointers.data(), nullptr, nullptr, 0),
-                    statement));
+                    query));
     }
 
-    std::unique_ptr<BareRows> rows(const QByteArray& statement) override {
-        return std::make_unique<BarePostgresRows>(book_, statement);
+    std::unique_ptr<BareRows> rows(const QByteArray& query) override {
+        return std::make_unique<BarePostgresRows>(book_, query);
     }
 
     bool hold(const QByteArray& row) override {
@@ -99,8 +99,8 @@ public:
     }
     void letGo(const QByteArray& row) override { write(LetGo, {row.constData()}); }
 
-    void touch(const QByteArray& row, const QByteArray& statement) override {
-        const QByteArray names[] = {prepared(Hold), prepared(statement), prepared(LetGo)};
+    void touch(const QByteArray& row, const QByteArray& query) override {
+        const QByteArray names[] = {prepared(Hold), prepared(query), prepared(LetGo)};
         const char* const value = row.constData();
         PQenterPipelineMode(connection_);
         for (const QByteArray& name : names)
@@ -108,7 +108,7 @@ public:
                                 nullptr, nullptr, 0);
         PQpipelineSync(connection_);
         for (int answers = 0; answers < 3; ++answers) {
-            PQclear(checked(connection_, PQgetResult(connection_), statement));
+            PQclear(checked(connection_, PQgetResult(connection_), query));
             PQgetResult(connection_);  // the end of its rows
         }
         PQclear(PQgetResult(connection_));
@@ -119,13 +119,13 @@ private:
     static constexpr auto Hold = "SELECT pg_advisory_lock(hashtextextended($1, 1))";
     static constexpr auto LetGo = "SELECT pg_advisory_unlock(hashtextextended($1, 1))";
 
-    QByteArray prepared(const QByteArray& statement) {
-        QByteArray& name = names_[statement];
+    QByteArray prepared(const QByteArray& query) {
+        QByteArray& name = names_[query];
         if (!name.isEmpty()) return name;
         name = 'b' + QByteArray::number(names_.size());
         PQclear(checked(connection_,
-                        PQprepare(connection_, name.constData(), statement.constData(), 0, nullptr),
-                        statement));
+                        PQprepare(connection_, name.constData(), query.constData(), 0, nullptr),
+                        query));
         return name;
     }
 
@@ -139,7 +139,7 @@ private:
 
     Book book_;
     PGconn* connection_;
-    QHash<QByteArray, QByteArray> names_;  ///< of prepared statements
+    QHash<QByteArray, QByteArray> names_;  ///< of prepared queries
 };
 
 }  // namespace

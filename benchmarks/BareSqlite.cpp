@@ -40,34 +40,34 @@ public:
         sqlite3_close(handle_);
     }
 
-    double run(const QByteArray& statement, int column) override {
-        sqlite3_stmt* prepared = prepare(handle_, statement);
+    double run(const QByteArray& query, int column) override {
+        sqlite3_stmt* prepared = prepare(handle_, query);
         double value = 0;
         int step = sqlite3_step(prepared);
         if (step == SQLITE_ROW) value = sqlite3_column_double(prepared, column);
         while (step == SQLITE_ROW) step = sqlite3_step(prepared);
-        if (step != SQLITE_DONE) stop(handle_, statement);
+        if (step != SQLITE_DONE) stop(handle_, query);
         sqlite3_finalize(prepared);
         return value;
     }
 
-    void write(const QByteArray& statement, const std::vector<BareValue>& values) override {
-        sqlite3_stmt*& prepared = writes_[statement];
-        if (!prepared) prepared = prepare(handle_, statement);
+    void write(const QByteArray& query, const std::vector<BareValue>& values) override {
+        sqlite3_stmt*& prepared = writes_[query];
+        if (!prepared) prepared = prepare(handle_, query);
         int place = 0;
         for (const BareValue& value : values) bind(prepared, ++place, value);
-        if (sqlite3_step(prepared) != SQLITE_DONE) stop(handle_, statement);
+        if (sqlite3_step(prepared) != SQLITE_DONE) stop(handle_, query);
         sqlite3_reset(prepared);
     }
 
-    std::unique_ptr<BareRows> rows(const QByteArray& statement) override {
+    std::unique_ptr<BareRows> rows(const QByteArray& query) override {
         sqlite3* reader = connect();
-        return std::make_unique<BareSqliteRows>(reader, prepare(reader, statement));
+        return std::make_unique<BareSqliteRows>(reader, prepare(reader, query));
     }
 
 private:
-    [[noreturn]] static void stop(sqlite3* handle, const QByteArray& statement) {
-        std::fprintf(stderr, "%s: %s\n", sqlite3_errmsg(handle), statement.constData());
+    [[noreturn]] static void stop(sqlite3* handle, const QByteArray& query) {
+        std::fprintf(stderr, "%s: %s\n", sqlite3_errmsg(handle), query.constData());
         std::exit(1);
     }
 
@@ -82,11 +82,11 @@ private:
         return handle;
     }
 
-    static sqlite3_stmt* prepare(sqlite3* handle, const QByteArray& statement) {
+    static sqlite3_stmt* prepare(sqlite3* handle, const QByteArray& query) {
         sqlite3_stmt* prepared = nullptr;
-        if (sqlite3_prepare_v2(handle, statement.constData(), static_cast<int>(statement.size()),
-                               &prepared, nullptr) != SQLITE_OK)
-            stop(handle, statement);
+        if (sqlite3_prepare_v2(handle, query.constData(), static_cast<int>(query.size()), &prepared,
+                               nullptr) != SQLITE_OK)
+            stop(handle, query);
         return prepared;
     }
 

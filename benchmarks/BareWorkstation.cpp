@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a workstation does at the least: bare_workstation NUMBER POSTINGS
 //
-// The statements and locks of a posting with the engine's client library and nothing around them.
+// The queries and locks of a posting with the engine's client library and nothing around them.
 // It speaks as the workstation of the tests does: "ready", then a line for each posting.
 #include <fcntl.h>
 #include <libpq-fe.h>
@@ -26,13 +26,13 @@ namespace {
     std::exit(1);
 }
 
-/// The first row of a statement; empty for none.
+/// The first row of a query; empty for none.
 using Row = QList<QByteArray>;
 
 class BareBook {
 public:
     virtual ~BareBook() = default;
-    virtual Row run(const QString& statement) = 0;
+    virtual Row run(const QString& query) = 0;
     virtual void hold(const QByteArray& row) = 0;
     virtual void letGo(const QByteArray& row) = 0;
 };
@@ -45,8 +45,8 @@ public:
         run(u"PRAGMA synchronous=FULL"_s);
         locks_ = ::open((file + u"-bare-locks"_s).toUtf8().constData(), O_RDWR | O_CREAT, 0600);
     }
-    Row run(const QString& statement) override {
-        const QByteArray text = statement.toUtf8();
+    Row run(const QString& query) override {
+        const QByteArray text = query.toUtf8();
         sqlite3_stmt* prepared = nullptr;
         if (sqlite3_prepare_v2(handle_, text.constData(), -1, &prepared, nullptr) != SQLITE_OK)
             stop(sqlite3_errmsg(handle_));
@@ -82,8 +82,8 @@ public:
     ServerBook(const QString& host, const QString& catalogue, const QString& user)
         : handle_(PQsetdbLogin(host.toUtf8(), nullptr, nullptr, nullptr, catalogue.toUtf8(),
                                user.toUtf8(), nullptr)) {}
-    Row run(const QString& statement) override {
-        PGresult* result = PQexec(handle_, statement.toUtf8());
+    Row run(const QString& query) override {
+        PGresult* result = PQexec(handle_, query.toUtf8());
         if (PQresultStatus(result) != PGRES_TUPLES_OK && PQresultStatus(result) != PGRES_COMMAND_OK)
             stop(PQerrorMessage(handle_));
         Row row;

@@ -44,7 +44,7 @@ const BenchServer& BenchServer::instance() {
 }
 
 BenchServer::BenchServer()
-    // Beside the books, whose folder belongs to whoever made them alone.
+    // Beside the books, whose folder only its owner can enter.
     : folder_(QDir::current().absoluteFilePath(u"build/bench/server"_s)) {
     if (!QDir(folder_).exists(u"PG_VERSION"_s)) {
         QDir().mkpath(folder_);
@@ -52,7 +52,7 @@ BenchServer::BenchServer()
         run({program(u"initdb"_s), u"-D"_s, folder_, u"-E"_s, u"UTF8"_s, u"--locale=C.UTF-8"_s,
              u"-U"_s, QString::fromLatin1(User), u"-A"_s, u"trust"_s});
     }
-    // One that a run left behind which was cut short is as good.
+    // Also when a run that was cut short left the server running.
     run({program(u"pg_ctl"_s), u"-D"_s, folder_, u"-w"_s, u"-s"_s, u"-o"_s,
          u"-k %1 -c listen_addresses= -c fsync=off"_s.arg(folder_), u"restart"_s});
 }
@@ -61,7 +61,7 @@ BenchServer::~BenchServer() {
     try {
         run({program(u"pg_ctl"_s), u"-D"_s, folder_, u"-s"_s, u"-m"_s, u"fast"_s, u"stop"_s});
     } catch (const std::exception&) {
-        // It stays for the next run.
+        // A server that does not stop is restarted by the next run.
     }
 }
 

@@ -87,8 +87,8 @@ Book book(Engine engine, const QString& name, const database::BookSizes& sizes) 
     return engine == Engine::Sqlite ? fileBook(name, sizes) : serverBook(name, sizes);
 }
 
-std::vector<Case> cases(const Book& book, const QByteArray& statement) {
-    const std::unique_ptr<BareRows> rows = bareSqlite(book)->rows(statement);
+std::vector<Case> cases(const Book& book, const QByteArray& query) {
+    const std::unique_ptr<BareRows> rows = bareSqlite(book)->rows(query);
     std::vector<Case> found;
     while (rows->next())
         found.push_back({static_cast<qint32>(rows->integer(0)), QString::fromUtf8(rows->text(1)),
@@ -147,7 +147,8 @@ BookCopy::BookCopy(const Book& original) : book_(original) {
         book_.catalogue += u"_copy"_s;
         database::postgres::Database server(serverBook(u"postgres"_s).server());
         server.run("DROP DATABASE IF EXISTS " + server.name(book_.catalogue) + " WITH (FORCE)");
-        // Nobody may be on a catalogue that is copied; what is connected here connects anew.
+        // A catalogue that is copied must have no connections; those of this program are opened
+        // anew.
         server.number(
             "SELECT count(pg_terminate_backend(pid, 5000)) FROM pg_stat_activity WHERE datname = " +
             server.literal(original.catalogue));

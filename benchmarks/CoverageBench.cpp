@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Try-out and posting at the level of the rules, against the bare engine that prepares and runs the
-// same statements with the same settings.
+// same queries with the same settings.
 #include <optional>
 
 #include "benchmarks/Bare.h"
@@ -67,19 +67,20 @@ void runTryOut(const Case& of, const ado::RecordsetPtr& record) {
     coverage::tryOut(documentFor(of, record), run);
 }
 
-/// A lookup of a pessimistic row: it is found, held, read as it is then, and let go.
-void lookUpHeld(Bare& bare, const QByteArray& row, const QString& statement) {
-    const QByteArray text = statement.toUtf8();
+/// Looks a row up as a pessimistic row set does: finds it, holds it, reads it as it is then, and
+/// lets it go.
+void lookUpHeld(Bare& bare, const QByteArray& row, const QString& query) {
+    const QByteArray text = query.toUtf8();
     bare.run(text);
     if (!bare.hold(row)) return;
     bare.run(text);
     bare.letGo(row);
 }
 
-/// The statements and locks of one try-out.
+/// The queries and locks of one try-out.
 void runBareTryOut(Bare& bare, const Case& of) {
     using namespace coverage::queries;
-    const auto run = [&bare](const QString& statement) { return bare.run(statement.toUtf8()); };
+    const auto run = [&bare](const QString& query) { return bare.run(query.toUtf8()); };
     const double main = bare.run(rubric(of.rubrica_id).toUtf8(), 1);
     const QString own = accumulator(of.rubrica_id, of.socio_id, of.codABC);
     lookUpHeld(bare, own.toUtf8(), own);
@@ -150,7 +151,8 @@ void compareBooks(Report& report, const QString& name, bool fresh) {
     std::vector<double> times[2];
     for (int round = 0; round < 15; ++round)
         for (int turn : {0, 1}) {
-            // The order changes, so that neither always runs behind the other.
+            // Each of the two goes first in turn, so that neither always finds what the other left
+            // in memory.
             const int at = (round + turn) % 2;
             use(books[at]);
             const ado::RecordsetPtr record = pendingRow();

@@ -37,10 +37,10 @@ ado::ConnectionPtr connect(const Book& book) {
     return connection;
 }
 
-ado::RecordsetPtr open(const QString& statement, const ado::ConnectionPtr& connection,
+ado::RecordsetPtr open(const QString& query, const ado::ConnectionPtr& connection,
                        ado::LockType lock = ado::adLockReadOnly) {
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statement, connection, ado::adOpenStatic, lock, ado::adCmdUnknown);
+    rows->Open(query, connection, ado::adOpenStatic, lock, ado::adCmdUnknown);
     return rows;
 }
 
@@ -75,8 +75,8 @@ struct Seen {
 /// @param most  the memory that was in use at any time, in MB; null when nobody asks
 Seen pass(const ado::ConnectionPtr& connection, double* most) {
     Seen seen;
-    for (const QString& statement : Movements) {
-        const ado::RecordsetPtr rows = open(statement, connection);
+    for (const QString& query : Movements) {
+        const ado::RecordsetPtr rows = open(query, connection);
         for (; !rows->atEnd(); rows->MoveNext()) {
             seen.members += rows->value(Socio).toInt();
             seen.letters += rows->value(Data).isValid();
@@ -91,8 +91,8 @@ Seen pass(const ado::ConnectionPtr& connection, double* most) {
 
 Seen barePass(Bare& bare) {
     Seen seen;
-    for (const QString& statement : Movements) {
-        const std::unique_ptr<BareRows> rows = bare.rows(statement.toUtf8());
+    for (const QString& query : Movements) {
+        const std::unique_ptr<BareRows> rows = bare.rows(query.toUtf8());
         for (; rows->next(); ++seen.rows) {
             seen.members += rows->integer(Socio);
             seen.letters += rows->text(Data)[0] != '\0';
@@ -128,7 +128,7 @@ void measurePass(Report& report, Engine engine) {
 
 // --- Writing
 
-/// Runs both in turn, a stretch each.
+/// Runs both in turn, one stretch each.
 void compareStretches(Report& report, const QString& name, const std::function<void()>& ours,
                       const std::function<void()>& theirs) {
     std::vector<double> ourTimes, theirTimes;
@@ -263,7 +263,7 @@ void measureOpening(Report& report, Engine engine) {
 }
 
 /// What the caller waits for: a row is held, read as it is then, and let go. On a server that is
-/// held against the same statements in one round trip.
+/// held against the same queries in one round trip.
 class LockPairs {
 public:
     explicit LockPairs(const Book& book) : session_(connect(book)->session()), bare_(bare(book)) {}
@@ -276,7 +276,7 @@ public:
         own();
         other();
         for (int pair = 0; pair < pairs; ++pair) {
-            // The order changes, so that neither always runs behind the other.
+            // Each of the two goes first in turn: the second one finds the memory filled.
             if (pair % 2 != 0) ours.push_back(settled(own));
             theirs.push_back(settled(other));
             if (pair % 2 == 0) ours.push_back(settled(own));
@@ -284,7 +284,8 @@ public:
     }
 
 private:
-    /// What the server still does for either of them, the other one does not wait for.
+    /// The time of some work. Waits until the server is idle again, so that what it still does for
+    /// one of the two does not slow the other one down.
     double settled(const std::function<void()>& work) {
         const double time = milliseconds(work);
         fresh_.clear();

@@ -28,7 +28,7 @@ namespace {
 constexpr int Movements = 100'000;
 constexpr int ManyPages = 5'000;
 
-/// The first so many movements, as the statements of a member select them.
+/// The first so many movements, as the extracts of a member select them.
 ado::RecordsetPtr movements(int count) {
     const double last = bare(largeBook())
                             ->run(
@@ -112,7 +112,8 @@ void measurePdf(Report& report, const printing::Report& design, int rounds) {
 
 /// Rows and pages together, from nothing to the last page.
 void measureMemory(Report& report) {
-    // Nothing that earlier measures left behind is counted, and nothing is put into its place.
+    // Memory that earlier measures used and gave back is returned first, so that it is neither
+    // counted nor used again.
     malloc_trim(0);
     mallopt(M_MMAP_THRESHOLD, 128 * 1024);
     const double before = residentMegabytes(QCoreApplication::applicationPid());
@@ -120,7 +121,7 @@ void measureMemory(Report& report) {
     printing::Layout layout(reports::rptExtrato2(), rows);
     layout.go(-1);
     const bool enough = layout.pages()->count() >= ManyPages;
-    // A shorter report was not what was asked for, and must not pass.
+    // A shorter report would pass without having been measured.
     report.value(Memory, u"MB"_s, 150,
                  enough ? residentMegabytes(QCoreApplication::applicationPid()) - before : 1e9);
 }

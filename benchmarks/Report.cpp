@@ -46,7 +46,7 @@ void Report::pair(const QString& name, double limit, int calls, const std::funct
     timed(calls, ours);  // warm up
     timed(calls, bare);
     for (int round = 0; round < Rounds; ++round) {
-        // The order changes, so that neither always runs behind the other.
+        // Each of the two goes first in turn: the second one finds the memory filled.
         const bool oursFirst = round % 2 == 0;
         double ourTime = oursFirst ? timed(calls, ours) : 0;
         const double bareTime = timed(calls, bare);

@@ -85,7 +85,7 @@ double longestHold(const Book& large) {
     beat.start(0);
     view.open(host::BookSettings::read());
     while (!isRead) QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
-    // What was put off until the rows were there.
+    // Serves what was put off until the rows were there.
     for (int turns = 0; turns < 20; ++turns) QCoreApplication::processEvents();
     return longest;
 }
@@ -96,7 +96,7 @@ void measureHostMemory(Report& report, const Book& large) {
     QProcess host;
     host.start(QCoreApplication::applicationDirPath() + u"/zelmars"_s, QStringList());
     host.waitForStarted();
-    // It is done reading when it has not grown for two seconds.
+    // It has read everything when it has not grown for two seconds.
     double most = 0;
     for (int still = 0; still < 20 && host.state() == QProcess::Running;) {
         host.waitForFinished(100);

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Eight workstations that post at once, on both engines, against eight processes that do the bare
-// statements and locks; and workstations that are killed at random instants. The script of the
+// queries and locks; and workstations that are killed at random instants. The script of the
 // tests runs the office.
 #include <QCoreApplication>
 #include <QProcess>
@@ -22,7 +22,7 @@ const QString Kills = u"200"_s;
 constexpr int Rounds = 5;
 const QString RoundPostings = u"200"_s;
 
-/// At least 0.6 of the postings that the bare statements reach in the same time.
+/// At least 0.6 of the postings that the bare queries reach in the same time.
 constexpr double Throughput = 1 / 0.6;
 
 struct Outcome {
@@ -55,7 +55,7 @@ void measurePostings(Report& report, const QString& engine) {
     const QStringList round{u"work"_s, Workstations, RoundPostings};
     std::vector<double> ours, bare;
     for (int at = 0; at < Rounds; ++at) {
-        // The order changes, so that neither always runs behind the other.
+        // Each of the two goes first in turn: the second one finds the memory filled.
         if (at % 2 != 0) ours.push_back(office(engine, round).pace);
         bare.push_back(office(engine, round + QStringList{u"bare_workstation"_s}).pace);
         if (at % 2 == 0) ours.push_back(office(engine, round).pace);

@@ -28,7 +28,8 @@ void requireThread() {
                             "programa, a das janelas."_s);
 }
 
-/// The run of an operation.
+/// Lives as long as an operation runs: the pending error is cleared at the end of the outermost
+/// one.
 class Operation {
 public:
     Operation() { requireThread(); }
@@ -57,7 +58,7 @@ bool loggedInOrRefused() {
     return false;
 }
 
-/// Screens abort a process without an application; a host that has none hears of it instead.
+/// A screen aborts a process that has no application object: its host gets a failure instead.
 void requireApplication() {
     if (!qobject_cast<QApplication*>(QCoreApplication::instance()))
         throw core::Failure(core::InvalidCall,
@@ -98,7 +99,7 @@ bool openLaterInSilence() {
         openingPreamble();
         core::MsgBox(NotYet, core::Icon::Critical);
     } catch (const std::exception&) {
-        // The host hears of it by the result.
+        // Intentional: the result alone tells the host.
     }
     return false;
 }
@@ -147,8 +148,8 @@ void General::Registo(const QVariant&, const QVariant& Pkey, QString*, QString*,
 }
 
 void General::NewMovimento(bool bHospital, QString* strConMember, QString* strSQL) {
-    openNew(strConMember, strSQL, [bHospital](QString& connection, QString& statement) {
-        entry::openNewMovimento(bHospital, connection, statement);
+    openNew(strConMember, strSQL, [bHospital](QString& connection, QString& query) {
+        entry::openNewMovimento(bHospital, connection, query);
     });
 }
 

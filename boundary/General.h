@@ -11,8 +11,8 @@
 /// argument left out. It holds no data: all objects share one login state and one data environment.
 ///
 /// A failure goes up to the caller as a core::Failure, except where an operation says otherwise. A
-/// call in another thread than the application's always fails so.
-/// Without a valid login all but the marked operations show the refusal "Bad Login" and return.
+/// call in another thread than the application's always fails so. Without a valid login an
+/// operation shows the refusal "Bad Login" and returns, except where it says otherwise.
 class General : public QObject {
     Q_OBJECT
 public:
@@ -20,8 +20,9 @@ public:
 
     /// The rubrics, modal, on the row set of `strSQL` through the connection of that name.
     Q_INVOKABLE void CallPlafonds(QString* strConMember, QString* strSQL);
-    /// The hospitals, likewise.
+    /// The hospitals, in the same way.
     Q_INVOKABLE void CallHospitais(QString* strConMember, QString* strSQL);
+    /// Data maintenance, tax declarations, year close; modal.
     Q_INVOKABLE void CallManutencaoDados();
     Q_INVOKABLE void CallIRS();
     Q_INVOKABLE void CallFechoAno();
@@ -37,13 +38,15 @@ public:
     /// The entry screen on a new row, modeless. Empty texts receive the defaults that were used.
     Q_INVOKABLE void NewMovimento(bool bHospital, QString* strConMember = nullptr,
                                   QString* strSQL = nullptr);
-    /// A correction of an account, and a receipt, likewise.
+    /// A reposition, and a receipt, on a new row in the same way.
     Q_INVOKABLE void Correcao(QString* strConMember = nullptr, QString* strSQL = nullptr);
     Q_INVOKABLE void Recebimento(QString* strConMember = nullptr, QString* strSQL = nullptr);
-    /// Both arguments are ignored.
+    /// A member's extract, modal. Both arguments are ignored.
     Q_INVOKABLE void Extratos(QString* strConMember = nullptr, QString* strSQL = nullptr);
+    /// The payment listings, modal.
     Q_INVOKABLE void LPagamentos();
-    // These three go on without a valid login and give false for any failure, without a word.
+    /// Debt listing, debt letters, hospital listing: true on success. Intentional: they go on
+    /// without a valid login and give false for any failure, without a word.
     Q_INVOKABLE bool Ldividas();
     Q_INVOKABLE bool Lcartasdividas();
     Q_INVOKABLE bool Lhospitais();

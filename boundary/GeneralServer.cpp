@@ -104,8 +104,8 @@ com::Dispatch* makeGeneral() {
     return new GeneralComponent;
 }
 
-/// Screens outlive the object whose operation opened them. They can only be looked for in their own
-/// thread; elsewhere there may be one.
+/// True when a screen is still open: screens outlive the object whose operation opened them. Only
+/// their own thread can look for them; in any other one there may be some.
 bool isScreenShown() {
     if (!qobject_cast<QApplication*>(QCoreApplication::instance())) return false;
     if (QThread::currentThread() != qApp->thread()) return true;

@@ -26,27 +26,27 @@ bool isUnderWay(const QString& type) {
 
 }  // namespace
 
-QString movementInForceStatement(const QVariant& Pkey) {
+QString movementInForceQuery(const QVariant& Pkey) {
     return u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s + core::toText(Pkey);
 }
 
 void openRegisto(const QVariant& Pkey, QObject* Caller) {
-    // A key that is no number fails here; as a number it is not used.
+    // A key that is no number is refused here; the query takes it as it was given.
     core::toLong(Pkey);
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(movementInForceStatement(Pkey), environment::dtZelmars::instance().MSAccess(),
+    rows->Open(movementInForceQuery(Pkey), environment::dtZelmars::instance().MSAccess(),
                ado::adOpenDynamic, ado::adLockOptimistic, ado::adCmdUnknown);
     if (rows->atEnd()) return;
     const QString type = core::toText(rows->Collect(u"tipo"_s));
     const bool isDocument = type == tipo::Document || type == tipo::Hospital;
     if (!isDocument && type != tipo::Receipt && type != tipo::Reposition) return;
-    // Asked before another view makes room.
+    // Before anything is attached, so that a refusal leaves the screens as they are.
     if (isUnderWay(type))
         throw core::Failure(core::InvalidCall,
                             u"Há um lançamento por terminar. Termine-o ou cancele-o antes de ver "
                             "outro movimento."_s);
-    // Of every type: the hidden entry screen keeps the row as well as the screen that shows it. One
-    // on which somebody is typing keeps the row that is typed.
+    // Intentional: the entry screen, though hidden, keeps the row of a movement of any type, beside
+    // the screen that shows it. Where somebody is typing it keeps the row that is being typed.
     if (!entry::isEntryUnderWay()) entry::attachMovement(rows, Caller);
     if (isDocument)
         entry::showMovement(type);

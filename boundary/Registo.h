@@ -6,8 +6,9 @@
 
 namespace boundary {
 
-/// One row: a movement that is in force, with the member and the names that the screens show.
-QString movementInForceStatement(const QVariant& Pkey);
+/// The query of one row: a movement that is in force, with the member and the names that the
+/// screens show.
+QString movementInForceQuery(const QVariant& Pkey);
 
 /// Opens the movement whose key is `Pkey` read-only, in the screen of its type. A movement that is
 /// not in force, or of a type without a screen, opens nothing. Fails while something is being typed

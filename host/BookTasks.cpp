@@ -3,13 +3,13 @@
 
 #include <unistd.h>
 
-#include <QTextStream>
 #include <csignal>
 
 #include "database/Book.h"
 #include "database/Copy.h"
 #include "database/ServerBook.h"
 #include "host/BookSettings.h"
+#include "host/Console.h"
 #include "host/Password.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -19,10 +19,6 @@ using namespace Qt::StringLiterals;
 namespace host {
 
 namespace {
-
-void say(const QString& text) {
-    QTextStream(stdout) << text << Qt::endl;
-}
 
 void enterAsAdministrator(database::ServerCatalogue& server, const QString& admin) {
     server.user = admin;
@@ -34,7 +30,8 @@ void enterAsAdministrator(database::ServerCatalogue& server, const QString& admi
 
 volatile std::sig_atomic_t interrupted = 0;
 
-/// While it lives, Ctrl+C is a wish and not the end.
+/// While it lives, Ctrl+C does not end the program: it is noted, and the copying stops at the next
+/// step and clears up behind itself.
 class Interruptible {
 public:
     Interruptible() {
@@ -48,7 +45,7 @@ public:
     Interruptible& operator=(const Interruptible&) = delete;
 };
 
-/// One line that changes at a terminal; one line for each table elsewhere.
+/// At a terminal one line that changes; elsewhere, as in a file, one line for each table.
 void showProgress(const database::CopyProgress& progress) {
     if (interrupted) throw core::Failure(core::InvalidCall, u"a cópia foi interrompida."_s);
     static const bool isTerminal = isatty(STDOUT_FILENO);

@@ -8,7 +8,8 @@ namespace host {
 
 void makeBook(const CommandLine& line);
 void makeServerBook(const CommandLine& line);
-/// Shows how far it is. Ctrl+C ends it as a failure does: nothing stays in the target.
+/// Shows how far the copying has come. Ctrl+C ends it as a failure does: nothing stays in the
+/// target.
 void copyBook(const CommandLine& line);
 
 }  // namespace host

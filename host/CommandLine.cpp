@@ -50,9 +50,10 @@ public:
         note(u"falta %1."_s.arg(meaning));
         return {};
     }
-    /// The line, unless something lacks in it or is left over.
+    /// The line as it was read, or a refusal when something is missing in it or left over.
     CommandLine ended(const CommandLine& line) {
-        // A switch that is not known may be why something else lacks.
+        // An unknown switch is told first: it may be a misspelt one, for want of which something
+        // else seems to be missing.
         for (const QString& word : rest_)
             if (isSwitch(word)) return refused(u"não há a opção «%1»."_s.arg(word));
         if (!wrong_.isEmpty()) return refused(wrong_);
@@ -61,7 +62,7 @@ public:
     }
 
 private:
-    /// What lacks first is told.
+    /// Of several things that are missing the first is told.
     void note(const QString& why) {
         if (wrong_.isEmpty()) wrong_ = why;
     }

@@ -11,7 +11,7 @@ namespace host {
 struct CommandLine {
     enum class Task { Window, Operation, Init, InitServer, Copy, Register, Help, Version, Wrong };
     Task task = Task::Window;
-    QString wrong = {};       ///< of Wrong: the word that is wrong or lacks, in a sentence
+    QString wrong = {};       ///< of Wrong: the word that is wrong or missing, in a sentence
     OperationCall call = {};  ///< of Operation
     QString folder = {};      ///< of Init
     QString group = {};       ///< of Init: whose members share the book; empty for nobody

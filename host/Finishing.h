@@ -5,9 +5,9 @@
 
 namespace host {
 
-/// Does what is missing of a posting or annulment that was cut short, each step once, whoever else
-/// is at it. Gives in a sentence what was done. Fails with what the failing step fails with; what
-/// was done until then stays done.
+/// Does what is missing of a posting or annulment that was cut short. Each step is done once, also
+/// when another workstation finishes the same one at the same time. Gives in a sentence what was
+/// done. Fails as the failing step does; what was done until then stays done.
 QString finish(data::Operation operation);
 
 }  // namespace host

@@ -8,8 +8,8 @@
 
 namespace host {
 
-/// True while the book is being waited for: what would read it then is tried again until nobody
-/// waits any more, or `owner` is gone.
+/// True while the book is being waited for, when it must not be read: the caller returns, and
+/// `again` is called a little later, unless `owner` is gone by then. It is to ask here once more.
 template <class Again>
 bool leftForLater(QObject* owner, const Again& again) {
     if (!core::isWaiting()) return false;

@@ -26,7 +26,7 @@ const QString NamedKeys =
     u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, "
     "doc_valor, credito, debito, no_kor, nome, familiar from vwZelmars_Movimentos_Vigor where "
     "movimento_id in (%1)"_s;
-// The day comes first: corrections for members who left have keys of another range.
+// The day comes first: the keys of the two tables behind the view do not go by time together.
 const QString NewestFirst = u"order by data desc, movimento_id desc"_s;
 // The keys of the movements since a day, in one of the two tables behind the view.
 const QString NewestKeys =
@@ -102,8 +102,8 @@ MovementBook::MovementBook(const BookSettings& settings)
 
 std::shared_ptr<MovementSearch> MovementBook::newest(int count) const {
     auto search = std::make_shared<MovementSearch>();
-    // The newest days need not hold any movement of the members who left: what was posted since
-    // counts from the last key, not from the last one shown.
+    // What is posted later is told by its key, counted from the greatest one of each table: the
+    // rows that are shown first need not hold any movement of the members who left.
     for (const bool activo : {false, true}) {
         const std::vector<qint32> greatest = numbers(GreatestKey.arg(tableOf(activo)));
         if (!greatest.empty()) search->knowKey(activo, greatest.front());
@@ -114,8 +114,9 @@ std::shared_ptr<MovementSearch> MovementBook::newest(int count) const {
     return search;
 }
 
-/// The newest of each table, together in no order. The view would look the names up for all
-/// movements before it takes the newest, and a server would sort all days.
+/// The newest of each table, together in no order. They are looked for table by table: through the
+/// view an engine would find the names of all movements before it takes the newest, and a server
+/// would sort all days.
 std::vector<qint32> MovementBook::newestKeys(int count) const {
     std::vector<qint32> keys;
     for (const bool activo : {false, true}) {
@@ -142,9 +143,9 @@ QDate MovementBook::lastDay(const QString& table) const {
 
 std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
     auto search = std::make_shared<MovementSearch>();
-    const auto each = [&](const QString& statement, const auto& take) {
+    const auto each = [&](const QString& query, const auto& take) {
         const auto row = ado::Recordset::create();
-        row->Open(statement, connection_);
+        row->Open(query, connection_);
         for (; !row->atEnd() && !stop.stop_requested(); row->MoveNext()) take(*row);
         row->Close();
     };
@@ -191,24 +192,25 @@ std::vector<MovementKey> MovementBook::named(const std::vector<qint32>& keys,
         takeNames(*row, movements.back(), search);
     }
     row->Close();
-    // Asked for in this order, an engine may pass over all days in search of a few keys.
+    // Sorted here: with an ORDER BY an engine may pass over all days in search of a few keys.
     std::sort(movements.begin(), movements.end(), [](const MovementKey& a, const MovementKey& b) {
         return std::tie(a.data, a.movimento_id) > std::tie(b.data, b.movimento_id);
     });
     return movements;
 }
 
-/// The numbers in the first column of a statement's rows; null gives 0.
-std::vector<qint32> MovementBook::numbers(const QString& statement) const {
+/// The numbers in the first column of a query's rows; null gives 0.
+std::vector<qint32> MovementBook::numbers(const QString& query) const {
     std::vector<qint32> numbers;
     const auto row = ado::Recordset::create();
-    for (row->Open(statement, connection_); !row->atEnd(); row->MoveNext())
+    for (row->Open(query, connection_); !row->atEnd(); row->MoveNext())
         numbers.push_back(number(row->value(0)));
     row->Close();
     return numbers;
 }
 
-/// A correcting row is its annulled movement's only trace since; it names the member alone.
+/// Takes in anew what was annulled of a member. An annulment leaves the annulled row under its old
+/// key; only the correcting row is new, and all that it tells is the member.
 void MovementBook::takeAnnulled(MovementSearch& search, qint32 socio_id) const {
     const auto row = ado::Recordset::create();
     row->Open(Keys + AnnulledOf.arg(socio_id), connection_);

@@ -41,7 +41,7 @@ public:
     std::shared_ptr<MovementSearch> newest(int count) const;
     /// All movements and the names of all persons; null when it was stopped.
     std::shared_ptr<MovementSearch> all(std::stop_token stop) const;
-    /// Takes in what was posted since, and what those rows correct; returns how many movements were
+    /// Takes in what was posted since, and what those rows annul; returns how many movements were
     /// posted.
     int takeNewer(MovementSearch& search) const;
 
@@ -52,7 +52,7 @@ public:
     std::vector<MovementRow> rows(const std::vector<qint32>& keys) const;
 
 private:
-    std::vector<qint32> numbers(const QString& statement) const;
+    std::vector<qint32> numbers(const QString& query) const;
     QDate lastDay(const QString& table) const;
     std::vector<qint32> newestKeys(int count) const;
     std::vector<MovementKey> named(const std::vector<qint32>& keys, MovementSearch& search) const;

@@ -28,7 +28,7 @@ void MovementLoader::run(const BookSettings& settings) {
 }
 
 void MovementLoader::take(const std::shared_ptr<MovementSearch>& search, const QString& failure) {
-    // Whoever hears of it reads the book.
+    // Those who are told read the book.
     if (leftForLater(this, [=, this] { take(search, failure); })) return;
     if (next_) return run(*std::exchange(next_, std::nullopt));
     isReading_ = false;

@@ -17,7 +17,7 @@ class MovementLoader : public QObject {
     Q_OBJECT
 public:
     using QObject::QObject;
-    /// Reads afresh. What is under way is stopped and nobody hears of it.
+    /// Reads afresh. What is under way is stopped and its result dropped.
     void start(const BookSettings& settings);
     bool isReading() const { return isReading_; }
 
@@ -30,7 +30,8 @@ private:
     void take(const std::shared_ptr<MovementSearch>& search, const QString& failure);
 
     bool isReading_ = false;
-    std::optional<BookSettings> next_;  // a server that has not answered yet is not waited for
+    std::optional<BookSettings>
+        next_;  // what to read when the thread, stopped meanwhile, has ended
     std::jthread thread_;
 };
 

@@ -8,12 +8,12 @@ namespace host {
 
 namespace {
 
-/// The order of numbers with a sign, in numbers without one.
+/// A number with a sign as one without, so that their orders are the same.
 quint64 unsignedOrder(qint64 number) {
     return quint64(number) ^ (quint64(1) << 63);
 }
 
-/// The first eight bytes of a text as a number that is in the same order.
+/// The first eight bytes of a text as a number; numbers are in the order of the texts.
 quint64 head(std::string_view text) {
     quint64 bytes = 0;
     for (std::size_t at = 0; at < 8; ++at)
@@ -21,7 +21,7 @@ quint64 head(std::string_view text) {
     return bytes;
 }
 
-/// The place of each text among them all; equal texts share theirs.
+/// For each text its rank among all of them; equal texts have the same rank.
 template <class TextAt>
 std::vector<quint32> ranks(std::size_t count, const TextAt& textAt) {
     std::vector<std::pair<quint64, quint32>> texts(count);
@@ -72,13 +72,13 @@ MovementOrder::Keys MovementOrder::keys(MovementRow::Column column) const {
                 keys.push_back(unsignedOrder(amounts[std::size_t(column - MovementRow::Value)]));
             return keys;
         case MovementRow::Number:
-            for (const auto& entry : search_.entries_) keys.push_back(unsignedOrder(entry.number));
+            for (const auto& item : search_.items_) keys.push_back(unsignedOrder(item.number));
             return keys;
         case MovementRow::Date:
         case MovementRow::ColumnCount:
             break;
     }
-    for (const auto& entry : search_.entries_) keys.push_back(unsignedOrder(entry.day));
+    for (const auto& item : search_.items_) keys.push_back(unsignedOrder(item.day));
     return keys;
 }
 
@@ -86,9 +86,9 @@ MovementOrder::Keys MovementOrder::personKeys(PersonText which) const {
     const auto textAt = [&](std::size_t at) { return text(search_.persons_[at], which); };
     std::vector<quint32> ranked = ranks(search_.persons_.size(), textAt);
     Keys keys;
-    for (const auto& entry : search_.entries_) {
-        const quint32 member = search_.persons_[entry.person].member;
-        const quint32 person = which == PersonText::Relative ? entry.person : member;
+    for (const auto& item : search_.items_) {
+        const quint32 member = search_.persons_[item.person].member;
+        const quint32 person = which == PersonText::Relative ? item.person : member;
         const bool isNobody = which == PersonText::Relative && person == member;
         const quint64 longerLater =
             which == PersonText::Staff ? quint64(textAt(person).size()) << 32 : 0;
@@ -98,9 +98,9 @@ MovementOrder::Keys MovementOrder::personKeys(PersonText which) const {
 }
 
 MovementOrder::Keys MovementOrder::documentKeys() const {
-    const std::vector<quint32> ranked = ranks(search_.entries_.size(), [&](std::size_t at) {
-        const auto& entry = search_.entries_[at];
-        return search_.text(entry.document, entry.documentSize);
+    const std::vector<quint32> ranked = ranks(search_.items_.size(), [&](std::size_t at) {
+        const auto& item = search_.items_[at];
+        return search_.text(item.document, item.documentSize);
     });
     return Keys(ranked.begin(), ranked.end());
 }
@@ -110,7 +110,7 @@ MovementOrder::Keys MovementOrder::typeKeys() const {
         return std::string_view(search_.types_[at]);
     });
     Keys keys;
-    for (const auto& entry : search_.entries_) keys.push_back(ranked[entry.type]);
+    for (const auto& item : search_.items_) keys.push_back(ranked[item.type]);
     return keys;
 }
 

@@ -64,14 +64,15 @@ public:
         askPersons(core::foldedWords(text));
     }
 
-    bool fits(const Entry& entry) const {
-        return fitsType_[entry.type] || fitsPerson_[entry.person] || fitsNumber(entry.number) ||
-               isIn(inDocument_, search_.text(entry.document, entry.documentSize)) ||
-               fitsDay(entry.day);
+    bool fits(const Item& item) const {
+        return fitsType_[item.type] || fitsPerson_[item.person] || fitsNumber(item.number) ||
+               isIn(inDocument_, search_.text(item.document, item.documentSize)) ||
+               fitsDay(item.day);
     }
 
 private:
-    /// Whether a word of the text begins so. Looks at the blanks only, one before each word.
+    /// Whether a word of the text begins with this one. Each word of the text stands behind a
+    /// blank.
     static bool isIn(std::string_view beginning, std::string_view text) {
         if (beginning.size() < 2) return false;
         std::size_t at = 0;
@@ -108,28 +109,28 @@ private:
 };
 
 void MovementSearch::append(const MovementKey& movement) {
-    entries_.push_back(entryOf(movement));
+    items_.push_back(itemOf(movement));
     amounts_.push_back(movement.amounts);
 }
 
 void MovementSearch::prepend(const std::vector<MovementKey>& movements) {
-    std::vector<Entry> newer;
+    std::vector<Item> newer;
     std::vector<std::array<qint64, 3>> amounts;
     for (const MovementKey& movement : movements) {
-        newer.push_back(entryOf(movement));
+        newer.push_back(itemOf(movement));
         amounts.push_back(movement.amounts);
     }
-    entries_.insert(entries_.begin(), newer.begin(), newer.end());
+    items_.insert(items_.begin(), newer.begin(), newer.end());
     amounts_.insert(amounts_.begin(), amounts.begin(), amounts.end());
 }
 
 void MovementSearch::correct(const MovementKey& movement) {
-    const auto known = std::find_if(entries_.begin(), entries_.end(), [&](const Entry& entry) {
-        return entry.id == movement.movimento_id;
+    const auto known = std::find_if(items_.begin(), items_.end(), [&](const Item& item) {
+        return item.id == movement.movimento_id;
     });
-    if (known == entries_.end()) return;
-    *known = entryOf(movement);
-    amounts_[std::size_t(known - entries_.begin())] = movement.amounts;
+    if (known == items_.end()) return;
+    *known = itemOf(movement);
+    amounts_[std::size_t(known - items_.begin())] = movement.amounts;
 }
 
 void MovementSearch::knowKey(bool activo, qint32 movimento_id) {
@@ -151,26 +152,26 @@ std::vector<quint32> MovementSearch::find(const QString& filter) const {
     for (const QString& text : filter.simplified().split(' '_L1, Qt::SkipEmptyParts))
         words.emplace_back(*this, text);
     std::vector<quint32> found;
-    for (std::size_t position = 0; position < entries_.size(); ++position) {
-        const auto fits = [&](const Word& word) { return word.fits(entries_[position]); };
+    for (std::size_t position = 0; position < items_.size(); ++position) {
+        const auto fits = [&](const Word& word) { return word.fits(items_[position]); };
         if (std::all_of(words.begin(), words.end(), fits)) found.push_back(quint32(position));
     }
     return found;
 }
 
-MovementSearch::Entry MovementSearch::entryOf(const MovementKey& movement) {
+MovementSearch::Item MovementSearch::itemOf(const MovementKey& movement) {
     knowKey(movement.activo, movement.movimento_id);
     const std::string document =
         ' ' + core::folded(movement.doc_no.simplified()).substr(0, LongestText);
-    const Entry entry{movement.movimento_id,
-                      movement.movimento_no,
-                      relativeAt(movement.socio_id, movement.codABC),
-                      movement.data.isValid() ? qint32(movement.data.toJulianDay()) : 0,
-                      quint32(texts_.size()),
-                      quint16(document.size()),
-                      positionOf(core::folded(movement.tipo), types_)};
+    const Item item{movement.movimento_id,
+                    movement.movimento_no,
+                    relativeAt(movement.socio_id, movement.codABC),
+                    movement.data.isValid() ? qint32(movement.data.toJulianDay()) : 0,
+                    quint32(texts_.size()),
+                    quint16(document.size()),
+                    positionOf(core::folded(movement.tipo), types_)};
     texts_ += document;
-    return entry;
+    return item;
 }
 
 quint32 MovementSearch::memberAt(qint32 socio_id) {

@@ -48,8 +48,8 @@ public:
     void nameMember(qint32 socio_id, const QString& no_kor, const QString& nome);
     void nameRelative(qint32 socio_id, const QString& codABC, const QString& nome);
 
-    std::size_t size() const { return entries_.size(); }
-    qint32 movimento_id(std::size_t position) const { return entries_[position].id; }
+    std::size_t size() const { return items_.size(); }
+    qint32 movimento_id(std::size_t position) const { return items_[position].id; }
     /// The greatest key known of the table of the active members, or of those who left; 0 without
     /// any.
     qint32 newest(bool activo) const { return newest_[activo ? 1 : 0]; }
@@ -61,7 +61,7 @@ public:
 
 private:
     friend class MovementOrder;
-    struct Entry {
+    struct Item {
         qint32 id;
         qint32 number;
         quint32 person;
@@ -78,17 +78,18 @@ private:
     };
     class Word;
 
-    Entry entryOf(const MovementKey& movement);
+    Item itemOf(const MovementKey& movement);
     quint32 memberAt(qint32 socio_id);
     quint32 relativeAt(qint32 socio_id, const QString& codABC);
     quint32 addPerson(quint64 key, quint32 member);
     void name(quint32 person, const std::string& staff, const std::string& nome);
     std::string_view text(quint32 from, quint16 size) const;
 
-    std::vector<Entry> entries_;
-    std::vector<std::array<qint64, 3>> amounts_;  // of the entries
+    std::vector<Item> items_;
+    std::vector<std::array<qint64, 3>> amounts_;  // of the items
     std::vector<Person> persons_;
-    QHash<quint64, quint32> personAt_;  // by socio_id and, below it, the position in codes_ plus 1
+    QHash<quint64, quint32> personAt_;  // by socio_id, shifted left, plus the position in codes_
+                                        // plus 1; 0 for the member
     std::vector<std::string> types_;
     std::vector<std::string> codes_;
     std::string texts_;          // folded; each word behind a blank

@@ -27,7 +27,7 @@ void MovementSorter::run(const Wish& wish) {
 }
 
 void MovementSorter::take(const std::vector<quint32>& positions) {
-    // Whoever hears of it reads the book.
+    // Those who are told read the book.
     if (leftForLater(this, [this, positions] { take(positions); })) return;
     if (next_) return run(*std::exchange(next_, std::nullopt));
     isBusy_ = false;

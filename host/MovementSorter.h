@@ -22,9 +22,9 @@ public:
     };
 
     using QObject::QObject;
-    /// Sorts as wished. What is under way is finished first, and nobody hears of its result.
+    /// Sorts as wished. What is under way is finished first, and its result dropped.
     void start(const Wish& wish);
-    /// Nobody hears of the result of what is under way.
+    /// Drops the result of what is under way: finished() comes without positions.
     void forget();
     /// True while another thread reads what is sorted.
     bool isBusy() const { return isBusy_; }

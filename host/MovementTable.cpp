@@ -5,9 +5,9 @@
 #include <QClipboard>
 #include <QHeaderView>
 #include <QKeyEvent>
-#include <QLabel>
 
 #include "host/MovementList.h"
+#include "host/Notice.h"
 
 using namespace Qt::StringLiterals;
 
@@ -20,18 +20,10 @@ constexpr int Widths[MovementRow::ColumnCount] = {8, 12, 9, 34, 34, 6, 14, 13, 1
 constexpr int LeastName = 16;
 constexpr int MostCopied = 10'000;
 
-QLabel* centredLabel(const QString& name) {
-    auto* label = new QLabel;
-    label->setObjectName(name);
-    label->setTextFormat(Qt::PlainText);
-    label->setAlignment(Qt::AlignHCenter);
-    label->setWordWrap(true);
-    return label;
-}
-
 }  // namespace
 
-MovementTable::MovementTable(MovementList* movements) : movements_(movements) {
+MovementTable::MovementTable(MovementList* movements)
+    : movements_(movements), empty_(new Notice(viewport(), u"Vazio"_s, u"VazioSugestao"_s)) {
     setObjectName(u"Lista"_s);
     setAccessibleName(u"Movimentos"_s);
     setModel(movements);
@@ -58,20 +50,7 @@ MovementTable::MovementTable(MovementList* movements) : movements_(movements) {
     connect(header, &QHeaderView::sectionResized, this, [this](int column, int before, int after) {
         giveFreeSpace(column, std::max(0, after - before));
     });
-    addEmptyText();
     connect(movements, &QAbstractItemModel::modelReset, this, &MovementTable::showEmptyText);
-}
-
-void MovementTable::addEmptyText() {
-    empty_ = centredLabel(u"Vazio"_s);
-    hint_ = centredLabel(u"VazioSugestao"_s);
-    hint_->setForegroundRole(QPalette::PlaceholderText);
-    auto* column = new QVBoxLayout(viewport());
-    column->setContentsMargins(60, 20, 60, 20);
-    column->addStretch(2);
-    column->addWidget(empty_);
-    column->addWidget(hint_);
-    column->addStretch(3);
 }
 
 void MovementTable::standOn(int row) {
@@ -82,15 +61,15 @@ void MovementTable::standOn(int row) {
 }
 
 void MovementTable::setEmptyText(const QString& text, const QString& hint) {
-    empty_->setText(text);
-    hint_->setText(hint);
+    empty_->text->setText(text);
+    empty_->hint->setText(hint);
     showEmptyText();
 }
 
 void MovementTable::showEmptyText() {
     const bool isEmpty = model()->rowCount() == 0;
-    empty_->setVisible(isEmpty);
-    hint_->setVisible(isEmpty);
+    empty_->text->setVisible(isEmpty);
+    empty_->hint->setVisible(isEmpty);
 }
 
 QByteArray MovementTable::columns() const {
@@ -100,7 +79,7 @@ QByteArray MovementTable::columns() const {
 void MovementTable::setColumns(const QByteArray& columns) {
     QHeaderView* header = horizontalHeader();
     header->restoreState(columns);
-    // Widths alone are kept: the newest are at the top when the window opens.
+    // Only the widths come back, not the order: the newest are at the top when the window opens.
     header->setSectionResizeMode(QHeaderView::Interactive);
     header->setSortIndicatorClearable(true);
     header->setSortIndicatorShown(true);

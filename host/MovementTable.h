@@ -3,11 +3,10 @@
 
 #include <QTableView>
 
-class QLabel;
-
 namespace host {
 
 class MovementList;
+class Notice;
 
 /// The table of movements: columns as wide as the person made them, what is left of the window to
 /// the names; Ctrl+C copies whole rows; a text in the middle while there are none.
@@ -34,14 +33,12 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
-    void addEmptyText();
     void showEmptyText();
     void copyRows();
     void giveFreeSpace(int kept, int mostTaken);
 
     MovementList* movements_;
-    QLabel* empty_;
-    QLabel* hint_;
+    Notice* empty_;
     bool isFitting_ = false;
 };
 

@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementsView.h"
 
-#include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
 #include <QStackedWidget>
 
 #include "host/LeftForLater.h"
 #include "host/MovementTable.h"
+#include "host/Notice.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
 #include "platform/forms/Form.h"
@@ -26,16 +26,6 @@ QString reasonNotToOpen(const QString& tipo) {
     if (tipo == "COR"_L1) return u"é a correção de um movimento anulado."_s;
     if (tipo == "SA"_L1) return u"é o saldo que passou do ano anterior."_s;
     return {};
-}
-
-QLabel* centredLabel(const QString& name) {
-    auto* label = new QLabel;
-    label->setObjectName(name);
-    label->setTextFormat(Qt::PlainText);
-    label->setTextInteractionFlags(Qt::TextSelectableByMouse);
-    label->setAlignment(Qt::AlignHCenter);
-    label->setWordWrap(true);
-    return label;
 }
 
 }  // namespace
@@ -61,16 +51,10 @@ void MovementsView::layOut() {
     filterRow->addWidget(filter_);
 
     list_ = new MovementTable(movements_);
-    notice_ = centredLabel(u"Aviso"_s);
-    hint_ = centredLabel(u"Sugestao"_s);
-    hint_->setForegroundRole(QPalette::PlaceholderText);
     auto* noticePage = new QWidget;
-    auto* noticeColumn = new QVBoxLayout(noticePage);
-    noticeColumn->setContentsMargins(60, 20, 60, 20);
-    noticeColumn->addStretch(2);
-    noticeColumn->addWidget(notice_);
-    noticeColumn->addWidget(hint_);
-    noticeColumn->addStretch(3);
+    notice_ = new Notice(noticePage, u"Aviso"_s, u"Sugestao"_s);
+    for (QLabel* label : {notice_->text, notice_->hint})
+        label->setTextInteractionFlags(Qt::TextSelectableByMouse);
     stack_ = new QStackedWidget;
     stack_->addWidget(list_);
     stack_->addWidget(noticePage);
@@ -279,8 +263,8 @@ void MovementsView::showUnreadable(const QString& text) {
 }
 
 void MovementsView::showNotice(const QString& text, const QString& hint) {
-    notice_->setText(text);
-    hint_->setText(hint);
+    notice_->text->setText(text);
+    notice_->hint->setText(hint);
     stack_->setCurrentIndex(1);
     emit countChanged({});
 }

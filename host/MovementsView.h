@@ -7,13 +7,13 @@
 #include "host/MovementLoader.h"
 #include "host/MovementSorter.h"
 
-class QLabel;
 class QLineEdit;
 class QStackedWidget;
 
 namespace host {
 
 class MovementTable;
+class Notice;
 
 /// The list of movements in force with its filter; in place of the list a text when the book cannot
 /// be read.
@@ -76,13 +76,13 @@ private:
     MovementList* movements_;
     MovementLoader* loader_;
     MovementSorter* sorter_;
-    int sortColumn_ = -1;  // none: the newest first
+    int sortColumn_ = -1;  // -1 for none, with the newest first
     Qt::SortOrder sortOrder_ = Qt::AscendingOrder;
-    bool isNewerWanted_ = false;  // put off until what is sorted may be changed
+    bool isNewerWanted_ =
+        false;  // takeNewer() waits until the sorter no longer reads the movements
     QLineEdit* filter_;
     MovementTable* list_;
-    QLabel* notice_;
-    QLabel* hint_;
+    Notice* notice_;
     QStackedWidget* stack_;
 };
 

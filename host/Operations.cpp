@@ -83,7 +83,7 @@ OperationCall Operations::rubrics() {
 }
 
 OperationCall Operations::hospitals() {
-    // The list shows the postal code under a name of its own.
+    // The screen shows the postal code under another name than the table has for it.
     return {
         u"CallHospitais"_s,
         {u"MSAccess"_s,

@@ -15,7 +15,7 @@ struct OperationCall {
     QVariantList arguments;
 };
 
-/// The component as this program uses it: by name, and never before it is needed.
+/// Calls the component by name; it is made when the first operation is called.
 class Operations {
 public:
     /// Names of the component's operations, as the command line knows them.

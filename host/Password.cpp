@@ -11,7 +11,7 @@ namespace host {
 
 namespace {
 
-termios before{};  ///< the terminal as it was, also for who gives up with Ctrl+C
+termios before{};  ///< the terminal as it was, put back also when Ctrl+C ends the program
 
 void showAgain() {
     tcsetattr(STDIN_FILENO, TCSAFLUSH, &before);

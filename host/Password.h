@@ -5,8 +5,7 @@
 
 namespace host {
 
-/// The passwords that a command needs never stand on its line, where every user of the machine
-/// could read them.
+/// Passwords are never given on the command line, where every user of the machine could read them.
 inline constexpr auto AdminPasswordVariable = "ZELMARS_ADMIN_PASSWORD";
 inline constexpr auto UserPasswordVariable = "ZELMARS_USER_PASSWORD";
 

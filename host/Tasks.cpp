@@ -2,9 +2,9 @@
 #include "host/Tasks.h"
 
 #include <QLibrary>
-#include <QTextStream>
 
 #include "host/BookTasks.h"
+#include "host/Console.h"
 #include "host/frmPrincipal.h"
 #include "platform/com/Place.h"
 #include "platform/core/Failure.h"
@@ -17,21 +17,13 @@ namespace host {
 
 namespace {
 
-void say(const QString& text) {
-    QTextStream(stdout) << text << Qt::endl;
-}
-
-void complain(const QString& text) {
-    QTextStream(stderr) << text << Qt::endl;
-}
-
 bool hasWindow() {
     const QWidgetList windows = QApplication::topLevelWidgets();
     return std::any_of(windows.begin(), windows.end(),
                        [](const QWidget* window) { return window->isVisible(); });
 }
 
-/// Ends the program when the last window went, also one that was only hidden.
+/// Ends the program when its last window has closed or was hidden.
 class LastWindow : public QObject {
 protected:
     bool eventFilter(QObject*, QEvent* event) override {

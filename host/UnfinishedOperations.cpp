@@ -17,8 +17,8 @@ namespace {
 
 constexpr qsizetype LinesShown = 12;  ///< a box with more would not fit the screen
 
-/// The program's own connection for the rules, which the component does not share. Open as long as
-/// it lives.
+/// Opens a connection for the rules of this program, whose data environment is not that of the
+/// component, and closes it at its end.
 class RulesConnection {
 public:
     explicit RulesConnection(const BookSettings& settings)

@@ -38,8 +38,8 @@ QWidget* entryUnderWay(const QStringList& screens) {
     return nullptr;
 }
 
-/// The screens that an operation would take away from what is typed into them. Which one shows a
-/// movement hangs on its type: the component sees to that.
+/// The screens that an operation opens anew, losing what is typed into them. Viewing a movement is
+/// not among them: its screen depends on the movement's type, and the component refuses by itself.
 QStringList screensTakenBy(const QString& operation) {
     if (operation == "Recebimento"_L1) return {u"frmRecebimento"_s};
     if (operation == "Correcao"_L1) return {u"frmReposicao"_s};
@@ -155,7 +155,7 @@ void frmPrincipal::addStatusLine() {
     bold.setBold(true);
     sample_->setFont(bold);
     sample_->hide();
-    // The one whose name goes into what is posted.
+    // The name that goes into what is posted.
     user_ = new QLabel(u"Utilizador: "_s + data::ObterUtilizador());
     user_->setObjectName(u"Utilizador"_s);
     for (QLabel* label : {count_, sample_, book_, user_}) label->setContentsMargins(8, 0, 8, 0);
@@ -198,7 +198,7 @@ void frmPrincipal::runUnguarded(const OperationCall& call) {
     if (QWidget* entry = entryUnderWay(screensTakenBy(call.operation))) {
         core::MsgBox(u"Já há um lançamento aberto.\nTermine-o ou cancele-o antes de abrir outro."_s,
                      core::Icon::Information);
-        // After the box, which gives the focus back to this window.
+        // Only after the box has closed, because that gives the focus back to this window.
         return bringForward(entry);
     }
     forms::handle([&] { operations_.call(call); });
@@ -226,7 +226,7 @@ void frmPrincipal::reload() {
     sample_->setVisible(movements_->isSample());
 }
 
-/// After the book was read afresh, at the start as well as after a lost connection.
+/// Asked whenever the book was read afresh: at the start, and after a lost connection.
 void frmPrincipal::offerToFinish() {
     if (isOffering_) return;
     const QScopedValueRollback offering(isOffering_, true);

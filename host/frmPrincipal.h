@@ -21,7 +21,8 @@ public:
     frmPrincipal();
     ~frmPrincipal() override;
 
-    /// Called by the component after a movement was annulled: its correcting row tells which.
+    /// Called by the component after a movement was annulled: the list finds out which by the
+    /// correcting row.
     Q_INVOKABLE void RemoteKey(const QVariant& movimento_id);
 
     /// Reads the settings and the book afresh.
@@ -56,7 +57,7 @@ private:
     void restoreLook();
     void saveLook() const;
 
-    bool isOffering_ = false;  ///< the question about unfinished operations is open
+    bool isOffering_ = false;  ///< the question about unfinished operations is being asked
     Operations operations_;
     bool isRunning_ = false;
     MovementsView* movements_;

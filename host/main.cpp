@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include <QApplication>
-#include <QTextStream>
 
 #include "host/CommandLine.h"
+#include "host/Console.h"
 #include "host/Tasks.h"
 
 using namespace Qt::StringLiterals;
@@ -30,7 +30,7 @@ int main(int argc, char** argv) {
     if (!line.needsScreen())
         return performWith(std::make_unique<QCoreApplication>(argc, argv), line);
     if (!hasScreen()) {
-        QTextStream(stderr) << u"Não há ecrã onde abrir a janela."_s << Qt::endl;
+        host::complain(u"Não há ecrã onde abrir a janela."_s);
         return host::Failed;
     }
     return performWith(std::make_unique<QApplication>(argc, argv), line);

@@ -38,7 +38,7 @@ const Source& active() {
     return source;
 }
 
-const Source& closed() {
+const Source& inactive() {
     static const Source source{
         .detailedByDate =
             u"SELECT tbZelmar_movimentos_Inactivos.*, "
@@ -88,14 +88,14 @@ QString where(const Source& source, const Selection& selection) {
     return u"WHERE "_s + (selection.detailed ? documents : QString()) + period + member;
 }
 
-QString statementOver(const Source& source, const Selection& selection) {
+QString queryOver(const Source& source, const Selection& selection) {
     return select(source, selection) + source.from + where(source, selection);
 }
 
 }  // namespace
 
 QString extractQuery(const Selection& selection) {
-    return statementOver(active(), selection) + u"UNION "_s + statementOver(closed(), selection) +
+    return queryOver(active(), selection) + u"UNION "_s + queryOver(inactive(), selection) +
            u"ORDER BY movimento_id "_s;
 }
 

@@ -4,8 +4,8 @@
 #include <QDate>
 #include <QString>
 
-/// The statements behind a member's printed statement of movements. Active and closed tables are
-/// read together; a row is one movement, in order of movimento_id.
+/// The queries behind a member's printed extract. The tables of the year and of the closed years
+/// are read together; a row is one movement, in order of movimento_id.
 namespace reports {
 
 /// Which movements of a member.
@@ -14,7 +14,8 @@ struct Selection {
     bool detailed = true;  ///< medical documents with their amounts; otherwise the account's lines
     bool byDocument = false;  ///< by `doc_no`; otherwise by `first` and `last`
     QDate first;
-    QDate last;      ///< at midnight: what carries a later time of that day is left out
+    /// Intentional: as a midnight, so that rows with a later time of that day are left out.
+    QDate last;
     QString doc_no;  ///< joined in as it stands
 };
 

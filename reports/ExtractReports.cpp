@@ -29,7 +29,7 @@ Field whole(Field text) {
     return text;
 }
 
-/// Letterhead and member, the same on both statements.
+/// Letterhead and member, the same on both extracts.
 Section memberHeader() {
     constexpr double Value = 22;
     Section section{.name = u"Section4"_s};
@@ -51,13 +51,13 @@ Section memberHeader() {
     return section;
 }
 
-/// Rule above what follows.
+/// Adds a line across the page above what follows.
 Section totals() {
     return {
         .name = u"Section5"_s, .height = 2, .items = {Rule{QLineF(0, 0.5, page::InnerWidth, 0.5)}}};
 }
 
-Report statement(const QString& name) {
+Report extract(const QString& name) {
     return {.name = name,
             .caption = u"Extracto de Lançamentos"_s,
             .dataMember = u"Print_Extrato1"_s,
@@ -76,7 +76,8 @@ Report prtExtrato1() {
     const Style boldRight{.bold = true, .align = Align::Right};
     const std::vector<Column> amounts{
         {u"Documento"_s, u"doc_valor"_s, 20, Align::Right, Money},
-        // The percentage itself is not kept: under its title stands what it came to.
+        // Intentional: a movement does not keep its percentage, so under that title stands the
+        // amount that it came to.
         {u"%%"_s, u"comparticipacao"_s, 20, Align::Right, Money},
         {u"Comparticipação"_s, u"comparticipacao"_s, 25, Align::Right, Money},
         {u"Recebido"_s, u"recebido"_s, 19.5, Align::Right, Money},
@@ -86,7 +87,7 @@ Report prtExtrato1() {
         {u"Saldo C/C"_s, u"saldo_acumulado"_s, 20, Align::Right, Money},
         {u"A Receber"_s, u"debito"_s, 19.5, Align::Right, Money},
     };
-    Report report = statement(u"prtExtrato1"_s);
+    Report report = extract(u"prtExtrato1"_s);
     Section& block = report.detail;
     const double first = 1;
     const double second = first + LineHeight;
@@ -134,7 +135,7 @@ Report rptExtrato2() {
         {u"Crédito"_s, u"credito"_s, 19, Align::Right, Money},
         {u"Recebido"_s, u"debito"_s, 19, Align::Right, Money},
     };
-    Report report = statement(u"rptExtrato2"_s);
+    Report report = extract(u"rptExtrato2"_s);
     addTitles(report.reportHeader, columns);
     report.reportHeader.height += 1;
     addValues(report.detail, columns);

@@ -3,7 +3,7 @@
 
 #include "platform/printing/Report.h"
 
-/// The two printed statements of a member's movements. Both are bound to `Print_Extrato1`; the
+/// The two printed extracts of a member's movements. Both are bound to `Print_Extrato1`; the
 /// captions `nib`, `no_kor`, `nome`, `morada`, `localidade` of their section `Section4` are the
 /// member's and set before printing.
 ///

@@ -9,7 +9,7 @@ using namespace printing;
 
 namespace {
 
-/// Between a text and the edge of its column.
+/// The gap between a text and the edge of its column.
 constexpr double Padding = 1.1;
 
 template <class MakeItem>

@@ -11,13 +11,14 @@ namespace reports {
 
 /// The organisation, as it stands at the head of what it sends out.
 inline constexpr QStringView OrganisationName = u"Tesmar Nacional";
-/// Its postal address, on one line. To be replaced by the one that it wants printed.
+/// Its postal address, on one line; a placeholder until the organisation gives its own.
 inline constexpr QStringView OrganisationAddress = u"Lisboa";
 
 /// Height of a line of text at the usual size.
 inline constexpr double LineHeight = 4.8;
 
-/// A text that stays, and the value of a column, each on one line from `x`, `y` of the section on.
+/// A fixed text, and the value of a column, each on one line that begins at `x`, `y` of the
+/// section.
 printing::Label label(double x, double y, double width, const QString& caption,
                       const printing::Style& style = {});
 printing::Field field(double x, double y, double width, const QString& column,

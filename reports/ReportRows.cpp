@@ -12,7 +12,7 @@ ado::RecordsetPtr openReportRows(const QString& name) {
 ado::RecordsetPtr openReportRows(const QString& name, const QString& text) {
     environment::dtZelmars& environment = environment::dtZelmars::instance();
     ado::RecordsetPtr rows = environment.Recordsets(name);
-    // A preview that nobody waited for leaves it open.
+    // A modeless preview of the same report may have left it open.
     if (rows->State() != ado::adStateClosed) rows->Close();
     environment.Commands(name).CommandText = text;
     rows->Open(text, environment.SqlServer());

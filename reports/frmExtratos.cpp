@@ -82,7 +82,7 @@ QWidget* frmExtratos::kindFrame() {
     grid->addWidget(Option2, 1, 0);
     grid->addWidget(Text1, 1, 1, 1, 3);
     grid->setColumnStretch(4, 1);
-    // The fields that come and go move nothing.
+    // Fields that are hidden keep their room, so that nothing moves.
     for (int line : {0, 1}) grid->setRowMinimumHeight(line, Text1->sizeHint().height());
     for (forms::DatePicker* date : {Text3, Text4})
         date->setFixedWidth(date->fontMetrics().horizontalAdvance(u"00-00-0000000000"_s));
@@ -165,7 +165,7 @@ void frmExtratos::No_Kor_Validate(bool& cancel) {
     member->Close();
 }
 
-/// A search that fails says nothing. Also members outside the plan may be chosen.
+/// Intentional: a search that fails says nothing, and members outside the plan may be chosen too.
 void frmExtratos::Command1_Click() {
     core::passingOver([this] {
         const qint32 id = data::chooseMember(data::openSearch());
@@ -221,7 +221,8 @@ void frmExtratos::Imprimir_Click() {
         Imprimir->setEnabled(true);
         Imprimir->setFocus();
     });
-    // Who has left the file of active members gets no statement, and nobody is told.
+    // Intentional: a member who has left the table of active members gets no extract, and no box
+    // says so.
     const ado::RecordsetPtr member = data::openMemberById(socio_id_);
     if (!member->atEnd()) print(*member);
     member->Close();

@@ -12,7 +12,7 @@ namespace reports {
 
 struct Selection;
 
-/// Prints a member's statement of movements, or shows it.
+/// Prints the extract of a member's movements, or shows it.
 class frmExtratos : public forms::Form {
     Q_OBJECT
 public:
@@ -20,7 +20,7 @@ public:
 
     /// True when the screen that was left for this one comes back on "&Fechar".
     bool Show_Options = false;
-    /// What brings it back.
+    /// Brings that screen back.
     std::function<void()> onClosed;
 
     /// A member already known; 0 and empty texts for none.

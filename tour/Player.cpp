@@ -6,7 +6,8 @@
 #include <QEventLoop>
 #include <QMessageBox>
 #include <QTest>
-#include <QTextStream>
+
+#include "host/Console.h"
 
 using namespace Qt::StringLiterals;
 
@@ -14,12 +15,10 @@ namespace tour {
 
 namespace {
 
+using host::say;
+
 constexpr int TickMilliseconds = 25;
 constexpr int TicksOfPatience = 400;  // ten seconds for one step
-
-void say(const QString& text) {
-    QTextStream(stdout) << text << Qt::endl;
-}
 
 /// The screen that a person would be typing into.
 QWidget* frontScreen(const QString& wanted) {
@@ -35,13 +34,14 @@ QString described(QWidget* screen) {
     return screen->objectName();
 }
 
-/// The modal screens in front when the keys were pressed that have not come back yet, the last one
-/// behind; null for none.
+/// For each key whose handler has not returned yet, the last one at the end: the modal screen that
+/// was in front when it was pressed, null for none.
 std::vector<QPointer<QWidget>> keysAtWork;
 
-/// A key that opens a modal screen comes back when that is closed, and the next steps are played
-/// meanwhile. One that closes its screen has to come back first: until then what opened the screen
-/// is still at work.
+/// True while the next step has to wait. The handler of a key that opens a modal screen returns
+/// when that screen is closed, and the next steps are played meanwhile. But the handler of a key
+/// that closes its screen has to return first, because until then what opened the screen is still
+/// at work.
 bool keyIsAtWork() {
     const QWidget* modal = QApplication::activeModalWidget();
     return !keysAtWork.empty() && (!modal || modal == keysAtWork.back());
@@ -109,7 +109,7 @@ void Player::tick() {
     if (step.act) step.act(front);
 }
 
-/// Closes what is modal, one after the other, so that their callers come back.
+/// Closes one modal screen at each tick, so that what opened it returns; then ends.
 void Player::giveUp() {
     if (QWidget* modal = QApplication::activeModalWidget())
         modal->close();
@@ -128,7 +128,7 @@ void Player::take(const QString& picture, QWidget* screen) {
 }
 
 void Player::type(QWidget* screen, const QStringList& keys) {
-    // A key may close the window that it is typed into, and is released nowhere then.
+    // A key may close the window that it is typed into; it is not released there then.
     const QPointer<QWindow> window = screen->windowHandle();
     for (const QString& key : keys) {
         if (key.startsWith(u'<')) {

@@ -28,7 +28,8 @@ public:
               const std::function<void(QWidget*)>& act,
               const std::function<bool(QWidget*)>& ready = {});
 
-    /// Plays all steps. False when a screen did not come; what was in front instead is said.
+    /// Plays all steps. False when a screen did not come or a picture could not be saved; the
+    /// reason goes to the standard output.
     bool play();
 
     /// Types words and keys into a screen: a text, or a name of a key in angle brackets, such as

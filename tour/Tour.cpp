@@ -7,9 +7,9 @@
 #include <QLineEdit>
 #include <QTableView>
 #include <QTemporaryDir>
-#include <QTextStream>
 
 #include "database/Book.h"
+#include "host/Console.h"
 #include "host/Operations.h"
 #include "host/Tasks.h"
 #include "host/frmPrincipal.h"
@@ -25,6 +25,7 @@ namespace tour {
 namespace {
 
 using host::Operations;
+using host::say;
 using Keys = QStringList;
 
 // Members of the sample book: one with everything in order, one without a bank number.
@@ -35,7 +36,7 @@ std::function<void(QWidget*)> typing(const Keys& keys) {
     return [keys](QWidget* screen) { Player::type(screen, keys); };
 }
 
-/// A field of the screen shows something.
+/// A condition: a field of the screen shows something.
 std::function<bool(QWidget*)> shows(const QString& field) {
     return [field](QWidget* screen) {
         const auto* box = screen->findChild<QLineEdit*>(field);
@@ -43,7 +44,7 @@ std::function<bool(QWidget*)> shows(const QString& field) {
     };
 }
 
-/// A label of the screen begins with that text.
+/// A condition: a label of the screen begins with that text.
 std::function<bool(QWidget*)> says(const QString& label, const QString& text) {
     return [label, text](QWidget* screen) {
         const auto* found = screen->findChild<QLabel*>(label);
@@ -65,7 +66,7 @@ std::function<bool(QWidget*)> unticked(const QString& check) {
     };
 }
 
-/// The first row of the screen's list has such a text in one of its columns.
+/// A condition: the first row of the screen's list has that text in one of its columns.
 std::function<bool(QWidget*)> listBeginsWith(const QString& text) {
     return [text](QWidget* screen) {
         const auto* list = screen->findChild<QTableView*>();
@@ -147,7 +148,7 @@ public:
     }
 
     /// The member's documents of the year, looked at and kept as PDF.
-    void statement(const QString& file) {
+    void extract(const QString& file) {
         open({}, {u"Extratos"_s, {}});
         const QString newYear = core::today().toString(u"01-01-yyyy"_s);
         player_.step(u"frmExtratos"_s, {},
@@ -169,7 +170,7 @@ private:
                      [this, call](QWidget*) { operations_.call(call); });
     }
 
-    /// Types the member's number, with the question about his premium that always comes.
+    /// Types the member's number and answers the question about his premiums, which always comes.
     void chooseMember(const QString& picture) {
         player_.step(u"frmMovimentos"_s, {}, typing({GoodMember, u"<Tab>"_s}), shows(u"Text8"_s));
         player_.step(u"box:Quer ver o extrato"_s, picture, typing({u"<Alt+N>"_s}));
@@ -180,7 +181,8 @@ private:
         player_.step(u"frmEscolherFamiliar"_s, picture, typing(way));
     }
 
-    /// Today and then one field after the other; tries the document out.
+    /// Types today and then one field after the other (an empty text leaves one as it is), and
+    /// tries the document out.
     void fillIn(const Keys& texts) {
         Keys keys{core::today().toString(u"dd-MM-yyyy"_s)};
         for (const QString& text : texts) {
@@ -196,10 +198,6 @@ private:
     Player& player_;
     Operations operations_;
 };
-
-void say(const QString& text) {
-    QTextStream(stdout) << text << Qt::endl;
-}
 
 }  // namespace
 
@@ -223,9 +221,9 @@ bool play(const QString& folder) {
     script.hospitalBill();
     script.view();
     script.otherWindows();
-    const QString statement = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);
-    QFile::remove(statement);
-    script.statement(statement);
+    const QString extract = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);
+    QFile::remove(extract);
+    script.extract(extract);
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
     return played;

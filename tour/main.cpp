@@ -2,8 +2,8 @@
 // Plays the road of a document through the real screens: zelmars-tour FOLDER
 #include <QApplication>
 #include <QTemporaryFile>
-#include <QTextStream>
 
+#include "host/Console.h"
 #include "host/Tasks.h"
 #include "platform/core/Failure.h"
 #include "tour/Tour.h"
@@ -12,8 +12,8 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// The toolkit's display without a screen is smaller than any office's, so the tour describes one.
-/// It is read while the application is made.
+/// Without a screen the toolkit pretends a display that is smaller than any office's: here is one
+/// of an office's size. The file is read while the application object is made.
 void describeDisplay(QTemporaryFile& description) {
     if (!description.open()) return;
     description.write(
@@ -23,15 +23,11 @@ void describeDisplay(QTemporaryFile& description) {
     qputenv("QT_QPA_PLATFORM", "offscreen:configfile=" + QFile::encodeName(description.fileName()));
 }
 
-void complain(const QString& text) {
-    QTextStream(stderr) << text << Qt::endl;
-}
-
 }  // namespace
 
 int main(int argc, char** argv) {
     if (argc != 2 || argv[1][0] == '\0' || argv[1][0] == '-') {
-        complain(
+        host::complain(
             u"zelmars-tour PASTA: percorre o lançamento de um documento num livro de exemplo e "
             "deixa as imagens na pasta."_s);
         return host::WrongUse;
@@ -44,7 +40,7 @@ int main(int argc, char** argv) {
     try {
         return tour::play(QString::fromLocal8Bit(argv[1])) ? host::Done : host::Failed;
     } catch (const core::Failure& failure) {
-        complain(failure.text());
+        host::complain(failure.text());
         return host::Failed;
     }
 }

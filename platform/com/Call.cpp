@@ -97,7 +97,7 @@ public:
     }
 
     /// What the method's table of arguments holds for it. The argument must not move afterwards.
-    void* entry() {
+    void* place() {
         void* data = holdsVariant_ ? &value_ : value_.data();
         if (!byReference_) return data;
         pointer_ = leftOut_ && !holdsVariant_ ? nullptr : data;
@@ -144,14 +144,14 @@ QVariant invoke(QObject* target, const QMetaMethod& method, QVariantList& given)
     QVariant result;
     if (!variantResult && resultType.id() != QMetaType::Void) result = QVariant(resultType);
     std::vector<void*> table{variantResult ? &result : result.data()};
-    for (Argument& argument : arguments) table.push_back(argument.entry());
-    // Straight into the class's own table, past the checks of QMetaMethod::invoke: a failure raised
-    // in the member then crosses no frame of the library.
-    // What the member has changed comes back also when it fails then.
+    for (Argument& argument : arguments) table.push_back(argument.place());
+    // What the member has changed comes back also when it fails.
     const auto writtenBack = qScopeGuard([&] {
         for (std::size_t at = 0; at < arguments.size(); ++at)
             arguments[at].writeBack(given[static_cast<qsizetype>(at)]);
     });
+    // Straight into the class's own table, past the checks of QMetaMethod::invoke: a failure raised
+    // in the member then crosses no frame of the toolkit, which is not made for exceptions.
     target->qt_metacall(QMetaObject::InvokeMetaMethod, method.methodIndex(), table.data());
     return result;
 }

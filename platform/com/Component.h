@@ -21,6 +21,7 @@ namespace com {
 /// that does not convert (its position is in the text), InvalidCall for a null target. A failure
 /// raised inside the member passes through as it is.
 QVariant call(QObject* target, const QString& member, QVariantList& arguments);
+/// The same for a caller that wants no argument back.
 QVariant call(QObject* target, const QString& member, QVariantList&& arguments = {});
 
 /// One reference to a component; the component goes when the last reference does.
@@ -37,8 +38,8 @@ public:
     explicit operator bool() const { return component_ != nullptr; }
     /// The component itself; null for an empty reference.
     QObject* object() const;
-    Dispatch* dispatch() const { return component_; }
 
+    /// As the functions above do on object().
     QVariant call(const QString& member, QVariantList& arguments) const;
     QVariant call(const QString& member, QVariantList&& arguments = {}) const;
 

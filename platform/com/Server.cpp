@@ -64,7 +64,8 @@ void write(const QString& path, const QString& value) {
     registry::writeValue(registry::Hive::ClassesRoot, path, {}, value);
 }
 
-/// Runs a step of the registration. An entry point has no other way to tell a person why.
+/// Runs a step of the registration. A failure is also written out: an entry point can only answer
+/// with a number, and a person has to learn why.
 template <class Step>
 Status registering(Step step) {
     try {

@@ -35,11 +35,16 @@ std::atomic<quint32>& serverUse();
 // The bodies of the four entry points. A server exports DllGetClassObject, DllCanUnloadNow,
 // DllRegisterServer and DllUnregisterServer with C linkage (the macro below) and answers with
 // these.
+
+/// Gives the factory of the served class, ClassNotAvailable for any other class.
 Status getClassObject(const ServedClass& served, const Guid& clsid, const Guid& iid, void** object);
+/// Ok when nothing keeps the server loaded, else False.
 Status canUnloadNow(const ServedClass& served);
 /// Writes the class into HKEY_CLASSES_ROOT: programmatic name, class id, the path of the shared
-/// object that holds `anyFunctionOfTheServer`, interface and version.
+/// object that holds `anyFunctionOfTheServer`, interface and version. What fails is written to the
+/// standard error stream and answered with SelfRegistrationFailed.
 Status registerServer(const ServedClass& served, const void* anyFunctionOfTheServer);
+/// Removes what registerServer wrote; what is not there does no harm.
 Status unregisterServer(const ServedClass& served);
 
 /// Text of a class id: "{xxxxxxxx-xxxx-xxxx-xxxx-xxxxxxxxxxxx}".
@@ -47,6 +52,7 @@ QString guidText(const Guid& guid);
 
 }  // namespace com
 
+/// Exports the four entry points of a server; `served` is a function that gives its ServedClass.
 #define ZELMARS_SERVER(served)                                                                    \
     extern "C" {                                                                                  \
     Q_DECL_EXPORT com::Status DllGetClassObject(const com::Guid* clsid, const com::Guid* iid,     \

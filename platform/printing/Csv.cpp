@@ -34,7 +34,7 @@ QString harmless(const QString& text) {
     return risky.match(text).hasMatch() && !sameNumber.match(text).hasMatch() ? u'\'' + text : text;
 }
 
-/// Of a text, whatever it holds, so that no reader takes a sign in it for the end of the cell.
+/// A text as a cell: always in quotes, so that no reader takes a sign in it for the cell's end.
 QString quoted(const QString& text) {
     return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
 }
@@ -46,7 +46,8 @@ QStringList heading(const QStringList& names) {
     return cells;
 }
 
-/// A computed column comes as a double, with what it lies beside the amount meant.
+/// An engine gives a computed column as a double, which lies a little beside the amount that is
+/// meant.
 QVariant asAmount(const QVariant& value) {
     if (value.typeId() != QMetaType::Double) return value;
     return QVariant::fromValue(core::Money::fromDouble(value.toDouble()));

@@ -31,7 +31,7 @@ Label& labelOf(Report& report, const QString& section, const QString& label) {
 DataReport::DataReport(const Report& design) : report_(design) {}
 
 void DataReport::setCaption(const QString& section, const QString& label, const QString& caption) {
-    // Nobody's name is taken for a page number.
+    // A "%p" in somebody's name must not turn into the page's number.
     labelOf(report_, section, label).caption = QString(caption).replace(u'%', u"%%"_s);
 }
 

@@ -14,6 +14,7 @@ class DataReport {
 public:
     explicit DataReport(const Report& design);
 
+    /// The declaration with the captions set so far.
     const Report& design() const { return report_; }
 
     /// Sets the text of a label of a section, both found by name; it is printed letter for letter.

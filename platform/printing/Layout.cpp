@@ -178,11 +178,12 @@ void Layout::Implementation::endPage() {
 }
 
 void Layout::Implementation::print(const PreparedSection& section, double more) {
-    if (section.height() <= 0) return;  // opens no page either
+    if (section.height() <= 0) return;  // a section that is not there opens no page either
     const double top = page::Margin + pageHeader.height() +
                        (inGroup && repeatsGroupHeader ? groupHeader.height() : 0);
     const double room = bodyBottom - top;
-    // What no page can hold together is parted; what no page can hold at all runs over the footer.
+    // Sections that no page can hold together are parted; one that no page can hold runs over the
+    // footer.
     const double need = section.height() + (section.height() + more <= room + Grace ? more : 0);
     const bool asEmptyAsItGets = y <= bodyTop + Grace && bodyTop <= top + Grace;
     if (y + need > bodyBottom + Grace && !asEmptyAsItGets) {

@@ -21,7 +21,9 @@ public:
     /// Goes on for about so many milliseconds (or to the end when negative). True when complete.
     /// Fails as reading a row does.
     bool go(int milliseconds);
+    /// True when all pages are laid out.
     bool isComplete() const { return pages_->isComplete(); }
+    /// The pages laid out so far; those who hold them see the following ones come.
     const std::shared_ptr<Pages>& pages() const { return pages_; }
 
 private:

@@ -21,7 +21,7 @@ QPen penOf(double millimetres) {
     return {Qt::black, millimetres * UnitsPerMillimetre, Qt::SolidLine, Qt::FlatCap, Qt::MiterJoin};
 }
 
-/// Whole units: no office printer has finer dots, and a PDF is smaller.
+/// Rounded to whole units: no office printer has finer dots, and a PDF becomes smaller.
 QPointF inUnits(const QPointF& point) {
     return (point * UnitsPerMillimetre).toPoint();
 }
@@ -58,7 +58,7 @@ void paint(QPainter& painter, const Pages& pages, const Page& page, Faces& faces
     }
 }
 
-/// Smaller paper takes the page smaller.
+/// How large the page becomes on that paper; 1 where it fits.
 double sizeOn(const QPageSize& paper) {
     const QSizeF size = paper.size(QPageSize::Millimeter);
     const double fit = std::min(size.width() / page::Width, size.height() / page::Height);

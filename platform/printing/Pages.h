@@ -21,11 +21,13 @@ struct TextRun {
     bool open = false;  ///< the number of pages is still missing: see Pages::resolved
 };
 
+/// A straight line, in millimetres as above.
 struct Line {
     QLineF line;
     double width = 0;
 };
 
+/// A rectangle behind texts, in millimetres as above.
 struct Box {
     QRectF rect;
     bool shaded = false;
@@ -54,7 +56,9 @@ public:
     /// wants. Other runs as they are.
     TextRun resolved(const TextRun& run) const;
 
+    /// Adds the next page.
     void add(const Page& page);
+    /// Tells that no page is to come.
     void complete() { complete_ = true; }
 
 private:

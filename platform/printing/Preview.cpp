@@ -122,7 +122,7 @@ void Preview::Implementation::stop() {
     view->setPages(nullptr);
 }
 
-// The work between keys and mouse.
+// What is worked at between keys and mouse.
 
 void Preview::Implementation::work() {
     addPages();
@@ -156,7 +156,7 @@ void Preview::Implementation::act(PreviewCommand command) {
     message->clear();
     run(command);
     if (form->isUnloaded()) return;
-    // Behind a dialog, without a window manager, nobody else gives the focus back.
+    // Where no window manager runs, nobody else gives the focus back after a dialog.
     if (!form->isActiveWindow()) form->activateWindow();
     const QWidget* focus = form->ActiveControl();
     const bool finding = findBar->isVisible() && focus && findBar->isAncestorOf(focus);

@@ -19,6 +19,7 @@ class CheckBox;
 
 namespace printing {
 
+/// Does what a person asks of the preview.
 using PreviewHandler = std::function<void(PreviewCommand)>;
 
 /// A button for a command, one that clicking does not give the focus: it stays on the pages.
@@ -32,19 +33,24 @@ public:
     /// @param page   from 0; -1 for none yet
     /// @param count  of the pages laid out so far
     void showPage(int page, int count);
+    /// @param percent  of the size on paper
     void showZoom(double percent);
+    /// Whether the pages stand one below the other.
     void showContinuous(bool continuous);
-    /// Whether the pages can go out of here.
+    /// Whether the buttons for printing, PDF and CSV can be pressed.
     void setOutputEnabled(bool enabled);
+    /// For the window, which Esc closes by this button.
     forms::Button* closeButton() const { return close_; }
 
     /// The page that a person wants, from 0; it may be one that is not there.
     std::function<void(int page)> onPage;
+    /// The size that a person wants, and whether it is to follow the window.
     std::function<void(double percent)> onPercent;
     std::function<void(PreviewView::Fit fit)> onFit;
 
-    // Put the cursor into the field of the page's number, of the size.
+    /// Puts the cursor into the field of the page's number.
     void askPage();
+    /// Puts the cursor into the field of the size.
     void askZoom();
 
 private:

@@ -39,7 +39,9 @@ struct PreviewAction {
     QStringView keys;  ///< none where it is empty
 };
 
+/// The actions of all commands, in the order of the commands.
 std::span<const PreviewAction> previewActions();
+/// The action of one command.
 const PreviewAction& previewAction(PreviewCommand command);
 
 }  // namespace printing

@@ -17,7 +17,9 @@ public:
     void open();
     /// On to the next place, or back to the one before; comes up if it is hidden.
     void findNext(bool forward);
+    /// Ends the search, with its highlights, and hides.
     void end();
+    /// True while pages are still to be searched.
 
     bool isLooking() const { return search_.state() == PreviewSearch::State::Looking; }
     /// Goes on for about so many milliseconds, see PreviewSearch, and shows the place found.

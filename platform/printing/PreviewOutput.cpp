@@ -57,14 +57,14 @@ bool mayWriteOver(const QString& file) {
 
 /// The file that the person wants; empty for none.
 QString askFile(QWidget* parent, const Kind& kind, const QString& caption) {
-    static QString folder;  // of the file saved last
+    static QString folder;  // where the last file was saved
     if (folder.isEmpty() || !QDir(folder).exists())
         folder = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
     QFileDialog dialog(parent, kind.title, folder);
     dialog.setObjectName(kind.name);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.setFileMode(QFileDialog::AnyFile);
-    // Asked here, in the words of the other boxes.
+    // The question is asked below, in the words of the other boxes.
     dialog.setOption(QFileDialog::DontConfirmOverwrite);
     dialog.setNameFilter(kind.filter);
     dialog.setDefaultSuffix(kind.suffix);

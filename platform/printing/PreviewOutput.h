@@ -25,6 +25,7 @@ QString printAsking(QWidget* parent, const Pages& pages, int current);
 /// Asks for the file, by default named for the report in the documents folder or where the last
 /// one was put, and before an older one is written over.
 QString savePdfAsking(QWidget* parent, const Pages& pages);
+/// The same for the rows as a text for spreadsheets; what they hold is told in Output.h.
 QString exportCsvAsking(QWidget* parent, const Report& report, const ado::RecordsetPtr& rows);
 
 }  // namespace printing

@@ -33,7 +33,9 @@ public:
     /// end of those that are there.
     State go(int milliseconds, bool moreToCome);
 
+    /// How far the search has come.
     State state() const { return state_; }
+    // The place found, while the state says so.
     int hitPage() const { return page_; }
     QRectF hitBox() const { return box_; }  ///< millimetres on the page
     /// True when the end, or looking back the beginning, was passed on the way.

@@ -22,30 +22,35 @@ struct Highlight {
 class PreviewView : public QAbstractScrollArea {
     Q_OBJECT
 public:
+    /// What the size follows when the window changes: its width, the whole page in it, nothing.
     enum class Fit { Width, Page, None };
+    // The smallest and the largest size, in percent of the size on paper.
     static constexpr double LeastPercent = 10;
     static constexpr double MostPercent = 400;
 
     PreviewView(const QString& name, QWidget* parent);
 
+    /// Shows other pages; null for none.
     void setPages(std::shared_ptr<const Pages> pages);
     /// To be called when pages were added or the last one is known.
     void pagesAdded();
     /// Gives the found texts of a page; asked for the pages in sight at each painting.
     void setHighlights(std::function<std::vector<Highlight>(int page)> highlights);
 
-    /// -1 while there is none.
+    /// The page that the person is at; -1 while there is none.
     int currentPage() const { return current_; }
     /// Shows a page from its top; a page that is not there is replaced by the nearest one.
     void goToPage(int page);
     /// Shows a page so that the box (millimetres) is in sight, moving no more than needed.
     void reveal(int page, const QRectF& box);
 
+    /// Whether pages stand one below the other, or one is shown at a time.
     bool isContinuous() const { return continuous_; }
     void setContinuous(bool continuous);
 
     /// As shown; 100 is the size on paper.
     double percent() const { return percent_; }
+    /// What the size follows from now on.
     Fit fit() const { return fit_; }
     void setFit(Fit fit);
     /// Held between LeastPercent and MostPercent.

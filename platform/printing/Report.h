@@ -57,6 +57,7 @@ struct Total {
     Style style;
 };
 
+/// A straight line; its width in millimetres.
 struct Rule {
     QLineF line;
     double width = 0.2;
@@ -69,6 +70,7 @@ struct Band {
     bool framed = false;
 };
 
+/// Anything that a section can hold.
 using Item = std::variant<Label, Field, Total, Rule, Band>;
 
 /// Items in the order in which they are painted. A section is never split over two pages.
@@ -96,12 +98,12 @@ struct Report {
     Section reportFooter = {};
 };
 
-/// What reports share.
+/// The paper of all reports, A4 upright, in millimetres.
 namespace page {
 inline constexpr double Width = 210;
 inline constexpr double Height = 297;
 inline constexpr double Margin = 12;
-/// Between the margins.
+// What lies between the margins.
 inline constexpr double InnerWidth = Width - 2 * Margin;
 inline constexpr double InnerHeight = Height - 2 * Margin;
 }  // namespace page

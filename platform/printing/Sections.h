@@ -20,8 +20,10 @@ public:
     size_t place(const QString& column);
     /// Fails with NoSuchItem and the name of a column that the rows do not have.
     void lookUp(ado::Recordset& rows);
+    /// Takes in the values of the current row, the `row`th of its set.
     void read(const ado::Recordset& rows, qint64 row);
 
+    /// The values taken in last, each at its place.
     const std::vector<QVariant>& values() const { return values_; }
 
 private:
@@ -33,6 +35,7 @@ private:
 /// Which figures a section shows.
 enum class Over { Report, Group };
 
+/// One section, ready to be printed on page after page.
 class PreparedSection {
 public:
     /// @param row      what the fields are read from
@@ -40,6 +43,7 @@ public:
     PreparedSection(const Section& section, Over over, Faces& faces, RowValues& row,
                     RowValues& details, Tallies& tallies);
 
+    /// In millimetres; 0 for a section that is not there.
     double height() const { return height_; }
     /// Prints the section at that height of the page, which is the `number`th, counted from 1.
     void print(Page& page, double top, int number) const;

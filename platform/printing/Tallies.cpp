@@ -14,7 +14,7 @@ namespace printing {
 namespace {
 
 constexpr long double UnitsOfOne = 1e7L;
-constexpr int UnitsOfMoney = 1000;  // in its least unit
+constexpr int UnitsOfMoney = 1000;  // ten-millionths in its least unit
 
 void requireRange(bool holds) {
     if (!holds) throw core::Failure(core::Overflow, u"O total não cabe num montante."_s);
@@ -26,7 +26,7 @@ void Sum::add(const QVariant& value) {
     if (value.typeId() == qMetaTypeId<core::Money>()) {
         units_ += Wide(value.value<core::Money>().units()) * UnitsOfMoney;
     } else if (value.typeId() == QMetaType::Float) {
-        // Single precision does not reach the seventh decimal.
+        // A 32-bit float knows nothing of the seventh decimal: its shortest decimal is meant.
         units_ += Wide(core::Money::fromDouble(core::toDouble(value)).units()) * UnitsOfMoney;
     } else {
         // Engines give a computed column as a double.

@@ -25,6 +25,7 @@ private:
 /// Figures over the rows of a report and of the group being printed.
 class Tallies {
 public:
+    /// What a total of either kind shows.
     struct Tally {
         Sum sum;  ///< nulls are passed over
         qint64 count = 0;
@@ -33,10 +34,12 @@ public:
     /// A tally of a column of the detail rows; its place among the tallies. Only what is to be
     /// summed is read as a number.
     size_t add(size_t column, bool summed);
+    /// Sets the figures of the group to nothing.
     void startGroup();
     /// Takes a row in. Fails as adding to a sum does.
     void take(const std::vector<QVariant>& row);
 
+    // The figures so far of the tally at that place.
     const Tally& ofReport(size_t place) const { return tallies_[place].report; }
     const Tally& ofGroup(size_t place) const { return tallies_[place].group; }
 

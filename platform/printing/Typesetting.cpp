@@ -67,7 +67,7 @@ void setLine(std::vector<TextRun>& into, Faces& faces, QString text, const QRect
     double width = face->width(text);
     if (width > box.width() && overlong == Overlong::Shrink) {
         Style smaller = style;
-        // In half points, and never too small to read.
+        // Sizes go by half points, and never below what can be read.
         smaller.points = std::max(5.0, std::floor(2 * style.points * box.width() / width) / 2);
         face = &faces.of(smaller);
         width = face->width(text);
@@ -87,7 +87,7 @@ Face::Face(const Style& of)
     : style(of), font(fontOf(of)), metrics_(font), raw_(QRawFont::fromFont(font)) {}
 
 const Face::Letter* Face::letter(QChar c) const {
-    // The currency sign stands in nearly every row.
+    // The currency sign, which stands in nearly every row, takes the place of the letter 0.
     const size_t at = c == u'€' ? 0 : c.unicode();
     if (at >= letters_.size() || c == QChar::SoftHyphen) return nullptr;
     Letter& known = letters_[at];

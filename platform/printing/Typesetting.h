@@ -16,6 +16,7 @@ class QPainter;
 /// whatever the screen is, so that a page is the same wherever it is laid out and painted.
 namespace printing {
 
+/// In which everything is measured.
 inline constexpr int UnitsPerInch = 600;
 inline constexpr double UnitsPerMillimetre = UnitsPerInch / 25.4;
 
@@ -25,10 +26,14 @@ class Face {
 public:
     explicit Face(const Style& of);
 
-    /// In millimetres.
+    // All lengths in millimetres.
+
     double width(const QString& text) const;
+    /// The text cut so that it is no wider, with an ellipsis where something was cut.
     QString elided(const QString& text, double width) const;
+    /// Of a line, from its upper edge down to where the letters stand.
     double ascent() const { return metrics_.ascent() / UnitsPerMillimetre; }
+    /// Of a line.
     double height() const { return metrics_.height() / UnitsPerMillimetre; }
 
     /// Paints a text, `at` being the painter's units, with the painter's font set to this one.
@@ -54,6 +59,7 @@ private:
 /// Faces made so far: a font is costly to make, and a report uses few.
 class Faces {
 public:
+    /// The face of a style; it stays where it is.
     const Face& of(const Style& style);
 
 private:

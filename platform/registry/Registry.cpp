@@ -37,6 +37,12 @@ QStringList readFolders() {
     return {own, MachineFolder};
 }
 
+QString hiveName(Hive hive) {
+    for (const auto& [known, name] : HiveNames)
+        if (known == hive) return name.toString();
+    return {};
+}
+
 QString fileOf(const QString& folder, Hive hive) {
     return folder + u'/' + hiveName(hive) + u".ini"_s;
 }
@@ -77,7 +83,8 @@ public:
     std::optional<SettingsFile> file;
 
 private:
-    /// In a folder that is there, and before a password could land in a file that others read.
+    /// Makes the folder where it is missing, and refuses a file that others can read before a
+    /// password lands in it.
     static const QString& prepared(const QString& name) {
         if (!core::makePrivateFolder(QFileInfo(name).path()))
             refuseToWrite(name, u"a pasta não pôde ser criada."_s);
@@ -99,12 +106,6 @@ Hive hiveNamed(QStringView name) {
     return Hive::None;
 }
 
-QString hiveName(Hive hive) {
-    for (const auto& [known, name] : HiveNames)
-        if (known == hive) return name.toString();
-    return {};
-}
-
 QString writableFolder() {
     const QString chosen = qEnvironmentVariable("ZELMARS_REGISTRY");
     if (!chosen.isEmpty()) return chosen;
@@ -116,9 +117,9 @@ std::optional<Key> Key::open(Hive hive, const QString& path) {
     const QString name = entryName(path, {});
     if (name.isEmpty()) return Key(hive, path);
     for (const QString& folder : readFolders()) {
-        const QStringList entries = fileIn(folder, hive).entries();
-        if (std::any_of(entries.begin(), entries.end(),
-                        [&](const QString& entry) { return liesUnder(entry, name); }))
+        const QStringList settings = fileIn(folder, hive).settings();
+        if (std::any_of(settings.begin(), settings.end(),
+                        [&](const QString& setting) { return liesUnder(setting, name); }))
             return Key(hive, path);
     }
     return std::nullopt;

@@ -31,8 +31,6 @@ enum class Hive : quint32 {
 
 /// The hive of a name, exact with case; None for any other text.
 Hive hiveNamed(QStringView name);
-/// The name of a hive, empty for None.
-QString hiveName(Hive hive);
 
 /// An open key. Closing it twice, or never, does no harm.
 class Key {
@@ -61,9 +59,10 @@ using Values = QList<std::pair<QString, QString>>;
 /// file that others can read is refused with a Failure whose text names it and the command that
 /// mends it, so that a password never lands in an open file.
 void writeValues(Hive hive, const QString& path, const Values& values);
+/// The same for one value; an empty name is the key's own value.
 void writeValue(Hive hive, const QString& path, const QString& name, const QString& value);
 
-/// Removes a key with all that lies under it. Missing is fine.
+/// Removes a key, or a value, with all that lies under it. One that is not there does no harm.
 void removeKey(Hive hive, const QString& path);
 
 /// The folder that writeValue writes to.

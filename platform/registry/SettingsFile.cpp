@@ -15,7 +15,7 @@ namespace registry {
 
 namespace {
 
-/// The group of entries that have none.
+/// The heading under which settings without a group stand.
 const QString NoGroup = u"General"_s;
 /// The heading of a group that has that name.
 const QString NamedGeneral = u"%General"_s;
@@ -145,9 +145,9 @@ core::Failure refusal(const QString& text) {
 
 }  // namespace
 
-bool liesUnder(const QString& entry, const QString& name) {
-    return name.isEmpty() || entry.compare(name, Qt::CaseInsensitive) == 0 ||
-           entry.startsWith(name + u'/', Qt::CaseInsensitive);
+bool liesUnder(const QString& setting, const QString& name) {
+    return name.isEmpty() || setting.compare(name, Qt::CaseInsensitive) == 0 ||
+           setting.startsWith(name + u'/', Qt::CaseInsensitive);
 }
 
 SettingsFile::SettingsFile(const QString& file, Readers readers) : file_(file) {
@@ -185,7 +185,7 @@ SettingsFile::Line SettingsFile::understood(const QString& text, qsizetype numbe
     const qsizetype sign = bare.indexOf(u'=');
     const QString name = decodedName(trimmed(bare.left(qMax(sign, qsizetype{0}))));
     if (name.isEmpty()) throw refuse(u"falta o nome ou o «=»; a forma é nome=valor."_s);
-    const QString entry = group.isEmpty() ? name : group + u'/' + name;
+    const QString setting = group.isEmpty() ? name : group + u'/' + name;
     const QString written = trimmed(bare.mid(sign + 1));
     if (written.startsWith(u'"')) {
         const auto value = unquoted(written);
@@ -193,17 +193,17 @@ SettingsFile::Line SettingsFile::understood(const QString& text, qsizetype numbe
             throw refuse(
                 u"as aspas não fecham no fim, ou uma «\\» está antes de um sinal sem "
                 "significado (escreva «\\\\» por «\\» e «\\\"» por aspas)."_s);
-        return {text, group, entry, *value};
+        return {text, group, setting, *value};
     }
-    // Read in two ways by different programs, so that neither is taken for what was meant.
+    // Programs read such a value in two ways, so that neither can be taken for what was meant.
     if (written.contains(u'\\'))
         throw refuse(u"um valor com «\\» tem de estar entre aspas, com «\\\\» por cada «\\»."_s);
-    return {text, group, entry, written.isNull() ? u""_s : written};
+    return {text, group, setting, written.isNull() ? u""_s : written};
 }
 
 void SettingsFile::refusePassword(Readers readers) const {
     const bool holdsPassword = std::any_of(lines_.begin(), lines_.end(), [](const Line& line) {
-        return line.entry.endsWith("password"_L1, Qt::CaseInsensitive) && !line.value.isEmpty();
+        return line.setting.endsWith("password"_L1, Qt::CaseInsensitive) && !line.value.isEmpty();
     });
     const bool isShared = readers == Readers::Group;
     const QFile::Permissions theirs = isShared ? QFile::ReadGroup : QFile::Permissions();
@@ -213,35 +213,35 @@ void SettingsFile::refusePassword(Readers readers) const {
             "Corrija-o com o comando: chmod %2 '%1'"_s.arg(file_, isShared ? u"640"_s : u"600"_s));
 }
 
-const SettingsFile::Line* SettingsFile::find(const QString& entry) const {
+const SettingsFile::Line* SettingsFile::find(const QString& setting) const {
     const auto found = std::find_if(lines_.rbegin(), lines_.rend(), [&](const Line& line) {
-        return !line.entry.isEmpty() && line.entry.compare(entry, Qt::CaseInsensitive) == 0;
+        return !line.setting.isEmpty() && line.setting.compare(setting, Qt::CaseInsensitive) == 0;
     });
     return found == lines_.rend() ? nullptr : &*found;
 }
 
-QStringList SettingsFile::entries() const {
-    QStringList entries;
+QStringList SettingsFile::settings() const {
+    QStringList settings;
     for (const Line& line : lines_)
-        if (!line.entry.isEmpty()) entries << line.entry;
-    return entries;
+        if (!line.setting.isEmpty()) settings << line.setting;
+    return settings;
 }
 
-std::optional<QString> SettingsFile::value(const QString& entry) const {
-    const Line* const line = find(entry);
+std::optional<QString> SettingsFile::value(const QString& setting) const {
+    const Line* const line = find(setting);
     return line ? std::optional(line->value) : std::nullopt;
 }
 
-void SettingsFile::set(const QString& entry, const QString& value) {
-    if (const Line* const known = find(entry)) {
+void SettingsFile::set(const QString& setting, const QString& value) {
+    if (const Line* const known = find(setting)) {
         Line& line = lines_[static_cast<std::size_t>(known - lines_.data())];
         line.text = line.text.left(line.text.indexOf(u'=') + 1) + quotedWhereNeeded(value);
         line.value = value;
         return;
     }
-    const qsizetype slash = entry.indexOf(u'/');
-    const QString group = slash < 0 ? QString() : entry.left(slash);
-    const QString text = encodedName(entry.mid(slash + 1)) + u'=' + quotedWhereNeeded(value);
+    const qsizetype slash = setting.indexOf(u'/');
+    const QString group = slash < 0 ? QString() : setting.left(slash);
+    const QString text = encodedName(setting.mid(slash + 1)) + u'=' + quotedWhereNeeded(value);
     // Behind the last line of its group, before the blank lines that part it from the next one.
     auto last = std::find_if(lines_.rbegin(), lines_.rend(), [&](const Line& line) {
         return line.group.compare(group, Qt::CaseInsensitive) == 0 && !trimmed(line.text).isEmpty();
@@ -250,12 +250,12 @@ void SettingsFile::set(const QString& entry, const QString& value) {
         lines_.push_back({headingOf(group), group, {}, {}});
         last = lines_.rbegin();
     }
-    lines_.insert(last.base(), {text, group, entry, value});
+    lines_.insert(last.base(), {text, group, setting, value});
 }
 
-void SettingsFile::remove(const QString& entry) {
+void SettingsFile::remove(const QString& setting) {
     std::erase_if(lines_, [&](const Line& line) {
-        return !line.entry.isEmpty() && liesUnder(line.entry, entry);
+        return !line.setting.isEmpty() && liesUnder(line.setting, setting);
     });
 }
 

@@ -11,7 +11,7 @@ namespace registry {
 /// A settings file: lines `name=value` under headings `[group]`, comments behind ";" or "#" at the
 /// beginning of a line, UTF-8. A value means what stands there, whatever signs it holds; blanks
 /// around it do not count. Between quotes they do, and `\"`, `\\`, `\n`, `\r`, `\t` and `\xHHHH`
-/// stand for signs. An entry is named by its group and its name, parted by "/", without regard to
+/// stand for signs. A setting is named by its group and its name, parted by "/", without regard to
 /// case; the group "General" is no part of it. Comments and the order of the lines are kept.
 class SettingsFile {
 public:
@@ -26,32 +26,34 @@ public:
     /// and somebody else has access to it.
     explicit SettingsFile(const QString& file, Readers readers = Readers::Owner);
 
-    QStringList entries() const;
-    /// Nothing for a missing entry. Of several with the same name the last one counts.
-    std::optional<QString> value(const QString& entry) const;
+    /// The names of all settings, in the order of the lines.
+    QStringList settings() const;
+    /// Nothing for a missing setting. Of several with the same name the last one counts.
+    std::optional<QString> value(const QString& setting) const;
 
-    void set(const QString& entry, const QString& value);
-    /// Removes the entry and all that lies under it; with an empty name everything.
-    void remove(const QString& entry);
+    /// Changes the setting's line; a new one goes behind the last line of its group.
+    void set(const QString& setting, const QString& value);
+    /// Removes the setting and all that lies under it; with an empty name everything.
+    void remove(const QString& setting);
     /// Replaces the file in one go; only its owner can read it. Fails with a core::Failure.
     void write() const;
 
 private:
     struct Line {
-        QString text;   ///< as it stands in the file
-        QString group;  ///< that it belongs to
-        QString entry;  ///< empty for comments and headings
+        QString text;     ///< as it stands in the file
+        QString group;    ///< that it belongs to
+        QString setting;  ///< empty for comments and headings
         QString value;
     };
     Line understood(const QString& text, qsizetype number, QString& group) const;
-    const Line* find(const QString& entry) const;
+    const Line* find(const QString& setting) const;
     void refusePassword(Readers readers) const;
 
     QString file_;
     std::vector<Line> lines_;
 };
 
-/// True for the entry itself and for all that lies under it; for an empty name for everything.
-bool liesUnder(const QString& entry, const QString& name);
+/// True for the setting itself and for all that lies under it; for an empty name for everything.
+bool liesUnder(const QString& setting, const QString& name);
 
 }  // namespace registry

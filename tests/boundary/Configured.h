@@ -9,7 +9,8 @@
 #include "tests/support/Book.h"
 #include "tests/support/Failure.h"
 
-/// A book with the five values that name it. Afterwards the component is as it was when loaded.
+/// A book with the five values that name it. After each case the component's state is that of a
+/// fresh one.
 class Configured : public testing::Test {
 protected:
     void TearDown() override {

@@ -30,7 +30,7 @@ protected:
         EXPECT_LE(window.frameGeometry().width(), display.width());
         EXPECT_LE(window.frameGeometry().height(), display.height());
         for (const auto* button : window.findChildren<QPushButton*>()) {
-            // Those beside the fields scroll with them.
+            // Buttons beside the fields scroll with them.
             if (!button->isVisible() || qobject_cast<QGroupBox*>(button->parentWidget())) continue;
             EXPECT_EQ(button->visibleRegion().boundingRect(), button->rect())
                 << button->objectName().toStdString();
@@ -73,7 +73,7 @@ TEST_F(Screens, DISABLED_FitThisDisplay) {
 TEST(Displays, OfOfficesShowEveryScreenWithItsButtons) {
     const struct {
         int width;
-        int height;  // less what a panel takes
+        int height;  // of the display, less the panel of the desktop
         int dotsPerInch;
     } displays[] = {{1366, 728, 96}, {1366, 728, 120}, {1920, 1040, 144}};
     const QTemporaryDir folder;

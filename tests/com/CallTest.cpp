@@ -54,7 +54,7 @@ TEST_F(CallByName, GivesBackArgumentsByReference) {
 }
 
 TEST_F(CallByName, NamesWhatIsNoMember) {
-    // Signals, private slots and what every object has are no members.
+    // Signals, private slots and the methods that every QObject has cannot be called.
     for (const QString& name : {u"nada"_s, u"changed"_s, u"hidden"_s, u"deleteLater"_s}) {
         const core::Failure failure = failureOf(&sample, name);
         EXPECT_EQ(failure.number(), core::NoSuchMember);

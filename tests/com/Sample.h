@@ -18,7 +18,7 @@ public:
     Q_INVOKABLE QString nameOf(QObject* object) {
         return object ? object->objectName() : QStringLiteral("nenhum");
     }
-    /// As a search window is called: an argument in the middle may be left out.
+    /// Takes arguments as a search window does: one in the middle may be left out.
     Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& a = {},
                                  const QVariant& b = {}) {
         return QStringList{code, a.toString(), b.toString()}.join(u':');

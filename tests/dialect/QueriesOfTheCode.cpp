@@ -40,7 +40,7 @@ QList<Listed> commands() {
 QList<Listed> ofMovementsAndMembers() {
     return {
         {u"new movement"_s, data::NoMovementQuery.toString(), false},
-        {u"movement in force"_s, boundary::movementInForceStatement(Movement)},
+        {u"movement in force"_s, boundary::movementInForceQuery(Movement)},
         {u"counter"_s, data::CounterQuery.toString()},
         {u"cheque number"_s, payments::ChequesStatement.toString()},
         {u"member by number"_s, data::memberQuery(u"100015"_s)},

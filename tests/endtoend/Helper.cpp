@@ -3,8 +3,8 @@
 //
 //   endtoend_helper server   a private PostgreSQL server; says its folder
 //   endtoend_helper hold     holds rows as editing screens do. A line of its input is a number of
-//                            seconds and a statement: it lets go of the row that it held, goes
-//                            through those of the statement, holding each, keeps the last one and
+//                            seconds and a query: it lets go of the row that it held, goes
+//                            through those of the query, holding each, keeps the last one and
 //                            says "held", or why not after so many seconds
 #include <QCoreApplication>
 #include <QTextStream>

@@ -1,6 +1,6 @@
 # SPDX-License-Identifier: MIT
 """A member's account by key presses alone: a receipt posted and annulled, documents of a member and
-of one who has left annulled, corrections with and without a rubric; the rows in the book.
+of one who has left annulled, repositions with and without a rubric; the rows in the book.
 
 Usage: account.py FOLDER_OF_THE_PROGRAMS [sqlite|postgresql [FOLDER_FOR_PICTURES]]
 """
@@ -72,16 +72,16 @@ def receipt(desktop, book, counter):
                "AND rubrica_id_main = 0")
     expect("account", book.rows(account, row["socio_id"]), [{"credito_ac": single(150.25)}])
 
-    # It stands on top of the list without anybody asking.
+    # It stands on top of the list without a refresh.
     desktop.keys("Escape", "Return")
     desktop.at(ACCOUNT)
     desktop.show("recebimento-registado")
     confirm(desktop, "alt+a", "Anular Recebimento")
     desktop.at(MAIN)
-    correction = newest(book)
-    print(" ", correction)
-    expect("correction", (correction["movimento_no"], correction["tipo"], correction["credito"],
-                          correction["debito"]), (counter + 1, "COR", -150.25, 0))
+    correcting = newest(book)
+    print(" ", correcting)
+    expect("correcting row", (correcting["movimento_no"], correcting["tipo"], correcting["credito"],
+                              correcting["debito"]), (counter + 1, "COR", -150.25, 0))
     expect("annulled", book.rows("SELECT tipo, modo_pagamento FROM tbZelmar_Movimentos "
                                  "WHERE movimento_no = ?", counter),
            [{"tipo": "ANL", "modo_pagamento": "ANL"}])
@@ -107,10 +107,10 @@ def document(desktop, book, counter, suffix):
     desktop.at(MAIN)
     desktop.keys("ctrl+f", "Escape")
     desktop.show("lista" + suffix)
-    correction = newest(book, bool(suffix))
-    print(" ", correction)
-    expect("correction", (correction["movimento_no"], correction["tipo"], correction["credito"],
-                          correction["debito"], correction["liquido"]),
+    correcting = newest(book, bool(suffix))
+    print(" ", correcting)
+    expect("correcting row", (correcting["movimento_no"], correcting["tipo"], correcting["credito"],
+                              correcting["debito"], correcting["liquido"]),
            (counter, "COR", -row["credito"], -row["debito"], None))
     expect("annulled", book.rows(f"SELECT tipo, modo_pagamento FROM tbZelmar_Movimentos{suffix} "
                                  "WHERE movimento_id = ?", row["movimento_id"]),
@@ -121,7 +121,7 @@ def document(desktop, book, counter, suffix):
             "no_docs": before["no_docs"] - 1})
 
 
-def corrections(desktop, book, counter):
+def repositions(desktop, book, counter):
     rubric = book.row("SELECT rubrica_id FROM tbZelmar_Plafonds WHERE code = '5.02'")["rubrica_id"]
     open_account(desktop, "ctrl+k")
     desktop.keys("alt+i")
@@ -139,8 +139,8 @@ def corrections(desktop, book, counter):
     open_account(desktop, "ctrl+k")
     typed(desktop, "", "", "", "", "", "0", "7,75")
     without = posted(desktop, book, counter + 1)
-    expect("corrections", [(row["tipo"], row["codabc"], row["rubrica_id"], row["debito"],
-                            row["credito"]) for row in (with_rubric, without)],
+    expect("repositions", [(row["tipo"], row["codabc"], row["rubrica_id"], row["debito"],
+                             row["credito"]) for row in (with_rubric, without)],
            [("REP", "A", rubric, 12.5, 0), ("REP", None, 0, 0, 7.75)])
     expect("totals", book.rows(
         "SELECT codABC, rubrica_id, debito_ac, credito_ac FROM tbSocios_Acumulados "
@@ -155,7 +155,7 @@ def account(desktop, programs, book):
     desktop.start([os.path.join(programs, "zelmars")])
     receipt(desktop, book, counter)
     document(desktop, book, counter + 2, "")
-    corrections(desktop, book, counter + 3)
+    repositions(desktop, book, counter + 3)
     document(desktop, book, counter + 5, "_Inactivos")
     expect("next number", book.row("SELECT zelmars FROM tbContadores")["zelmars"], counter + 6)
     expect("days of the rows", {str(row["data"])[:10] for row in book.rows(

@@ -32,10 +32,10 @@ class Helper:
     def answer(self):
         return self.process.stdout.readline().strip()
 
-    def hold(self, seconds, statement):
-        """Holds the rows of a statement one after the other and keeps the last; "held", or why
+    def hold(self, seconds, query):
+        """Holds the rows of a query one after the other and keeps the last; "held", or why
         not after so many seconds."""
-        self.process.stdin.write(f"{seconds} {statement}\n")
+        self.process.stdin.write(f"{seconds} {query}\n")
         self.process.stdin.flush()
         return self.answer()
 
@@ -44,39 +44,39 @@ class SqliteBook:
     def __init__(self, folder):
         self.file = folder + "/zelmars.db"
 
-    def rows(self, statement, *values):
+    def rows(self, query, *values):
         with sqlite3.connect(f"file:{self.file}?mode=ro", uri=True) as book:
             book.row_factory = sqlite3.Row
             return [{name.lower(): row[name] for name in row.keys()}
-                    for row in book.execute(statement, values)]
+                    for row in book.execute(query, values)]
 
-    def write(self, statements):
+    def write(self, queries):
         with sqlite3.connect(self.file) as book:
-            book.executescript(statements)
+            book.executescript(queries)
 
-    def row(self, statement, *values):
-        return next(iter(self.rows(statement, *values)), None)
+    def row(self, query, *values):
+        return next(iter(self.rows(query, *values)), None)
 
 
 class ServerBook(SqliteBook):
     def __init__(self, host):
         self.host = host
 
-    def rows(self, statement, *values):
+    def rows(self, query, *values):
         for value in values:
-            statement = statement.replace("?", f"'{value}'", 1)
-        lines = self._psql(f"SELECT row_to_json(t) FROM ({statement}) t").splitlines()
+            query = query.replace("?", f"'{value}'", 1)
+        lines = self._psql(f"SELECT row_to_json(t) FROM ({query}) t").splitlines()
         # The server shows a 32-bit float by its shortest decimal.
         return [{name: single(value) if name.endswith("_ac") and value is not None else value
                  for name, value in json.loads(line).items()} for line in lines]
 
 
-    def write(self, statements):
-        self._psql(statements)
+    def write(self, queries):
+        self._psql(queries)
 
-    def _psql(self, statements):
+    def _psql(self, queries):
         return subprocess.run(["psql", "-XAtq", "-h", self.host, "-U", "dono", "zelmars"],
-                              input=statements, check=True, text=True,
+                              input=queries, check=True, text=True,
                               stdout=subprocess.PIPE).stdout
 
 

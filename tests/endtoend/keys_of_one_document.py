@@ -39,7 +39,7 @@ def document(desktop, programs, book):
         beyond += 1
         desktop.at(window)
 
-    # Choosing the person leaves the number, so that it is looked up on the way.
+    # Choosing the person takes the focus off the number, so that the member is looked up on the way.
     hand_over(MEMBER, "alt+i")
     desktop.at("Quotizações")
     beside("Return", "Escolher Familiar")

@@ -42,7 +42,7 @@ def post_both(desktop, programs, book):
     questions = [up_to_the_question(desktop, programs, document, amount)
                  for document, amount in AMOUNTS.items()]
     desktop.show("perguntas")
-    # Held up at the counter, both are let go at one moment.
+    # Both wait at the counter, and are let go at the same moment.
     with Helper(programs, desktop.environment, "hold") as gate:
         require(gate.hold(5, "select * from tbContadores") == "held", "the counter is not held")
         for _, question in questions:

@@ -11,12 +11,12 @@ from desktop import Failed
 from entry import ENTRY, MAIN, choose_member_and_person, fill_in_fields, leave
 from play import play
 
-STATEMENT = "Extrato de Quotizações"
+EXTRACT = "Extrato de Quotizações"
 WITHOUT_BANK_NUMBER = "100023"
 
 
-def premium_statement(desktop):
-    """It stays in front of the entry when the questions about the bank number have followed it."""
+def premium_extract(desktop):
+    """The premium account stays in front of the entry when the questions about the bank number have followed it."""
     desktop.type(WITHOUT_BANK_NUMBER)
     desktop.keys("Tab")
     desktop.at("Quotizações")
@@ -25,14 +25,14 @@ def premium_statement(desktop):
     desktop.keys("Return")
     desktop.at("Associados")
     desktop.keys("alt+n")
-    desktop.at(STATEMENT)
-    desktop.settled(STATEMENT)
+    desktop.at(EXTRACT)
+    desktop.settled(EXTRACT)
     desktop.keys("alt+s")
     desktop.at(ENTRY)
 
 
 def entry_under_way(desktop, main):
-    """It comes to the front when another one was asked for."""
+    """An entry under way comes to the front when another one is asked for."""
     desktop.turn_to(main)
     desktop.ask("ctrl+n")
     desktop.keys("Return")
@@ -41,7 +41,7 @@ def entry_under_way(desktop, main):
 
 
 def confirmation(desktop, program):
-    """It leaves the results of the try-out in sight, and so does its frame."""
+    """The box leaves the results of the try-out in sight, and so does its frame."""
     desktop.keys("alt+k")
     desktop.keys("ctrl+a")
     choose_member_and_person(desktop)
@@ -62,7 +62,7 @@ def windows(desktop, programs, _book):
     main = desktop.window_of(program, MAIN)
     desktop.keys("ctrl+n")
     desktop.at(ENTRY)
-    premium_statement(desktop)
+    premium_extract(desktop)
     entry_under_way(desktop, main)
     confirmation(desktop, program)
     desktop.ask("Escape")

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The statements' texts, letter by letter.
+// The queries' texts, letter by letter.
 #include "reports/ExtractQuery.h"
 
 #include <gtest/gtest.h>
@@ -12,7 +12,7 @@ namespace reports {
 
 namespace {
 
-TEST(Statements, AreJoinedToTheLetter) {
+TEST(ExtractQueries, AreJoinedToTheLetter) {
     QFile file(QStringLiteral(QUERIES_FILE));
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));
     for (const bool detailed : {true, false})

@@ -59,10 +59,10 @@ protected:
     }
 };
 
-TEST_F(Extratos, BothStatementsInBothSelectionsAddUpWhatTheyList) {
+TEST_F(Extratos, BothExtractsInBothSelectionsAddUpWhatTheyList) {
     struct Case {
         bool detailed;
-        QString last;  // empty for a statement by document
+        QString last;  // empty for an extract by document
         QStringList expected;
     };
     const Case cases[] = {
@@ -130,7 +130,7 @@ TEST_F(Extratos, MemberIsFoundByNumberOrBySearch) {
         person.fill(u"No_Kor"_s, u"999999"_s);
         EXPECT_TRUE(person.find(u"No_Kor"_s)->hasFocus());
         person.fill(u"No_Kor"_s, {});
-        // Given up; failed, which says nothing; found, in the plan or not.
+        // The search is given up; fails, which says nothing; finds a member, in the plan or not.
         book.exec(u"update tbSocios set zelmar = 0"_s);
         const std::pair<QVariant, QString> answers[] = {
             {0, {}}, {u"nenhum número"_s, {}}, {socio, u"António Manuel Silva Matos"_s}};
@@ -188,7 +188,7 @@ TEST_F(Extratos, PreviewIsWaitedForAndItsRowsAreClosed) {
         person.fill(u"No_Kor"_s, u"100015"_s);
         choose(u"Check1"_s, false);
         choose(u"Check2"_s, false);
-        openReportRows(u"Print_Extrato1"_s, u"SELECT 1 AS outra"_s);  // somebody's preview
+        openReportRows(u"Print_Extrato1"_s, u"SELECT 1 AS outra"_s);  // as a modeless preview leaves it
         person.onScreen(u"rptExtrato2"_s, [&] {
             EXPECT_EQ(rows->State(), ado::adStateOpen);
             EXPECT_TRUE(rows->hasColumn(u"saldo"_s));
@@ -212,7 +212,7 @@ TEST_F(Extratos, WayFromAnEntryLeadsBackToAnother) {
             if (end == End::Leave) person.accelerator(u'S');
             person.enter();
         };
-        const auto statements = [&] {
+        const auto extracts = [&] {
             EXPECT_FALSE(forms::DefaultInstance<entry::frmMovimentos>::isLoaded());
             EXPECT_EQ(shown(u"No_Kor"_s), u"100015"_s);
             EXPECT_EQ(shown(u"Text2"_s), u"António Manuel Silva Matos"_s);
@@ -221,7 +221,7 @@ TEST_F(Extratos, WayFromAnEntryLeadsBackToAnother) {
             person.accelerator(u'F');
         };
         person.onScreen(u"frmMovimentosF"_s, [&] {
-            person.onScreen(u"frmExtratos"_s, statements);
+            person.onScreen(u"frmExtratos"_s, extracts);
             person.accelerator(u'E');
             person.enter();
         });

@@ -42,7 +42,8 @@ protected:
         program.waitForFinished();
         EXPECT_EQ(program.exitStatus(), QProcess::CrashExit) << "it ended before";
     }
-    /// Held, nothing can be written to the settings, so that the program stands before that step.
+    /// While it is held, nothing can be written to the settings, so that the program stands before
+    /// that step.
     QString settingsLock() const {
         QDir().mkpath(folder_.filePath(u"registry"_s));
         return folder_.filePath(u"registry/HKEY_LOCAL_MACHINE.ini.lock"_s);

@@ -36,11 +36,11 @@ public:
     static inline QString failure;
     static inline QPointer<QObject> caller;
 
-    Q_INVOKABLE void CallPlafonds(QString* connection, QString* statement) {
-        note(u"CallPlafonds %1 %2"_s.arg(*connection, *statement));
+    Q_INVOKABLE void CallPlafonds(QString* connection, QString* query) {
+        note(u"CallPlafonds %1 %2"_s.arg(*connection, *query));
     }
-    Q_INVOKABLE void CallHospitais(QString* connection, QString* statement) {
-        note(u"CallHospitais %1 %2"_s.arg(*connection, *statement));
+    Q_INVOKABLE void CallHospitais(QString* connection, QString* query) {
+        note(u"CallHospitais %1 %2"_s.arg(*connection, *query));
     }
     Q_INVOKABLE void Registo(const QVariant&, const QVariant& key, QString* = nullptr,
                              QString* = nullptr, QObject* given = nullptr) {
@@ -176,7 +176,7 @@ TEST_F(PrincipalWindow, EveryOperationIsInTheMenuWithItsArguments) {
     for (const auto& [name, call] : calls) {
         auto* action = window_.findChild<QAction*>(name);
         ASSERT_TRUE(action) << name.toStdString();
-        // What is still to come is grey.
+        // An operation whose screen is still to come is grey.
         EXPECT_EQ(action->isEnabled(), host::Operations::isThere(call.section(u' ', 0, 0)));
         action->setEnabled(true);
         action->trigger();
@@ -298,7 +298,7 @@ TEST_F(PrincipalWindow, ColumnsKeepTheirWidthsAndTheNamesTakeTheRest) {
     window_.resize(window_.width() + 100, window_.height());
     EXPECT_TRUE(fills());
     EXPECT_EQ(list->columnWidth(3), 351);
-    // So they stand when the window is opened again.
+    // A window that is opened later has the same widths.
     host::MovementsView next;
     next.resize(list->width(), 400);
     next.setColumns(window_.findChild<host::MovementsView*>()->columns());
@@ -395,7 +395,7 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
     window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
     EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
 
-    // A receipt under way keeps its own screen, and no other.
+    // A receipt under way keeps its own screen; other operations go on.
     entry.setObjectName(u"frmRecebimento"_s);
     button->setText(u"&OK"_s);
     person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});

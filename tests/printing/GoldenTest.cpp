@@ -44,13 +44,13 @@ QString golden(const QString& name, const QString& shown) {
                                           : u"missing: "_s + file.fileName();
 }
 
-TEST_F(Ledger, PrintsStatementsAsTheyWereSeen) {
+TEST_F(Ledger, PrintsExtractsAsTheyWereSeen) {
     const struct {
         printing::Report report;
         const char16_t* name;
         int rows;
         int pages;
-    } statements[] = {
+    } extracts[] = {
         {reports::rptExtrato2(), u"summary-empty", 0, 1},
         {reports::rptExtrato2(), u"summary-one", 1, 1},
         {reports::rptExtrato2(), u"summary-full-page", 39, 1},
@@ -61,13 +61,13 @@ TEST_F(Ledger, PrintsStatementsAsTheyWereSeen) {
         {reports::prtExtrato1(), u"detailed-full-page", 7, 1},
         {reports::prtExtrato1(), u"detailed-many", 20, 3},
     };
-    for (const auto& statement : statements) {
-        const QString name = QString::fromUtf16(statement.name);
+    for (const auto& extract : extracts) {
+        const QString name = QString::fromUtf16(extract.name);
         SCOPED_TRACE(name.toStdString());
         book.exec(u"delete from tbZelmar_Movimentos"_s);
-        fill(statement.rows);
-        const auto pages = laidOut(statement.report, movements());
-        EXPECT_EQ(pages->count(), statement.pages);
+        fill(extract.rows);
+        const auto pages = laidOut(extract.report, movements());
+        EXPECT_EQ(pages->count(), extract.pages);
         const QString shown = describe(*pages);
         EXPECT_EQ(shown, golden(name, shown));
     }
@@ -77,7 +77,7 @@ TEST_F(Ledger, PrintsGroupsOverSeveralPages) {
     for (const QString& name : {u"Hospital A"_s, u"Hospital B"_s, u"Hospital sem contas"_s})
         book.hospital(name.right(1), name);
     fill(130);
-    const auto pages = laidOut(twoLevels(), open(TwoLevelStatement));
+    const auto pages = laidOut(twoLevels(), open(TwoLevelQuery));
     const QString shown = describe(*pages);
     EXPECT_EQ(shown, golden(u"two-levels"_s, shown));
     // 65 movements of each hospital, each one euro more debit than credit.

@@ -71,7 +71,7 @@ TEST_F(Ledger, FillsInDatePageNumbersAndCaptionsLetterForLetter) {
                            .height = 5,
                            .items = {printing::Label{u"nome"_s, QRectF(0, 0, 90, 5), u"?"_s, {}},
                                      reports::label(90, 0, 60, u"%D, 100%% %p/%P %"_s)}};
-    // One document a page, and a little higher than that: what is not there opens no page more.
+    // Exactly one document a page, and one a little higher than that: no empty page follows.
     design.detail = {.height = printing::page::InnerHeight - 9,
                      .items = {reports::field(0, 0, 50, u"doc_no"_s)}};
     design.pageFooter = {.height = 10, .items = {reports::label(0, 0, 186, u"%p de %P"_s, Right)}};
@@ -125,7 +125,7 @@ TEST_F(Ledger, ShowsAComputedAmountAsTheTotalOverItDoes) {
     }
 }
 
-TEST_F(Ledger, CutsNothingOnAStatementThatAMemberMustRead) {
+TEST_F(Ledger, CutsNothingOnAnExtractThatAMemberMustRead) {
     fill(2);
     const QString number = u"FATURA-2026/00012345"_s;
     book.exec(u"update tbZelmar_Movimentos set codABC = 'CWM1', doc_no = '%1'"_s.arg(number));
@@ -167,9 +167,7 @@ TEST_F(Ledger, NamesWhatTheRowsDoNotHave) {
         if (hasGroups) book.hospital();
         printing::Report groups = twoLevels();
         const auto said = [&](const QString& name) {
-            return failureOf([&] { laidOut(groups, open(TwoLevelStatement)); })
-                .text()
-                .contains(name);
+            return failureOf([&] { laidOut(groups, open(TwoLevelQuery)); }).text().contains(name);
         };
         reports::addValues(groups.detail, {{u""_s, u"inventada"_s, 20}});
         EXPECT_TRUE(said(u"«inventada»"_s));
@@ -177,7 +175,7 @@ TEST_F(Ledger, NamesWhatTheRowsDoNotHave) {
         EXPECT_TRUE(said(u"«outro»"_s));
     }
 
-    // Rows that somebody closes under way stop it too.
+    // The layout also ends when somebody closes the rows under way.
     fill(500);
     const ado::RecordsetPtr rows = movements();
     design.detail = {};

@@ -33,10 +33,10 @@ void Ledger::fill(int count) {
             rows.join(u','));
 }
 
-ado::RecordsetPtr Ledger::open(const QString& statement) const {
+ado::RecordsetPtr Ledger::open(const QString& query) const {
     ado::RecordsetPtr rows = ado::Recordset::create();
     rows->setClientSide(true);
-    rows->Open(statement, connection);
+    rows->Open(query, connection);
     return rows;
 }
 
@@ -83,7 +83,7 @@ printing::Report twoLevels() {
     return report;
 }
 
-const QString TwoLevelStatement =
+const QString TwoLevelQuery =
     u"SHAPE {SELECT hospital_id, nome AS hospital FROM tbHospitais ORDER BY nome }  AS lista "
     "APPEND ({SELECT tbZelmar_Movimentos.*, debito - credito AS divida FROM tbZelmar_Movimentos "
     "ORDER BY movimento_no } AS detalhe RELATE 'hospital_id' TO 'hospital_id') AS detalhe"_s;

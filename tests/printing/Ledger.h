@@ -16,8 +16,8 @@ protected:
     /// Movements 1 to `count`: `debito` is the number and ten cents, `credito` one euro less; every
     /// seventh has no document number and no rubric.
     void fill(int count);
-    ado::RecordsetPtr open(const QString& statement) const;
-    /// With the columns of both statements of movements.
+    ado::RecordsetPtr open(const QString& query) const;
+    /// With the columns of both extracts.
     ado::RecordsetPtr movements() const;
     static std::shared_ptr<printing::Pages> laidOut(const printing::Report& report,
                                                     const ado::RecordsetPtr& rows);
@@ -30,5 +30,5 @@ protected:
 
 /// A listing in two levels over hospitals and their movements, each with a total.
 printing::Report twoLevels();
-/// What it is printed from.
-extern const QString TwoLevelStatement;
+/// The query that it is printed from.
+extern const QString TwoLevelQuery;

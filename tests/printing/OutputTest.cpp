@@ -45,7 +45,7 @@ protected:
     }
     /// The pages say what was asked for, to the last total: 40 debits of n + 0.1, credits a euro
     /// less.
-    static void expectStatement(const QString& file) {
+    static void expectExtract(const QString& file) {
         const QString text = textOfPdf(file);
         for (const QString& part :
              {u"Extracto de Lançamentos"_s, u"Associado: Conceição Muñoz"_s, u"FT 2026/39"_s,
@@ -71,7 +71,7 @@ TEST_F(ReportOutput, WritesPdfsOrSaysWhyNot) {
     EXPECT_TRUE(textOfPdf(file).contains(u"Total a Receber: € 824,00 Escudos: 165.197,17 Esc"_s));
     const auto pages = laidOut(report.design(), movements());
     writePdf(*pages, file);
-    expectStatement(file);
+    expectExtract(file);
     const QString nowhere = folder.filePath(u"não há/extracto.pdf"_s);
     EXPECT_TRUE(failureOf([&] { writePdf(*pages, nowhere); })
                     .text()
@@ -98,7 +98,7 @@ TEST_F(ReportOutput, PrintsOnTheDefaultPrinterWithoutAsking) {
     support::PrintServer server;
     report.PrintReport(movements());
     EXPECT_EQ(server.titles(1), QStringList{u"Extracto de Lançamentos"_s});
-    expectStatement(server.file(1));
+    expectExtract(server.file(1));
 }
 
 TEST_F(ReportOutput, PrintsWholeJobsOrNone) {
@@ -113,7 +113,7 @@ TEST_F(ReportOutput, PrintsWholeJobsOrNone) {
     qunsetenv("TMPDIR");
     report.PrintReport(movements());
     EXPECT_EQ(server.titles(1).size(), 1);
-    expectStatement(server.file(1));  // the first job that the server got
+    expectExtract(server.file(1));  // the first job that the server got
 }
 
 TEST_F(ReportOutput, LosesNothingWithoutAPrinter) {
@@ -131,15 +131,15 @@ TEST_F(ReportOutput, LosesNothingWithoutAPrinter) {
               document(name + u" (2).pdf"_s));
     report.PrintReport(movements());
     EXPECT_EQ(documents(), QStringList({name + u" (2).pdf"_s, name + u".pdf"_s}));
-    expectStatement(document(name + u".pdf"_s));
+    expectExtract(document(name + u".pdf"_s));
 
-    // Where the documents should be stands something else.
+    // Something else stands where the documents folder should be.
     QDir(document({})).removeRecursively();
     QFile inTheWay(QDir::homePath() + u"/Documents"_s);
     ASSERT_TRUE(inTheWay.open(QIODevice::WriteOnly));
     expectBox(QDir::homePath() + u'/' + name + u".pdf"_s);
     report.PrintReport(movements());
-    expectStatement(QDir::homePath() + u'/' + name + u".pdf"_s);
+    expectExtract(QDir::homePath() + u'/' + name + u".pdf"_s);
     QFile::remove(inTheWay.fileName());
 }
 
@@ -170,7 +170,7 @@ TEST_F(ReportOutput, GivesRowsThatSpreadsheetsReadAndDoNotRun) {
         EXPECT_TRUE(lines.contains(u";\"%1\";%2,25;"_s.arg(cells[row - 1]).arg(row).toUtf8()));
     book.exec(u"delete from tbZelmar_Movimentos where movimento_no > 2"_s);
     book.hospital(u"1"_s, u"Hospital A"_s);
-    EXPECT_EQ(written(twoLevels(), open(TwoLevelStatement)).toStdString(),
+    EXPECT_EQ(written(twoLevels(), open(TwoLevelQuery)).toStdString(),
               "\ufeff\"hospital\";\"movimento_no\";\"divida\"\r\n\"Hospital A\";2;-1235,6\r\n");
 }
 

@@ -75,10 +75,10 @@ TEST_F(PreviewWindow, IsInUseWhileTheLastPagesAreStillToCome) {
     showRows();
     person.waitUntil([&] { return status().startsWith(u"Página 1 de "_s); }, u"the first page"_s);
     EXPECT_TRUE(status().endsWith(u'…')) << status().toStdString();
-    // Who does not wait for the last page goes on reading.
+    // A person who gives up waiting for the last page goes on reading.
     person.onScreen(u"Espera"_s, [&] { person.escape(); });
     control(Qt::Key_S);
-    // A page and a text that are not there yet are come to in time.
+    // A page and a text that are asked for before they are laid out come as soon as they are.
     control(Qt::Key_G), person.type(u"500"_s), person.enter();
     EXPECT_EQ(said(u"Mensagem"_s), u"A preparar a página 500…"_s);
     person.waitUntil([&] { return status().startsWith(u"Página 500 de "_s); }, u"page 500"_s);
@@ -203,7 +203,7 @@ TEST_F(PreviewWindow, SavesFilesAndAsksBeforeWritingOver) {
     EXPECT_TRUE(contents(pdf).startsWith("%PDF"));
     EXPECT_TRUE(said(u"Mensagem"_s).contains(pdf));
 
-    // The same name again: a no leads back to the question for a name.
+    // The same name again: answering no leads back to the question for a name.
     QFile::remove(pdf);
     ASSERT_TRUE(QFile(pdf).open(QIODevice::WriteOnly));
     const support::Operator::Box box{

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // One clerk at one workstation. Says "ready", then does what each line of the input asks for and
-// says "done", or "not done" where the screen would have stayed; boxes are said before that.
+// says "done", or "not done" where the screen would have stayed open; before that it says the texts
+// of the boxes.
 //
 //   annul KEY             presses "Anular" on a movement
 //   receipt MEMBER EUROS  posts what a member pays in
@@ -49,8 +50,8 @@ bool annul(const QString& key) {
 
 bool postReceipt(qint32 socio_id, const QString& amount) {
     QString connection;
-    QString statement;
-    const ado::RecordsetPtr row = data::openNewMovement(connection, statement);
+    QString query;
+    const ado::RecordsetPtr row = data::openNewMovement(connection, query);
     row->AddNew();
     row->setCollect(u"data"_s, core::fromDate(core::today()));
     row->setCollect(u"tipo"_s, data::tipo::Receipt.toString());

@@ -22,7 +22,7 @@ using namespace Qt::StringLiterals;
 
 namespace {
 
-/// Stands for the progress window, which nobody looks at here.
+/// Stands for the progress window.
 class NoProgress : public QObject {
     Q_OBJECT
 public:
@@ -67,7 +67,7 @@ ado::RecordsetPtr keyIn(const office::Job& job, const QString& number) {
     return row;
 }
 
-/// The cheque's number as it is offered, without the screen that offers it.
+/// The cheque's number that the screen would offer.
 void takeCheque(const ado::RecordsetPtr& movement) {
     const qint64 number = payments::chequeNumber(payments::nextChequeNumber());
     movement->setCollect(u"cheque"_s, number);

@@ -22,7 +22,7 @@ class Audit:
         self.faults = []
         self.lagging = 0
         if isinstance(book, ServerBook):
-            # A statement that the server was given before the kill may still be running.
+            # A query that the server was given before the kill may still be running.
             wait_until("the server does no more for the dead", lambda: not book.rows(
                 "SELECT 1 FROM pg_stat_activity WHERE datname = current_database() "
                 "AND state = 'active' AND wait_event IS DISTINCT FROM 'ClientRead' "

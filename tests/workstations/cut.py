@@ -88,7 +88,7 @@ class Checks:
         wait_until(f"{job} waits", lambda: self.book.row(
             "SELECT 1 AS one FROM tbOperacoes WHERE passo = ?", step))
         clerk.end()
-        # The next one finds the row free at once: the dead hold nothing.
+        # The next one finds the row free at once: a killed process holds nothing.
         assert self.holder.hold(5, "select * from tbSocios where socio_id = 1") == "held"
 
     def finish_twice_at_once(self, what, lines):
@@ -125,7 +125,7 @@ class Checks:
             f"Anulação do nº {number} de 100001, 20,00: {missing}",
             f"Anulação do nº {number}: concluído."])
         self.check("account", self.account(1), (before[0] - 50, before[1] - 20, before[2] - 1))
-        self.check("corrections", len(self.book.rows(
+        self.check("correcting rows", len(self.book.rows(
             "SELECT 1 AS one FROM tbZelmar_Movimentos WHERE tipo = 'COR'")), number - 900)
 
     def race(self, pairs):
@@ -151,7 +151,7 @@ class Checks:
             clerk.end()
         half = pairs // 2
         self.check("told by whom", late, pairs)
-        self.check("corrections of the race", len(self.book.rows(
+        self.check("correcting rows of the race", len(self.book.rows(
             "SELECT 1 AS one FROM tbZelmar_Movimentos WHERE tipo = 'COR'")) - corrected, pairs)
         (debit, credit, documents), (own_debit, own_credit, own) = accounts
         self.check("accounts after the race", (self.account(1), self.account(2)),

@@ -42,7 +42,7 @@ INSERT INTO tbZelmar_Plafonds (rubrica_id, rubrica_id_main, code, percent, agreg
 
 
 class Workstation:
-    """A process; `posted` is what it said of itself."""
+    """A process; `posted` are the postings that it said were done."""
 
     def __init__(self, number, program, postings, environment):
         self.number = number
@@ -53,7 +53,7 @@ class Workstation:
                                         stdin=subprocess.PIPE, stdout=subprocess.PIPE, bufsize=0)
 
     def lines(self):
-        """What it has said since; None once it has ended."""
+        """What it has said since the last call; None once it has ended."""
         heard = os.read(self.process.stdout.fileno(), 65536)
         *lines, self.rest = (self.rest + heard).split(b"\n")
         return [line.decode() for line in lines] if heard else None
@@ -124,7 +124,7 @@ class Office:
         self.note(one, lines)
 
     def admit(self, one, count):
-        """All begin together; whoever comes later begins at once."""
+        """All begin together; one that replaces a killed one begins at once."""
         one.is_ready = True
         if self.began:
             one.begin()
@@ -172,8 +172,8 @@ class Office:
             if one.process.returncode is None and not one.is_killed:
                 one.kill()
 
-    def hold(self, seconds, statement):
-        answer = self.holder.hold(seconds, statement)
+    def hold(self, seconds, query):
+        answer = self.holder.hold(seconds, query)
         if answer != "held":
             self.faults.append(answer)
 
