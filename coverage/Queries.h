@@ -29,8 +29,8 @@ QString groupCreditOfRelatives(const QVariant& main, qint32 socio_id);
 /// One row: a member's debits and credits over all his accumulators, as `tdebito_ac`,
 /// `tcredito_ac`.
 QString balance(qint32 socio_id);
-/// One row: what of the franchise is spent, whole family and every type of movement. The alias
-/// `t_iliquido` sums `liquido`; that is how it is meant.
+/// One row: what of the franchise is spent, whole family and every type of movement. Intentional:
+/// the alias `t_iliquido` sums `liquido`, whatever its name says.
 QString franchise(qint32 socio_id, const QVariant& rubrica_id);
 /// One row: a member.
 QString member(qint32 socio_id);

@@ -21,7 +21,7 @@ inline constexpr QStringView CounterQuery = u"select * from tbContadores";
 /// workstation is given the same. Fails when what follows it cannot be stored.
 ///
 /// A counter without a row gives the number 1 and stores 1, so the next draw gives 1 once more.
-/// This repetition is meant to stay.
+/// Intentional: this repetition stays.
 qint32 drawMovementNumber();
 
 /// Asks whether to finish the posting.

@@ -12,8 +12,8 @@ namespace data {
 /// text for no row; otherwise the value. A statement that fails, or a column that is not there,
 /// fails the caller.
 ///
-/// The statement always runs on the first connection of the data environment: `strConnection` and
-/// the two last texts are accepted and, on purpose, without effect.
+/// The query always runs on the first connection of the data environment. Intentional:
+/// `strConnection` and the two last texts are accepted and have no effect.
 QVariant DLookup(const QString& strSQL, const QString& strConnection, const QString& strField,
                  const QString& unused1 = {}, const QString& unused2 = {});
 

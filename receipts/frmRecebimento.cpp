@@ -59,7 +59,7 @@ void frmRecebimento::setDefaults() {
     DataCombo3->setBoundText(data::modo::Cheque.toString());
 }
 
-/// The date goes grey as well, and stays so. It is meant so.
+/// Intentional: the date goes grey as well, and stays so.
 void frmRecebimento::numberWiped() {
     AccountScreen::numberWiped();
     Text3->setBackColor(forms::BackColor::Menu);

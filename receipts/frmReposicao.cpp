@@ -127,8 +127,8 @@ com::Object frmReposicao::openMemberFile() {
     return file;
 }
 
-/// Whether the member is enrolled is not tested. A search given up leaves no member, with the
-/// number and the name of the former one still shown. It is meant so.
+/// Intentional: whether the member is enrolled is not tested. A search given up leaves no member,
+/// with the number and the name of the former one still shown.
 void frmReposicao::Command1_Click() {
     forms::handlePlainly([this] {
         const qint32 id = core::toLong(openMemberFile().call(u"FindSocios"_s));
