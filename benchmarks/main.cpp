@@ -34,6 +34,7 @@ int main(int argc, char** argv) {
         benchmarks::measureCoverage(report);
         benchmarks::measureAccounts(report);
         benchmarks::measureEngines(report);
+        benchmarks::measureLists(report);
         benchmarks::measurePrinting(report);
         benchmarks::measureScreens(report);
         benchmarks::measureSearches(report);
