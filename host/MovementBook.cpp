@@ -17,14 +17,16 @@ namespace host {
 
 namespace {
 
-// One row is one movement in force; the columns of MovementKey in its order.
-const QString Keys =
-    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, "
-    "doc_valor, credito, debito from vwZelmars_Movimentos_Vigor "_s;
+// One row is one movement in force; the columns of MovementKey in their order.
+const QString Columns =
+    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, doc_valor, credito, "
+    "debito"_s;
+// All movements of one of the two tables behind the view.
+const QString AllKeys = Columns + u" from %1"_s;
 // The same of some movements, with the names of their persons.
 const QString NamedKeys =
-    u"select movimento_id, movimento_no, socio_id, codABC, data, tipo, doc_no, ficheiro, "
-    "doc_valor, credito, debito, no_kor, nome, familiar from vwZelmars_Movimentos_Vigor where "
+    Columns +
+    u", ficheiro, no_kor, nome, familiar from vwZelmars_Movimentos_Vigor where "
     "movimento_id in (%1)"_s;
 // The day comes first: the keys of the two tables behind the view do not go by time together.
 const QString NewestFirst = u"order by data desc, movimento_id desc"_s;
@@ -36,7 +38,8 @@ const QString GreatestKey = u"select max(movimento_id) from %1"_s;
 // What was posted since, in one of them.
 const QString KeysSince = u"select movimento_id from %1 where movimento_id > %2"_s;
 // What was annulled of one member's.
-const QString AnnulledOf = u"where socio_id = %1 and tipo = 'ANL'"_s;
+const QString AnnulledOf =
+    Columns + u", ficheiro from vwZelmars_Movimentos_Vigor where socio_id = %1 and tipo = 'ANL'"_s;
 // One row is one movement as the list shows it; the columns of MovementRow in its order.
 const QString Rows =
     u"select movimento_id, movimento_no, data, no_kor, nome, familiar, tipo, doc_no, doc_valor, "
@@ -49,32 +52,66 @@ const QString SampleMembers =
 const QString Members = u"select socio_id, no_kor, nome from %1"_s;
 const QString Relatives = u"select socio_id, codABC, nome from %1"_s;
 
-qint32 number(const QVariant& value) {
-    return core::isNull(value) ? 0 : value.toInt();
+std::string_view text(const ado::Recordset& row, int column) {
+    const ado::Cell cell = row.readCell(column);
+    return cell.kind == ado::Cell::Text ? cell.text : std::string_view();
 }
 
-/// A view gives its amounts as one engine's money and as the other's doubles.
-qint64 units(const QVariant& amount) {
-    if (amount.typeId() == qMetaTypeId<core::Money>()) return amount.value<core::Money>().units();
-    return core::Money::fromDouble(core::toDouble(amount)).units();
+qint32 number(const ado::Recordset& row, int column) {
+    const ado::Cell cell = row.readCell(column);
+    return cell.kind == ado::Cell::Integer ? qint32(cell.integer) : 0;
 }
 
-MovementKey keyOf(const ado::Recordset& row) {
-    MovementKey key;
-    key.movimento_id = number(row.value(0));
-    key.movimento_no = number(row.value(1));
-    key.socio_id = number(row.value(2));
-    key.codABC = core::toText(row.value(3));
-    key.data = core::toDate(row.value(4));
-    key.tipo = core::toText(row.value(5));
-    key.doc_no = core::toText(row.value(6));
-    key.activo = row.value(7) == u"ACTIVO"_s;
-    for (std::size_t at = 0; at < key.amounts.size(); ++at) {
-        const QVariant amount = row.value(8 + int(at));
-        if (!core::isNull(amount)) key.amounts[at] = units(amount);
+/// Amounts come as one engine's texts and as the other's doubles.
+qint64 units(const ado::Cell& cell) {
+    switch (cell.kind) {
+        case ado::Cell::Null:
+            return MovementKey::NoAmount;
+        case ado::Cell::Integer:
+            return cell.integer * 10000;
+        case ado::Cell::Real:
+            return core::Money::fromDouble(cell.real).units();
+        case ado::Cell::Text:
+            break;
     }
-    return key;
+    const auto amount = core::Money::fromPlainText(
+        QString::fromLatin1(cell.text.data(), qsizetype(cell.text.size())));
+    return amount ? amount->units() : MovementKey::NoAmount;
 }
+
+/// Reads the rows of a statement that begins with the columns of MovementKey. Rows of one day
+/// mostly lie together, and their day is worked out once.
+class KeyReader {
+public:
+    MovementKey read(const ado::Recordset& row) {
+        MovementKey key;
+        key.movimento_id = number(row, 0);
+        key.movimento_no = number(row, 1);
+        key.socio_id = number(row, 2);
+        key.codABC = text(row, 3);
+        if (const std::string_view moment = text(row, 4); moment != moment_) {
+            moment_ = moment;
+            day_ = core::toDate(row.value(4));
+        }
+        key.data = day_;
+        key.tipo = text(row, 5);
+        key.doc_no = text(row, 6);
+        for (std::size_t at = 0; at < key.amounts.size(); ++at)
+            key.amounts[at] = units(row.readCell(7 + int(at)));
+        return key;
+    }
+
+    /// The same of the view, whose `ficheiro` tells the table.
+    MovementKey readOfView(const ado::Recordset& row) {
+        MovementKey key = read(row);
+        key.activo = text(row, 10) == "ACTIVO";
+        return key;
+    }
+
+private:
+    std::string moment_;
+    QDate day_;
+};
 
 QString tableOf(bool activo) {
     return activo ? u"tbZelmar_Movimentos"_s : u"tbZelmar_Movimentos_Inactivos"_s;
@@ -87,9 +124,8 @@ QString listed(const std::vector<qint32>& keys) {
 }
 
 void takeNames(const ado::Recordset& row, const MovementKey& key, MovementSearch& search) {
-    search.nameMember(key.socio_id, core::toText(row.value(11)), core::toText(row.value(12)));
-    if (!key.codABC.isEmpty())
-        search.nameRelative(key.socio_id, key.codABC, core::toText(row.value(13)));
+    search.nameMember(key.socio_id, text(row, 11), text(row, 12));
+    search.nameRelative(key.socio_id, key.codABC, text(row, 13));
 }
 
 }  // namespace
@@ -150,18 +186,25 @@ std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
         row->Close();
     };
     const auto takeMember = [&](const ado::Recordset& row) {
-        search->nameMember(number(row.value(0)), core::toText(row.value(1)),
-                           core::toText(row.value(2)));
+        search->nameMember(number(row, 0), text(row, 1), text(row, 2));
     };
     const auto takeRelative = [&](const ado::Recordset& row) {
-        search->nameRelative(number(row.value(0)), core::toText(row.value(1)),
-                             core::toText(row.value(2)));
+        search->nameRelative(number(row, 0), text(row, 1), text(row, 2));
     };
     each(Members.arg(u"tbSocios"_s), takeMember);
     each(Members.arg(u"tbSocios_Inactivos"_s), takeMember);
     each(Relatives.arg(u"tbSocios_Familias"_s), takeRelative);
     each(Relatives.arg(u"tbSocios_Familias_Inactivos"_s), takeRelative);
-    each(Keys + NewestFirst, [&](const ado::Recordset& row) { search->append(keyOf(row)); });
+    // The view would look up the names of every movement, and an engine would sort them all.
+    for (const bool activo : {false, true}) {
+        KeyReader reader;
+        each(AllKeys.arg(tableOf(activo)), [&](const ado::Recordset& row) {
+            MovementKey key = reader.read(row);
+            key.activo = activo;
+            search->append(key);
+        });
+    }
+    search->sort();
     return stop.stop_requested() ? nullptr : search;
 }
 
@@ -172,7 +215,7 @@ int MovementBook::takeNewer(MovementSearch& search) const {
         const QString since = KeysSince.arg(tableOf(activo)).arg(search.newest(activo));
         const std::vector<MovementKey> newer = named(numbers(since), search);
         for (const MovementKey& key : newer)
-            if (key.tipo == "COR"_L1) corrected.insert(key.socio_id);
+            if (key.tipo == "COR") corrected.insert(key.socio_id);
         search.prepend(newer);
         taken += int(newer.size());
     }
@@ -186,9 +229,10 @@ std::vector<MovementKey> MovementBook::named(const std::vector<qint32>& keys,
     std::vector<MovementKey> movements;
     if (keys.empty()) return movements;
     const auto row = ado::Recordset::create();
+    KeyReader reader;
     row->Open(NamedKeys.arg(listed(keys)), connection_);
     for (; !row->atEnd(); row->MoveNext()) {
-        movements.push_back(keyOf(*row));
+        movements.push_back(reader.readOfView(*row));
         takeNames(*row, movements.back(), search);
     }
     row->Close();
@@ -204,7 +248,7 @@ std::vector<qint32> MovementBook::numbers(const QString& query) const {
     std::vector<qint32> numbers;
     const auto row = ado::Recordset::create();
     for (row->Open(query, connection_); !row->atEnd(); row->MoveNext())
-        numbers.push_back(number(row->value(0)));
+        numbers.push_back(number(*row, 0));
     row->Close();
     return numbers;
 }
@@ -213,8 +257,9 @@ std::vector<qint32> MovementBook::numbers(const QString& query) const {
 /// key; only the correcting row is new, and all that it tells is the member.
 void MovementBook::takeAnnulled(MovementSearch& search, qint32 socio_id) const {
     const auto row = ado::Recordset::create();
-    row->Open(Keys + AnnulledOf.arg(socio_id), connection_);
-    for (; !row->atEnd(); row->MoveNext()) search.correct(keyOf(*row));
+    KeyReader reader;
+    row->Open(AnnulledOf.arg(socio_id), connection_);
+    for (; !row->atEnd(); row->MoveNext()) search.correct(reader.readOfView(*row));
     row->Close();
 }
 
@@ -227,7 +272,7 @@ std::vector<MovementRow> MovementBook::rows(const std::vector<qint32>& keys) con
     const auto row = ado::Recordset::create();
     for (row->Open(Rows.arg(listed(keys)), connection_); !row->atEnd(); row->MoveNext()) {
         MovementRow& shown = rows.emplace_back();
-        shown.movimento_id = number(row->value(0));
+        shown.movimento_id = number(*row, 0);
         for (int column = 0; column < MovementRow::ColumnCount; ++column)
             shown.values[column] = row->value(column + 1);
     }

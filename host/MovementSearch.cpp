@@ -3,6 +3,8 @@
 
 #include <QStringList>
 #include <algorithm>
+#include <numeric>
+#include <tuple>
 
 #include "platform/core/Folding.h"
 #include "platform/core/Format.h"
@@ -14,11 +16,19 @@ namespace host {
 namespace {
 
 /// Where a text stands in a short list; it is added when it is new.
-quint16 positionOf(const std::string& text, std::vector<std::string>& list) {
+quint16 positionOf(std::string_view text, std::vector<std::string>& list) {
     const auto known = std::find(list.begin(), list.end(), text);
     if (known != list.end()) return quint16(known - list.begin());
-    list.push_back(text);
+    list.emplace_back(text);
     return quint16(list.size() - 1);
+}
+
+/// A text without blanks at its ends, and with one only where there are several.
+std::string simplified(const std::string& text) {
+    const bool isSimple = text.find("  ") == text.npos &&
+                          text.find_first_of("\t\n\r") == text.npos && !text.starts_with(' ') &&
+                          !text.ends_with(' ');
+    return isSimple ? text : QString::fromStdString(text).simplified().toStdString();
 }
 
 constexpr std::size_t LongestText = 1000;  // what can be searched for, in bytes
@@ -124,6 +134,24 @@ void MovementSearch::prepend(const std::vector<MovementKey>& movements) {
     amounts_.insert(amounts_.begin(), amounts.begin(), amounts.end());
 }
 
+void MovementSearch::sort() {
+    std::vector<quint32> order(items_.size());
+    std::iota(order.begin(), order.end(), 0U);
+    std::sort(order.begin(), order.end(), [this](quint32 a, quint32 b) {
+        return std::tie(items_[a].day, items_[a].id) > std::tie(items_[b].day, items_[b].id);
+    });
+    std::vector<Item> items;
+    std::vector<std::array<qint64, 3>> amounts;
+    items.reserve(order.size());
+    amounts.reserve(order.size());
+    for (const quint32 position : order) {
+        items.push_back(items_[position]);
+        amounts.push_back(amounts_[position]);
+    }
+    items_ = std::move(items);
+    amounts_ = std::move(amounts);
+}
+
 void MovementSearch::correct(const MovementKey& movement) {
     const auto known = std::find_if(items_.begin(), items_.end(), [&](const Item& item) {
         return item.id == movement.movimento_id;
@@ -138,12 +166,12 @@ void MovementSearch::knowKey(bool activo, qint32 movimento_id) {
     newest = std::max(newest, movimento_id);
 }
 
-void MovementSearch::nameMember(qint32 socio_id, const QString& no_kor, const QString& nome) {
+void MovementSearch::nameMember(qint32 socio_id, std::string_view no_kor, std::string_view nome) {
     name(memberAt(socio_id), core::foldedWords(no_kor), core::foldedWords(nome));
 }
 
-void MovementSearch::nameRelative(qint32 socio_id, const QString& codABC, const QString& nome) {
-    if (codABC.isEmpty()) return;
+void MovementSearch::nameRelative(qint32 socio_id, std::string_view codABC, std::string_view nome) {
+    if (codABC.empty()) return;
     name(relativeAt(socio_id, codABC), {}, core::foldedWords(nome));
 }
 
@@ -162,16 +190,23 @@ std::vector<quint32> MovementSearch::find(const QString& filter) const {
 MovementSearch::Item MovementSearch::itemOf(const MovementKey& movement) {
     knowKey(movement.activo, movement.movimento_id);
     const std::string document =
-        ' ' + core::folded(movement.doc_no.simplified()).substr(0, LongestText);
+        ' ' + core::folded(simplified(movement.doc_no)).substr(0, LongestText);
     const Item item{movement.movimento_id,
                     movement.movimento_no,
                     relativeAt(movement.socio_id, movement.codABC),
                     movement.data.isValid() ? qint32(movement.data.toJulianDay()) : 0,
                     quint32(texts_.size()),
                     quint16(document.size()),
-                    positionOf(core::folded(movement.tipo), types_)};
+                    typeAt(movement.tipo)};
     texts_ += document;
     return item;
+}
+
+/// Of a few types, each folded once.
+quint16 MovementSearch::typeAt(const std::string& tipo) {
+    const quint16 position = positionOf(tipo, rawTypes_);
+    if (position == types_.size()) types_.push_back(core::folded(std::string_view(tipo)));
+    return position;
 }
 
 quint32 MovementSearch::memberAt(qint32 socio_id) {
@@ -180,9 +215,9 @@ quint32 MovementSearch::memberAt(qint32 socio_id) {
     return known != personAt_.constEnd() ? *known : addPerson(key, quint32(persons_.size()));
 }
 
-quint32 MovementSearch::relativeAt(qint32 socio_id, const QString& codABC) {
-    if (codABC.isEmpty()) return memberAt(socio_id);
-    const auto code = quint64(positionOf(codABC.toStdString(), codes_)) + 1;
+quint32 MovementSearch::relativeAt(qint32 socio_id, std::string_view codABC) {
+    if (codABC.empty()) return memberAt(socio_id);
+    const auto code = quint64(positionOf(codABC, codes_)) + 1;
     const quint64 key = quint64(quint32(socio_id)) << 16 | code;
     const auto known = personAt_.constFind(key);
     return known != personAt_.constEnd() ? *known : addPerson(key, memberAt(socio_id));

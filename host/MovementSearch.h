@@ -19,10 +19,10 @@ struct MovementKey {
     qint32 movimento_id = 0;
     qint32 movimento_no = 0;  ///< 0 for none
     qint32 socio_id = 0;
-    QString codABC = {};
+    std::string codABC = {};  // UTF-8, as the other texts
     QDate data = {};
-    QString tipo = {};
-    QString doc_no = {};
+    std::string tipo = {};
+    std::string doc_no = {};
     bool activo = true;  ///< stands in the table of the active members
     /// Value, credit and debit, in the least unit of money.
     std::array<qint64, 3> amounts = {NoAmount, NoAmount, NoAmount};
@@ -37,16 +37,19 @@ struct MovementKey {
 /// or ".").
 class MovementSearch {
 public:
-    /// Adds a movement older than all others.
+    /// Adds a movement older than all others; those that come in another order are put into theirs
+    /// by sort().
     void append(const MovementKey& movement);
+    /// The newest day first, of one day the greatest key.
+    void sort();
     /// Adds movements newer than all others, the newest first.
     void prepend(const std::vector<MovementKey>& movements);
     /// Takes in anew a movement that was written again; one that is not here stays unknown.
     void correct(const MovementKey& movement);
     /// Names a member or a relative, before or after his movements; the last name given counts.
     /// A relative without a code is nobody.
-    void nameMember(qint32 socio_id, const QString& no_kor, const QString& nome);
-    void nameRelative(qint32 socio_id, const QString& codABC, const QString& nome);
+    void nameMember(qint32 socio_id, std::string_view no_kor, std::string_view nome);
+    void nameRelative(qint32 socio_id, std::string_view codABC, std::string_view nome);
 
     std::size_t size() const { return items_.size(); }
     qint32 movimento_id(std::size_t position) const { return items_[position].id; }
@@ -80,17 +83,19 @@ private:
 
     Item itemOf(const MovementKey& movement);
     quint32 memberAt(qint32 socio_id);
-    quint32 relativeAt(qint32 socio_id, const QString& codABC);
+    quint32 relativeAt(qint32 socio_id, std::string_view codABC);
     quint32 addPerson(quint64 key, quint32 member);
     void name(quint32 person, const std::string& staff, const std::string& nome);
+    quint16 typeAt(const std::string& tipo);
     std::string_view text(quint32 from, quint16 size) const;
 
     std::vector<Item> items_;
     std::vector<std::array<qint64, 3>> amounts_;  // of the items
     std::vector<Person> persons_;
-    QHash<quint64, quint32> personAt_;  // by socio_id, shifted left, plus the position in codes_
-                                        // plus 1; 0 for the member
-    std::vector<std::string> types_;
+    QHash<quint64, quint32> personAt_;   // by socio_id, shifted left, plus the position in codes_
+                                         // plus 1; 0 for the member
+    std::vector<std::string> types_;     // folded
+    std::vector<std::string> rawTypes_;  // as they were given, at the same positions
     std::vector<std::string> codes_;
     std::string texts_;          // folded; each word behind a blank
     qint32 newest_[2] = {0, 0};  // of those who left, of the active

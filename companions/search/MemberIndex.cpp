@@ -3,7 +3,6 @@
 
 #include <algorithm>
 
-#include "platform/ado/Recordset.h"
 #include "platform/core/Folding.h"
 #include "platform/core/Values.h"
 
@@ -35,32 +34,28 @@ void MemberIndex::load(const ado::ConnectionPtr& connection) {
     const auto rows = ado::Recordset::create();
     rows->Open(AllMembers, connection);
     MemberIndex fresh;
-    for (; !rows->atEnd(); rows->MoveNext()) {
-        const QVariant zelmar = rows->value(5);
-        fresh.add({core::toLong(rows->value(0)), core::toText(rows->value(1)),
-                   core::toText(rows->value(2)), core::toText(rows->value(3)),
-                   core::toText(rows->value(4)),
-                   !core::isNull(zelmar) && core::toDouble(zelmar) != 0});
-    }
+    for (; !rows->atEnd(); rows->MoveNext()) fresh.add(*rows);
     fresh.sort();
     *this = std::move(fresh);
 }
 
-void MemberIndex::add(const Member& member) {
+void MemberIndex::add(const ado::Recordset& row) {
     Entry entry{};
-    entry.socioId = member.socioId;
-    entry.enrolled = member.enrolled;
+    entry.socioId = static_cast<qint32>(row.readCell(0).integer);
+    const QVariant zelmar = row.value(5);
+    entry.enrolled = !core::isNull(zelmar) && core::toDouble(zelmar) != 0;
     entry.shownBegin = static_cast<quint32>(shown_.size());
-    for (const auto* text : {&member.number, &member.name, &member.shortName, &member.locality}) {
-        std::string line = text->toStdString();
-        std::replace(line.begin(), line.end(), '\n', ' ');
-        shown_ += line + '\n';
+    for (const int column : {1, 2, 3, 4}) {
+        const size_t begin = shown_.size();
+        shown_ += row.readCell(column).text;
+        std::replace(shown_.begin() + static_cast<std::ptrdiff_t>(begin), shown_.end(), '\n', ' ');
+        shown_ += '\n';
     }
     entry.shownEnd = static_cast<quint32>(shown_.size());
     entry.wordsBegin = static_cast<quint32>(words_.size());
-    words_ += core::foldedWords(member.number);
+    words_ += core::foldedWords(row.readCell(1).text);
     entry.nameBegin = static_cast<quint32>(words_.size());
-    words_ += core::foldedWords(member.name);
+    words_ += core::foldedWords(row.readCell(2).text);
     entry.wordsEnd = static_cast<quint32>(words_.size());
     entries_.push_back(entry);
 }

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "platform/ado/Connection.h"
+#include "platform/ado/Recordset.h"
 
 namespace companions {
 
@@ -25,10 +25,6 @@ class MemberIndex {
 public:
     /// Takes all active members in, by name. What was held before goes.
     void load(const ado::ConnectionPtr& connection);
-    void add(const Member& member);
-    /// Puts the members in the order of their names, without regard to accents and case.
-    void sort();
-
     int size() const { return static_cast<int>(entries_.size()); }
     Member at(int position) const;
     qint32 socioId(int position) const { return entries_[static_cast<size_t>(position)].socioId; }
@@ -46,6 +42,10 @@ private:
         quint32 shownBegin, shownEnd;
         quint32 wordsBegin, nameBegin, wordsEnd;
     };
+    /// Adds the member of a row of the statement.
+    void add(const ado::Recordset& row);
+    /// Puts the members in the order of their names, without regard to accents and case.
+    void sort();
     std::string_view words(const Entry& entry) const;
     std::string_view nameWords(const Entry& entry) const;
 

@@ -161,6 +161,11 @@ QVariant Recordset::readValue(const QString& name) const {
     return d->at == At::Row ? toVariant(d->rows->cell(column), d->typeOf(column)) : QVariant();
 }
 
+Cell Recordset::readCell(int column) const {
+    d->requireRow();
+    return d->at == At::Row ? d->rows->cell(column) : Cell();
+}
+
 void Recordset::setCollect(const QString& name, const QVariant& value) {
     setValue(d->columnOf(name), value);
 }

@@ -8,6 +8,7 @@
 #include "platform/ado/Connection.h"
 #include "platform/ado/Constants.h"
 #include "platform/ado/engine/Accompanying.h"
+#include "platform/ado/engine/Cell.h"
 #include "platform/ado/engine/Column.h"
 
 namespace ado {
@@ -96,6 +97,9 @@ public:
     /// The value as the statement read it, for a mere lookup: the row is not held for it and nobody
     /// is waited for. Of a row that this set added, null.
     QVariant readValue(const QString& name) const;
+    /// The same as the engine keeps it, good until the next move: for passes over very many rows,
+    /// of which nothing is converted that nobody wants.
+    Cell readCell(int column) const;
     QVariant value(int column) const;
     void setValue(int column, const QVariant& value);
 

@@ -14,12 +14,12 @@ namespace {
 /// The newest first; named by their numbers in what is expected below.
 host::MovementSearch sampleSearch() {
     host::MovementSearch search;
-    search.nameMember(1, u"100015"_s, u"António Manuel Silva Matos"_s);
-    search.nameMember(2, u"12040"_s, u"Conceição d'Araújo"_s);
-    search.nameMember(3, u"100073"_s, u"ANA SÁ"_s);
+    search.nameMember(1, "100015", "António Manuel Silva Matos");
+    search.nameMember(2, "12040", "Conceição d'Araújo");
+    search.nameMember(3, "100073", "ANA SÁ");
     qint32 key = 100;
-    const auto add = [&](qint32 number, qint32 socio, const QString& code, QDate day,
-                         const QString& tipo, const QString& document) {
+    const auto add = [&](qint32 number, qint32 socio, const char* code, QDate day, const char* tipo,
+                         const char* document) {
         search.append({.movimento_id = key--,
                        .movimento_no = number,
                        .socio_id = socio,
@@ -28,15 +28,15 @@ host::MovementSearch sampleSearch() {
                        .tipo = tipo,
                        .doc_no = document});
     };
-    add(1205, 1, u"A"_s, {2026, 11, 22}, u"DOC"_s, u"FT 2026/118"_s);
-    add(1204, 1, u"C1"_s, {2026, 11, 21}, u"HOS"_s, u"77001"_s);
-    add(1203, 2, u"B"_s, {2026, 11, 21}, u"DOC"_s, u"a-9%"_s);
-    add(120, 3, {}, {2026, 2, 1}, u"PAG"_s, {});
-    add(12, 2, u"A"_s, {2025, 11, 21}, u"ANL"_s, u"1204"_s);
-    add(0, 9, u"A"_s, {}, u"SA"_s, {});
-    search.nameRelative(1, u"A"_s, u"António Manuel Silva Matos"_s);
-    search.nameRelative(1, u"C1"_s, u"Inês Matos"_s);
-    search.nameRelative(2, u"B"_s, u"João Gonçalves"_s);
+    add(1205, 1, "A", {2026, 11, 22}, "DOC", "FT 2026/118");
+    add(1204, 1, "C1", {2026, 11, 21}, "HOS", "77001");
+    add(1203, 2, "B", {2026, 11, 21}, "DOC", "a-9%");
+    add(120, 3, "", {2026, 2, 1}, "PAG", "");
+    add(12, 2, "A", {2025, 11, 21}, "ANL", "1204");
+    add(0, 9, "A", {}, "SA", "");
+    search.nameRelative(1, "A", "António Manuel Silva Matos");
+    search.nameRelative(1, "C1", "Inês Matos");
+    search.nameRelative(2, "B", "João Gonçalves");
     return search;
 }
 
