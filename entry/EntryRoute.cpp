@@ -128,16 +128,15 @@ void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL) {
 }
 
 bool isEntryUnderWay() {
-    return Entry::isLoaded() && !Entry::get().bShowing;
+    // Also while it is hidden: the way out may lead back to it.
+    return Entry::isLoaded() && Entry::get().mode() == frmMovimentos::Mode::New;
 }
 
 void attachMovement(const ado::RecordsetPtr& rows, QObject* Caller) {
     forms::closeView<frmMovimentos>();
     frmMovimentos& screen = Entry::get();
-    screen.bShowing = true;
-    screen.Adodc1->setRecordset(rows);
+    screen.attach(rows);
     screen.CallbackClass = Caller;
-    screen.Movimento_ID = rows->Collect(u"movimento_id"_s);
 }
 
 void showMovement(const QString& tipo) {

@@ -207,7 +207,7 @@ void frmMovimentos::emptyBecomesNull(forms::TextBox* box) {
 }
 
 void frmMovimentos::Text6_Validate(bool& cancel) {
-    if (bShowing) return;
+    if (bShowing()) return;
     if (Text6->Text().isEmpty()) {
         emptyBecomesNull(Text6);
         return;
@@ -227,7 +227,7 @@ void frmMovimentos::Text6_Validate(bool& cancel) {
 
 void frmMovimentos::Text11_Validate(bool& cancel) {
     // In a view nothing is worked out, and an empty rate must not hold anybody.
-    if (bShowing) return;
+    if (bShowing()) return;
     const std::optional<double> rate = numberIn(Text11);
     if (!rate) {
         MsgBox(u"O valor que digitou não é um número válido."_s, Icon::Information);

@@ -19,9 +19,8 @@ class frmMovimentos : public forms::RecordScreen {
 public:
     frmMovimentos();
 
-    qint32 Socio_ID = 0;    ///< the chosen member; 0 for none
-    QVariant Familia_ID;    ///< the chosen person's family row; null until one was chosen
-    QVariant Movimento_ID;  ///< the movement under view
+    qint32 Socio_ID = 0;  ///< the chosen member; 0 for none
+    QVariant Familia_ID;  ///< the chosen person's family row; null until one was chosen
     bool bHospital = false;
     QPointer<QObject> CallbackClass;  ///< told of an annulment; may be null
 

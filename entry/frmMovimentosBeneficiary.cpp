@@ -16,7 +16,7 @@ using core::MsgBox;
 using forms::BackColor;
 
 void frmMovimentos::No_Kor_Validate(bool& cancel) {
-    if (bShowing) return;
+    if (bShowing()) return;
     if (No_Kor->Text().isEmpty()) {
         clearMember();
         return;

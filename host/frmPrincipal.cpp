@@ -16,7 +16,7 @@
 #include "host/MovementsView.h"
 #include "host/UnfinishedOperations.h"
 #include "platform/core/MsgBox.h"
-#include "platform/forms/Form.h"
+#include "platform/forms/RecordScreen.h"
 
 using namespace Qt::StringLiterals;
 
@@ -27,13 +27,11 @@ namespace {
 /// The screens of the component on which movements are typed.
 const QStringList EntryScreens{u"frmMovimentos"_s, u"frmRecebimento"_s, u"frmReposicao"_s};
 
-/// One of those screens with something typed into it, if there is one. A screen that only shows a
-/// movement is none: its main button reads "&Sair".
+/// One of those screens on which a movement is being typed, if there is one.
 QWidget* entryUnderWay(const QStringList& screens) {
     for (QWidget* window : QApplication::topLevelWidgets()) {
-        if (!window->isVisible() || !screens.contains(window->objectName())) continue;
-        const auto* button = window->findChild<QPushButton*>(u"Command3"_s);
-        if (!button || button->text() != "&Sair"_L1) return window;
+        const auto* screen = qobject_cast<forms::RecordScreen*>(window);
+        if (screen && screen->isUnderWay() && screens.contains(screen->objectName())) return window;
     }
     return nullptr;
 }

@@ -73,7 +73,7 @@ void AccountScreen::showReadOnly(const ado::RecordsetPtr& rows) {
 /// Intentional: whether the member is enrolled in the plan is not tested here, only where a search
 /// of the screen's own does.
 void AccountScreen::No_Kor_Validate(bool& cancel) {
-    if (bShowing) return;
+    if (bShowing()) return;
     if (No_Kor->Text().isEmpty()) {
         numberWiped();
         return;

@@ -158,7 +158,7 @@ void frmReposicao::Command2_Click() {
 
 /// Without a rubric the row holds 0, also when nothing was wiped.
 void frmReposicao::DataCombo1_LostFocus() {
-    if (bShowing || !DataCombo1->Text().isEmpty()) return;
+    if (bShowing() || !DataCombo1->Text().isEmpty()) return;
     core::passingOver([this] { DataCombo1->setBoundText(0); });
 }
 

@@ -23,10 +23,15 @@ RecordScreen::RecordScreen(const QString& name, const QString& caption)
     setCancelButton(Command4);
 }
 
+void RecordScreen::attach(const ado::RecordsetPtr& rows) {
+    mode_ = Mode::View;
+    Adodc1->setRecordset(rows);
+}
+
 void RecordScreen::showNew(const ado::RecordsetPtr& rows) {
     Adodc1->setRecordset(rows);
     rows->AddNew();
-    bShowing = false;
+    mode_ = Mode::New;
     watchTyping();
     typed_ = false;
     Timer1->setEnabled(true);
@@ -62,7 +67,7 @@ void RecordScreen::closeEvent(QCloseEvent* event) {
 void RecordScreen::showForReading(const QString& note) {
     setBandNote(this, note);
     Timer1->setEnabled(false);
-    bShowing = true;
+    mode_ = Mode::View;
     Command4->hide();
     Command3->setCaption(u"&Sair"_s);
     Command3->setDefault(true);
@@ -80,13 +85,13 @@ void RecordScreen::lockFields() {
 
 void RecordScreen::Timer1_Timer() {
     // The view has no defaults to set; the timer stays as it is.
-    if (bShowing) return;
+    if (bShowing()) return;
     Timer1->setEnabled(false);
     setDefaults();
 }
 
 void RecordScreen::Command3_Click() {
-    if (Command3->Caption() == u"&Sair"_s)
+    if (bShowing())
         Unload();
     else
         post();

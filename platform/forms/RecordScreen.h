@@ -12,20 +12,26 @@ namespace forms {
 class RecordScreen : public Form {
     Q_OBJECT
 public:
+    /// What the screen is there for: nothing yet, a new row, or the read-only view of a stored one.
+    enum class Mode { Unused, New, View };
+
     RecordScreen(const QString& name, const QString& caption);
 
     DataControl* Adodc1;
-    bool bShowing = false;  ///< an existing row, read-only
-    Button* Command3;       ///< "&OK"; "&Sair" on an existing row
-    Button* Command4;       ///< "&Cancelar"
+    Button* Command3;  ///< "&OK"; "&Sair" on an existing row
+    Button* Command4;  ///< "&Cancelar"
 
+    Mode mode() const { return mode_; }
+    bool bShowing() const { return mode_ == Mode::View; }
+    /// Takes a stored row for the view, which is shown later.
+    void attach(const ado::RecordsetPtr& rows);
     /// Adds a new row to the row set and shows the screen on it, modeless.
     void showNew(const ado::RecordsetPtr& rows);
     /// A person has chosen something in another window that is now part of the new row; what is
     /// typed into the controls counts by itself.
     void noteChoice() { typed_ = true; }
     /// True while a person is at work on a new row.
-    bool isUnderWay() const { return isVisible() && !bShowing; }
+    bool isUnderWay() const { return isVisible() && mode_ == Mode::New; }
 
 protected:
     /// Sets the new row's defaults, once, a moment after the screen is up and bound.
@@ -48,6 +54,7 @@ private:
     void Command3_Click();
 
     Timer* Timer1;
+    Mode mode_ = Mode::Unused;
     bool typed_ = false;  ///< a person has typed or chosen something since the row was added
     bool watching_ = false;
 };
@@ -56,7 +63,7 @@ private:
 /// person typed and makes room.
 template <class Screen>
 void closeView() {
-    if (DefaultInstance<Screen>::isLoaded() && DefaultInstance<Screen>::get().bShowing)
+    if (DefaultInstance<Screen>::isLoaded() && DefaultInstance<Screen>::get().bShowing())
         DefaultInstance<Screen>::unload();
 }
 

@@ -47,7 +47,7 @@ TEST_F(ReadOnlyView, ShowsAHospitalBillAndLocksIt) {
         {"Liquido", "€ 499,80"},
     };
     openView(movement(u"HOS"_s));
-    EXPECT_TRUE(form().bShowing);
+    EXPECT_TRUE(form().bShowing());
     for (const auto& [name, text] : fields)
         EXPECT_EQ(person.find(QString::fromLatin1(name))->property("text").toString(),
                   QString::fromUtf8(text));
@@ -75,7 +75,7 @@ TEST_F(ReadOnlyView, RegistoIsSilentAboutUnknownKeysAndTypesWithoutAScreen) {
     openView(movement(u"COR"_s));
     EXPECT_FALSE(person.isShown(u"frmMovimentos"_s));
     openView(movement(u"DOC"_s));
-    EXPECT_TRUE(form().bShowing) << "nothing of those stays in the way";
+    EXPECT_TRUE(form().bShowing()) << "nothing of those stays in the way";
 }
 
 }  // namespace

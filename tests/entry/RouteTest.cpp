@@ -145,7 +145,7 @@ TEST_F(Route, AnotherLoginOrOperationLeavesThePendingRowAndItPosts) {
     person.expectBox({.text = u"Há um lançamento por terminar."_s, .partly = true});
     General().Registo({}, key);
     General().Registo({}, 424242);
-    EXPECT_FALSE(form().bShowing);
+    EXPECT_FALSE(form().bShowing());
     EXPECT_EQ(form().Text6->Text(), u"€ 87,35"_s);
     EXPECT_EQ(form().Text12->Text(), u"a meio"_s);
     EXPECT_EQ(form().DataCombo1->Text(), u"0101  -  Consultas"_s);
@@ -165,7 +165,7 @@ TEST_F(Route, ReceiptIsShownBesideAnEntryUnderWayWhichKeepsItsRow) {
     EXPECT_EQ(person.peek<forms::TextBox>(u"No_Kor"_s)->Text(), u"100015"_s);
     person.accelerator(u'S');
     person.screen(u"frmMovimentos"_s);
-    EXPECT_FALSE(form().bShowing);
+    EXPECT_FALSE(form().bShowing());
     postAndLeave();
     EXPECT_EQ(book.text(u"select doc_valor from tbZelmar_Movimentos where movimento_no = 1"_s),
               u"87.35"_s);
@@ -200,7 +200,7 @@ TEST_F(Route, EntryThatCannotBeOpenedIsSaidAndLeavesNothingInTheWay) {
     person.accelerator(u'C');
     expectNoScreen();
     openView(key);
-    EXPECT_TRUE(form().bShowing);
+    EXPECT_TRUE(form().bShowing());
 }
 
 }  // namespace

@@ -20,6 +20,7 @@
 #include "platform/com/Component.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
+#include "platform/forms/RecordScreen.h"
 #include "platform/registry/LoginValues.h"
 #include "tests/support/Book.h"
 #include "tests/support/Operator.h"
@@ -374,12 +375,33 @@ TEST_F(PrincipalWindow, AnAnnulmentAndANewMovementRefreshTheListAndKeepTheOneInH
     EXPECT_TRUE(list->model()->index(0, 0).data(Qt::FontRole).value<QFont>().strikeOut());
 }
 
+/// Stands for one of the component's screens.
+class SomeEntry : public forms::RecordScreen {
+public:
+    explicit SomeEntry(const QString& connectionString)
+        : RecordScreen(u"frmMovimentos"_s, u"Lançamento"_s) {
+        connection_->ConnectionString = connectionString;
+        connection_->Open();
+        type();
+    }
+    void type() {
+        const auto rows = ado::Recordset::create();
+        rows->Open(u"select * from tbZelmar_Movimentos where movimento_id = 0"_s, connection_,
+                   ado::adOpenStatic, ado::adLockPessimistic);
+        showNew(rows);
+    }
+    void view() { attach(Adodc1->Recordset()); }
+
+protected:
+    void setDefaults() override {}
+    void post() override {}
+
+private:
+    ado::ConnectionPtr connection_ = std::make_shared<ado::Connection>();
+};
+
 TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
-    QWidget entry;
-    entry.setObjectName(u"frmMovimentos"_s);
-    auto* button = new QPushButton(u"&OK"_s, &entry);
-    button->setObjectName(u"Command3"_s);
-    entry.show();
+    SomeEntry entry(book_.connectionString());
     for (const char* name : {"NewMovimento", "NewMovimentoHospital"}) {
         person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
         window_.findChild<QAction*>(QString::fromLatin1(name))->trigger();
@@ -391,13 +413,13 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
         {.text = u"Quer voltar ao lançamento?"_s, .answer = core::Answer::Yes, .partly = true});
     EXPECT_FALSE(window_.close());
 
-    button->setText(u"&Sair"_s);  // shows a movement: nothing to lose
+    entry.view();
     window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
     EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
 
     // A receipt under way keeps its own screen; other operations go on.
     entry.setObjectName(u"frmRecebimento"_s);
-    button->setText(u"&OK"_s);
+    entry.type();
     person_.expectBox({.text = u"Já há um lançamento aberto"_s, .partly = true});
     person_.find<QTableView>(u"Lista"_s)->selectRow(1);
     for (const char* name : {"Recebimento", "Correcao", "Registo"})
