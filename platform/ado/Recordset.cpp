@@ -82,7 +82,7 @@ const QString& Recordset::Source() const {
 
 bool Recordset::atEnd() const {
     d->requireOpen();
-    return d->at == At::Nothing;
+    return d->current.isNothing();
 }
 
 void Recordset::MoveFirst() {
@@ -119,7 +119,8 @@ void Recordset::Update(const Accompaniment& with) {
 }
 
 void Recordset::CancelUpdate() {
-    d->cancel();
+    d->requireOpen();
+    d->current.cancel(d->isOutdated());
     emit currentRowChanged();
 }
 
@@ -129,7 +130,7 @@ void Recordset::Delete() {
 }
 
 bool Recordset::isNewRow() const {
-    return d->at == At::New;
+    return d->current.isNew();
 }
 
 Field Recordset::Fields(const QString& name) {
@@ -158,7 +159,8 @@ QVariant Recordset::Collect(const QString& name) const {
 QVariant Recordset::readValue(const QString& name) const {
     const int column = d->columnOf(name);
     d->requireRow();
-    return d->at == At::Row ? toVariant(d->rows->cell(column), d->typeOf(column)) : QVariant();
+    if (d->current.isNew() || d->current.at() != At::Queried) return {};
+    return toVariant(d->rows->cell(column), d->rows->columns().column(column).type);
 }
 
 Cell Recordset::readCell(int column) const {

@@ -2,39 +2,14 @@
 #pragma once
 
 #include <QHash>
-#include <algorithm>
-#include <optional>
-#include <unordered_map>
 
+#include "platform/ado/CurrentRow.h"
+#include "platform/ado/OwnWrites.h"
 #include "platform/ado/Recordset.h"
 #include "platform/ado/Rows.h"
 #include "platform/ado/dialect/ShapeQuery.h"
 
 namespace ado {
-
-/// Values of a row by column, few of them.
-class Changes {
-public:
-    bool isEmpty() const { return values_.empty(); }
-    void clear() { values_.clear(); }
-    const QVariant* find(int column) const {
-        for (const auto& value : values_)
-            if (value.first == column) return &value.second;
-        return nullptr;
-    }
-    void set(int column, const QVariant& value) {
-        for (auto& known : values_)
-            if (known.first == column) {
-                known.second = value;
-                return;
-            }
-        values_.emplace_back(column, value);
-    }
-    const std::vector<std::pair<int, QVariant>>& values() const { return values_; }
-
-private:
-    std::vector<std::pair<int, QVariant>> values_;
-};
 
 /// Child rows of a SHAPE, by the value that relates them.
 struct ChapterRows {
@@ -43,9 +18,6 @@ struct ChapterRows {
     std::shared_ptr<Pass> description;
     QHash<QString, std::shared_ptr<RowStore>> byKey;
 };
-
-/// What is current. An added row is one that this set inserted; it is read back when looked at.
-enum class At { Nothing, Row, Added, New };
 
 /// State and work of a row set; Recordset adds the signals.
 struct Recordset::Implementation {
@@ -60,76 +32,55 @@ struct Recordset::Implementation {
     QString book;                ///< where the rows came from; empty for the rows of a chapter
     std::shared_ptr<ChapterRows> chapter;
 
-    At at = At::Nothing;
-    At before = At::Nothing;  ///< what was current when a new row was started
-    qint64 addedAt = 0;
-    std::vector<RowIdentity> added;
-    Changes changes;  ///< written to the current row and not stored yet
-    RowStore fresh;   ///< the current row, read afresh from the table
-    bool wantsFresh = false;
-    std::unique_ptr<RowLock> held;
-    bool wasHeld = false;  ///< `fresh` was read under a lock, which may be gone by now
+    CurrentRow current;
+    OwnWrites own;
     std::unique_ptr<RowLock> heldPlace;  ///< of the first row of a table that has none
-    bool settled =
-        false;  ///< the current row was stored; until it is changed again nobody holds it
-    bool deleted = false;                        ///< the current row was deleted here
-    std::unordered_map<qint64, Changes> stored;  ///< by row in memory: what this set stored there
-    std::vector<bool> storedFar;                 ///< rows of a long set that this set stored
-    std::vector<qint64> gone;                    ///< rows that this set deleted, ascending
 
     struct Name {
         QString text;
         int column = -1;
     };
     mutable Name names[64];  ///< names found lately, by the place of their text
-    std::vector<std::optional<ColumnType>> types;  ///< of the columns that were read
 
     // Opening.
     void openRows();
-    void openStatement(const Query& statement);
-    void openShape(const Query& statement);
+    void openQuery(const Query& query);
+    void openShape(const Query& query);
     void close();
 
     // Moving.
-    void leaveRow();
     void toFirst();
     void toNext();
     void toLast();
-    void toRow(qint64 row);
-    /// Settles on a row of the statement, or passes it when it is gone.
+    void toRow(qint64 place);
+    /// Stands on a row of the query, or passes it when it is gone.
     void arrive(bool found);
-    bool isStoredFar(qint64 row) const {
-        const auto place = static_cast<std::size_t>(row);
-        return place < storedFar.size() && storedFar[place];
+    void standOnInserted(qint64 which) {
+        current.standOn(which < own.insertedCount() ? At::Inserted : At::Nothing, true, which);
     }
-    /// True for a row of the statement that may be another by now.
-    bool isOutdated(qint64 row) const {
-        return (cursor == adOpenDynamic && !table.isEmpty()) || isStoredFar(row);
-    }
-    void noteStored();
-    bool isGone(qint64 row) const { return std::binary_search(gone.begin(), gone.end(), row); }
-    qint64 recordCount() const;
-    qint64 rowsInMemory() const;
-    /// The statement's row that a list shows at that place.
-    qint64 shown(qint64 place) const;
+    bool isDynamic() const { return cursor == adOpenDynamic && !table.isEmpty(); }
+    /// True for a row of the query that may be another by now.
+    bool isOutdated(qint64 row) const { return isDynamic() || own.isMarked(row); }
+    bool isOutdated() const { return current.at() != At::Queried || isOutdated(rows->row()); }
+    qint64 recordCount() const { return rows->count() < 0 ? -1 : own.shownOf(rows->count()); }
+    qint64 rowsInMemory() const { return rows && rows->inMemory() ? recordCount() : 0; }
 
     // Reading.
     int find(const QString& name) const;
     int columnOf(const QString& name) const;
     QVariant value(int column);
     QVariant valueAt(qint64 place, int column);
-    RowIdentity identity();
+    TableRow tableRow();
     /// Takes the lock that the current row needs and reads the row afresh where that is called for.
     void look() {
-        if (!table.isEmpty()) lookAtRow();
+        const bool pessimistic = lockType == adLockPessimistic;
+        if (!table.isEmpty() && current.needsLook(pessimistic))
+            current.look(tableRow(), pessimistic);
     }
-    void lookAtRow();
-    bool isHeld() const { return held && held->isUnbroken(); }
-    /// Takes a lock again that went with its connection; fails with RowInUse when the row is not
-    /// any more as it was read.
-    void holdStill();
-    ColumnType typeOf(int column);
-    bool readFresh();
+    /// Takes a lock again that went with its connection.
+    void holdStill() {
+        if (current.isHoldBroken()) current.holdAgain(tableRow());
+    }
 
     // Writing.
     void requireOpen() const {
@@ -137,7 +88,7 @@ struct Recordset::Implementation {
     }
     void requireRow() const {
         requireOpen();
-        if (at == At::Nothing || deleted) refuseNoRow();
+        if (!current.exists()) refuseNoRow();
     }
     [[noreturn]] static void refuseClosed();
     [[noreturn]] static void refuseNoRow();
@@ -148,9 +99,10 @@ struct Recordset::Implementation {
     bool setValue(int column, const QVariant& value);
     void addNew();
     void update(const Accompaniment& with);
+    /// The changes by the names of their columns.
+    std::pair<QStringList, std::vector<QVariant>> written() const;
     void insertNew(const Accompaniment& with);
     void updateCurrent(const Accompaniment& with);
-    void cancel();
     void remove();
 };
 

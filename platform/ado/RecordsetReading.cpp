@@ -1,7 +1,5 @@
 // SPDX-License-Identifier: MIT
 // Opening, moving and reading of row sets.
-#include <limits>
-
 #include "platform/ado/RecordsetImplementation.h"
 #include "platform/ado/dialect/Query.h"
 #include "platform/ado/engine/ColumnValue.h"
@@ -33,38 +31,38 @@ int requireColumn(const Pass& pass, const QString& name) {
 void Recordset::Implementation::openRows() {
     const std::shared_ptr<Session> engine = connection->session();
     engine->setTimeout(connection->CommandTimeout);
-    const Query statement(source);
-    statement.requireQuery(connection->shapes());
+    const Query query(source);
+    query.requireQuery(connection->shapes());
     book = engine->book();
     try {
-        if (ShapeQuery::isShape(statement)) {
-            openShape(statement);
+        if (ShapeQuery::isShape(query)) {
+            openShape(query);
         } else {
-            openStatement(statement);
+            openQuery(query);
         }
     } catch (const core::Failure& failure) {
         throw explained(failure, source);
     }
-    at = rows->toFirst() ? At::Row : At::Nothing;
+    current.standOn(rows->toFirst() ? At::Queried : At::Nothing, false);
 }
 
-void Recordset::Implementation::openStatement(const Query& statement) {
+void Recordset::Implementation::openQuery(const Query& query) {
     Session& engine = *connection->session();
-    if (!readOnly()) table = statement.singleTable();
+    if (!readOnly()) table = query.singleTable();
     if (!table.isEmpty() && !engine.isTable(table)) table.clear();
-    rows = std::make_unique<Rows>(engine.open(statement, table), clientSide);
+    rows = std::make_unique<Rows>(engine.open(query, table), clientSide);
     // A counter without its row: of all that find none, one alone adds it; the others wait here
     // and find it then.
     const bool isCounter = cursor == adOpenDynamic && lockType == adLockPessimistic;
     if (!isCounter || table.isEmpty() || rows->toFirst()) return;
     RowStore nothing;
     heldPlace = engine.lock(table, NoRow, connection->CommandTimeout, nothing);
-    rows = std::make_unique<Rows>(engine.open(statement, table), clientSide);
+    rows = std::make_unique<Rows>(engine.open(query, table), clientSide);
     if (rows->toFirst()) heldPlace.reset();
 }
 
-void Recordset::Implementation::openShape(const Query& statement) {
-    const ShapeQuery shape = ShapeQuery::parse(statement);
+void Recordset::Implementation::openShape(const Query& query) {
+    const ShapeQuery shape = ShapeQuery::parse(query);
     const Query parent(shape.parent);
     const Query child(shape.child);
     parent.requireQuery(false);
@@ -91,99 +89,58 @@ void Recordset::Implementation::openShape(const Query& statement) {
 }
 
 void Recordset::Implementation::close() {
-    leaveRow();
+    current.standOn(At::Nothing, false);
+    own = {};
     heldPlace.reset();
     rows.reset();
     chapter.reset();
     table.clear();
     book.clear();
-    added.clear();
-    stored.clear();
-    storedFar.clear();
-    gone.clear();
-    types.clear();
     for (Name& name : names) name = {};
-    at = At::Nothing;
 }
 
 // --- Moving
 
-void Recordset::Implementation::leaveRow() {
-    if (at == At::New) at = before;
-    changes.clear();
-    fresh.clear();
-    wantsFresh = settled = deleted = wasHeld = false;
-    held.reset();
-}
-
 void Recordset::Implementation::toFirst() {
-    leaveRow();
+    current.leave();
     arrive(rows->toFirst());
 }
 
 void Recordset::Implementation::toNext() {
-    leaveRow();
-    if (at == At::Row) {
+    current.leave();
+    if (current.at() == At::Queried)
         arrive(rows->toNext());
-    } else if (at == At::Added && ++addedAt >= static_cast<qint64>(added.size())) {
-        at = At::Nothing;
-    }
-    wantsFresh = at == At::Added || wantsFresh;
+    else if (current.at() == At::Inserted)
+        standOnInserted(current.inserted() + 1);
 }
 
 void Recordset::Implementation::arrive(bool found) {
     for (; found; found = rows->toNext()) {
-        if (isGone(rows->row())) continue;
-        at = At::Row;
-        wantsFresh = isOutdated(rows->row());
-        if (cursor != adOpenDynamic || table.isEmpty() || readFresh()) return;
+        if (own.isDeleted(rows->row())) continue;
+        current.standOn(At::Queried, isOutdated(rows->row()));
+        if (!isDynamic() || current.read(tableRow())) return;
     }
-    addedAt = 0;
-    at = added.empty() ? At::Nothing : At::Added;
-    wantsFresh = at == At::Added;
+    standOnInserted(0);
 }
 
 void Recordset::Implementation::toLast() {
-    leaveRow();
-    bool found = rows->toLast();
-    if (!added.empty()) {
-        at = At::Added;
-        addedAt = static_cast<qint64>(added.size()) - 1;
-        wantsFresh = true;
-        return;
-    }
+    current.leave();
+    rows->toLast();
+    if (own.insertedCount() > 0) return standOnInserted(own.insertedCount() - 1);
     qint64 row = rows->row();
-    while (found && isGone(row)) found = --row >= 0;
-    if (found) rows->toRow(row);
-    at = found ? At::Row : At::Nothing;
-    wantsFresh = found && isOutdated(row);
+    while (row >= 0 && own.isDeleted(row)) --row;
+    if (row < 0) return current.standOn(At::Nothing, false);
+    rows->toRow(row);
+    current.standOn(At::Queried, isOutdated(row));
 }
 
 void Recordset::Implementation::toRow(qint64 place) {
     if (place < 0 || place >= rowsInMemory())
         throw core::Failure(core::NoCurrentRow, u"A linha pedida não existe."_s);
-    leaveRow();
-    const qint64 row = shown(place);
-    at = row < rows->count() ? At::Row : At::Added;
-    if (at == At::Row)
-        rows->toRow(row);
-    else
-        addedAt = row - rows->count();
-    wantsFresh = at == At::Added || isOutdated(row);
-}
-
-qint64 Recordset::Implementation::recordCount() const {
-    if (rows->count() < 0) return -1;
-    return rows->count() - static_cast<qint64>(gone.size()) + static_cast<qint64>(added.size());
-}
-
-qint64 Recordset::Implementation::rowsInMemory() const {
-    return rows && rows->inMemory() ? recordCount() : 0;
-}
-
-qint64 Recordset::Implementation::shown(qint64 place) const {
-    for (const qint64 row : gone) place += row <= place ? 1 : 0;
-    return place;
+    const qint64 row = own.shownAt(place);
+    if (row >= rows->count()) return standOnInserted(row - rows->count());
+    rows->toRow(row);
+    current.standOn(At::Queried, isOutdated(row));
 }
 
 // --- Reading
@@ -206,73 +163,35 @@ int Recordset::Implementation::columnOf(const QString& name) const {
 
 QVariant Recordset::Implementation::value(int column) {
     requireRow();
-    if (const QVariant* changed = changes.find(column)) return *changed;
-    if (at == At::New) return {};
+    const auto& changes = current.changes();
+    if (const auto change = changes.find(column); change != changes.end()) return change->second;
+    if (current.isNew()) return {};
     look();
-    const ColumnType type = typeOf(column);
-    if (fresh.count() > 0) return toVariant(fresh.cell(0, column), type);
-    if (at == At::Added) return {};  // deleted by somebody else since
-    if (!stored.empty())
-        if (const auto row = stored.find(rows->row()); row != stored.end())
-            if (const QVariant* known = row->second.find(column)) return *known;
+    const ColumnType type = rows->columns().column(column).type;
+    if (current.isFresh()) return toVariant(current.cell(column), type);
+    if (current.at() == At::Inserted) return {};  // deleted by somebody else since
+    if (const QVariant* known = own.stored(rows->row(), column)) return *known;
     return toVariant(rows->cell(column), type);
 }
 
-ColumnType Recordset::Implementation::typeOf(int column) {
-    const Pass& pass = rows->columns();
-    if (types.empty()) types.resize(static_cast<std::size_t>(pass.columnCount()));
-    std::optional<ColumnType>& known = types[static_cast<std::size_t>(column)];
-    if (!known) known = pass.column(column).type;
-    return *known;
-}
-
 QVariant Recordset::Implementation::valueAt(qint64 place, int column) {
-    const qint64 row = shown(place);
+    const qint64 row = own.shownAt(place);
     const ColumnType type = rows->columns().column(column).type;
-    if (row >= rows->count() || isStoredFar(row)) {
+    const qint64 inserted = row - rows->count();
+    if (inserted >= 0 || own.isMarked(row)) {
         RowStore store;
-        const RowIdentity which = row < rows->count()
-                                      ? rows->identityAt(row)
-                                      : added[static_cast<std::size_t>(row - rows->count())];
-        if (!session()->read(table, which, store)) return {};
+        const RowIdentity identity = inserted >= 0 ? own.inserted(inserted) : rows->identityAt(row);
+        if (!session()->read(table, identity, store)) return {};
         return toVariant(store.cell(0, column), type);
     }
-    if (const auto known = stored.find(row); known != stored.end())
-        if (const QVariant* changed = known->second.find(column)) return *changed;
+    if (const QVariant* known = own.stored(row, column)) return *known;
     return toVariant(rows->cellAt(row, column), type);
 }
 
-RowIdentity Recordset::Implementation::identity() {
-    return at == At::Added ? added[static_cast<std::size_t>(addedAt)] : rows->identity();
-}
-
-void Recordset::Implementation::lookAtRow() {
-    if (lockType == adLockPessimistic && !wasHeld && !settled) {
-        fresh.clear();
-        held = session()->lock(table, identity(), connection->CommandTimeout, fresh);
-        wasHeld = true;
-        wantsFresh = false;
-    }
-    if (wantsFresh) readFresh();
-}
-
-void Recordset::Implementation::holdStill() {
-    if (!wasHeld || isHeld()) return;
-    held.reset();
-    RowStore now;
-    std::unique_ptr<RowLock> again =
-        session()->lock(table, identity(), connection->CommandTimeout, now);
-    if (now != fresh)
-        throw core::Failure(core::RowInUse,
-                            u"A ligação a «%1» perdeu-se e a linha foi entretanto alterada por "
-                            u"outro posto; nada foi gravado. Leia-a de novo."_s.arg(book));
-    held = std::move(again);
-}
-
-bool Recordset::Implementation::readFresh() {
-    wantsFresh = false;
-    fresh.clear();
-    return session()->read(table, identity(), fresh);
+TableRow Recordset::Implementation::tableRow() {
+    const bool isInserted = current.at() == At::Inserted;
+    return {session(), table, isInserted ? own.inserted(current.inserted()) : rows->identity(),
+            connection->CommandTimeout};
 }
 
 // --- Requirements
