@@ -64,4 +64,19 @@ TEST_F(Deleting, TheLastRowsLeavesTheRowBeforeThemTheLast) {
     }
 }
 
+TEST_F(Deleting, ARowStaysDeletedWhenANewOneBehindItIsDropped) {
+    fill(1);
+    const auto rows = open(u"select * from tbMov"_s, connection, ado::adLockOptimistic);
+    for (const bool inserted : {false, true}) {
+        SCOPED_TRACE(inserted);
+        if (inserted) add(rows, u"a"_s);
+        rows->Delete();
+        rows->AddNew();
+        rows->CancelUpdate();
+        EXPECT_EQ(failureOf([&] { rows->Collect(u"nome"_s); }).number(), core::NoCurrentRow);
+        rows->MoveNext();
+        EXPECT_TRUE(rows->atEnd());
+    }
+}
+
 }  // namespace
