@@ -158,14 +158,13 @@ QVariant Recordset::Collect(const QString& name) const {
 
 QVariant Recordset::readValue(const QString& name) const {
     const int column = d->columnOf(name);
-    d->requireRow();
-    if (d->current.isNew() || d->current.at() != At::Queried) return {};
-    return toVariant(d->rows->cell(column), d->rows->columns().column(column).type);
+    return toVariant(readCell(column), d->rows->columns().column(column).type);
 }
 
 Cell Recordset::readCell(int column) const {
     d->requireRow();
-    return d->at == At::Row ? d->rows->cell(column) : Cell();
+    const bool isQueried = !d->current.isNew() && d->current.at() == At::Queried;
+    return isQueried ? d->rows->cell(column) : Cell();
 }
 
 void Recordset::setCollect(const QString& name, const QVariant& value) {
