@@ -123,11 +123,11 @@ TEST_F(Writing, ThroughAnOptimisticSetStoresEveryAssignment) {
             rows->MoveNext();
             rows->MoveFirst();
             EXPECT_EQ(rows->Collect(u"obs"_s).toString(), text) << last;
+            rows->AddNew();
+            rows->CancelUpdate();
+            EXPECT_EQ(rows->Collect(u"obs"_s).toString(), text) << last;
             EXPECT_EQ(book.value(u"SELECT obs FROM tbMov WHERE id = 1"_s).toString(), text);
         }
-        rows->AddNew();
-        rows->CancelUpdate();
-        EXPECT_EQ(rows->Collect(u"obs"_s), u"um"_s);
         rows->readAll();
         EXPECT_EQ(rows->valueAt(0, 7), u"um"_s);
     }
