@@ -32,10 +32,12 @@ void Translation::orderTerm(int first, int behind) {
 // Nulls come before all values. A table's identity has none and is found in its order as it is.
 void Translation::orderNulls(int first, int behind) {
     const bool descends = s.is(behind - 1, "desc"_L1);
+    const QString order = orderOfNulls(descends);
+    if (order.isEmpty()) return;
     const int end = descends || s.is(behind - 1, "asc"_L1) ? behind - 1 : behind;
     if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return;
     const Token& last = s.token(behind - 1);
-    edits_.insert(last.at + last.length, orderOfNulls(descends));
+    edits_.insert(last.at + last.length, order);
 }
 
 bool Translation::isIdentity(const ColumnName& column) {
