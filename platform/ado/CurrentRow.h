@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <map>
-
+#include "platform/ado/OwnWrites.h"
 #include "platform/ado/engine/RowStore.h"
 
 namespace ado {
@@ -39,8 +38,8 @@ public:
     void noteDeleted();
 
     /// What was written and is not stored yet, by column.
-    const std::map<int, QVariant>& changes() const { return changes_; }
-    void change(int column, const QVariant& value) { changes_[column] = value; }
+    const Changes& changes() const { return changes_; }
+    void change(int column, const QVariant& value) { put(changes_, column, value); }
     /// Drops the changes or the new row.
     /// @param isOutdated  as for standOn(), of the row that is come back to
     void cancel(bool isOutdated);
@@ -78,7 +77,7 @@ private:
     qint64 inserted_ = 0;
     bool isNew_ = false;
     bool isDeleted_ = false;  ///< the row stood on, by this set
-    std::map<int, QVariant> changes_;
+    Changes changes_;
     RowStore fresh_;  ///< empty, or the row
     bool isOutdated_ = false;
     Hold hold_ = Hold::None;

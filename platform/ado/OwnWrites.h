@@ -3,13 +3,33 @@
 
 #include <QVariant>
 #include <algorithm>
-#include <map>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "platform/ado/engine/Column.h"
 
 namespace ado {
+
+/// Values of a row by column, few of them.
+using Changes = std::vector<std::pair<int, QVariant>>;
+
+/// The value of a column among them; null for none.
+inline const QVariant* find(const Changes& changes, int column) {
+    for (const auto& [each, value] : changes)
+        if (each == column) return &value;
+    return nullptr;
+}
+
+/// Puts a value in the place of the column's former one, or behind the others.
+inline void put(Changes& changes, int column, const QVariant& value) {
+    for (auto& [each, known] : changes)
+        if (each == column) {
+            known = value;
+            return;
+        }
+    changes.emplace_back(column, value);
+}
 
 /// What a row set wrote to its table since its query ran. The query's rows are numbered from 0 and
 /// stay as they were read; this tells which of them are others by now. The rows that the set
@@ -19,13 +39,13 @@ public:
     /// @param values  what was stored there, by column
     /// @param inMemory  rows in memory are few, and what was stored there is kept; of the rows of a
     /// long pass a mark each is all that it may cost, and such a row is read afresh
-    void noteStored(qint64 row, const std::map<int, QVariant>& values, bool inMemory) {
+    void noteStored(qint64 row, const Changes& values, bool inMemory) {
         const auto place = static_cast<std::size_t>(row);
         if (!inMemory && place >= marked_.size()) marked_.resize(place + 1);
         if (!inMemory)
             marked_[place] = true;
         else
-            for (const auto& [column, value] : values) stored_[row][column] = value;
+            for (const auto& [column, value] : values) put(stored_[row], column, value);
     }
     void noteDeleted(qint64 row) {
         deleted_.insert(std::upper_bound(deleted_.begin(), deleted_.end(), row), row);
@@ -36,9 +56,7 @@ public:
     /// The value that was stored there and kept; null for none.
     const QVariant* stored(qint64 row, int column) const {
         const auto values = stored_.find(row);
-        if (values == stored_.end()) return nullptr;
-        const auto value = values->second.find(column);
-        return value != values->second.end() ? &value->second : nullptr;
+        return values == stored_.end() ? nullptr : find(values->second, column);
     }
     /// True for a row that was stored without its values being kept.
     bool isMarked(qint64 row) const {
@@ -63,7 +81,7 @@ public:
     }
 
 private:
-    std::unordered_map<qint64, std::map<int, QVariant>> stored_;
+    std::unordered_map<qint64, Changes> stored_;
     std::vector<bool> marked_;
     std::vector<qint64> deleted_;  ///< ascending
     std::vector<RowIdentity> inserted_;

@@ -163,8 +163,7 @@ int Recordset::Implementation::columnOf(const QString& name) const {
 
 QVariant Recordset::Implementation::value(int column) {
     requireRow();
-    const auto& changes = current.changes();
-    if (const auto change = changes.find(column); change != changes.end()) return change->second;
+    if (const QVariant* change = ado::find(current.changes(), column)) return *change;
     if (current.isNew()) return {};
     look();
     const ColumnType type = rows->columns().column(column).type;

@@ -26,7 +26,8 @@ bool Recordset::Implementation::setValue(int column, const QVariant& value) {
         look();
         holdStill();
         // Only a row that is held still is what it was read as.
-        if (current.isHeld() && !current.changes().contains(column) && this->value(column) == kept)
+        if (current.isHeld() && !ado::find(current.changes(), column) &&
+            this->value(column) == kept)
             return false;
     }
     current.change(column, kept);

@@ -188,7 +188,8 @@ TEST_F(Extratos, PreviewIsWaitedForAndItsRowsAreClosed) {
         person.fill(u"No_Kor"_s, u"100015"_s);
         choose(u"Check1"_s, false);
         choose(u"Check2"_s, false);
-        openReportRows(u"Print_Extrato1"_s, u"SELECT 1 AS outra"_s);  // as a modeless preview leaves it
+        openReportRows(u"Print_Extrato1"_s,
+                       u"SELECT 1 AS outra"_s);  // as a modeless preview leaves it
         person.onScreen(u"rptExtrato2"_s, [&] {
             EXPECT_EQ(rows->State(), ado::adStateOpen);
             EXPECT_TRUE(rows->hasColumn(u"saldo"_s));

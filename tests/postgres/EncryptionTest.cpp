@@ -10,7 +10,6 @@
 
 #include "database/ServerBook.h"
 #include "platform/ado/Connection.h"
-#include "platform/ado/Connection.h"
 #include "platform/ado/postgres/Handle.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Server.h"
