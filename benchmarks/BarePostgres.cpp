@@ -17,10 +17,10 @@ namespace {
 }
 
 PGconn* connect(const Book& book) {
-    const database::ServerCatalogue server = book.server();
-    PGconn* connection =
-        PQsetdbLogin(server.host.toUtf8().constData(), nullptr, nullptr, nullptr,
-                     server.name.toUtf8().constData(), server.user.toUtf8().constData(), nullptr);
+    const ado::postgres::Address server = book.server();
+    PGconn* connection = PQsetdbLogin(server.host.toUtf8().constData(), nullptr, nullptr, nullptr,
+                                      server.catalog.toUtf8().constData(),
+                                      server.user.toUtf8().constData(), nullptr);
     if (PQstatus(connection) != CONNECTION_OK) stop(connection, "connect");
     return connection;
 }

@@ -11,6 +11,7 @@
 #include "benchmarks/BenchServer.h"
 #include "boundary/Login.h"
 #include "database/Book.h"
+#include "platform/ado/postgres/BulkAccess.h"
 #include "platform/registry/LoginValues.h"
 
 using namespace Qt::StringLiterals;
@@ -63,23 +64,24 @@ Book serverBook(const QString& name) {
 
 Book serverBook(const QString& name, const database::BookSizes& sizes) {
     const Book made = serverBook(name);
-    database::postgres::Database server(serverBook(u"postgres"_s).server());
+    ado::postgres::BulkAccess server(serverBook(u"postgres"_s).server());
     if (server.number(
             "SELECT EXISTS (SELECT FROM pg_database WHERE datname = " + server.literal(name) + ')'))
         return made;
     tell(name + u" (server)"_s);
     const Book half = serverBook(name + u"_half"_s);
-    server.run("DROP DATABASE IF EXISTS " + server.name(half.catalogue));
-    server.run("CREATE DATABASE " + server.name(half.catalogue) + " TEMPLATE template0");
+    server.execute("DROP DATABASE IF EXISTS " + server.name(half.catalogue));
+    server.execute("CREATE DATABASE " + server.name(half.catalogue) + " TEMPLATE template0");
     database::createBook(half.server());
     database::fillSample(half.server(), sizes, AsOf);
     {
         // The rows of a book that grew by itself lie in the order of their numbers.
-        database::postgres::Database book(half.server());
-        book.run("CLUSTER tbZelmar_Movimentos USING tbZelmar_Movimentos_pkey");
-        book.run("VACUUM ANALYZE");
+        ado::postgres::BulkAccess book(half.server());
+        book.execute("CLUSTER tbZelmar_Movimentos USING tbZelmar_Movimentos_pkey");
+        book.execute("VACUUM ANALYZE");
     }
-    server.run("ALTER DATABASE " + server.name(half.catalogue) + " RENAME TO " + server.name(name));
+    server.execute("ALTER DATABASE " + server.name(half.catalogue) + " RENAME TO " +
+                   server.name(name));
     return made;
 }
 
@@ -106,7 +108,7 @@ QString Book::file() const {
     return database::bookFile(folder, Catalogue);
 }
 
-database::ServerCatalogue Book::server() const {
+ado::postgres::Address Book::server() const {
     return {folder, {}, QString::fromLatin1(BenchServer::User), {}, catalogue};
 }
 
@@ -145,15 +147,15 @@ BookCopy::BookCopy(const Book& original) : book_(original) {
         QFile::copy(original.file(), book_.file());
     } else {
         book_.catalogue += u"_copy"_s;
-        database::postgres::Database server(serverBook(u"postgres"_s).server());
-        server.run("DROP DATABASE IF EXISTS " + server.name(book_.catalogue) + " WITH (FORCE)");
+        ado::postgres::BulkAccess server(serverBook(u"postgres"_s).server());
+        server.execute("DROP DATABASE IF EXISTS " + server.name(book_.catalogue) + " WITH (FORCE)");
         // A catalogue that is copied must have no connections; those of this program are opened
         // anew.
         server.number(
             "SELECT count(pg_terminate_backend(pid, 5000)) FROM pg_stat_activity WHERE datname = " +
             server.literal(original.catalogue));
-        server.run("CREATE DATABASE " + server.name(book_.catalogue) + " TEMPLATE " +
-                   server.name(original.catalogue));
+        server.execute("CREATE DATABASE " + server.name(book_.catalogue) + " TEMPLATE " +
+                       server.name(original.catalogue));
     }
 }
 
@@ -161,8 +163,8 @@ BookCopy::~BookCopy() {
     if (book_.engine == Engine::Sqlite) {
         QDir(book_.folder).removeRecursively();
     } else {
-        database::postgres::Database server(serverBook(u"postgres"_s).server());
-        server.run("DROP DATABASE " + server.name(book_.catalogue) + " WITH (FORCE)");
+        ado::postgres::BulkAccess server(serverBook(u"postgres"_s).server());
+        server.execute("DROP DATABASE " + server.name(book_.catalogue) + " WITH (FORCE)");
     }
 }
 

@@ -19,8 +19,8 @@ struct Book {
     QString folder;     ///< of the file, or of the server's socket
     QString catalogue;  ///< of a server; an SQLite book has the usual name
 
-    QString file() const;                      ///< of an SQLite book
-    database::ServerCatalogue server() const;  ///< of a server's book
+    QString file() const;                   ///< of an SQLite book
+    ado::postgres::Address server() const;  ///< of a server's book
     /// What a connection opens it by.
     QString connectionString() const;
 };

@@ -12,12 +12,10 @@
 #include <algorithm>
 #include <cerrno>
 
-#include "database/SchemaText.h"
-#include "database/Sqlite.h"
-#include "database/SqliteBookWriter.h"
+#include "database/Schema.h"
 #include "database/sample/SampleBook.h"
 #include "platform/ado/engine/ConnectionSettings.h"
-#include "platform/core/Clock.h"
+#include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/LoginValues.h"
 #include "platform/registry/Registry.h"
@@ -81,18 +79,17 @@ private:
 /// Makes the book under a name of its own first; the book's name appears when all of it stands. The
 /// other name stays.
 void makeStaged(const QString& file, const BookOwners& owners,
-                const std::function<void(sqlite::Database&)>& fill) {
+                const std::function<void(ado::BulkAccess&)>& fill) {
     const QString staged = stagedFile(file);
     removeBook(staged);
     auto cleanup = qScopeGuard([&] { removeBook(staged); });
     owners.makeFile(staged);
     {
-        sqlite::Database book(staged, sqlite::Database::Mode::OpenExisting);
-        book.run("PRAGMA journal_mode=WAL; PRAGMA synchronous=FULL; BEGIN");
-        book.run(schemaText(u"sqlite.sql"_s));
-        book.run(schemaText(u"codes.sql"_s));
-        book.run("COMMIT");
+        ado::sqlite::BulkAccess book(staged);
+        book.begin(ado::BulkAccess::Purpose::Filling);
+        makeTables(book);
         if (fill) fill(book);
+        book.commit();
     }
     // Neither way goes over an existing file. Not every file system knows a second name.
     const bool isNamed =
@@ -124,15 +121,8 @@ void refuseUnnameable(const QString& folder) {
             .arg(registry::LongestValue - (source.size() - QDir(folder).absolutePath().size())));
 }
 
-void writeSample(sqlite::Database& book, const BookSizes& sizes, QDate asOf) {
-    SqliteBookWriter writer(book);
-    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
-    writer.commit();
-}
-
 bool hasMembers(const QString& file) {
-    sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
-    return book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)");
+    return ado::sqlite::BulkAccess(file).number("SELECT EXISTS (SELECT 1 FROM tbSocios)");
 }
 
 }  // namespace
@@ -142,7 +132,7 @@ QString bookFile(const QString& folder, const QString& catalogue) {
 }
 
 void createBook(const QString& folder, const QString& catalogue,
-                const std::function<void(sqlite::Database&)>& fill) {
+                const std::function<void(ado::BulkAccess&)>& fill) {
     const QString file = bookFile(folder, catalogue);
     refuseExisting(file);
     const BookOwners owners;
@@ -168,12 +158,14 @@ void writeSettings(const QString& folder, const QString& catalogue) {
 
 void fillSample(const QString& folder, const QString& catalogue, const BookSizes& sizes,
                 QDate asOf) {
-    sqlite::Database book(bookFile(folder, catalogue), sqlite::Database::Mode::OpenExisting);
+    ado::sqlite::BulkAccess book(bookFile(folder, catalogue));
     if (book.number("SELECT EXISTS (SELECT 1 FROM tbSocios)"
                     " OR EXISTS (SELECT 1 FROM tbZelmar_Movimentos)") != 0)
         throw refusal(
             u"O livro «%1» já tem associados ou movimentos."_s.arg(bookFile(folder, catalogue)));
-    writeSample(book, sizes, asOf);
+    book.begin(ado::BulkAccess::Purpose::Filling);
+    sample::fill(book, sizes, asOf);
+    book.commit();
 }
 
 void initBook(const QString& folder, bool sample, const BookOwners& owners) {
@@ -189,8 +181,8 @@ void initBook(const QString& folder, bool sample, const BookOwners& owners) {
     const bool isCutOff = isUnfinished(file) && hasMembers(file) == sample;
     if (!isCutOff) {
         refuseExisting(file);
-        makeStaged(file, owners, [&](sqlite::Database& book) {
-            if (sample) writeSample(book, {}, {});
+        makeStaged(file, owners, [&](ado::BulkAccess& book) {
+            if (sample) sample::fill(book, {}, {});
         });
     }
     auto undo = qScopeGuard([&] {

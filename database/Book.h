@@ -11,11 +11,11 @@
 ///
 /// Every failure is a core::Failure with a Portuguese text (or the engine's own). Nothing half-made
 /// stays behind one.
-namespace database {
-
-namespace sqlite {
-class Database;
+namespace ado {
+class BulkAccess;
 }
+
+namespace database {
 
 /// How large a sample book is. The defaults are the sample that the documents show.
 struct BookSizes {
@@ -34,7 +34,7 @@ QString bookFile(const QString& folder, const QString& catalogue);
 /// if it is missing. Fails if the file is there already, whatever it holds. What `fill` puts into
 /// the book is there when the file appears; the book is not made when it fails.
 void createBook(const QString& folder, const QString& catalogue,
-                const std::function<void(sqlite::Database&)>& fill = {});
+                const std::function<void(ado::BulkAccess&)>& fill = {});
 
 /// Fills an empty book with members, rubrics, hospitals, premiums, movements, accumulators and
 /// closed years. All dates derive from `asOf`, an invalid one being today: the same sizes and day

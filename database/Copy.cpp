@@ -7,18 +7,17 @@
 #include <algorithm>
 
 #include "database/Book.h"
-#include "database/PostgresBookReader.h"
-#include "database/PostgresBookWriter.h"
-#include "database/SchemaText.h"
-#include "database/SqliteBookReader.h"
-#include "database/SqliteBookWriter.h"
-#include "platform/ado/postgres/Handle.h"
-#include "platform/ado/sqlite/BookFile.h"
+#include "database/Schema.h"
+#include "platform/ado/postgres/BulkAccess.h"
+#include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/core/Failure.h"
 
 namespace database {
 
 using namespace Qt::StringLiterals;
+using ado::BulkAccess;
+using ado::TableShape;
+using ado::TableShapes;
 
 namespace {
 
@@ -45,16 +44,16 @@ QSet<QByteArray> filledTables() {
 struct Pair {
     TableShape from;
     TableShape into;
-    Totals totals;
+    ado::Totals totals;
 };
 
 /// The shape with its columns in the order of another one.
-TableShape ordered(const TableShape& shape, const Table& model) {
-    TableShape result{{shape.table.name, {}}, {}};
+TableShape ordered(const TableShape& shape, const TableShape& model) {
+    TableShape result{shape.name, {}, {}};
     for (const QByteArray& column : model.columns)
         for (size_t at = 0; at < shape.types.size(); ++at)
-            if (folded(shape.table.columns[at]) == folded(column)) {
-                result.table.columns.push_back(shape.table.columns[at]);
+            if (folded(shape.columns[at]) == folded(column)) {
+                result.columns.push_back(shape.columns[at]);
                 result.types.push_back(shape.types[at]);
             }
     return result;
@@ -65,15 +64,15 @@ constexpr auto Journal = "tboperacoes";
 
 bool hasJournal(const std::vector<TableShape>& shapes) {
     return std::any_of(shapes.begin(), shapes.end(),
-                       [](const TableShape& shape) { return folded(shape.table.name) == Journal; });
+                       [](const TableShape& shape) { return folded(shape.name) == Journal; });
 }
 
 QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes, bool withJournal) {
     QSet<QByteArray> names;
     for (const TableShape& shape : shapes)
-        for (const QByteArray& column : shape.table.columns)
-            if (withJournal || folded(shape.table.name) != Journal)
-                names += folded(shape.table.name + '.' + column);
+        for (const QByteArray& column : shape.columns)
+            if (withJournal || folded(shape.name) != Journal)
+                names += folded(shape.name + '.' + column);
     return names;
 }
 
@@ -93,51 +92,50 @@ void refuseDifferences(const std::vector<TableShape>& from, const std::vector<Ta
     refuse(target - source, u"no de origem"_s);
 }
 
-std::vector<Pair> paired(BookReader& from, BookReader& into) {
+std::vector<Pair> paired(BulkAccess& from, BulkAccess& into) {
     const std::vector<TableShape> source = from.tables();
     const std::vector<TableShape> target = into.tables();
     refuseDifferences(source, target);
+    const TableShapes known(source);
     std::vector<Pair> pairs;
     for (const TableShape& shape : target)
-        for (const TableShape& each : source)
-            if (folded(each.table.name) == folded(shape.table.name))
-                pairs.push_back({ordered(each, shape.table), shape, {}});
+        if (const TableShape* const each = known.find(shape.name))
+            pairs.push_back({ordered(*each, shape), shape, {}});
     return pairs;
 }
 
-void refuseFilled(BookReader& into, const std::vector<Pair>& pairs) {
+void refuseFilled(BulkAccess& into, const std::vector<Pair>& pairs) {
     const QSet<QByteArray> filled = filledTables();
     for (const Pair& pair : pairs)
-        if (!filled.contains(folded(pair.into.table.name)) && into.totals(pair.into).rows > 0)
+        if (!filled.contains(folded(pair.into.name)) && into.totals(pair.into).rows > 0)
             throw refusal(u"O livro de destino não está vazio: a tabela %1 tem linhas."_s.arg(
-                QString::fromUtf8(pair.into.table.name)));
+                QString::fromUtf8(pair.into.name)));
 }
 
-void carryRows(BookReader& from, BookWriter& writer, const Pair& pair, CopyProgress& progress,
+void carryRows(BulkAccess& from, BulkAccess& into, const Pair& pair, CopyProgress& progress,
                const CopyListener& listener) {
-    progress.table = QString::fromUtf8(pair.into.table.name);
+    progress.table = QString::fromUtf8(pair.into.name);
     progress.rows = 0;
     progress.isTableDone = false;
-    from.eachRow(pair.from, [&](const std::vector<Value>& values) {
-        writer.add(pair.into.table, values);
+    from.eachRow(pair.from, [&](const ado::BulkRow& row) {
+        into.add(pair.into, row);
         ++progress.allRows;
         if (++progress.rows % RowsBetweenReports == 0) listener(progress);
     });
-    writer.flush();
+    into.flush();
     progress.isTableDone = true;
     listener(progress);
 }
 
 /// What each side comes to is worked out by its own engine.
-void compare(BookReader& into, const Pair& pair) {
+void compare(BulkAccess& into, const Pair& pair) {
     if (into.totals(pair.into) == pair.totals) return;
     throw refusal(
         u"A cópia não ficou igual: na tabela %1 o número de linhas ou a soma de um montante "
-        "difere."_s.arg(QString::fromUtf8(pair.into.table.name)));
+        "difere."_s.arg(QString::fromUtf8(pair.into.name)));
 }
 
-CopySummary carry(BookReader& from, BookReader& into, BookWriter& writer,
-                  const CopyListener& listener) {
+CopySummary carry(BulkAccess& from, BulkAccess& into, const CopyListener& listener) {
     std::vector<Pair> pairs = paired(from, into);
     refuseFilled(into, pairs);
     CopyProgress progress;
@@ -145,65 +143,39 @@ CopySummary carry(BookReader& from, BookReader& into, BookWriter& writer,
         pair.totals = from.totals(pair.from);
         progress.total += pair.totals.rows;
     }
-    for (const Pair& pair : pairs) writer.clear(pair.into.table);
-    for (const Pair& pair : pairs) carryRows(from, writer, pair, progress, listener);
+    for (const Pair& pair : pairs) into.clear(pair.into);
+    for (const Pair& pair : pairs) carryRows(from, into, pair, progress, listener);
     CopySummary summary{static_cast<int>(pairs.size()), progress.allRows, 0};
     const std::map<QByteArray, qint64> lastKeys = from.lastKeys();
     for (const Pair& pair : pairs) {
         compare(into, pair);
         summary.sums += static_cast<int>(pair.totals.sums.size());
-        if (const auto last = lastKeys.find(folded(pair.from.table.name)); last != lastKeys.end())
-            writer.continueAfter(pair.into.table, last->second);
+        if (const auto last = lastKeys.find(folded(pair.from.name)); last != lastKeys.end())
+            into.continueAfter(pair.into, last->second);
     }
     return summary;
 }
 
-/// Lends a reader that sees the book as it stands now, whatever is written meanwhile.
-void withSource(const BookPlace& place, const std::function<void(BookReader&)>& use) {
-    if (place.isOnServer()) {
-        postgres::Database book(place.server);
-        book.run("BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY");
-        PostgresBookReader reader(book);
-        use(reader);
-        return;
-    }
+std::unique_ptr<BulkAccess> opened(const BookPlace& place) {
+    if (place.isOnServer()) return std::make_unique<ado::postgres::BulkAccess>(place.server);
     const QString file = bookFile(place.folder, place.name);
     if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
-    ado::sqlite::BookFile(file).refuseForeignJournal();
-    sqlite::Database book(file, sqlite::Database::Mode::OpenExisting);
-    book.run("BEGIN");
-    SqliteBookReader reader(book);
-    use(reader);
+    return std::make_unique<ado::sqlite::BulkAccess>(file);
 }
 
-CopySummary copyToFile(BookReader& from, const BookPlace& into, const CopyListener& listener) {
+CopySummary copied(const BookPlace& from, const BookPlace& into, const CopyListener& listener) {
+    const std::unique_ptr<BulkAccess> source = opened(from);
+    source->begin(BulkAccess::Purpose::Reading);
     CopySummary summary;
-    createBook(into.folder, into.name, [&](sqlite::Database& book) {
-        SqliteBookWriter writer(book);
-        SqliteBookReader reader(book);
-        summary = carry(from, reader, writer, listener);
-        writer.commit();
-    });
-    return summary;
-}
-
-/// Keeps everybody else from writing to the book until the transaction ends.
-void hold(postgres::Database& book, BookReader& reader) {
-    QByteArray names;
-    for (const TableShape& shape : reader.tables())
-        names += (names.isEmpty() ? "" : ", ") + shape.table.name;
-    if (!names.isEmpty()) book.run("LOCK TABLE " + names + " IN SHARE ROW EXCLUSIVE MODE");
-}
-
-CopySummary copyToServer(BookReader& from, const BookPlace& into, const CopyListener& listener) {
-    postgres::Database book(into.server);
-    postgres::Transaction transaction(book);
-    PostgresBookWriter writer(book);
-    PostgresBookReader reader(book);
-    hold(book, reader);
-    const CopySummary summary = carry(from, reader, writer, listener);
-    writer.finish();
-    transaction.commit();
+    if (into.isOnServer()) {
+        const std::unique_ptr<BulkAccess> target = opened(into);
+        target->begin(BulkAccess::Purpose::Filling);
+        summary = carry(*source, *target, listener);
+        target->commit();
+    } else {
+        createBook(into.folder, into.name,
+                   [&](BulkAccess& target) { summary = carry(*source, target, listener); });
+    }
     return summary;
 }
 
@@ -221,10 +193,12 @@ BookPlace BookPlace::parsed(const QString& text) {
         throw refusal(
             u"«%1» não diz onde está um livro; as formas são «sqlite:PASTA/NOME» e "
             "«postgresql:SERVIDOR[:PORTA]/NOME»."_s.arg(text));
-    if (isServer)
-        place.server = ServerCatalogue::at(where, place.name);
-    else
+    if (isServer) {
+        place.server.catalog = place.name;
+        place.server.place(where);
+    } else {
         place.folder = where;
+    }
     return place;
 }
 
@@ -233,17 +207,12 @@ QString BookPlace::shown() const {
 }
 
 CopySummary copyBook(const BookPlace& from, const BookPlace& into, const CopyListener& listener) {
-    CopySummary summary;
     try {
-        withSource(from, [&](BookReader& reader) {
-            summary = into.isOnServer() ? copyToServer(reader, into, listener)
-                                        : copyToFile(reader, into, listener);
-        });
+        return copied(from, into, listener);
     } catch (const core::Failure& failure) {
         throw core::Failure(failure.number(), u"Nada foi copiado: "_s + failure.text(),
                             failure.code());
     }
-    return summary;
 }
 
 }  // namespace database

@@ -3,7 +3,7 @@
 
 #include <functional>
 
-#include "database/Postgres.h"
+#include "platform/ado/postgres/Address.h"
 
 /// Carries a whole book from one engine to the other.
 namespace database {
@@ -11,7 +11,7 @@ namespace database {
 /// Where a book lies: in a file, or on a server where its host is set.
 struct BookPlace {
     QString folder;
-    ServerCatalogue server;
+    ado::postgres::Address server;
     QString name;
 
     /// Reads "sqlite:FOLDER/NAME" or "postgresql:HOST[:PORT]/NAME". Fails with a text that names

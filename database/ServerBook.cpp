@@ -3,33 +3,23 @@
 
 #include <QScopeGuard>
 
-#include "database/PostgresBookWriter.h"
-#include "database/SchemaText.h"
+#include "database/Schema.h"
 #include "database/sample/SampleBook.h"
 #include "platform/ado/Connection.h"
-#include "platform/core/Clock.h"
+#include "platform/ado/postgres/BulkAccess.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/LoginValues.h"
 
 namespace database {
 
 using namespace Qt::StringLiterals;
+using ado::postgres::Address;
+using ado::postgres::BulkAccess;
 
 namespace {
 
 core::Failure refusal(const QString& text) {
     return {core::InvalidCall, text};
-}
-
-void makeTables(postgres::Database& book) {
-    book.run(schemaText(u"postgresql.sql"_s));
-    book.run(schemaText(u"codes.sql"_s));
-}
-
-void writeSample(postgres::Database& book, const BookSizes& sizes, QDate asOf) {
-    PostgresBookWriter writer(book);
-    sample::fill(writer, sizes, asOf.isValid() ? asOf : core::today());
-    writer.finish();
 }
 
 /// The name that a connection string takes as it stands.
@@ -46,7 +36,7 @@ void refuseUnusable(const QString& what, const QString& text) {
 /// Makes a book on a server, step by step, and knows how to take each step back.
 class Installation {
 public:
-    Installation(const ServerCatalogue& catalogue, const ServerOperator& worker)
+    Installation(const Address& catalogue, const ServerOperator& worker)
         : catalogue_(catalogue), worker_(worker), server_(administration(catalogue)) {}
 
     void run(bool sample) {
@@ -64,17 +54,17 @@ public:
         enterAsOperator();
         registry::LoginValues{.dtUser = worker_.user,
                               .dtPassword = worker_.password,
-                              .dtInitialCatalog = catalogue_.name,
+                              .dtInitialCatalog = catalogue_.catalog,
                               .dtDataSource = catalogue_.dataSource()}
             .write();
         undo.dismiss();
-        postgres::Database(catalogue_).run("COMMENT ON TABLE public.tbcontadores IS NULL");
+        BulkAccess(catalogue_).execute("COMMENT ON TABLE public.tbcontadores IS NULL");
     }
 
 private:
     /// The catalogue that every server has, from where others are made.
-    static ServerCatalogue administration(ServerCatalogue catalogue) {
-        catalogue.name = u"postgres"_s;
+    static Address administration(Address catalogue) {
+        catalogue.catalog = u"postgres"_s;
         return catalogue;
     }
 
@@ -97,7 +87,7 @@ private:
                 u"«%1» tem outros direitos no servidor; escolha outro nome para o operador."_s.arg(
                     worker_.user));
         makesCatalogue_ =
-            !has("SELECT FROM pg_database WHERE datname = " + server_.literal(catalogue_.name));
+            !has("SELECT FROM pg_database WHERE datname = " + server_.literal(catalogue_.catalog));
         makesOwner_ = !hasRole(owner());
         makesOperator_ = !hasRole(worker_.user);
     }
@@ -106,7 +96,7 @@ private:
     /// the settings.
     bool isCutOff() const {
         if (makesCatalogue_) return false;
-        postgres::Database book(catalogue_);
+        BulkAccess book(catalogue_);
         return book.number(
             "SELECT obj_description(to_regclass('public.tbcontadores'), 'pg_class') = " +
             book.literal(mark_));
@@ -115,27 +105,27 @@ private:
     void makeCatalogue() {
         if (!makesCatalogue_) return;
         // Texts sort by the collation of their columns, whatever the catalogue's own.
-        server_.run("CREATE DATABASE " + server_.name(catalogue_.name) +
-                    " TEMPLATE template0 ENCODING 'UTF8' LOCALE 'C'");
+        server_.execute("CREATE DATABASE " + server_.name(catalogue_.catalog) +
+                        " TEMPLATE template0 ENCODING 'UTF8' LOCALE 'C'");
         madeCatalogue_ = true;
     }
 
     void makeBook(bool sample) {
-        postgres::Database book(catalogue_);
+        BulkAccess book(catalogue_);
         refuseFilled(book);
-        postgres::Transaction transaction(book);
+        book.begin(BulkAccess::Purpose::Filling);
         makeRoles(book);
-        book.run("SET LOCAL ROLE " + book.name(owner()));
+        book.execute("SET LOCAL ROLE " + book.name(owner()));
         makeTables(book);
-        book.run("RESET ROLE");
-        book.run(rights(book));
-        if (sample) writeSample(book, {}, {});
-        book.run("COMMENT ON TABLE public.tbcontadores IS " + book.literal(mark_));
-        transaction.commit();
+        book.execute("RESET ROLE");
+        book.execute(rights(book));
+        if (sample) sample::fill(book, {}, {});
+        book.execute("COMMENT ON TABLE public.tbcontadores IS " + book.literal(mark_));
+        book.commit();
         madeBook_ = true;
     }
 
-    void refuseFilled(postgres::Database& book) {
+    void refuseFilled(BulkAccess& book) {
         if (book.number("SELECT EXISTS (SELECT FROM pg_class WHERE relkind IN ('r', 'p', 'v', 'm')"
                         " AND relnamespace::regnamespace::text !~ '^(pg_|information_schema)')"))
             throw refusal(
@@ -145,21 +135,22 @@ private:
                 catalogue_.shown()));
     }
 
-    void makeRoles(postgres::Database& book) {
+    void makeRoles(BulkAccess& book) {
         const QByteArray ownerName = book.name(owner());
-        if (makesOwner_) book.run("CREATE ROLE " + ownerName + " NOLOGIN");
+        if (makesOwner_) book.execute("CREATE ROLE " + ownerName + " NOLOGIN");
         if (makesOperator_)
-            book.run(
+            book.execute(
                 "CREATE ROLE " + book.name(worker_.user) + " LOGIN PASSWORD " +
                 book.literal(QString::fromUtf8(book.encrypted(worker_.password, worker_.user))));
         if (madeCatalogue_)
-            book.run("ALTER DATABASE " + book.name(catalogue_.name) + " OWNER TO " + ownerName);
-        book.run("GRANT CREATE, USAGE ON SCHEMA public TO " + ownerName);
+            book.execute("ALTER DATABASE " + book.name(catalogue_.catalog) + " OWNER TO " +
+                         ownerName);
+        book.execute("GRANT CREATE, USAGE ON SCHEMA public TO " + ownerName);
     }
 
-    QByteArray rights(postgres::Database& book) const {
+    QByteArray rights(BulkAccess& book) const {
         return schemaText(u"roles.sql"_s)
-            .replace("{catalogue}", book.name(catalogue_.name))
+            .replace("{catalogue}", book.name(catalogue_.catalog))
             .replace("{operator}", book.name(worker_.user));
     }
 
@@ -167,7 +158,7 @@ private:
         ado::Connection connection;
         connection.ConnectionString =
             u"User ID=%1;Password=%2;Initial Catalog=%3;Data Source=%4;Connect Timeout=15"_s.arg(
-                worker_.user, worker_.password, catalogue_.name, catalogue_.dataSource());
+                worker_.user, worker_.password, catalogue_.catalog, catalogue_.dataSource());
         connection.Open();
     }
 
@@ -175,30 +166,32 @@ private:
     void takeBack() noexcept {
         try {
             if (madeCatalogue_)
-                server_.run("DROP DATABASE " + server_.name(catalogue_.name) + " WITH (FORCE)");
+                server_.execute("DROP DATABASE " + server_.name(catalogue_.catalog) +
+                                " WITH (FORCE)");
             else if (madeBook_)
                 takeBookBack();
-            if (madeBook_ && makesOperator_) server_.run("DROP ROLE " + server_.name(worker_.user));
-            if (madeBook_ && makesOwner_) server_.run("DROP ROLE " + server_.name(owner()));
+            if (madeBook_ && makesOperator_)
+                server_.execute("DROP ROLE " + server_.name(worker_.user));
+            if (madeBook_ && makesOwner_) server_.execute("DROP ROLE " + server_.name(owner()));
         } catch (const core::Failure&) {
         }
     }
 
     void takeBookBack() {
-        postgres::Database book(catalogue_);
-        book.run("DROP OWNED BY " + book.name(owner()));
-        book.run("REVOKE ALL ON DATABASE " + book.name(catalogue_.name) + " FROM " +
-                 book.name(worker_.user));
-        book.run("REVOKE ALL ON SCHEMA public FROM " + book.name(worker_.user));
-        book.run("ALTER ROLE " + book.name(worker_.user) + " IN DATABASE " +
-                 book.name(catalogue_.name) + " RESET search_path");
+        BulkAccess book(catalogue_);
+        book.execute("DROP OWNED BY " + book.name(owner()));
+        book.execute("REVOKE ALL ON DATABASE " + book.name(catalogue_.catalog) + " FROM " +
+                     book.name(worker_.user));
+        book.execute("REVOKE ALL ON SCHEMA public FROM " + book.name(worker_.user));
+        book.execute("ALTER ROLE " + book.name(worker_.user) + " IN DATABASE " +
+                     book.name(catalogue_.catalog) + " RESET search_path");
     }
 
-    QString owner() const { return catalogue_.name + u"_dono"_s; }
+    QString owner() const { return catalogue_.catalog + u"_dono"_s; }
 
-    ServerCatalogue catalogue_;
+    Address catalogue_;
     ServerOperator worker_;
-    postgres::Database server_;
+    BulkAccess server_;
     QString mark_;
     bool makesCatalogue_ = false;
     bool makesOwner_ = false;
@@ -209,25 +202,25 @@ private:
 
 }  // namespace
 
-void createBook(const ServerCatalogue& catalogue) {
-    postgres::Database book(catalogue);
-    postgres::Transaction transaction(book);
+void createBook(const Address& catalogue) {
+    BulkAccess book(catalogue);
+    book.begin(BulkAccess::Purpose::Filling);
     makeTables(book);
-    transaction.commit();
+    book.commit();
 }
 
-void fillSample(const ServerCatalogue& catalogue, const BookSizes& sizes, QDate asOf) {
-    postgres::Database book(catalogue);
+void fillSample(const Address& catalogue, const BookSizes& sizes, QDate asOf) {
+    BulkAccess book(catalogue);
     if (book.number("SELECT EXISTS (SELECT FROM tbSocios)"
                     " OR EXISTS (SELECT FROM tbZelmar_Movimentos)"))
         throw refusal(u"O livro «%1» já tem associados ou movimentos."_s.arg(catalogue.shown()));
-    postgres::Transaction transaction(book);
-    writeSample(book, sizes, asOf);
-    transaction.commit();
+    book.begin(BulkAccess::Purpose::Filling);
+    sample::fill(book, sizes, asOf);
+    book.commit();
 }
 
-void initBook(const ServerCatalogue& catalogue, const ServerOperator& worker, bool sample) {
-    refuseUnusable(u"O nome do catálogo"_s, catalogue.name);
+void initBook(const Address& catalogue, const ServerOperator& worker, bool sample) {
+    refuseUnusable(u"O nome do catálogo"_s, catalogue.catalog);
     refuseUnusable(u"O nome do operador"_s, worker.user);
     refuseUnusable(u"A palavra-passe do operador"_s, worker.password);
     Installation(catalogue, worker).run(sample);

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "database/Book.h"
-#include "database/Postgres.h"
+#include "platform/ado/postgres/Address.h"
 
 /// Makes books on a PostgreSQL server. Every failure is a core::Failure with a Portuguese text or
 /// the server's own.
@@ -10,11 +10,12 @@ namespace database {
 
 /// Makes the tables of an empty book in an existing catalogue: code lists, and counters that start
 /// at 1. Fails, changing nothing, when tables of a book are there already.
-void createBook(const ServerCatalogue& catalogue);
+void createBook(const ado::postgres::Address& catalogue);
 
 /// Fills an empty book with the sample content, the same as in a file. Fails, leaving the book as
 /// it was, if it has members already.
-void fillSample(const ServerCatalogue& catalogue, const BookSizes& sizes = {}, QDate asOf = {});
+void fillSample(const ado::postgres::Address& catalogue, const BookSizes& sizes = {},
+                QDate asOf = {});
 
 /// Who works with a new book on a server.
 struct ServerOperator {
@@ -28,6 +29,6 @@ struct ServerOperator {
 /// operator to see that it works, and writes the five values that name the book. `catalogue` is
 /// entered by its user, who must be an administrator of the server. Nothing stays behind a failure;
 /// a call that was cut off is ended by the same call.
-void initBook(const ServerCatalogue& catalogue, const ServerOperator& worker, bool sample);
+void initBook(const ado::postgres::Address& catalogue, const ServerOperator& worker, bool sample);
 
 }  // namespace database

@@ -20,12 +20,12 @@ namespace host {
 
 namespace {
 
-void enterAsAdministrator(database::ServerCatalogue& server, const QString& admin) {
-    server.user = admin;
-    server.password =
+void enterAsAdministrator(database::BookPlace& place, const QString& admin) {
+    place.server.user = admin;
+    place.server.password =
         password(AdminPasswordVariable,
                  u"Palavra-passe de «%1» em %2 (vazia, se o servidor não a pedir): "_s.arg(
-                     admin, server.shown()));
+                     admin, place.shown()));
 }
 
 volatile std::sig_atomic_t interrupted = 0;
@@ -82,7 +82,7 @@ void makeServerBook(const CommandLine& line) {
         throw core::Failure(
             core::InvalidCall,
             u"«%1» não é um servidor; a forma é «postgresql:SERVIDOR[:PORTA]»."_s.arg(line.server));
-    enterAsAdministrator(place.server, line.admin);
+    enterAsAdministrator(place, line.admin);
     const database::ServerOperator worker{
         line.user,
         password(UserPasswordVariable, u"Palavra-passe do operador «%1»: "_s.arg(line.user))};
@@ -94,8 +94,8 @@ void makeServerBook(const CommandLine& line) {
 void copyBook(const CommandLine& line) {
     auto from = database::BookPlace::parsed(line.from);
     auto into = database::BookPlace::parsed(line.into);
-    if (from.isOnServer()) enterAsAdministrator(from.server, line.admin);
-    if (into.isOnServer()) enterAsAdministrator(into.server, line.admin);
+    if (from.isOnServer()) enterAsAdministrator(from, line.admin);
+    if (into.isOnServer()) enterAsAdministrator(into, line.admin);
     const Interruptible interruptible;
     const database::CopySummary summary = database::copyBook(from, into, showProgress);
     say(u"Copiado de %1 para %2: %3 tabelas, %4 linhas. Os números de linhas e as somas de %5 "

@@ -3,8 +3,6 @@
 
 #include <algorithm>
 
-#include "database/sample/Tables.h"
-
 namespace database::sample {
 
 namespace {
@@ -23,8 +21,8 @@ Money times(Money amount, int count) {
     return Money::fromUnits(amount.units() * count);
 }
 
-void writeMember(BookWriter& writer, const Household& household) {
-    writer.add(tables::members(household.left),
+void writeMember(Writer& writer, const Household& household) {
+    writer.add("tbSocios", household.left,
                {qint64{household.socio_id}, household.no_kor, household.nome, household.nome_guerra,
                 household.nib.isEmpty() ? Value(Null) : household.nib,
                 qint64{household.enrolled ? 1 : 0}, dayValue(household.waiting),
@@ -32,18 +30,19 @@ void writeMember(BookWriter& writer, const Household& household) {
 }
 
 /// The payments of the year last paid, a quarter at a time.
-void writePayments(BookWriter& writer, const Household& household, int year, int lastMonth,
-                   QDate asOf) {
+void writePayments(Writer& writer, const Household& household, int year, int lastMonth, QDate asOf,
+                   qint64& lastPayment) {
     for (int before = 0; before < lastMonth; before += Quarter) {
         const int month = std::min(before + Quarter, lastMonth);
         const QDate day = std::min(QDate(year, month, 8), asOf);
-        writer.add(tables::premiumPayments(),
-                   {qint64{household.socio_id}, dayValue(day), qint64{year}, qint64{month},
-                    times(monthly(household), month - before), QByteArray("Prémio de zelmar")});
+        writer.add(
+            "tbQuotas_Movimentos",
+            {++lastPayment, qint64{household.socio_id}, dayValue(day), qint64{year}, qint64{month},
+             times(monthly(household), month - before), QByteArray("Prémio de zelmar")});
     }
 }
 
-void writePremium(BookWriter& writer, const Household& household, QDate asOf) {
+void writePremium(Writer& writer, const Household& household, QDate asOf, qint64& lastPayment) {
     if (household.premium == Premium::Never) return;
     QDate last = asOf;
     // A month late is still in order, but not across the new year.
@@ -56,25 +55,27 @@ void writePremium(BookWriter& writer, const Household& household, QDate asOf) {
         last = asOf.addMonths(-behind);
     }
     const Money paid = times(monthly(household), last.month());
-    writer.add(tables::premiums(),
+    writer.add("tbQuotas_Socios",
                {qint64{household.socio_id}, qint64{last.year()}, qint64{last.month()},
                 paid + times(monthly(household), behind), paid});
-    writePayments(writer, household, last.year(), last.month(), asOf);
+    writePayments(writer, household, last.year(), last.month(), asOf, lastPayment);
 }
 
 }  // namespace
 
-int writeMembers(BookWriter& writer, const BookSizes& sizes, QDate asOf) {
+int writeMembers(Writer& writer, const BookSizes& sizes, QDate asOf) {
     Households households(sizes, asOf);
     int withMovements = 0;
     qint64 socio_familia_id = 0;
+    qint64 lastPayment = 0;
     while (const std::optional<Household> household = households.next()) {
         writeMember(writer, *household);
         for (const Person& person : household->persons)
-            writer.add(tables::persons(household->left),
+            writer.add("tbSocios_Familias", household->left,
                        {++socio_familia_id, qint64{household->socio_id}, person.codABC, person.nome,
                         dayValue(person.birth), dayValue(person.waiting)});
-        if (!household->left && household->enrolled) writePremium(writer, *household, asOf);
+        if (!household->left && household->enrolled)
+            writePremium(writer, *household, asOf, lastPayment);
         if (household->hasMovements) ++withMovements;
     }
     return withMovements;

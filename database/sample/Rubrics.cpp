@@ -3,8 +3,6 @@
 
 #include <array>
 
-#include "database/sample/Tables.h"
-
 namespace database::sample {
 
 namespace {
@@ -119,10 +117,10 @@ std::span<const Hospital> hospitals() {
     return Hospitals;
 }
 
-void writeRubrics(BookWriter& writer) {
+void writeRubrics(Writer& writer) {
     for (const Rubric& rubric : Rubrics) {
         const bool main = isMain(rubric);
-        writer.add(tables::rubrics(),
+        writer.add("tbZelmar_Plafonds",
                    {qint64{idOf(rubric)}, main ? Value(Null) : Value(qint64{idOf(mainOf(rubric))}),
                     QByteArray(rubric.code), QByteArray(rubric.descrit),
                     main ? Value(Null) : Value(rubric.percent), ceiling(rubric.agregado),
@@ -134,11 +132,11 @@ void writeRubrics(BookWriter& writer) {
     }
 }
 
-void writeHospitals(BookWriter& writer) {
+void writeHospitals(Writer& writer) {
     qint64 id = 0;
     for (const Hospital& hospital : Hospitals) {
         const QByteArray code = 'H' + QByteArray::number(++id).rightJustified(2, '0');
-        writer.add(tables::hospitals(),
+        writer.add("tbHospitais",
                    {id, code, QByteArray(hospital.nome), QByteArray(hospital.morada),
                     QByteArray(hospital.code_postal), QByteArray(hospital.localidade),
                     QByteArray(hospital.telefone), Null, Null});

@@ -3,7 +3,7 @@
 
 #include <span>
 
-#include "database/BookWriter.h"
+#include "database/sample/Writer.h"
 
 namespace database::sample {
 
@@ -52,7 +52,7 @@ struct Hospital {
 };
 std::span<const Hospital> hospitals();
 
-void writeRubrics(BookWriter& writer);
-void writeHospitals(BookWriter& writer);
+void writeRubrics(Writer& writer);
+void writeHospitals(Writer& writer);
 
 }  // namespace database::sample

@@ -5,8 +5,9 @@
 
 #include "database/sample/Activity.h"
 #include "database/sample/Members.h"
-#include "database/sample/Tables.h"
+#include "database/sample/Writer.h"
 #include "database/sample/Year.h"
+#include "platform/core/Clock.h"
 
 namespace database::sample {
 
@@ -29,8 +30,7 @@ Value whole(const std::optional<int>& number) {
 }
 
 /// The values of a movement in every table that keeps one.
-void append(std::vector<Value>& row, const Movement& movement, qint64 number, qint64 id,
-            int socio_id) {
+void append(Row& row, const Movement& movement, qint64 number, qint64 id, int socio_id) {
     row.insert(row.end(), {number,
                            qint64{socio_id},
                            text(movement.codABC),
@@ -76,8 +76,8 @@ QByteArray personName(const Household& household, const QByteArray& codABC) {
 
 class Book {
 public:
-    Book(BookWriter& writer, const BookSizes& sizes, QDate asOf)
-        : writer_(writer), sizes_(sizes), asOf_(asOf) {}
+    Book(ado::BulkAccess& book, const BookSizes& sizes, QDate asOf)
+        : writer_(book), sizes_(sizes), asOf_(asOf) {}
 
     void fill() {
         writeRubrics(writer_);
@@ -86,10 +86,9 @@ public:
         debts_.assign(static_cast<size_t>(Households(sizes_, asOf_).count()), Money());
         debts_[FixedMembers - 1] = Money::fromUnits(FixedDebtUnits);
         for (int year = asOf_.year() - 2; year <= asOf_.year(); ++year) writeYear(year);
-        writer_.clear(tables::counters());
-        writer_.add(tables::counters(), {lastNumber_ + 1});
-        writer_.clear(tables::cheques());
-        writer_.add(tables::cheques(), {ChequesBefore + lastId_ + 1});
+        writer_.put("tbContadores", {lastNumber_ + 1});
+        writer_.put("tbCheques", {ChequesBefore + lastId_ + 1});
+        writer_.flush();
     }
 
 private:
@@ -142,27 +141,25 @@ private:
 
     void write(const Household& household, const Movement& movement, qint64 number) {
         const qint64 id = idBase_ + number;
-        std::vector<Value> row;
+        Row row;
         row.reserve(40);
+        row.emplace_back(live_ ? id : qint64{year_});
+        append(row, live_ ? movement : closed(movement), number, id, household.socio_id);
         if (live_) {
-            row.emplace_back(id);
-            append(row, movement, number, id, household.socio_id);
-            writer_.add(tables::movements(household.left), row);
+            writer_.add("tbZelmar_Movimentos", household.left, row);
             return;
         }
-        row = {qint64{year_},       household.no_kor,
-               household.nome,      household.nome_guerra,
-               household.taxNumber, text(personName(household, movement.codABC)),
-               household.street,    household.postalCode + ' ' + household.town};
-        append(row, closed(movement), number, id, household.socio_id);
-        writer_.add(tables::history(), row);
+        row.insert(row.end(), {household.no_kor, household.nome, household.nome_guerra,
+                               household.taxNumber, text(personName(household, movement.codABC)),
+                               household.street, household.postalCode + ' ' + household.town});
+        writer_.add("tbZelmar_Movimentos_Historico", row);
     }
 
     void writeAccumulators(const Household& household, Account& account, size_t at,
                            Random& random) {
         if (at >= FixedMembers) leaveTryOuts(household, account, at, random);
         for (const Accumulated& row : account.rows()) {
-            writer_.add(tables::accumulators(household.left),
+            writer_.add("tbSocios_Acumulados", household.left,
                         {qint64{household.socio_id}, text(row.codABC), whole(row.rubrica_id),
                          whole(row.rubrica_id_main), row.debito_ac.toDouble(),
                          row.credito_ac.toDouble(), whole(row.no_docs)});
@@ -184,7 +181,7 @@ private:
                     --missing;
     }
 
-    BookWriter& writer_;
+    Writer writer_;
     const BookSizes& sizes_;
     QDate asOf_;
     int eligible_ = 0;
@@ -199,8 +196,8 @@ private:
 
 }  // namespace
 
-void fill(BookWriter& writer, const BookSizes& sizes, QDate asOf) {
-    Book(writer, sizes, asOf).fill();
+void fill(ado::BulkAccess& book, const BookSizes& sizes, QDate asOf) {
+    Book(book, sizes, asOf.isValid() ? asOf : core::today()).fill();
 }
 
 }  // namespace database::sample

@@ -17,14 +17,18 @@ REVOKE USAGE ON LANGUAGE plpgsql FROM PUBLIC;
 REVOKE ALL ON ALL TABLES IN SCHEMA public FROM {operator};
 GRANT SELECT ON ALL TABLES IN SCHEMA public TO {operator};
 
--- A movement is posted whole. What an annulment marks is all that changes in it later.
-GRANT INSERT (
-        movimento_no, socio_id, codABC, rubrica_id, hospital_id, oe_id, data, tipo, doc_data,
-        doc_no, doc_valor, doc_iva, doc_tx_iva, recebido, incidencia, comparticipacao,
-        saldo_plafond, saldo_acumulado, iliquido, liquido, credito, debito, modo_pagamento, cheque,
-        descrit, obs, created_by),
-    UPDATE (tipo, modo_pagamento)
-    ON tbZelmar_Movimentos TO {operator};
+-- A movement is posted whole, but for its key. What an annulment marks is all that changes in it
+-- later.
+DO $do$
+BEGIN
+    EXECUTE (
+        SELECT format('GRANT INSERT (%s), UPDATE (tipo, modo_pagamento) ON %s TO %s',
+                      string_agg(attname, ', '), attrelid::regclass, $name${operator}$name$)
+          FROM pg_attribute
+         WHERE attrelid = 'tbZelmar_Movimentos'::regclass AND attnum > 0 AND NOT attisdropped
+           AND attname NOT IN ('movimento_id', 'upsize_ts')
+         GROUP BY attrelid);
+END $do$;
 -- Of a member who has left, movements are only annulled: the mark and the correcting row.
 GRANT INSERT (
         movimento_no, socio_id, codABC, rubrica_id, hospital_id, data, tipo, doc_data, doc_no,

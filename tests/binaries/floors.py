@@ -41,8 +41,7 @@ FLOORS = GROUND | {
 # The plan's arithmetic, on plain values, serves the sample books as well.
 FURTHER = {("database", "coverage/Calculation.h")}
 CLIENT_LIBRARIES = {"sqlite3.h", "libpq-fe.h"}
-# Until set-up works on the engines' own handles.
-OWN_CLIENTS = {"platform/ado/sqlite", "platform/ado/postgres", "database"}
+OWN_CLIENTS = {"platform/ado/sqlite", "platform/ado/postgres"}
 NOT_DELIVERED = {"build", "tests", "benchmarks"}
 INCLUDE = re.compile(r'^\s*#\s*include\s*(["<])([^">]+)[">]', re.MULTILINE)
 

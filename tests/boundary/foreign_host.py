@@ -60,12 +60,15 @@ def write_settings(folder, **values):
     file.chmod(0o600)
 
 
-def main(library_file, schema_file):
+def main(library_file, schema_folder):
     with tempfile.TemporaryDirectory() as name:
         folder = pathlib.Path(name)
         os.environ["ZELMARS_REGISTRY"] = name
         with sqlite3.connect(folder / "zelmars.db") as book:
-            book.executescript(pathlib.Path(schema_file).read_text())
+            schema = pathlib.Path(schema_folder)
+            movement = (schema / "movement.sql").read_text()
+            book.executescript(
+                (schema / "book.sql").read_text().replace("{movement}", movement))
         book.close()
         library = ctypes.CDLL(library_file)
         library.DllCanUnloadNow.restype = ctypes.c_int32

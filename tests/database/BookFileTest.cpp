@@ -10,16 +10,14 @@
 #include <QTemporaryDir>
 
 #include "database/Book.h"
-#include "database/Sqlite.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/Recordset.h"
+#include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/core/Failure.h"
 #include "platform/registry/Registry.h"
 #include "tests/support/Book.h"
 
 using namespace Qt::StringLiterals;
-
-namespace sqlite = database::sqlite;
 
 namespace {
 
@@ -225,13 +223,11 @@ TEST_F(BookFile, ABookInUseOrWithMembersIsNotFilled) {
 TEST_F(BookFile, AFillingThatFailsHalfWayLeavesTheBookEmptyAndReady) {
     database::createBook(path("book"), u"zelmars"_s);
     const QString file = database::bookFile(path("book"), u"zelmars"_s);
-    using sqlite::Database;
-    Database(file, Database::Mode::OpenExisting)
-        .run(
-            "create trigger stop before insert on tbSocios_Acumulados begin "
-            "select raise(abort, 'no room'); end");
+    ado::sqlite::BulkAccess(file).execute(
+        "create trigger stop before insert on tbSocios_Acumulados begin "
+        "select raise(abort, 'no room'); end");
     EXPECT_EQ(failureOf([&] { database::fillSample(path("book"), u"zelmars"_s); }), u"no room"_s);
-    Database book(file, Database::Mode::OpenExisting);
+    ado::sqlite::BulkAccess book(file);
     EXPECT_EQ(book.number("select count(*) from tbSocios"), 0);
     EXPECT_EQ(book.number("select count(*) from tbZelmar_Movimentos_Historico"), 0);
     EXPECT_EQ(book.number("select zelmars from tbContadores"), 1);

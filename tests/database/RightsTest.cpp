@@ -5,22 +5,23 @@
 #include "database/ServerBook.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/Recordset.h"
+#include "platform/ado/postgres/BulkAccess.h"
 #include "platform/core/Failure.h"
 #include "tests/support/Server.h"
 
 using namespace Qt::StringLiterals;
-using database::postgres::Database;
+using ado::postgres::BulkAccess;
 
 namespace {
 
 constexpr auto Operator = "posto";
 
-database::ServerCatalogue catalogue(const char* user) {
+ado::postgres::Address catalogue(const char* user) {
     return {.host = support::Server::instance().folder(),
             .port = {},
             .user = QString::fromLatin1(user),
             .password = u"segredo"_s,
-            .name = u"direitos"_s};
+            .catalog = u"direitos"_s};
 }
 
 class Rights : public testing::Test {
@@ -33,14 +34,14 @@ protected:
     /// The SQLSTATE with which the server refuses a statement; empty when it takes it. Nothing of
     /// it stays.
     std::string refusal(const char* statement) {
-        book_.run("BEGIN");
+        book_.execute("BEGIN");
         std::string code;
         try {
-            book_.run(statement);
+            book_.execute(statement);
         } catch (const core::Failure& failure) {
             code = failure.code().toStdString();
         }
-        book_.run("ROLLBACK");
+        book_.execute("ROLLBACK");
         return code;
     }
     void expectTaken(std::initializer_list<const char*> statements) {
@@ -51,7 +52,7 @@ protected:
             EXPECT_EQ(refusal(statement), "42501") << statement;
     }
 
-    Database book_{catalogue(Operator)};
+    BulkAccess book_{catalogue(Operator)};
 };
 
 TEST_F(Rights, AreEnoughForWhatTheScreensWrite) {
@@ -231,16 +232,16 @@ TEST_F(Rights, ReachNothingBesideTheBook) {
 }
 
 TEST_F(Rights, FindTheBooksOwnTablesWhateverStandsElsewhere) {
-    Database administration(catalogue(support::Server::User));
+    BulkAccess administration(catalogue(support::Server::User));
     EXPECT_EQ(administration.number("SELECT count(*) FROM pg_db_role_setting WHERE setrole ="
                                     " 'posto'::regrole AND 'search_path=public, pg_temp' ="
                                     " ANY (setconfig)"),
               1);
-    administration.run(
+    administration.execute(
         "CREATE SCHEMA isco AUTHORIZATION posto; CREATE TABLE isco.tbCheques (cheque_no bigint);"
         "ALTER TABLE isco.tbCheques OWNER TO posto;"
         "ALTER ROLE posto IN DATABASE direitos SET search_path = isco, public");
-    Database fresh(catalogue(Operator));
+    BulkAccess fresh(catalogue(Operator));
     EXPECT_EQ(fresh.number("SELECT count(*) FROM tbCheques"), 1);
     const auto connection = std::make_shared<ado::Connection>();
     connection->ConnectionString =
@@ -250,7 +251,7 @@ TEST_F(Rights, FindTheBooksOwnTablesWhateverStandsElsewhere) {
     rows->Open(u"select * from tbCheques"_s, connection, ado::adOpenStatic, ado::adLockReadOnly,
                ado::adCmdUnknown);
     EXPECT_FALSE(rows->atEnd());
-    administration.run("DROP SCHEMA isco CASCADE");
+    administration.execute("DROP SCHEMA isco CASCADE");
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Books on a server: what makes them, and what is left when that fails.
 #include "database/ServerBook.h"
+#include "platform/ado/postgres/BulkAccess.h"
 
 #include <gtest/gtest.h>
 
@@ -11,13 +12,13 @@
 #include "tests/support/Server.h"
 
 using namespace Qt::StringLiterals;
-using database::postgres::Database;
+using ado::postgres::BulkAccess;
 
 namespace {
 
 constexpr auto Operator = "balcao";
 
-database::ServerCatalogue catalogue(const QString& name, const QString& user = {}) {
+ado::postgres::Address catalogue(const QString& name, const QString& user = {}) {
     return {support::Server::instance().folder(),
             {},
             user.isEmpty() ? QString::fromLatin1(support::Server::User) : user,
@@ -44,8 +45,8 @@ protected:
     static void init(const QString& name, const QString& user = QString::fromLatin1(Operator)) {
         database::initBook(catalogue(name), {user, u"segredo"_s}, false);
     }
-    static Database& server() {
-        static Database book(catalogue(u"postgres"_s));
+    static BulkAccess& server() {
+        static BulkAccess book(catalogue(u"postgres"_s));
         return book;
     }
 
@@ -68,9 +69,9 @@ TEST_F(ServerBook, IsWhatTheWorkstationUsesFromThenOn) {
 }
 
 TEST_F(ServerBook, LeavesNothingBehindAFailure) {
-    server().run("CREATE ROLE fechado LOGIN PASSWORD 'outra'");
-    server().run("CREATE ROLE leigo LOGIN");
-    server().run("CREATE DATABASE existe");
+    server().execute("CREATE ROLE fechado LOGIN PASSWORD 'outra'");
+    server().execute("CREATE ROLE leigo LOGIN");
+    server().execute("CREATE DATABASE existe");
     const auto known = [] {
         return server().number(
             "SELECT (SELECT count(*) FROM pg_database) * 100 + (SELECT count(*) FROM pg_roles)");
@@ -84,12 +85,12 @@ TEST_F(ServerBook, LeavesNothingBehindAFailure) {
     // In a catalogue of its own and in one that was there: an operator who cannot enter.
     for (const QString& name : {u"falha"_s, u"existe"_s})
         expect(u"password authentication failed"_s, failureOf([&] { init(name, u"fechado"_s); }));
-    Database existing(catalogue(u"existe"_s));
+    BulkAccess existing(catalogue(u"existe"_s));
     const QByteArray objects =
         "SELECT count(*) FROM pg_class WHERE relnamespace = 'public'::regnamespace";
     EXPECT_EQ(existing.number(objects), 0);
     // A catalogue in use, an administrator who is none, an operator who is more than one.
-    existing.run("CREATE TABLE x (a int)");
+    existing.execute("CREATE TABLE x (a int)");
     expect(u"não está vazio"_s, failureOf([] { init(u"existe"_s); }));
     EXPECT_EQ(existing.number(objects), 1);
     expect(u"não é administrador"_s, failureOf([] {

@@ -7,9 +7,9 @@
 #include <QProcess>
 #include <QTemporaryDir>
 
-#include "database/Postgres.h"
-#include "database/Sqlite.h"
 #include "host/MovementBook.h"
+#include "platform/ado/postgres/BulkAccess.h"
+#include "platform/ado/sqlite/BulkAccess.h"
 #include "tests/support/Server.h"
 
 using namespace Qt::StringLiterals;
@@ -90,7 +90,7 @@ TEST_F(Program, EndsWithTheNextCallABookThatWasCutOff) {
         ASSERT_EQ(run(init), 0) << errors_.toStdString();
         EXPECT_EQ(run({u"Login"_s}), 0) << errors_.toStdString();
         EXPECT_EQ(QDir(book()).entryList({u"*.novo*"_s}, QDir::Files), QStringList());
-        database::sqlite::Database made(file, database::sqlite::Database::Mode::OpenExisting);
+        ado::sqlite::BulkAccess made(file);
         EXPECT_EQ(made.number("select count(*) from vwZelmars_Movimentos_Vigor"), 4000);
         EXPECT_EQ(run(init), 1);  // once only
     }
@@ -103,8 +103,9 @@ TEST_F(Program, EndsWithTheNextCallABookOnAServerThatWasCutOff) {
                            u"--catalog"_s, u"meio"_s,     u"--admin"_s,
                            admin};
     const auto has = [&](const QString& catalogue, const QByteArray& what) {
-        using database::postgres::Database;
-        return Database({folder, {}, admin, {}, catalogue}).number("select exists (" + what + ')');
+        using ado::postgres::BulkAccess;
+        return BulkAccess({folder, {}, admin, {}, catalogue})
+            .number("select exists (" + what + ')');
     };
     const auto isMade = [&] {
         return has(u"postgres"_s, "select from pg_database where datname = 'meio'") != 0;
@@ -126,8 +127,8 @@ TEST_F(Program, EndsWithTheNextCallABookOnAServerThatWasCutOff) {
         ASSERT_EQ(run(init), 0) << errors_.toStdString();
         EXPECT_EQ(run({u"Login"_s}), 0) << errors_.toStdString();
         EXPECT_EQ(run(init), 1);  // once only
-        database::postgres::Database({folder, {}, admin, {}, u"postgres"_s})
-            .run("drop database meio with (force)");
+        ado::postgres::BulkAccess({folder, {}, admin, {}, u"postgres"_s})
+            .execute("drop database meio with (force)");
         QFile::remove(folder_.filePath(u"registry/HKEY_LOCAL_MACHINE.ini"_s));
     }
 }

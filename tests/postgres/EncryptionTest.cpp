@@ -10,6 +10,7 @@
 
 #include "database/ServerBook.h"
 #include "platform/ado/Connection.h"
+#include "platform/ado/postgres/BulkAccess.h"
 #include "platform/ado/postgres/Handle.h"
 #include "tests/support/Failure.h"
 #include "tests/support/Server.h"
@@ -88,9 +89,16 @@ ado::ConnectionPtr entered(const QString& place, const QString& catalogue, const
     return connection;
 }
 
+ado::postgres::Address addressOf(const QString& place, const QString& catalogue) {
+    ado::postgres::Address address;
+    address.catalog = catalogue;
+    address.place(place);
+    return address;
+}
+
 /// Makes a book as the administrator does.
 void made(const QString& place, const QString& catalogue) {
-    auto server = database::ServerCatalogue::at(place, catalogue);
+    auto server = addressOf(place, catalogue);
     server.user = QString::fromLatin1(Server::User);
     server.password = u"segredo"_s;
     database::initBook(server, {u"balcao"_s, u"segredo"_s}, false);
@@ -150,7 +158,7 @@ TEST_F(Encryption, IsGivenUpByOneWordOnly) {
                         .text()
                         .contains(u"só «?tls=no»"_s))
             << qPrintable(place);
-    const auto server = database::ServerCatalogue::at(u"servidor:5433?tls=no"_s, u"livro"_s);
+    const auto server = addressOf(u"servidor:5433?tls=no"_s, u"livro"_s);
     EXPECT_EQ(server.dataSource(), u"postgresql:servidor:5433?tls=no"_s);
 }
 
@@ -187,12 +195,12 @@ TEST_F(Encryption, GivesNoPasswordToAServerThatAsksForIt) {
 
 TEST_F(Encryption, ReachesAServerThatProvesItself) {
     Server& server = Server::onNetwork();
-    database::postgres::Database administration({.host = server.folder(),
-                                                 .port = server.port(),
-                                                 .user = QString::fromLatin1(Server::User),
-                                                 .password = {},
-                                                 .name = u"postgres"_s});
-    administration.run(
+    ado::postgres::BulkAccess administration({.host = server.folder(),
+                                              .port = server.port(),
+                                              .user = QString::fromLatin1(Server::User),
+                                              .password = {},
+                                              .catalog = u"postgres"_s});
+    administration.execute(
         "ALTER ROLE dono PASSWORD 'segredo'; SET password_encryption = 'md5';"
         "CREATE ROLE velho LOGIN PASSWORD 'segredo'");
     const QString encrypted = u"127.1:"_s + server.port();

@@ -81,7 +81,7 @@ QString pattern(BookHandle::Content content) {
                         .port = {},
                         .user = QString::fromLatin1(Server::User),
                         .password = {},
-                        .name = name},
+                        .catalog = name},
                        {.user = Operator, .password = u"segredo"_s}, sample);
     made << name;
     return name;

@@ -2,6 +2,8 @@
 // Where a server is: names are looked up here and not by the client library, which would wait for a
 // silent name server as long as that pleases. And what a connection to it must prove before it gets
 // a password.
+#include "platform/ado/postgres/Address.h"
+
 #include <arpa/inet.h>
 #include <netdb.h>
 #include <sys/socket.h>
@@ -14,7 +16,6 @@
 
 #include "platform/ado/engine/EngineTexts.h"
 #include "platform/ado/engine/RowHolders.h"
-#include "platform/ado/postgres/Handle.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Wait.h"
 
@@ -116,13 +117,13 @@ bool Address::isReadable(const Found& found) const {
 }
 
 QString Address::shown() const {
-    return u"postgresql:"_s + source() + u'/' + catalog;
+    return dataSource() + u'/' + catalog;
 }
 
-QString Address::source() const {
+QString Address::dataSource() const {
     const bool isNumeric = host.contains(u':') && host[0] != u'/' && host[0] != u'[';
     const QString place = isNumeric ? u'[' + host + u']' : host;
-    return place + (port.isEmpty() ? QString() : u':' + port) +
+    return u"postgresql:"_s + place + (port.isEmpty() ? QString() : u':' + port) +
            (allowsPlain ? u"?tls=no"_s : QString());
 }
 

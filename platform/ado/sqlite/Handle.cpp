@@ -2,6 +2,7 @@
 #include "platform/ado/sqlite/Handle.h"
 
 #include <QThread>
+#include <limits>
 #include <utility>
 
 #include "platform/ado/sqlite/BookFile.h"
@@ -36,7 +37,7 @@ constexpr std::pair<const char*, int> EndlessFunctions[] = {
     {"printf", -1}, {"format", -1}, {"instr", 2}, {"replace", 3},
     {"trim", 2},    {"ltrim", 2},   {"rtrim", 2}, {"json_patch", 2}};
 
-/// An enlarged bind that is blank or a comment holds no second statement.
+/// What stands behind a statement and is blank is no second one.
 bool isBlank(const char* text) {
     while (*text == ' ' || *text == '\n' || *text == '\t' || *text == '\r' || *text == ';') ++text;
     return *text == '\0';
@@ -75,6 +76,12 @@ void Handle::limitWork() {
     for (const auto& [name, arguments] : EndlessFunctions)
         sqlite3_create_function_v2(db_, name, arguments, SQLITE_UTF8, nullptr, nullptr, nullptr,
                                    nullptr, nullptr);
+}
+
+void Handle::liftLimits() {
+    constexpr int MostThatThereIs = std::numeric_limits<int>::max();
+    sqlite3_limit(db_, SQLITE_LIMIT_LENGTH, MostThatThereIs);
+    sqlite3_progress_handler(db_, 0, nullptr, nullptr);
 }
 
 void Handle::setTimeout(int seconds) {

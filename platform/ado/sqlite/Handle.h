@@ -44,6 +44,8 @@ public:
 
     sqlite3* get() const { return db_; }
     void setTimeout(int seconds);
+    /// For work that takes as long as it takes; others that write are still waited for.
+    void liftLimits();
 
     /// Prepares the text, all of it: a second statement in it is refused.
     SqliteStatement prepare(const QByteArray& text);

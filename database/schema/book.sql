@@ -1,10 +1,11 @@
 -- SPDX-License-Identifier: MIT
--- The book on SQLite. Names are the system's own; letter case does not matter to the engine.
+-- The book's schema. Names are the system's own; letter case does not matter to any engine.
 --
--- Types by name, as the row-set layer reads them:
+-- It is written in the words of SQLite; another engine translates them. A name in braces stands for
+-- the file of that name. Types, as the row-set layer reads them:
 --   MONEY     an amount with four decimals
 --   REAL      a 32-bit float, DOUBLE a 64-bit one
---   DATETIME  text 'YYYY-MM-DD HH:MM:SS', a day being its first instant
+--   DATETIME  a moment without a zone (here text 'YYYY-MM-DD HH:MM:SS'), a day being its first instant
 -- Nothing refers to anything by a constraint: members leave into the tables *_Inactivos, rubrics and
 -- hospitals may go while old movements still name them, and the screens rely on being let.
 
@@ -13,33 +14,7 @@
 -- One row is one movement of a member's account in the current plan year.
 CREATE TABLE tbZelmar_Movimentos (
     movimento_id      INTEGER PRIMARY KEY AUTOINCREMENT,  -- never given twice
-    movimento_no      INTEGER,                            -- drawn from tbContadores, unique in a year
-    socio_id          INTEGER,
-    codABC            VARCHAR(4),                         -- whom it is for; null or '' for nobody
-    rubrica_id        INTEGER,
-    hospital_id       INTEGER,
-    oe_id             INTEGER,
-    data              DATETIME,                           -- day of entry
-    tipo              VARCHAR(3),
-    doc_data          DATETIME,
-    doc_no            VARCHAR(20),
-    doc_valor         MONEY,
-    doc_iva           MONEY,
-    doc_tx_iva        DOUBLE,                             -- per cent, 0 to 100
-    recebido          MONEY,
-    incidencia        MONEY,
-    comparticipacao   MONEY,
-    saldo_plafond     MONEY,
-    saldo_acumulado   MONEY,
-    iliquido          MONEY,
-    liquido           MONEY,
-    credito           MONEY,
-    debito            MONEY,
-    modo_pagamento    VARCHAR(3),
-    cheque            BIGINT,
-    descrit           TEXT,
-    obs               TEXT,
-    created_by        VARCHAR(50),
+    {movement},
     upsize_ts         BIGINT                              -- row version of the former server; unused
 );
 -- Franchise of the try-out: WHERE socio_id = ? AND rubrica_id = ?; statements: WHERE socio_id = ?
@@ -50,38 +25,9 @@ CREATE INDEX ixMovimentos_data ON tbZelmar_Movimentos (data);
 -- The same for members who have left.
 CREATE TABLE tbZelmar_Movimentos_Inactivos (
     movimento_id      INTEGER PRIMARY KEY AUTOINCREMENT,
-    movimento_no      INTEGER,
-    socio_id          INTEGER,
-    codABC            VARCHAR(4),
-    rubrica_id        INTEGER,
-    hospital_id       INTEGER,
-    oe_id             INTEGER,
-    data              DATETIME,
-    tipo              VARCHAR(3),
-    doc_data          DATETIME,
-    doc_no            VARCHAR(20),
-    doc_valor         MONEY,
-    doc_iva           MONEY,
-    doc_tx_iva        DOUBLE,
-    recebido          MONEY,
-    incidencia        MONEY,
-    comparticipacao   MONEY,
-    saldo_plafond     MONEY,
-    saldo_acumulado   MONEY,
-    iliquido          MONEY,
-    liquido           MONEY,
-    credito           MONEY,
-    debito            MONEY,
-    modo_pagamento    VARCHAR(3),
-    cheque            BIGINT,
-    descrit           TEXT,
-    obs               TEXT,
-    created_by        VARCHAR(50),
+    {movement},
     upsize_ts         BIGINT
 );
--- A movement keeps its id when its member leaves. What is first written here (corrections, opening
--- balances) is numbered far above, so that an id names one movement in both tables together.
-INSERT INTO sqlite_sequence (name, seq) VALUES ('tbZelmar_Movimentos_Inactivos', 1000000000);
 -- The same statements as above, run on this table beside them.
 CREATE INDEX ixMovimentos_Inactivos_socio ON tbZelmar_Movimentos_Inactivos (socio_id, rubrica_id);
 CREATE INDEX ixMovimentos_Inactivos_data ON tbZelmar_Movimentos_Inactivos (data);
@@ -89,33 +35,7 @@ CREATE INDEX ixMovimentos_Inactivos_data ON tbZelmar_Movimentos_Inactivos (data)
 -- Movements of closed years, with the member's name and address as they stood at the close.
 CREATE TABLE tbZelmar_Movimentos_Historico (
     ano                 INTEGER,                          -- the year closed
-    movimento_no        INTEGER,
-    socio_id            INTEGER,
-    codABC              VARCHAR(4),
-    rubrica_id          INTEGER,
-    hospital_id         INTEGER,
-    oe_id               INTEGER,
-    data                DATETIME,
-    tipo                VARCHAR(3),
-    doc_data            DATETIME,
-    doc_no              VARCHAR(20),
-    doc_valor           MONEY,
-    doc_iva             MONEY,
-    doc_tx_iva          DOUBLE,
-    recebido            MONEY,
-    incidencia          MONEY,
-    comparticipacao     MONEY,
-    saldo_plafond       MONEY,
-    saldo_acumulado     MONEY,
-    iliquido            MONEY,
-    liquido             MONEY,
-    credito             MONEY,
-    debito              MONEY,
-    modo_pagamento      VARCHAR(3),
-    cheque              BIGINT,
-    descrit             TEXT,
-    obs                 TEXT,
-    created_by          VARCHAR(50),
+    {movement},
     no_kor              VARCHAR(10),
     nome                VARCHAR(100),
     nome_guerra         VARCHAR(40),

@@ -1,0 +1,45 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <unordered_map>
+
+#include "platform/ado/engine/BulkAccess.h"
+#include "platform/ado/sqlite/Handle.h"
+
+namespace ado::sqlite {
+
+/// A book's file.
+class BulkAccess final : public ado::BulkAccess {
+public:
+    /// Opens an existing file; never makes one.
+    explicit BulkAccess(const QString& file);
+    ~BulkAccess() override;
+    BulkAccess(const BulkAccess&) = delete;
+    BulkAccess& operator=(const BulkAccess&) = delete;
+
+    void execute(const QByteArray& statements) override { handle_.execute(statements.constData()); }
+    qint64 number(const QByteArray& query) override;
+    QByteArray translated(const QByteArray& schema) const override { return schema; }
+
+    void begin(Purpose purpose) override;
+    void commit() override;
+
+    std::vector<TableShape> tables() override;
+    void eachRow(const TableShape& shape, const std::function<void(const BulkRow&)>& row) override;
+    Totals totals(const TableShape& shape) override;
+    std::map<QByteArray, qint64> lastKeys() override;
+
+    void add(const TableShape& shape, const BulkRow& row) override;
+    void clear(const TableShape& shape) override;
+    void flush() override { insertions_.clear(); }
+    void continueAfter(const TableShape& shape, qint64 lastKey) override;
+
+private:
+    bool step(sqlite3_stmt* statement);
+
+    Handle handle_;
+    Purpose purpose_ = Purpose::Reading;
+    std::unordered_map<const TableShape*, QByteArray> insertions_;
+};
+
+}  // namespace ado::sqlite
