@@ -49,23 +49,20 @@ void frmMovimentos::bindControls() {
     DataCombo3->setList(lists.Recordsets(u"msModosPagamento"_s), u"completo"_s, u"code"_s);
     DataCombo4->setList(lists.Recordsets(u"msOutrasInstituicoes"_s), u"descrit"_s, u"oe_id"_s);
 
-    const std::pair<forms::Bound*, QString> bindings[] = {
-        {Text3, u"codABC"_s},
-        {Text1, u"doc_data"_s},
-        {Text5, u"doc_no"_s},
-        {Text6, u"doc_valor"_s},
-        {Text9, u"recebido"_s},
-        {Text11, u"doc_tx_iva"_s},
-        {Text10, u"doc_iva"_s},
-        {DataCombo4, u"oe_id"_s},
-        {Text12, u"obs"_s},
-        {Text7, u"data"_s},
-        {Text8, u"tipo"_s},
-        {DataCombo1, u"rubrica_id"_s},
-        {DataCombo2, u"hospital_id"_s},
-        {DataCombo3, u"modo_pagamento"_s},
-    };
-    for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
+    forms::bindAll(Adodc1, {{Text3, u"codABC"_s},
+                            {Text1, u"doc_data"_s},
+                            {Text5, u"doc_no"_s},
+                            {Text6, u"doc_valor"_s},
+                            {Text9, u"recebido"_s},
+                            {Text11, u"doc_tx_iva"_s},
+                            {Text10, u"doc_iva"_s},
+                            {DataCombo4, u"oe_id"_s},
+                            {Text12, u"obs"_s},
+                            {Text7, u"data"_s},
+                            {Text8, u"tipo"_s},
+                            {DataCombo1, u"rubrica_id"_s},
+                            {DataCombo2, u"hospital_id"_s},
+                            {DataCombo3, u"modo_pagamento"_s}});
 }
 
 void frmMovimentos::connectHandlers() {
@@ -152,12 +149,7 @@ void frmMovimentos::showReadOnly(const QString& tipo) {
     LimiteAplicavel->hide();
     Label12->hide();
 
-    const std::pair<forms::Bound*, QString> bindings[] = {
-        {No_Kor, u"no_kor"_s},
-        {Text2, u"nome"_s},
-        {Text4, u"familiar"_s},
-    };
-    for (const auto& [control, column] : bindings) control->bind(Adodc1, column);
+    forms::bindAll(Adodc1, {{No_Kor, u"no_kor"_s}, {Text2, u"nome"_s}, {Text4, u"familiar"_s}});
     for (const ResultBox& result : resultBoxes())
         if (!result.column.isEmpty()) result.box->bind(Adodc1, result.column);
 

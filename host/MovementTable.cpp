@@ -8,6 +8,7 @@
 
 #include "host/MovementList.h"
 #include "host/Notice.h"
+#include "platform/forms/Look.h"
 
 using namespace Qt::StringLiterals;
 
@@ -27,19 +28,11 @@ MovementTable::MovementTable(MovementList* movements)
     setObjectName(u"Lista"_s);
     setAccessibleName(u"Movimentos"_s);
     setModel(movements);
-    setSelectionBehavior(SelectRows);
+    forms::settleTable(*this);
     setSelectionMode(ExtendedSelection);
-    setAlternatingRowColors(true);
-    setShowGrid(false);
-    setWordWrap(false);
-    setTabKeyNavigation(false);
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollMode(ScrollPerPixel);
-    verticalHeader()->hide();
-    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    verticalHeader()->setDefaultSectionSize(fontMetrics().height() * 3 / 2);
     QHeaderView* header = horizontalHeader();
-    header->setHighlightSections(false);
     header->setSectionsMovable(false);
     header->setSectionsClickable(true);
     header->setSortIndicatorClearable(true);

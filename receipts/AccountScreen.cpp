@@ -52,16 +52,15 @@ QWidget* AccountScreen::fieldNamedBy(const QString& text) const {
 void AccountScreen::bindControls() {
     DataCombo3->setList(environment::dtZelmars::instance().Recordsets(u"msModosPagamento"_s),
                         u"completo"_s, u"code"_s);
-    DataCombo3->bind(Adodc1, u"modo_pagamento"_s);
-    Text8->bind(Adodc1, u"tipo"_s);
-    Credito->bind(Adodc1, u"credito"_s);
-    Text1->bind(Adodc1, u"descrit"_s);
+    forms::bindAll(Adodc1, {{DataCombo3, u"modo_pagamento"_s},
+                            {Text8, u"tipo"_s},
+                            {Credito, u"credito"_s},
+                            {Text1, u"descrit"_s}});
 }
 
 void AccountScreen::showReadOnly(const ado::RecordsetPtr& rows) {
     Adodc1->setRecordset(rows);
-    No_Kor->bind(Adodc1, u"no_kor"_s);
-    Text2->bind(Adodc1, u"nome"_s);
+    forms::bindAll(Adodc1, {{No_Kor, u"no_kor"_s}, {Text2, u"nome"_s}});
     Text2->setBackColor(BackColor::Window);
     lockFields();
     for (forms::TextBox* box : findChildren<forms::TextBox*>())

@@ -28,8 +28,7 @@ frmRecebimento::frmRecebimento()
     layOut(u"Recebimento"_s, u"Registo do dinheiro que o associado entrega ao Plano de Saúde."_s,
            {receiptFrame()}, {Command2, Command3, Command4});
     Command2->hide();
-    Text3->bind(Adodc1, u"data"_s);
-    Text4->bind(Adodc1, u"cheque"_s);
+    forms::bindAll(Adodc1, {{Text3, u"data"_s}, {Text4, u"cheque"_s}});
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Command2_Click(); };
     forms::tabThrough(

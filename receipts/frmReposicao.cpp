@@ -54,10 +54,10 @@ frmReposicao::frmReposicao()
 void frmReposicao::bindControls() {
     DataCombo1->setList(environment::dtZelmars::instance().Recordsets(u"msRubricas"_s),
                         u"completo"_s, u"rubrica_id"_s);
-    DataCombo1->bind(Adodc1, u"rubrica_id"_s);
-    Text3->bind(Adodc1, u"codABC"_s);
-    Text7->bind(Adodc1, u"data"_s);
-    Debito->bind(Adodc1, u"debito"_s);
+    forms::bindAll(Adodc1, {{DataCombo1, u"rubrica_id"_s},
+                            {Text3, u"codABC"_s},
+                            {Text7, u"data"_s},
+                            {Debito, u"debito"_s}});
 }
 
 void frmReposicao::addPersonRow() {

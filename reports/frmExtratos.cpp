@@ -11,6 +11,7 @@
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
+#include "platform/forms/Fields.h"
 #include "platform/printing/DataReport.h"
 #include "reports/ExtractQuery.h"
 #include "reports/ExtractReports.h"
@@ -99,19 +100,14 @@ void frmExtratos::layOut() {
     foot->addWidget(Imprimir, 1, 2);
     foot->addWidget(Command4, 1, 3);
 
-    auto* all = new QVBoxLayout(this);
-    all->setContentsMargins(0, 0, 0, 0);
-    all->setSpacing(0);
-    all->addWidget(forms::headingBand(u"Impressão de Extratos de Movimentos"_s, {}, u"Label3"_s,
-                                      u"Label4"_s, u"Image1"_s));
-    auto* body = new QVBoxLayout;
-    body->setContentsMargins(12, 10, 12, 12);
-    body->setSpacing(9);
+    QVBoxLayout* body =
+        forms::bodyUnder(forms::headingBand(u"Impressão de Extratos de Movimentos"_s, {},
+                                            u"Label3"_s, u"Label4"_s, u"Image1"_s),
+                         this);
     body->addWidget(beneficiaryFrame());
     body->addWidget(kindFrame());
     body->addLayout(foot);
     body->addStretch(1);
-    all->addLayout(body);
 
     Imprimir->setDefault(true);
     QWidget* const order[] = {No_Kor, Command1, Option1, Text3,    Text4,   Option2,

@@ -10,6 +10,7 @@
 #include "platform/core/Values.h"
 #include "platform/forms/Controls.h"
 #include "platform/forms/DataGrid.h"
+#include "platform/forms/Fields.h"
 
 using namespace Qt::StringLiterals;
 
@@ -91,19 +92,15 @@ void frmQuotas::layOut() {
     auto* foot = new QHBoxLayout;
     foot->addWidget(lblTotais, 1);
     foot->addWidget(cmdSair);
-    auto* content = new QVBoxLayout;
-    content->setContentsMargins(12, 6, 12, 12);
-    content->setSpacing(8);
-    content->addWidget(lblAssociado);
-    content->addWidget(lblSituacao);
-    content->addWidget(DataGrid1, 1);
-    content->addLayout(foot);
-    auto* whole = new QVBoxLayout(this);
-    whole->setContentsMargins(0, 0, 0, 0);
-    whole->addWidget(forms::headingBand(u"Extrato de Quotizações"_s,
-                                        u"Prémios do Plano de Saúde pagos pelo associado."_s,
-                                        u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
-    whole->addLayout(content);
+    QVBoxLayout* body =
+        forms::bodyUnder(forms::headingBand(u"Extrato de Quotizações"_s,
+                                            u"Prémios do Plano de Saúde pagos pelo associado."_s,
+                                            u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s),
+                         this);
+    body->addWidget(lblAssociado);
+    body->addWidget(lblSituacao);
+    body->addWidget(DataGrid1, 1);
+    body->addLayout(foot);
     resize(100 * fontMetrics().averageCharWidth(), 28 * fontMetrics().height());
 }
 

@@ -10,6 +10,8 @@
 #include "companions/search/MemberList.h"
 #include "platform/core/Format.h"
 #include "platform/forms/Controls.h"
+#include "platform/forms/Fields.h"
+#include "platform/forms/Look.h"
 #include "platform/forms/TextBox.h"
 
 using namespace Qt::StringLiterals;
@@ -47,21 +49,13 @@ void frmProcurar::layOut() {
     lstSocios->setObjectName(u"lstSocios"_s);
     lstSocios->setModel(members_);
     lstSocios->setFocusPolicy(Qt::NoFocus);
-    lstSocios->setSelectionBehavior(QAbstractItemView::SelectRows);
-    lstSocios->setSelectionMode(QAbstractItemView::SingleSelection);
-    lstSocios->setAlternatingRowColors(true);
-    lstSocios->setShowGrid(false);
-    lstSocios->setWordWrap(false);
-    lstSocios->verticalHeader()->hide();
-    lstSocios->verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-    lstSocios->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 6);
+    forms::settleTable(*lstSocios);
     const int character = fontMetrics().averageCharWidth();
     lstSocios->setColumnWidth(MemberList::Number, 15 * character);
     lstSocios->setColumnWidth(MemberList::ShortName, 26 * character);
     lstSocios->setColumnWidth(MemberList::Locality, 24 * character);
     lstSocios->setColumnWidth(MemberList::Enrolled, 12 * character);
     lstSocios->horizontalHeader()->setSectionResizeMode(MemberList::Name, QHeaderView::Stretch);
-    lstSocios->horizontalHeader()->setHighlightSections(false);
 
     lblEncontrados->setObjectName(u"lblEncontrados"_s);
     cmdEscolher->setDefault(true);
@@ -75,19 +69,15 @@ void frmProcurar::layOut() {
     buttons->addWidget(lblEncontrados, 1);
     for (auto* button : {cmdActualizar, cmdEscolher, cmdDesistir}) buttons->addWidget(button);
 
-    auto* content = new QVBoxLayout;
-    content->setContentsMargins(12, 6, 12, 12);
-    content->setSpacing(8);
-    content->addLayout(search);
-    content->addWidget(lstSocios, 1);
-    content->addLayout(buttons);
-    auto* whole = new QVBoxLayout(this);
-    whole->setContentsMargins(0, 0, 0, 0);
-    whole->addWidget(forms::headingBand(
-        u"Procurar Associado"_s,
-        u"Escreva o início do número ou de palavras do nome; as setas percorrem a lista."_s,
-        u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
-    whole->addLayout(content);
+    QVBoxLayout* body = forms::bodyUnder(
+        forms::headingBand(
+            u"Procurar Associado"_s,
+            u"Escreva o início do número ou de palavras do nome; as setas percorrem a lista."_s,
+            u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s),
+        this);
+    body->addLayout(search);
+    body->addWidget(lstSocios, 1);
+    body->addLayout(buttons);
     resize(130 * character, 32 * fontMetrics().height());
 }
 

@@ -9,6 +9,8 @@
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Controls.h"
+#include "platform/forms/Fields.h"
+#include "platform/forms/Look.h"
 
 using namespace Qt::StringLiterals;
 
@@ -74,16 +76,8 @@ void frmEscolherFamiliar::layOut(const QString& member) {
     lstFamiliares->setObjectName(u"lstFamiliares"_s);
     lstFamiliares->setHorizontalHeaderLabels(
         {u"Código"_s, u"Grau de parentesco"_s, u"Nome"_s, u"Nascimento"_s, u"Carência até"_s});
-    lstFamiliares->setEditTriggers(QAbstractItemView::NoEditTriggers);
-    lstFamiliares->setSelectionBehavior(QAbstractItemView::SelectRows);
-    lstFamiliares->setSelectionMode(QAbstractItemView::SingleSelection);
-    lstFamiliares->setTabKeyNavigation(false);
-    lstFamiliares->setAlternatingRowColors(true);
-    lstFamiliares->setShowGrid(false);
-    lstFamiliares->verticalHeader()->hide();
-    lstFamiliares->verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 8);
+    forms::settleTable(*lstFamiliares);
     auto* header = lstFamiliares->horizontalHeader();
-    header->setHighlightSections(false);
     header->setDefaultAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     const int character = fontMetrics().averageCharWidth();
     for (const auto& [column, width] :
@@ -97,16 +91,12 @@ void frmEscolherFamiliar::layOut(const QString& member) {
     buttons->addStretch(1);
     buttons->addWidget(cmdEscolher);
     buttons->addWidget(cmdDesistir);
-    auto* content = new QVBoxLayout;
-    content->setContentsMargins(12, 6, 12, 12);
-    content->setSpacing(8);
-    content->addWidget(lstFamiliares, 1);
-    content->addLayout(buttons);
-    auto* whole = new QVBoxLayout(this);
-    whole->setContentsMargins(0, 0, 0, 0);
-    whole->addWidget(forms::headingBand(u"Para quem é o documento?"_s, member, u"lblTitulo"_s,
-                                        u"lblExplicacao"_s, u"picTitulo"_s));
-    whole->addLayout(content);
+    QVBoxLayout* body =
+        forms::bodyUnder(forms::headingBand(u"Para quem é o documento?"_s, member, u"lblTitulo"_s,
+                                            u"lblExplicacao"_s, u"picTitulo"_s),
+                         this);
+    body->addWidget(lstFamiliares, 1);
+    body->addLayout(buttons);
     resize(115 * character, 22 * fontMetrics().height());
 }
 

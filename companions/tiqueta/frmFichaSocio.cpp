@@ -10,6 +10,7 @@
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Controls.h"
+#include "platform/forms/Fields.h"
 #include "platform/forms/TextBox.h"
 
 using namespace Qt::StringLiterals;
@@ -78,17 +79,13 @@ void frmFichaSocio::layOut() {
     buttons->addStretch(1);
     buttons->addWidget(cmdOK);
     buttons->addWidget(cmdCancelar);
-    auto* content = new QVBoxLayout;
-    content->setContentsMargins(12, 6, 12, 12);
-    content->setSpacing(10);
-    for (auto* frame : {identification(), plan(), address()}) content->addWidget(frame);
-    content->addLayout(buttons);
-    auto* whole = new QVBoxLayout(this);
-    whole->setContentsMargins(0, 0, 0, 0);
-    whole->addWidget(forms::headingBand(u"Ficha de Associado"_s,
-                                        u"Dados do associado, da conta bancária e da inscrição."_s,
-                                        u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
-    whole->addLayout(content);
+    QVBoxLayout* body = forms::bodyUnder(
+        forms::headingBand(u"Ficha de Associado"_s,
+                           u"Dados do associado, da conta bancária e da inscrição."_s,
+                           u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s),
+        this);
+    for (auto* frame : {identification(), plan(), address()}) body->addWidget(frame);
+    body->addLayout(buttons);
 }
 
 QWidget* frmFichaSocio::identification() {
@@ -123,15 +120,15 @@ QWidget* frmFichaSocio::address() {
 
 void frmFichaSocio::bindFields() {
     Adodc1->setRecordset(member_);
-    txtNumero->bind(Adodc1, u"no_kor"_s);
-    txtContribuinte->bind(Adodc1, u"no_contribuinte"_s);
-    txtNome->bind(Adodc1, u"nome"_s);
-    txtNomeGuerra->bind(Adodc1, u"nome_guerra"_s);
-    txtNib->bind(Adodc1, u"nib"_s);
-    txtCarencia->bind(Adodc1, u"zelmar_data_carencia"_s);
-    txtMorada->bind(Adodc1, u"morada1"_s);
-    txtCodigoPostal->bind(Adodc1, u"code_postal1"_s);
-    txtLocalidade->bind(Adodc1, u"localidade1"_s);
+    forms::bindAll(Adodc1, {{txtNumero, u"no_kor"_s},
+                            {txtContribuinte, u"no_contribuinte"_s},
+                            {txtNome, u"nome"_s},
+                            {txtNomeGuerra, u"nome_guerra"_s},
+                            {txtNib, u"nib"_s},
+                            {txtCarencia, u"zelmar_data_carencia"_s},
+                            {txtMorada, u"morada1"_s},
+                            {txtCodigoPostal, u"code_postal1"_s},
+                            {txtLocalidade, u"localidade1"_s}});
     chkZelmar->setChecked(isEnrolled());
 }
 

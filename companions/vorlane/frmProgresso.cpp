@@ -7,6 +7,7 @@
 #include <algorithm>
 
 #include "platform/forms/Controls.h"
+#include "platform/forms/Fields.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/MsgBoxes.h"
 
@@ -44,16 +45,10 @@ frmProgresso::frmProgresso(int total, const QString& message, const QString& tit
 void frmProgresso::layOut(const QString& message, const QString& title) {
     auto* lblMensagem = new QLabel(message, this);
     lblMensagem->setObjectName(u"lblMensagem"_s);
-    auto* content = new QVBoxLayout;
-    content->setContentsMargins(16, 12, 16, 16);
-    content->setSpacing(8);
-    content->addWidget(lblMensagem);
-    content->addWidget(ProgressBar1);
-    auto* whole = new QVBoxLayout(this);
-    whole->setContentsMargins(0, 0, 0, 0);
-    whole->addWidget(
-        forms::headingBand(title, {}, u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s));
-    whole->addLayout(content);
+    QVBoxLayout* body = forms::bodyUnder(
+        forms::headingBand(title, {}, u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s), this);
+    body->addWidget(lblMensagem);
+    body->addWidget(ProgressBar1);
     setMinimumWidth(60 * fontMetrics().averageCharWidth());
     adjustSize();
     move(middleOf(QApplication::activeWindow()) - rect().center());

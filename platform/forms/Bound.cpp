@@ -76,4 +76,8 @@ bool Bound::writeEntered(const std::function<void()>& step) {
     return true;
 }
 
+void bindAll(DataControl* source, std::initializer_list<std::pair<Bound*, QString>> columns) {
+    for (const auto& [control, column] : columns) control->bind(source, column);
+}
+
 }  // namespace forms

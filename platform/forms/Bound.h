@@ -66,4 +66,7 @@ private:
     QMetaObject::Connection onField_;
 };
 
+/// Binds each control of a screen to its column.
+void bindAll(DataControl* source, std::initializer_list<std::pair<Bound*, QString>> columns);
+
 }  // namespace forms

@@ -36,11 +36,11 @@ DataCombo::DataCombo(const QString& name, QWidget* parent)
     setCompleter(completer);
     completer->popup()->installEventFilter(this);
     connect(lineEdit(), &QLineEdit::textEdited, this, [this] {
-        edited_ = true;
+        setEdited(true);
         offerMatches();
     });
     connect(this, &QComboBox::activated, this, [this] {
-        edited_ = false;
+        setEdited(false);
         chosen_ = BoundText();
         if (writeChoice()) handle(onGotFocus);
     });
@@ -58,7 +58,7 @@ void DataCombo::setList(const ado::RecordsetPtr& rows, const QString& listField,
 }
 
 void DataCombo::fill() {
-    const bool typing = edited_;
+    const bool typing = isEdited();
     const QString typed = currentText();
     const QSignalBlocker quiet(this);
     clear();
@@ -80,12 +80,12 @@ void DataCombo::fill() {
     choose(chosen_);
     if (!typing) return;
     setEditText(typed);
-    edited_ = true;
+    setEdited(true);
 }
 
 void DataCombo::choose(const QVariant& value) {
     chosen_ = value;
-    edited_ = false;
+    setEdited(false);
     int entry = -1;
     const QString wanted = core::toText(value);
     for (int at = 0; entry < 0 && !core::isNull(value) && at < count(); ++at)
@@ -114,14 +114,6 @@ void DataCombo::setLocked(bool locked) {
     tint(hasFocus());
 }
 
-void DataCombo::refreshFromRow() {
-    if (!edited_) choose(rowValue());
-}
-
-void DataCombo::rowReplaced() {
-    choose(rowValue());
-}
-
 QStringList DataCombo::entries() const {
     QStringList texts;
     for (int at = 0; at < count(); ++at) texts << itemText(at);
@@ -148,7 +140,7 @@ bool DataCombo::settleTypedText() {
     const int entry = entryFor(typed);
     if (entry < 0 && !typed.isEmpty()) return false;
     const bool hadChoice = !core::isNull(chosen_);
-    edited_ = false;
+    setEdited(false);
     const QSignalBlocker quiet(this);
     setCurrentIndex(entry);
     setEditText(entry < 0 ? QString() : itemText(entry));
@@ -162,26 +154,24 @@ bool DataCombo::writeChoice() {
     return writeEntered([&] { writeRow(choice); });
 }
 
-bool DataCombo::leave() {
+bool DataCombo::mayLeave() {
     // The list of completions would keep the next click to itself.
     if (completer() && completer()->popup()->isVisible()) completer()->popup()->hide();
-    if (!edited_) return true;
-    if (!settleTypedText()) {
-        constexpr qsizetype Quoted = 40;
-        const QString typed = currentText().trimmed();
-        core::MsgBox(u"«"_s + (typed.size() > Quoted ? typed.left(Quoted) + u'…' : typed) +
-                         u"» não consta da lista."_s,
-                     core::Icon::Exclamation);
-        return false;
-    }
-    if (writeChoice()) return true;
-    edited_ = true;
+    return true;
+}
+
+bool DataCombo::take() {
+    if (settleTypedText()) return writeChoice();
+    constexpr qsizetype Quoted = 40;
+    const QString typed = currentText().trimmed();
+    core::MsgBox(u"«"_s + (typed.size() > Quoted ? typed.left(Quoted) + u'…' : typed) +
+                     u"» não consta da lista."_s,
+                 core::Icon::Exclamation);
     return false;
 }
 
 void DataCombo::focusInEvent(QFocusEvent* event) {
-    const bool entering = !entered_;
-    entered_ = true;
+    const bool entering = enters();
     QComboBox::focusInEvent(event);
     tint(true);
     if (entering) handle(onGotFocus);
@@ -189,12 +179,11 @@ void DataCombo::focusInEvent(QFocusEvent* event) {
 
 void DataCombo::focusOutEvent(QFocusEvent* event) {
     QComboBox::focusOutEvent(event);
-    if (isAnotherWindows(event) || !entered_) return;
-    entered_ = false;
+    if (!leaves(event)) return;
     tint(false);
     // A text that fits nothing is refused by whoever asks before the focus goes on.
     const bool fits = currentText().trimmed().isEmpty() || entryFor(currentText()) >= 0;
-    if (!edited_ || fits) leave();
+    if (!isEdited() || fits) leave();
     handle(onLostFocus);
 }
 

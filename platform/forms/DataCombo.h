@@ -4,8 +4,7 @@
 #include <QComboBox>
 #include <functional>
 
-#include "platform/forms/Bound.h"
-#include "platform/forms/Validation.h"
+#include "platform/forms/TypedField.h"
 
 class QStringListModel;
 
@@ -16,7 +15,7 @@ namespace forms {
 /// opens the list. An emptied text is no choice. A text that fits no entry stays and is refused
 /// with a box. When the list's row set is opened again the combo takes the list anew and keeps what
 /// was chosen.
-class DataCombo : public QComboBox, public Bound, public Validating {
+class DataCombo : public QComboBox, public TypedField {
     Q_OBJECT
 public:
     explicit DataCombo(const QString& name, QWidget* parent = nullptr);
@@ -43,15 +42,12 @@ public:
     /// Runs when the focus leaves, after the choice was written to the row.
     std::function<void()> onLostFocus;
 
-    /// Takes the entry that was typed and writes it. Refuses, with a box that says why, a text that
-    /// fits no entry and what the row cannot take; in a row set that is open to read only a change
-    /// goes nowhere.
-    bool leave() override;
     bool eventFilter(QObject* watched, QEvent* event) override;
 
 protected:
-    void refreshFromRow() override;
-    void rowReplaced() override;
+    bool mayLeave() override;
+    bool take() override;
+    void showRow() override { choose(rowValue()); }
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -75,8 +71,6 @@ private:
     QVariant chosen_;  ///< the stored value, also one that is not in the list
     QVariant wiped_;
     bool locked_ = false;
-    bool edited_ = false;   ///< a person has typed since the choice was last settled
-    bool entered_ = false;  ///< has the focus, also while another window is active
 };
 
 }  // namespace forms

@@ -7,6 +7,7 @@
 
 #include "platform/core/Format.h"
 #include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
 
 namespace forms {
 
@@ -109,16 +110,7 @@ DataGrid::DataGrid(const QString& name, QWidget* parent)
     : QTableView(parent), rows_(new Rows(this)) {
     setObjectName(name);
     setModel(rows_);
-    setSelectionBehavior(SelectRows);
-    setSelectionMode(SingleSelection);
-    setEditTriggers(NoEditTriggers);
-    setAlternatingRowColors(true);
-    setShowGrid(false);
-    setTabKeyNavigation(false);
-    setWordWrap(false);
-    verticalHeader()->hide();
-    verticalHeader()->setDefaultSectionSize(fontMetrics().height() + 7);
-    horizontalHeader()->setHighlightSections(false);
+    settleTable(*this);
     horizontalHeader()->setStretchLastSection(true);
     connect(this, &QTableView::doubleClicked, this, &DataGrid::chosen);
 }

@@ -2,6 +2,7 @@
 #include "platform/forms/Look.h"
 
 #include <QApplication>
+#include <QHeaderView>
 #include <QIcon>
 #include <QLibraryInfo>
 #include <QLocale>
@@ -11,6 +12,7 @@
 #include <QPixmap>
 #include <QProxyStyle>
 #include <QStyleOption>
+#include <QTableView>
 #include <QTranslator>
 
 #include "platform/core/Format.h"
@@ -279,6 +281,20 @@ QColor blended(const QColor& under, const QColor& over, double part) {
     const auto mix = [part](int a, int b) { return qRound(a + (b - a) * part); };
     return QColor(mix(under.red(), over.red()), mix(under.green(), over.green()),
                   mix(under.blue(), over.blue()));
+}
+
+void settleTable(QTableView& table) {
+    table.setSelectionBehavior(QAbstractItemView::SelectRows);
+    table.setSelectionMode(QAbstractItemView::SingleSelection);
+    table.setEditTriggers(QAbstractItemView::NoEditTriggers);
+    table.setAlternatingRowColors(true);
+    table.setShowGrid(false);
+    table.setTabKeyNavigation(false);
+    table.setWordWrap(false);
+    table.verticalHeader()->hide();
+    table.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    table.verticalHeader()->setDefaultSectionSize(table.fontMetrics().height() * 3 / 2);
+    table.horizontalHeader()->setHighlightSections(false);
 }
 
 QColor focusedGround(const QPalette& palette) {

@@ -4,6 +4,7 @@
 #include <QColor>
 
 class QPalette;
+class QTableView;
 
 namespace forms {
 
@@ -15,6 +16,10 @@ QPalette readable(QPalette desktop);
 
 /// `part` of `over`, the rest of `under`; 0..1.
 QColor blended(const QColor& under, const QColor& over, double part);
+
+/// How every table looks and answers: rows as wholes, one chosen at a time, striped, without a grid
+/// and all of one height; Tab leaves it.
+void settleTable(QTableView& table);
 
 /// The ground of the field that a person types into.
 QColor focusedGround(const QPalette& palette);

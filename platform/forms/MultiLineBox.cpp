@@ -11,7 +11,7 @@ MultiLineBox::MultiLineBox(const QString& name, QWidget* parent) : QPlainTextEdi
     setTabChangesFocus(true);
     connect(this, &QPlainTextEdit::textChanged, this, [this] {
         if (showing_) return;
-        edited_ = true;
+        setEdited(true);
         emit textEdited();
     });
 }
@@ -27,19 +27,11 @@ QSize MultiLineBox::sizeHint() const {
     return {QPlainTextEdit::sizeHint().width(), fontMetrics().lineSpacing() * 5 + 12};
 }
 
-bool MultiLineBox::leave() {
-    if (!edited_ || !hasRow()) return true;
-    if (!writeEntered([this] { writeRow(Text()); })) return false;
-    edited_ = false;
-    return true;
+bool MultiLineBox::take() {
+    return !hasRow() || writeEntered([this] { writeRow(Text()); });
 }
 
-void MultiLineBox::refreshFromRow() {
-    if (!edited_) rowReplaced();
-}
-
-void MultiLineBox::rowReplaced() {
-    edited_ = false;
+void MultiLineBox::showRow() {
     const QString text = core::toText(rowValue());
     if (text == Text()) return;
     showing_ = true;

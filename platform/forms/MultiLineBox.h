@@ -3,15 +3,14 @@
 
 #include <QPlainTextEdit>
 
-#include "platform/forms/Bound.h"
-#include "platform/forms/Validation.h"
+#include "platform/forms/TypedField.h"
 
 namespace forms {
 
 /// Several lines of plain text, bound to a text column or not. Enter begins a new line, Tab goes on
 /// to the next control. A bound box writes what a person has typed when it is left, as a TextBox
 /// does.
-class MultiLineBox : public QPlainTextEdit, public Bound, public Validating {
+class MultiLineBox : public QPlainTextEdit, public TypedField {
     Q_OBJECT
 public:
     explicit MultiLineBox(const QString& name, QWidget* parent = nullptr);
@@ -23,7 +22,6 @@ public:
 
     /// Five lines high.
     QSize sizeHint() const override;
-    bool leave() override;
     bool takesEnter() const override { return true; }
 
 signals:
@@ -31,13 +29,12 @@ signals:
     void textEdited();
 
 protected:
-    void refreshFromRow() override;
-    void rowReplaced() override;
+    bool take() override;
+    void showRow() override;
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
 
 private:
-    bool edited_ = false;   ///< a person has changed the text since it was last shown
     bool showing_ = false;  ///< code is changing the text
 };
 

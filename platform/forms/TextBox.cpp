@@ -16,11 +16,11 @@ namespace forms {
 
 TextBox::TextBox(const QString& name, QWidget* parent) : QLineEdit(parent) {
     setObjectName(name);
-    connect(this, &QLineEdit::textEdited, this, [this] { edited_ = true; });
+    connect(this, &QLineEdit::textEdited, this, [this] { setEdited(true); });
 }
 
 void TextBox::setText(const QString& text) {
-    edited_ = false;
+    setEdited(false);
     if (hasRow())
         setValue(convert(text));
     else
@@ -28,7 +28,7 @@ void TextBox::setText(const QString& text) {
 }
 
 void TextBox::setValue(const QVariant& value) {
-    edited_ = false;
+    setEdited(false);
     if (hasRow()) writeRow(value);
     showValue(hasRow() ? rowValue() : value);
 }
@@ -36,7 +36,7 @@ void TextBox::setValue(const QVariant& value) {
 void TextBox::setFormat(QStringView format) {
     format_ = format.toString();
     setAlignment((isNumeric() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignVCenter);
-    if (!edited_) showValue(shown_);
+    if (!isEdited()) showValue(shown_);
 }
 
 bool TextBox::isNumeric() const {
@@ -88,40 +88,31 @@ QVariant TextBox::convert(const QString& text) const {
 
 void TextBox::showValue(const QVariant& value) {
     shown_ = value;
-    edited_ = false;
-    const QString text = core::formatted(value, entered_ ? QStringView() : QStringView(format_));
+    setEdited(false);
+    const QString text = core::formatted(value, isEntered() ? QStringView() : QStringView(format_));
     if (text != QLineEdit::text()) QLineEdit::setText(text);
-}
-
-void TextBox::refreshFromRow() {
-    if (!edited_) showValue(rowValue());
-}
-
-void TextBox::rowReplaced() {
-    showValue(rowValue());
 }
 
 /// Pasted blanks are no part of a number, a date or a name's number.
 void TextBox::cutBlanks() {
     const QString text = QLineEdit::text().trimmed();
-    if (edited_ && !format_.isEmpty() && text != QLineEdit::text()) QLineEdit::setText(text);
+    if (isEdited() && !format_.isEmpty() && text != QLineEdit::text()) QLineEdit::setText(text);
 }
 
-bool TextBox::leave() {
+bool TextBox::mayLeave() {
     cutBlanks();
     bool cancel = false;
     if (onValidate && !handle([this, &cancel] { onValidate(cancel); })) return false;
-    if (cancel) return false;
-    if (!edited_) return true;
-    if (writeEntered([this] { setValue(convert(QLineEdit::text())); })) return true;
-    edited_ = true;
-    return false;
+    return !cancel;
+}
+
+bool TextBox::take() {
+    return writeEntered([this] { setValue(convert(QLineEdit::text())); });
 }
 
 void TextBox::focusInEvent(QFocusEvent* event) {
-    const bool entering = !entered_;
-    entered_ = true;
-    if (entering && !edited_) showValue(shown_);
+    const bool entering = enters();
+    if (entering && !isEdited()) showValue(shown_);
     QLineEdit::focusInEvent(event);
     if (entering && !isAnotherWindows(event))
         keepSelection_ = event->reason() == Qt::MouseFocusReason;
@@ -130,17 +121,16 @@ void TextBox::focusInEvent(QFocusEvent* event) {
 
 void TextBox::focusOutEvent(QFocusEvent* event) {
     QLineEdit::focusOutEvent(event);
-    if (isAnotherWindows(event)) return;
-    entered_ = false;
+    if (!leaves(event)) return;
     keepSelection_ = false;
-    if (!edited_) showValue(shown_);
+    if (!isEdited()) showValue(shown_);
 }
 
 void TextBox::keyPressEvent(QKeyEvent* event) {
     const bool mark = event->key() == Qt::Key_Period || event->key() == Qt::Key_Comma;
     if (mark && (event->modifiers() & Qt::KeypadModifier) && isNumeric() && !isReadOnly()) {
         insert(core::decimalMark());
-        edited_ = true;
+        setEdited(true);
         return;
     }
     const auto modifiers = event->modifiers() & ~Qt::KeypadModifier;
@@ -157,7 +147,7 @@ void TextBox::stepDay(int days) {
     QLineEdit::setText(core::formatted(next, core::format::Date));
     selectAll();
     // As if it had been typed.
-    edited_ = true;
+    setEdited(true);
     emit textEdited(text());
 }
 

@@ -4,8 +4,7 @@
 #include <QLineEdit>
 #include <functional>
 
-#include "platform/forms/Bound.h"
-#include "platform/forms/Validation.h"
+#include "platform/forms/TypedField.h"
 
 namespace forms {
 
@@ -25,7 +24,7 @@ enum class BackColor { Menu, Window };
 /// In a box with a number format the decimal key of the numeric pad types the locale's mark. In one
 /// with the date format the arrows go a day on and back, from today in an empty box. Blanks around
 /// what was typed or pasted are cut off when a box with a format is left.
-class TextBox : public QLineEdit, public Bound, public Validating {
+class TextBox : public QLineEdit, public TypedField {
     Q_OBJECT
 public:
     explicit TextBox(const QString& name, QWidget* parent = nullptr);
@@ -34,7 +33,7 @@ public:
     QString Text() const { return text(); }
     /// The value behind the text, with the digits that the display format does not show; of a text
     /// that somebody is typing, what it stands for. Fails with TypeMismatch when it is none.
-    QVariant Value() const { return edited_ ? convert(text()) : shown_; }
+    QVariant Value() const { return isEdited() ? convert(text()) : shown_; }
     /// Sets the text and, when bound, writes it to the row at once, as typing and leaving would.
     /// Fails with TypeMismatch when the column does not take it.
     void setText(const QString& text);
@@ -59,13 +58,12 @@ public:
     /// Sets `cancel` to keep the focus in the box. Runs at each leaving, changed or not.
     std::function<void(bool& cancel)> onValidate;
 
-    bool leave() override;
-
 protected:
     /// The value that a typed text stands for. Fails with TypeMismatch and a text for the operator.
     virtual QVariant convert(const QString& text) const;
-    void refreshFromRow() override;
-    void rowReplaced() override;
+    bool mayLeave() override;
+    bool take() override;
+    void showRow() override { showValue(rowValue()); }
     void focusInEvent(QFocusEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
     void keyPressEvent(QKeyEvent* event) override;
@@ -80,8 +78,6 @@ private:
     void cutBlanks();
     QString format_;
     QVariant shown_;              ///< the value behind the text, as long as nobody types
-    bool edited_ = false;         ///< a person has changed the text since it was last shown
-    bool entered_ = false;        ///< has the focus, also while another window is active
     bool keepSelection_ = false;  ///< the click that brought the focus leaves the selection alone
     BackColor backColor_ = BackColor::Window;
 };
