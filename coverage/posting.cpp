@@ -55,7 +55,7 @@ bool bankNumberCheck(qint32 socio_id) {
     return true;
 }
 
-/// A failing statement is passed over; false when one failed. A movement without a number is not
+/// A step that fails is passed over; false when one failed. A movement without a number is not
 /// saved: it would be paid without standing in the accumulators.
 bool save(const Posting& posting, data::Operation& operation) {
     ado::Recordset& record = *posting.document.record;

@@ -6,7 +6,7 @@
 #include "platform/ado/Recordset.h"
 #include "platform/com/Component.h"
 
-/// Active members, as the screens find them. Values are joined into the statements as they stand.
+/// Active members, as the screens find them. Values are joined into the queries as they stand.
 namespace data {
 
 /// One row: a member, by the staff number or by the key.
@@ -15,7 +15,7 @@ QString memberQuery(qint32 socio_id);
 /// One row: a person of a member's family.
 QString personQuery(const QVariant& socio_familia_id);
 
-/// The staff number is what people type. Null when nobody has that number, whatever the statement
+/// The staff number is what people type. Null when nobody has that number, whatever the query
 /// found; blanks around what was typed or stored do not count.
 ado::RecordsetPtr openMemberByNumber(const QString& typed);
 ado::RecordsetPtr openMemberById(qint32 socio_id);

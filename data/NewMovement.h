@@ -11,7 +11,7 @@ inline constexpr QStringView NoMovementQuery =
     u"select * from tbzelmar_movimentos where movimento_id = 0";
 
 /// The empty row set to which a screen adds its new row. Empty texts receive their defaults: the
-/// connection "MSAccess" and the statement that returns no movement. Fails as opening does.
+/// connection "MSAccess" and the query that returns no movement. Fails as opening does.
 ado::RecordsetPtr openNewMovement(QString& strConMember, QString& strSQL);
 
 /// One row: the counters.

@@ -37,13 +37,13 @@ bool isRegistered(Operation& operation) {
 }
 
 ado::RecordsetPtr openMovement(Operation& operation) {
-    QString statement = u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s +
-                        numberText(operation.movimento_id) + u" AND socio_id = "_s +
-                        numberText(operation.socio_id);
+    QString query = u"SELECT * FROM vwZelmars_Movimentos_Vigor WHERE movimento_id = "_s +
+                    numberText(operation.movimento_id) + u" AND socio_id = "_s +
+                    numberText(operation.socio_id);
     // Movements that came from elsewhere may have no number.
     if (operation.movimento_no != 0)
-        statement += u" AND movimento_no = "_s + numberText(operation.movimento_no);
-    ado::RecordsetPtr movement = openToRead(statement);
+        query += u" AND movimento_no = "_s + numberText(operation.movimento_no);
+    ado::RecordsetPtr movement = openToRead(query);
     if (movement->atEnd()) return nullptr;
     operation.ficheiro = core::toText(movement->Collect(u"ficheiro"_s));
     return movement;

@@ -6,15 +6,15 @@
 
 namespace data {
 
-ado::RecordsetPtr openToRead(const QString& statement) {
+ado::RecordsetPtr openToRead(const QString& query) {
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statement, environment::dtZelmars::instance().MSAccess());
+    rows->Open(query, environment::dtZelmars::instance().MSAccess());
     return rows;
 }
 
-ado::RecordsetPtr openToWrite(const QString& statement) {
+ado::RecordsetPtr openToWrite(const QString& query) {
     const ado::RecordsetPtr rows = ado::Recordset::create();
-    rows->Open(statement, environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
+    rows->Open(query, environment::dtZelmars::instance().MSAccess(), ado::adOpenStatic,
                ado::adLockPessimistic, ado::adCmdUnknown);
     return rows;
 }

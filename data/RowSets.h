@@ -7,10 +7,10 @@
 namespace data {
 
 /// To be read only.
-ado::RecordsetPtr openToRead(const QString& statement);
+ado::RecordsetPtr openToRead(const QString& query);
 
 /// To be written: static cursor, pessimistic locks.
-ado::RecordsetPtr openToWrite(const QString& statement);
+ado::RecordsetPtr openToWrite(const QString& query);
 
 /// Adds to a sum of the current row, or takes from it. A sum with a null stays null, whichever of
 /// the two is null.

@@ -6,10 +6,10 @@
 
 namespace data {
 
-/// One column of the first row of a statement, without the caller holding a row set.
+/// One column of the first row of a query, without the caller holding a row set.
 ///
-/// Three outcomes stay apart: null for an empty statement or column name, or a null column; empty
-/// text for no row; otherwise the value. A statement that fails, or a column that is not there,
+/// Three outcomes stay apart: null for an empty query or column name, or a null column; empty
+/// text for no row; otherwise the value. A query that fails, or a column that is not there,
 /// fails the caller.
 ///
 /// The query always runs on the first connection of the data environment. Intentional:

@@ -95,12 +95,12 @@ bool mayClaim(const QString& codABC, const QVariant& Familia_ID, qint32 Socio_ID
 
 }  // namespace
 
-QString premiumStatement(qint32 socio_id) {
+QString premiumQuery(qint32 socio_id) {
     return u"select * from tbQuotas_Socios where socio_id="_s + QString::number(socio_id);
 }
 
 com::Object testPremium(qint32 socio_id) {
-    const ado::RecordsetPtr premium = data::openToRead(premiumStatement(socio_id));
+    const ado::RecordsetPtr premium = data::openToRead(premiumQuery(socio_id));
     if (premium->atEnd())
         MsgBox(
             u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
@@ -111,11 +111,11 @@ com::Object testPremium(qint32 socio_id) {
     if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
                u"Quotizações"_s, Buttons::NoYes) != Answer::Yes)
         return {};
-    const com::Object statement = data::openSearch();
-    statement.call(u"appShow"_s,
-                   {u"QUO01"_s, 1, QVariant(), u"Activos"_s,
-                    u"tbQuotas_Movimentos.socio_id="_s + QString::number(socio_id), true, true});
-    return statement;
+    const com::Object extract = data::openSearch();
+    extract.call(u"appShow"_s,
+                 {u"QUO01"_s, 1, QVariant(), u"Activos"_s,
+                  u"tbQuotas_Movimentos.socio_id="_s + QString::number(socio_id), true, true});
+    return extract;
 }
 
 void testBankNumber(const QVariant& nib, const std::function<QVariant()>& memberId) {

@@ -12,11 +12,11 @@
 namespace entry {
 
 /// One row: a member's premium.
-QString premiumStatement(qint32 socio_id);
+QString premiumQuery(qint32 socio_id);
 
-/// Warns of premium arrears, and in every case offers the premium statement. Nothing of it stops
-/// the choice of the member. Gives the component that shows the statement, whose window lives as
-/// long as somebody keeps it; empty when no statement was wanted.
+/// Warns of premium arrears, and in every case offers the premium extract. Nothing of it stops
+/// the choice of the member. Gives the component that shows the extract, whose window lives as
+/// long as somebody keeps it; empty when no extract was wanted.
 com::Object testPremium(qint32 socio_id);
 
 /// Warns of a missing bank number, or of one that has not its 21 characters, and then offers the

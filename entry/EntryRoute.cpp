@@ -14,7 +14,7 @@ namespace {
 
 using Entry = forms::DefaultInstance<frmMovimentos>;
 using Exit = forms::DefaultInstance<frmMovimentosF>;
-using Statements = forms::DefaultInstance<reports::frmExtratos>;
+using Extracts = forms::DefaultInstance<reports::frmExtratos>;
 using Choice = frmMovimentosF::Choice;
 
 /// Who an entry was for.
@@ -32,7 +32,7 @@ void closeEntry() {
     if (Exit::isLoaded()) Exit::get().onChosen = nullptr;
     Exit::unload();
     Entry::unload();
-    Statements::unload();
+    Extracts::unload();
 }
 
 void openAnother(bool bHospital) {
@@ -50,7 +50,7 @@ void continueWithSameMember() {
     openAnother(bHospital);
 }
 
-/// After statements there is no entry left, and the next one is an ordinary one.
+/// After the extracts there is no entry left, and the next one is an ordinary one.
 void continueWithNewMember() {
     const bool bHospital = Entry::isLoaded() && Entry::get().bHospital;
     closeEntry();
@@ -59,10 +59,10 @@ void continueWithNewMember() {
 
 void offerOtherMember();
 
-void printStatements() {
+void printExtracts() {
     const Member member = memberOf(Entry::get());
     closeEntry();
-    reports::frmExtratos& screen = Statements::get();
+    reports::frmExtratos& screen = Extracts::get();
     screen.setMember(member.id, member.number, member.name);
     screen.Show_Options = true;
     screen.onClosed = offerOtherMember;
@@ -77,8 +77,8 @@ void follow(Choice choice) {
         case Choice::NewMember:
             continueWithNewMember();
             break;
-        case Choice::Statements:
-            printStatements();
+        case Choice::Extracts:
+            printExtracts();
             break;
         case Choice::Leave:
             closeEntry();
@@ -93,7 +93,7 @@ void askHowToGoOn(const QString& outcome) {
     Exit::get().ShowModal();
 }
 
-/// On the way back from statements.
+/// On the way back from the extracts.
 void offerOtherMember() {
     Exit::get().offerOtherMember();
     askHowToGoOn({});

@@ -11,7 +11,7 @@
 namespace entry {
 
 /// Opens the entry screen modeless on a new row. Empty texts are replaced by their defaults: the
-/// connection "MSAccess" and the statement that returns no movement. Fails as opening a row set
+/// connection "MSAccess" and the query that returns no movement. Fails as opening a row set
 /// does.
 void openNewMovimento(bool bHospital, QString& strConMember, QString& strSQL);
 

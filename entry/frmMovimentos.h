@@ -123,7 +123,7 @@ private:
     };
     std::vector<ResultBox> resultBoxes() const;
 
-    com::Object search_;  ///< the last search component; keeps its premium statement open
+    com::Object search_;  ///< the last search component; keeps its premium extract open
     QString memberNumber_;
     data::Operation operation_;  ///< the posting or annulment that this screen is for
 };

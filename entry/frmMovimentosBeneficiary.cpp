@@ -40,7 +40,7 @@ void frmMovimentos::No_Kor_Validate(bool& cancel) {
 /// Typing recolours the person's fields and keeps what they hold.
 void frmMovimentos::takeMemberFound(ado::Recordset& member) {
     const qint32 id = core::toLong(member.Collect(u"socio_id"_s));
-    if (com::Object statement = testPremium(id)) search_ = statement;
+    if (com::Object extract = testPremium(id)) search_ = extract;
     // The member file takes the number typed as a 16-bit integer.
     testBankNumber(member.Collect(u"nib"_s),
                    [id] { return QVariant::fromValue(core::toInteger(id)); });
@@ -57,14 +57,14 @@ void frmMovimentos::Command1_Click() {
     forms::handlePlainly([this] { searchMember(); });
 }
 
-/// The search component is dropped at the end. A premium statement that is open stays until another
+/// The search component is dropped at the end. A premium extract that is open stays until another
 /// one takes its place.
 void frmMovimentos::searchMember() {
     const qint32 id = data::chooseMember(data::openSearch());
     if (id == 0) return;
     noteChoice();
     if (const ado::RecordsetPtr member = data::openEnrolledMember(id)) {
-        if (com::Object statement = testPremium(id)) search_ = statement;
+        if (com::Object extract = testPremium(id)) search_ = extract;
         testBankNumber(member->Collect(u"nib"_s), [id] { return QVariant(id); });
         Socio_ID = id;
         memberNumber_ = core::toText(member->Collect(u"no_kor"_s));

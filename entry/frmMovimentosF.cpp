@@ -65,7 +65,7 @@ void frmMovimentosF::Command1_Click() {
     else if (Option1->isChecked())
         choose(Choice::Leave);
     else if (Option3->isChecked())
-        choose(Choice::Statements);
+        choose(Choice::Extracts);
     else if (Option4->isChecked())
         choose(Choice::NewMember);
 }

@@ -12,13 +12,13 @@ namespace entry {
 class frmMovimentosF : public forms::Form {
     Q_OBJECT
 public:
-    enum class Choice { SameMember, NewMember, Statements, Leave };
+    enum class Choice { SameMember, NewMember, Extracts, Leave };
 
     frmMovimentosF();
 
     /// What became of the entry, beside the options.
     void tell(const QString& outcome);
-    /// The choice that is left after statements: another member, or to leave.
+    /// The choice that is left after the extracts: another member, or to leave.
     void offerOtherMember();
 
     /// Called on "OK" with the option chosen; closing the screen without a choice leaves.

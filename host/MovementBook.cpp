@@ -79,7 +79,7 @@ qint64 units(const ado::Cell& cell) {
     return amount ? amount->units() : MovementKey::NoAmount;
 }
 
-/// Reads the rows of a statement that begins with the columns of MovementKey. Rows of one day
+/// Reads the rows of a query that begins with the columns of MovementKey. Rows of one day
 /// mostly lie together, and their day is worked out once.
 class KeyReader {
 public:

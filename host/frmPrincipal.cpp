@@ -110,9 +110,9 @@ void frmPrincipal::addEntryMenu() {
 void frmPrincipal::addListingMenus() {
     QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
     addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
-    QMenu* statements = menuBar()->addMenu(u"&Extratos"_s);
-    addOperation(statements, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
-    addOperation(statements, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
+    QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
+    addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
+    addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
     QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
     addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
     addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});

@@ -7,7 +7,7 @@
 namespace receipts {
 
 /// Open the screen modeless on a new row. Empty texts are replaced by their defaults: the
-/// connection "MSAccess" and the statement that returns no movement. Fail as opening a row set
+/// connection "MSAccess" and the query that returns no movement. Fail as opening a row set
 /// does.
 void openNewReceipt(QString& strConMember, QString& strSQL);
 void openNewReposition(QString& strConMember, QString& strSQL);

@@ -22,7 +22,7 @@ public:
 
     /// Opens the window with this code:
     ///   "SOC01"  the search; waits and gives the socio_id taken, 0 when the user gave up;
-    ///   "QUO01"  the premium statement; stays open while this object is kept, no result. `members`
+    ///   "QUO01"  the premium extract; stays open while this object is kept, no result. `members`
     ///            is "Activos" or "Inactivos", `filter` a condition on tbQuotas_Movimentos.
     /// The other arguments belong to windows that are not offered. An unknown code fails.
     Q_INVOKABLE QVariant appShow(const QString& code, const QVariant& second = {},

@@ -18,7 +18,7 @@ namespace lumbra {
 namespace {
 
 // One row a payment.
-QString paymentsStatement(const QString& filter) {
+QString paymentsQuery(const QString& filter) {
     return u"SELECT * FROM tbQuotas_Movimentos WHERE "_s + filter +
            u" ORDER BY tbQuotas_Movimentos.ano DESC, tbQuotas_Movimentos.mes DESC"_s;
 }
@@ -29,7 +29,7 @@ QString memberQuery(const QString& members, int socioId) {
 }
 
 // The member's premium as a whole: month last paid, due, paid.
-QString premiumStatement(int socioId) {
+QString premiumQuery(int socioId) {
     return u"SELECT ult_mes, ult_ano, total_quotas, total_pago FROM tbQuotas_Socios "
            "WHERE socio_id = %1"_s.arg(socioId);
 }
@@ -64,7 +64,7 @@ frmQuotas::frmQuotas(const ado::ConnectionPtr& connection, const QString& member
       lblTotais(new QLabel(this)),
       lblSituacao(new QLabel(this)),
       cmdSair(new forms::Button(u"cmdSair"_s, u"&Sair"_s, this)) {
-    payments_->Open(paymentsStatement(filter), connection, ado::adOpenStatic);
+    payments_->Open(paymentsQuery(filter), connection, ado::adOpenStatic);
     socioId_ = memberOf(payments_, filter);
     layOut();
     connectHandlers();
@@ -122,7 +122,7 @@ void frmQuotas::showTotals(const ado::ConnectionPtr& connection) {
     lblTotais->setText(u"Pagamentos: %1    Total: %2"_s.arg(payments_->RecordCount())
                            .arg(money(QVariant::fromValue(sum))));
     const auto premium = ado::Recordset::create();
-    premium->Open(premiumStatement(socioId_), connection);
+    premium->Open(premiumQuery(socioId_), connection);
     lblSituacao->setText(
         premium->atEnd() ? u"Ainda não liquidou nenhum prémio."_s
                          : u"Último mês pago: %1/%2    Total devido: %3    Total pago: %4"_s.arg(

@@ -10,7 +10,7 @@ class DataGrid;
 
 namespace lumbra {
 
-/// The statement of a member's premium payments, newest first, with what he owes and has paid.
+/// The extract of a member's premium payments, newest first, with what he owes and has paid.
 class frmQuotas : public forms::Form {
     Q_OBJECT
 public:

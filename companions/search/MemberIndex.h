@@ -20,7 +20,7 @@ struct Member {
 };
 
 /// The active members, held for searching: some 150 bytes a member, so that a keystroke among
-/// 100,000 of them costs milliseconds and no statement.
+/// 100,000 of them costs milliseconds and no query.
 class MemberIndex {
 public:
     /// Takes all active members in, by name. What was held before goes.
@@ -42,7 +42,7 @@ private:
         quint32 shownBegin, shownEnd;
         quint32 wordsBegin, nameBegin, wordsEnd;
     };
-    /// Adds the member of a row of the statement.
+    /// Adds the member of a row of the query.
     void add(const ado::Recordset& row);
     /// Puts the members in the order of their names, without regard to accents and case.
     void sort();

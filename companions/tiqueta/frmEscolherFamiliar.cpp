@@ -26,7 +26,7 @@ QString memberQuery(int socioId) {
 
 // One row a person: the member himself and his relatives. The member's own waiting period stands
 // in his record, a relative's in the family.
-QString familyStatement(int socioId) {
+QString familyQuery(int socioId) {
     return u"SELECT tbSocios_Familias.socio_familia_id, tbSocios_Familias.codABC, "
            "tbSocios_Familias_CodeABC.grau, tbSocios_Familias.nome, "
            "tbSocios_Familias.data_nascimento, tbSocios_Familias.data_carencia, "
@@ -108,7 +108,7 @@ void frmEscolherFamiliar::connectHandlers() {
 
 void frmEscolherFamiliar::fill(const ado::ConnectionPtr& connection, int socioId) {
     const auto family = ado::Recordset::create();
-    for (family->Open(familyStatement(socioId), connection); !family->atEnd(); family->MoveNext()) {
+    for (family->Open(familyQuery(socioId), connection); !family->atEnd(); family->MoveNext()) {
         const QString code = core::toText(family->value(1));
         const QVariant waiting = family->value(isMemberHimself(code) ? 6 : 5);
         const int row = lstFamiliares->rowCount();

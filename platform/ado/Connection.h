@@ -12,7 +12,7 @@ class Session;
 
 /// A connection to a book, opened from its connection string. The engine is chosen by the string's
 /// `Data Source`: `sqlite:FOLDER` (the book is FOLDER/`Initial Catalog`.db) or
-/// `postgresql:HOST[:PORT]`. Provider "MSDataShape.1" makes SHAPE statements known to it.
+/// `postgresql:HOST[:PORT]`. Provider "MSDataShape.1" makes SHAPE queries known to it.
 class Connection {
 public:
     explicit Connection(const QString& name = {});
@@ -22,7 +22,7 @@ public:
 
     QString Name;              ///< as the data environment knows it; may be empty
     QString ConnectionString;  ///< takes effect at the next Open
-    int CommandTimeout = 30;   ///< seconds that a statement or a lock waits before it fails
+    int CommandTimeout = 30;   ///< seconds that a query or a lock waits before it fails
 
     ObjectState State() const { return session_ ? adStateOpen : adStateClosed; }
     /// Opens an existing book; never makes one. Fails with the engine's text, or with a text that

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-/// Names of states, cursor types and lock types, with the values that statements' authors know.
+/// Names of states, cursor types and lock types, with the values that authors of queries know.
 namespace ado {
 
 enum ObjectState { adStateClosed = 0, adStateOpen = 1 };

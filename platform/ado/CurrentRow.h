@@ -33,7 +33,7 @@ public:
     void leave();
     /// @param isOutdated  the values that the query read may not be the row's any more
     void standOn(At at, bool isOutdated, qint64 inserted = 0);
-    /// Puts a new row before the one stood on, which cancel() comes back to.
+    /// A new row takes the place of the current one, which cancel() comes back to.
     void startNew();
     void noteDeleted();
 
@@ -76,7 +76,7 @@ private:
     At at_ = At::Nothing;
     qint64 inserted_ = 0;
     bool isNew_ = false;
-    bool isDeleted_ = false;  ///< the row stood on, by this set
+    bool isDeleted_ = false;  ///< the current row, by this set
     Changes changes_;
     RowStore fresh_;  ///< empty, or the row
     bool isOutdated_ = false;

@@ -35,7 +35,7 @@ private:
     int column_;
 };
 
-/// Rows of one statement, one of them current. Opening costs what is read, not what the table
+/// Rows of one query, one of them current. Opening costs what is read, not what the table
 /// holds; a pass over a large table runs in bounded memory. Rows of a `SELECT *` over one table can
 /// be written with a lock type other than read only.
 ///
@@ -46,8 +46,8 @@ public:
     static RecordsetPtr create();
     ~Recordset() override;
 
-    /// Opens a statement: one SELECT, or a SHAPE on a shaping connection; anything else, or a
-    /// second statement behind it, is refused before it reaches the engine. The first row, if any,
+    /// Opens a query: one SELECT, or a SHAPE on a shaping connection; anything else, or a
+    /// second query behind it, is refused before it reaches the engine. The first row, if any,
     /// is current. A dynamic pessimistic set of a table without rows holds the place of the first
     /// one until Update or Close, so that of several workstations one alone adds a counter's row.
     void Open(const QString& source, const ConnectionPtr& connection,
@@ -94,7 +94,7 @@ public:
     /// column keeps. Fails with TypeMismatch, Overflow (past the column's range or length),
     /// NotUpdatable (read-only set) or NoCurrentRow.
     void setCollect(const QString& name, const QVariant& value);
-    /// The value as the statement read it, for a mere lookup: the row is not held for it and nobody
+    /// The value as the query read it, for a mere lookup: the row is not held for it and nobody
     /// is waited for. Of a row that this set added, null.
     QVariant readValue(const QString& name) const;
     /// The same as the engine keeps it, good until the next move: for passes over very many rows,
@@ -103,7 +103,7 @@ public:
     QVariant value(int column) const;
     void setValue(int column, const QVariant& value);
 
-    /// The child set of the current row of a SHAPE statement, by the name of its chapter. Of a set
+    /// The child set of the current row of a SHAPE query, by the name of its chapter. Of a set
     /// without rows it is an empty one that knows its columns.
     RecordsetPtr Chapter(const QString& name) const;
 

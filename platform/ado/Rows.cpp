@@ -68,7 +68,8 @@ bool Rows::toNext() {
     return seek(row_);
 }
 
-// The last row is stood on without being read: whoever only wants the count goes back to the first.
+// The last row becomes the current one without being read: whoever only wants the count goes back
+// to the first.
 bool Rows::toLast() {
     if (count_ < 0) seek(std::numeric_limits<qint64>::max());
     row_ = count_ - 1;

@@ -5,7 +5,7 @@
 
 namespace ado {
 
-/// The rows of one statement and a place among them. Few rows are taken in at once and the engine
+/// The rows of one query and a place among them. Few rows are taken in at once and the engine
 /// is let go; of many the first are kept and the others come from the pass, so that memory does not
 /// grow with the table.
 class Rows {
@@ -22,15 +22,16 @@ public:
     bool toLast();
     /// Number of rows; -1 as long as nobody has seen the last one.
     qint64 count() const { return count_; }
-    /// The row stood on, from 0.
+    /// Place of the current row, from 0.
     qint64 row() const { return row_; }
 
-    // Of the row stood on.
+    /// A value of the current row, good until the place changes.
     Cell cell(int column) {
         if (kept(row_)) return store_->cell(row_, column);
         if (passRow_ != row_) seek(row_);
         return pass_->cell(column);
     }
+    /// What tells the current row from all others.
     RowIdentity identity();
 
     bool inMemory() const { return complete_; }

@@ -25,7 +25,7 @@ enum FailureNumber : int {
     DatabaseFailure = -2147217900,
 };
 
-/// A statement that failed: what the operator reads when nobody traps it.
+/// A query or write that failed: what the operator reads when nobody traps it.
 class Failure : public std::exception {
 public:
     /// @param number  never 0

@@ -38,7 +38,7 @@ QDate toDate(const QVariant& value);
 /// The first instant of a day as a field holds it.
 QVariant fromDate(QDate day);
 
-/// The text of a value as it is joined into a statement or shown plain: "" for null, numbers with
+/// The text of a value as it is joined into a query or shown plain: "" for null, numbers with
 /// a point, whole numbers without decimals.
 QString toText(const QVariant& value);
 

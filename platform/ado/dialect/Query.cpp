@@ -134,7 +134,7 @@ qsizetype Query::end() const {
 void Query::requireQuery(bool shapes) const {
     if (!is(0, "select"_L1) && !(shapes && is(0, "shape"_L1)))
         refuse(u"Só são aceites consultas (SELECT); não foi executado: %1"_s.arg(text_.left(80)));
-    // No statement of the system has one; typed in, it would hide the rest of a statement.
+    // No query of the system has one; typed in, it would hide the rest of a query.
     if (hasComment_)
         refuse(
             u"Uma consulta não pode ter comentários; não foi executado: %1"_s.arg(text_.left(80)));

@@ -22,7 +22,7 @@ struct Token {
     qsizetype length;
 };
 
-/// A statement's text, cut into tokens once. Blanks and comments stand between tokens. Makes a
+/// A query's text, cut into tokens once. Blanks and comments stand between tokens. Makes a
 /// Failure of a quote or a comment that nobody closes, and of a null character.
 class Query {
 public:

@@ -12,7 +12,7 @@ namespace {
 /// Reads the tokens of the form one behind the other.
 class Reader {
 public:
-    explicit Reader(const Query& statement) : s(statement) {}
+    explicit Reader(const Query& query) : s(query) {}
 
     void expect(QLatin1StringView word) {
         if (!s.is(at_, word)) fail();
@@ -51,12 +51,12 @@ private:
 
 }  // namespace
 
-bool ShapeQuery::isShape(const Query& statement) {
-    return statement.is(0, "shape"_L1);
+bool ShapeQuery::isShape(const Query& query) {
+    return query.is(0, "shape"_L1);
 }
 
-ShapeQuery ShapeQuery::parse(const Query& statement) {
-    Reader reader(statement);
+ShapeQuery ShapeQuery::parse(const Query& query) {
+    Reader reader(query);
     ShapeQuery shape;
     reader.expect("shape"_L1);
     shape.parent = reader.braced();

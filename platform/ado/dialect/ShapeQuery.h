@@ -14,9 +14,9 @@ struct ShapeQuery {
     QString childColumn;
     QString chapter;
 
-    static bool isShape(const Query& statement);
-    /// Fails with a text when the statement is no such form.
-    static ShapeQuery parse(const Query& statement);
+    static bool isShape(const Query& query);
+    /// Fails with a text when the query is no such form.
+    static ShapeQuery parse(const Query& query);
 };
 
 }  // namespace ado

@@ -51,7 +51,7 @@ QString Translation::run(bool withIdentity) {
     return edits_.applied(s.text());
 }
 
-// One walk that finds what there is to do, so that a plain statement costs nothing more.
+// One walk that finds what there is to do, so that a plain query costs nothing more.
 void Translation::survey() {
     int depth = 0;
     int inner = 0;  // depth of the outermost SELECT in brackets; 0 outside of one

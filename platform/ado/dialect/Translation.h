@@ -119,8 +119,8 @@ private:
     std::vector<Source> sources_;
     std::size_t outer_ = 0;  ///< the first SELECT's first source
     int from_ = -1;          ///< FROM of the first SELECT
-    int group_ = -1;         ///< GROUP of the whole statement
-    int order_ = -1;         ///< ORDER of the whole statement
+    int group_ = -1;         ///< GROUP of the whole query
+    int order_ = -1;         ///< ORDER of the whole query
     int limit_ = -1;
     bool grouped_ = false;  ///< GROUP BY, DISTINCT or an aggregate: rows are no rows of a table
     bool compound_ = false;

@@ -147,7 +147,7 @@ bool Translation::isOrderedByIdentity() {
     return found;
 }
 
-// What a statement leaves open is settled, so that both engines give the rows in one order: rows
+// What a query leaves open is settled, so that both engines give the rows in one order: rows
 // that are equal in its own order, and all rows where it has none.
 void Translation::orders() {
     if (order_ >= 0) orderTerms();

@@ -20,7 +20,7 @@ QVariant toColumn(const QVariant& value, const Column& column);
 /// A date and time as it is stored and as texts of it are compared: "YYYY-MM-DD HH:MM:SS".
 QString storedForm(const QDateTime& moment);
 
-/// Reads a date text of a statement or of a person's hand: "YYYY-MM-DD" or month/day/year, behind
+/// Reads a date text of a query or of a person's hand: "YYYY-MM-DD" or month/day/year, behind
 /// it maybe "HH:MM[:SS]". Invalid when there is no such moment.
 QDateTime parseMoment(QStringView text);
 

@@ -17,7 +17,7 @@ namespace ado {
 class Query;
 class RowStore;
 
-/// A forward pass over the rows of one statement. The rows are those of the moment of opening.
+/// A forward pass over the rows of one query. The rows are those of the moment of opening.
 class Pass {
 public:
     virtual ~Pass() = default;
@@ -53,9 +53,9 @@ class Session {
 public:
     virtual ~Session() = default;
 
-    /// Opens a pass over a statement of the original dialect. With `table` not empty the statement
+    /// Opens a pass over a query of the original dialect. With `table` not empty the query
     /// is a `SELECT *` over that one table and the pass knows each row's identity.
-    virtual std::shared_ptr<Pass> open(const Query& statement, const QString& table) = 0;
+    virtual std::shared_ptr<Pass> open(const Query& query, const QString& table) = 0;
 
     /// True when rows of that name can be written: an existing table, not a view.
     virtual bool isTable(QStringView name) = 0;
@@ -79,7 +79,7 @@ public:
     virtual std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                           RowStore& into) = 0;
 
-    /// Seconds that a statement may wait for another program before it fails.
+    /// Seconds that a query may wait for another program before it fails.
     virtual void setTimeout(int seconds) = 0;
 
     /// Names the book, so that a row's identity is never used on another one.
