@@ -60,21 +60,6 @@ CheckBox::CheckBox(const QString& name, const QString& caption, QWidget* parent)
     connect(this, &QCheckBox::clicked, this, [this] { handlePress(this, onClick); });
 }
 
-ListBox::ListBox(const QString& name, QWidget* parent) : QListWidget(parent) {
-    setObjectName(name);
-    connect(this, &QListWidget::itemClicked, this, [this] { handlePress(this, onClick); });
-}
-
-QVariant ListBox::Text() const {
-    return currentItem() ? currentItem()->text() : QVariant();
-}
-
-void ListBox::setText(const QString& text) {
-    const QList<QListWidgetItem*> found =
-        findItems(text, Qt::MatchFixedString | Qt::MatchCaseSensitive);
-    setCurrentItem(found.isEmpty() ? nullptr : found.first());
-}
-
 Frame::Frame(const QString& name, const QString& caption, QWidget* parent)
     : QGroupBox(caption, parent) {
     setObjectName(name);

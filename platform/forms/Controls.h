@@ -3,7 +3,6 @@
 
 #include <QCheckBox>
 #include <QGroupBox>
-#include <QListWidget>
 #include <QProgressBar>
 #include <QPushButton>
 #include <QRadioButton>
@@ -49,20 +48,6 @@ public:
     CheckBox(const QString& name, const QString& caption, QWidget* parent = nullptr);
     bool Value() const { return isChecked(); }
     void setValue(bool ticked) { setChecked(ticked); }
-    std::function<void()> onClick;
-};
-
-/// A list of texts of which one can be chosen.
-class ListBox : public QListWidget {
-    Q_OBJECT
-public:
-    explicit ListBox(const QString& name, QWidget* parent = nullptr);
-    void AddItem(const QString& text) { addItem(text); }
-    void Clear() { clear(); }
-    /// The chosen text; null when none is chosen.
-    QVariant Text() const;
-    /// Chooses the entry with exactly that text; without one nothing is chosen.
-    void setText(const QString& text);
     std::function<void()> onClick;
 };
 

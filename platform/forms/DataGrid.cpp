@@ -3,7 +3,6 @@
 
 #include <QAbstractTableModel>
 #include <QHeaderView>
-#include <QKeyEvent>
 
 #include "platform/core/Format.h"
 #include "platform/forms/Form.h"
@@ -35,13 +34,6 @@ public:
         readAnew();
     }
 
-    QVariant value(int row, const QString& field) const {
-        if (row < 0 || row >= count_) return {};
-        const int column = columnOf(field);
-        return column < 0 ? QVariant() : set_->valueAt(row, column);
-    }
-
-    const std::vector<GridColumn>& columns() const { return columns_; }
     int rowCount(const QModelIndex& parent = {}) const override {
         return parent.isValid() ? 0 : count_;
     }
@@ -112,7 +104,6 @@ DataGrid::DataGrid(const QString& name, QWidget* parent)
     setModel(rows_);
     settleTable(*this);
     horizontalHeader()->setStretchLastSection(true);
-    connect(this, &QTableView::doubleClicked, this, &DataGrid::chosen);
 }
 
 void DataGrid::setColumns(const std::vector<GridColumn>& columns) {
@@ -125,22 +116,6 @@ void DataGrid::setColumns(const std::vector<GridColumn>& columns) {
 void DataGrid::setRecordset(const ado::RecordsetPtr& recordset) {
     rows_->setRecordset(recordset);
     if (rows_->rowCount() > 0) selectRow(0);
-}
-
-int DataGrid::currentRow() const {
-    return currentIndex().row();
-}
-
-QVariant DataGrid::currentValue(const QString& field) const {
-    return rows_->value(currentRow(), field);
-}
-
-void DataGrid::keyPressEvent(QKeyEvent* event) {
-    const bool enter = event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter;
-    if (enter && currentRow() >= 0)
-        emit chosen();
-    else
-        QTableView::keyPressEvent(event);
 }
 
 }  // namespace forms

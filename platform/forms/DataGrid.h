@@ -24,17 +24,6 @@ public:
     explicit DataGrid(const QString& name, QWidget* parent = nullptr);
     void setColumns(const std::vector<GridColumn>& columns);
     void setRecordset(const ado::RecordsetPtr& recordset);
-    /// Row under the cursor, -1 for none.
-    int currentRow() const;
-    /// A value of the row under the cursor; null when there is none.
-    QVariant currentValue(const QString& field) const;
-
-signals:
-    /// Enter or a double click on a row. What is connected runs through forms::handle.
-    void chosen();
-
-protected:
-    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     class Rows;
