@@ -6,7 +6,7 @@
 #include "benchmarks/Benches.h"
 #include "benchmarks/Books.h"
 #include "boundary/environment/dtZelmars.h"
-#include "companions/search/MemberList.h"
+#include "companions/search/MemberIndex.h"
 #include "host/MovementBook.h"
 
 using namespace Qt::StringLiterals;
@@ -38,8 +38,7 @@ void readAll() {
 }
 
 void readMembers() {
-    companions::MemberList list(nullptr);
-    list.load(environment::dtZelmars::instance().MSAccess());
+    companions::MemberIndex::read(environment::dtZelmars::instance().MSAccess());
 }
 
 double timeToBeCurrent() {

@@ -40,7 +40,7 @@ double slowest(const std::function<void(const QString&)>& filter) {
 void measureMemberSearch(Report& report, const Book& large) {
     use(large);
     companions::MemberList list(nullptr);
-    list.load(environment::dtZelmars::instance().MSAccess());
+    list.setMembers(companions::MemberIndex::read(environment::dtZelmars::instance().MSAccess()));
     report.value(u"filter keystroke, search window (slowest)"_s, u"ms"_s, 100,
                  slowest([&list](const QString& typed) {
                      list.setFilter(typed);

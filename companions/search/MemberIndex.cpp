@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "companions/search/MemberIndex.h"
 
+#include <QtEndian>
 #include <algorithm>
+#include <array>
 
 #include "platform/core/Folding.h"
 #include "platform/core/Values.h"
@@ -28,15 +30,36 @@ std::vector<std::string> wordsOf(const std::string& text) {
     return words;
 }
 
+/// The members of the book that was searched last.
+struct Kept {
+    QString book;
+    std::shared_ptr<const MemberIndex> members;
+};
+
+Kept& kept() {
+    static Kept only;
+    return only;
+}
+
 }  // namespace
 
-void MemberIndex::load(const ado::ConnectionPtr& connection) {
+std::shared_ptr<const MemberIndex> MemberIndex::read(const ado::ConnectionPtr& connection) {
     const auto rows = ado::Recordset::create();
     rows->Open(AllMembers, connection);
-    MemberIndex fresh;
-    for (; !rows->atEnd(); rows->MoveNext()) fresh.add(*rows);
-    fresh.sort();
-    *this = std::move(fresh);
+    const auto fresh = std::make_shared<MemberIndex>();
+    if (const auto before = lastRead(connection)) {
+        fresh->entries_.reserve(before->entries_.size() + 1);
+        fresh->shown_.reserve(before->shown_.size());
+        fresh->words_.reserve(before->words_.size());
+    }
+    for (; !rows->atEnd(); rows->MoveNext()) fresh->add(*rows);
+    fresh->sort();
+    kept() = {connection->ConnectionString, fresh};
+    return fresh;
+}
+
+std::shared_ptr<const MemberIndex> MemberIndex::lastRead(const ado::ConnectionPtr& connection) {
+    return kept().book == connection->ConnectionString ? kept().members : nullptr;
 }
 
 void MemberIndex::add(const ado::Recordset& row) {
@@ -53,17 +76,34 @@ void MemberIndex::add(const ado::Recordset& row) {
     }
     entry.shownEnd = static_cast<quint32>(shown_.size());
     entry.wordsBegin = static_cast<quint32>(words_.size());
-    words_ += core::foldedWords(row.readCell(1).text);
+    core::appendFoldedWords(words_, row.readCell(1).text);
     entry.nameBegin = static_cast<quint32>(words_.size());
-    words_ += core::foldedWords(row.readCell(2).text);
+    core::appendFoldedWords(words_, row.readCell(2).text);
     entry.wordsEnd = static_cast<quint32>(words_.size());
     entries_.push_back(entry);
 }
 
 void MemberIndex::sort() {
-    std::stable_sort(entries_.begin(), entries_.end(), [this](const Entry& a, const Entry& b) {
-        return nameWords(a) < nameWords(b);
+    // Two numbers of a name's first bytes tell nearly all names apart, and lie side by side.
+    struct Key {
+        std::array<quint64, 2> head;
+        quint32 position;
+    };
+    std::vector<Key> keys(entries_.size());
+    for (quint32 at = 0; at < keys.size(); ++at) {
+        std::array<char, 16> head{};
+        nameWords(entries_[at]).copy(head.data(), head.size());
+        keys[at] = {{qFromBigEndian<quint64>(head.data()), qFromBigEndian<quint64>(&head[8])}, at};
+    }
+    std::sort(keys.begin(), keys.end(), [this](const Key& a, const Key& b) {
+        if (a.head != b.head) return a.head < b.head;
+        const int order = nameWords(entries_[a.position]).compare(nameWords(entries_[b.position]));
+        return order == 0 ? a.position < b.position : order < 0;
     });
+    std::vector<Entry> sorted;
+    sorted.reserve(entries_.size());
+    for (const Key& key : keys) sorted.push_back(entries_[key.position]);
+    entries_ = std::move(sorted);
 }
 
 Member MemberIndex::at(int position) const {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QString>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -23,8 +24,12 @@ struct Member {
 /// 100,000 of them costs milliseconds and no query.
 class MemberIndex {
 public:
-    /// Takes all active members in, by name. What was held before goes.
-    void load(const ado::ConnectionPtr& connection);
+    /// Reads all active members, by name.
+    static std::shared_ptr<const MemberIndex> read(const ado::ConnectionPtr& connection);
+    /// The members as they were last read from that book in this process; null when they never
+    /// were.
+    static std::shared_ptr<const MemberIndex> lastRead(const ado::ConnectionPtr& connection);
+
     int size() const { return static_cast<int>(entries_.size()); }
     Member at(int position) const;
     qint32 socioId(int position) const { return entries_[static_cast<size_t>(position)].socioId; }

@@ -1,21 +1,25 @@
 // SPDX-License-Identifier: MIT
 #include "companions/search/MemberList.h"
 
+#include <algorithm>
+
 using namespace Qt::StringLiterals;
 
 namespace companions {
 
 MemberList::MemberList(QObject* parent) : QAbstractTableModel(parent) {}
 
-void MemberList::load(const ado::ConnectionPtr& connection) {
-    index_.load(connection);
-    setFilter({});
-}
-
 void MemberList::setFilter(const QString& typed) {
     beginResetModel();
-    found_ = index_.matching(typed);
+    found_ = members_->matching(typed);
     endResetModel();
+}
+
+int MemberList::rowOf(qint32 socioId) const {
+    const auto found = std::find_if(found_.begin(), found_.end(), [&](int position) {
+        return members_->socioId(position) == socioId;
+    });
+    return found == found_.end() ? -1 : static_cast<int>(found - found_.begin());
 }
 
 int MemberList::rowCount(const QModelIndex& parent) const {
@@ -28,7 +32,7 @@ int MemberList::columnCount(const QModelIndex& parent) const {
 
 QVariant MemberList::data(const QModelIndex& index, int role) const {
     if (role != Qt::DisplayRole || !index.isValid()) return {};
-    const Member member = index_.at(found_[static_cast<size_t>(index.row())]);
+    const Member member = members_->at(found_[static_cast<size_t>(index.row())]);
     switch (index.column()) {
         case Number:
             return member.number;

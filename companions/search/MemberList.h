@@ -14,12 +14,15 @@ public:
     enum Column { Number, Name, ShortName, Locality, Enrolled, ColumnCount };
 
     explicit MemberList(QObject* parent);
-    void load(const ado::ConnectionPtr& connection);
+    void setMembers(const std::shared_ptr<const MemberIndex>& members) { members_ = members; }
+    /// To be called also after setMembers().
     void setFilter(const QString& typed);
 
-    int total() const { return index_.size(); }
+    int total() const { return members_->size(); }
     /// The key of the member in that row.
-    qint32 socioId(int row) const { return index_.socioId(found_[static_cast<size_t>(row)]); }
+    qint32 socioId(int row) const { return members_->socioId(found_[static_cast<size_t>(row)]); }
+    /// The row of the member with that key; -1 when he is not among those found.
+    int rowOf(qint32 socioId) const;
 
     int rowCount(const QModelIndex& parent = {}) const override;
     int columnCount(const QModelIndex& parent = {}) const override;
@@ -27,7 +30,7 @@ public:
     QVariant headerData(int section, Qt::Orientation orientation, int role) const override;
 
 private:
-    MemberIndex index_;
+    std::shared_ptr<const MemberIndex> members_;
     std::vector<int> found_;
 };
 

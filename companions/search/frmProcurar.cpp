@@ -6,6 +6,7 @@
 #include <QKeyEvent>
 #include <QLabel>
 #include <QTableView>
+#include <QTimer>
 
 #include "companions/search/MemberList.h"
 #include "platform/core/Format.h"
@@ -38,13 +39,14 @@ frmProcurar::frmProcurar(const ado::ConnectionPtr& connection)
       cmdDesistir(new forms::Button(u"cmdDesistir"_s, u"&Desistir"_s, this)) {
     layOut();
     connectHandlers();
-    reload();
+    showMembers();
 }
 
 void frmProcurar::layOut() {
     txtProcurar->setMaxLength(200);
     txtProcurar->setPlaceholderText(u"número, ou palavras do nome por qualquer ordem"_s);
     txtProcurar->installEventFilter(this);
+    lstSocios->viewport()->installEventFilter(this);
 
     lstSocios->setObjectName(u"lstSocios"_s);
     lstSocios->setModel(members_);
@@ -89,9 +91,22 @@ void frmProcurar::connectHandlers() {
     cmdDesistir->onClick = [this] { Unload(); };
 }
 
-void frmProcurar::reload() {
-    members_->load(connection_);
+void frmProcurar::showMembers() {
+    const auto before = MemberIndex::lastRead(connection_);
+    isOutdated_ = before != nullptr;
+    members_->setMembers(before ? before : MemberIndex::read(connection_));
     filter();
+    txtProcurar->setFocus();
+}
+
+/// A mark that was moved stays where it is.
+void frmProcurar::reload() {
+    const int marked = lstSocios->currentIndex().row();
+    const qint32 socioId = marked > 0 ? members_->socioId(marked) : 0;
+    members_->setMembers(MemberIndex::read(connection_));
+    isOutdated_ = false;
+    filter();
+    if (const int row = members_->rowOf(socioId); row > 0) lstSocios->selectRow(row);
     txtProcurar->setFocus();
 }
 
@@ -105,7 +120,9 @@ void frmProcurar::filter() {
         u"%1 de %2 associados"_s.arg(locale.toString(found), locale.toString(members_->total())));
 }
 
+/// Nobody is taken by what was read for an earlier window.
 void frmProcurar::take() {
+    if (isOutdated_) reload();
     const QModelIndex current = lstSocios->currentIndex();
     if (!current.isValid()) return;
     taken_(members_->socioId(current.row()));
@@ -113,6 +130,14 @@ void frmProcurar::take() {
 }
 
 bool frmProcurar::eventFilter(QObject* watched, QEvent* event) {
+    if (watched == lstSocios->viewport() && event->type() == QEvent::Paint && !isPainted_) {
+        isPainted_ = true;
+        QTimer::singleShot(0, this, [this] {
+            forms::handle([this] {
+                if (isOutdated_) reload();
+            });
+        });
+    }
     if (watched != txtProcurar || event->type() != QEvent::KeyPress)
         return Form::eventFilter(watched, event);
     switch (static_cast<QKeyEvent*>(event)->key()) {

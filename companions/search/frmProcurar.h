@@ -15,7 +15,8 @@ namespace companions {
 class MemberList;
 
 /// Finds a member while the operator types. The focus stays in the search field: the arrows move
-/// the list, Enter takes, Esc gives up, F5 reads the members anew.
+/// the list, Enter takes, Esc gives up, F5 reads the members anew. Members that were read for an
+/// earlier window are there at once, and are read anew as soon as the window is painted.
 class frmProcurar : public forms::Form {
     Q_OBJECT
 public:
@@ -26,6 +27,7 @@ private:
     explicit frmProcurar(const ado::ConnectionPtr& connection);
     void layOut();
     void connectHandlers();
+    void showMembers();
     void reload();
     void filter();
     void take();
@@ -33,6 +35,8 @@ private:
 
     ado::ConnectionPtr connection_;
     MemberList* members_;
+    bool isOutdated_ = false;  ///< what is shown was read for an earlier window
+    bool isPainted_ = false;
     std::function<void(int)> taken_;
 
     forms::TextBox* txtProcurar;

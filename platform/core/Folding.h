@@ -18,6 +18,8 @@ inline std::string folded(const QString& text) {
 /// The words of a text, folded, each behind one blank, so that " ana" finds the beginning of a word
 /// only. Everything but letters and digits parts words.
 std::string foldedWords(std::string_view utf8);
+/// The same, behind what `words` holds already.
+void appendFoldedWords(std::string& words, std::string_view utf8);
 inline std::string foldedWords(const QString& text) {
     return foldedWords(std::string_view(text.toStdString()));
 }
