@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QString>
+
 #include "benchmarks/Report.h"
 
 namespace benchmarks {
@@ -12,7 +14,13 @@ void measureLists(Report& report);
 void measurePrinting(Report& report);
 void measureScreens(Report& report);
 void measureSearches(Report& report);
+void measureWaits(Report& report);
 void measureWorkstations(Report& report);
+
+/// What the program is told by when it is started to be waited for: it opens the main window on the
+/// book in the settings, and says when its list is painted.
+inline const QString UntilListStands = QStringLiteral("--until-list-stands");
+int tellWhenListStands();
 
 /// What a process holds in memory now; 0 when it cannot be told.
 double residentMegabytes(qint64 process);

@@ -12,6 +12,7 @@
 #include "boundary/Login.h"
 #include "database/Book.h"
 #include "platform/ado/postgres/BulkAccess.h"
+#include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/registry/LoginValues.h"
 
 using namespace Qt::StringLiterals;
@@ -44,7 +45,9 @@ void tell(const QString& name) {
     std::fflush(stdout);
 }
 
-Book fileBook(const QString& name, const database::BookSizes& sizes) {
+using Fill = std::function<void(ado::BulkAccess&)>;
+
+Book fileBook(const QString& name, const database::BookSizes& sizes, const Fill& more) {
     Book made{Engine::Sqlite, QDir::current().absoluteFilePath(u"build/bench/books/"_s + name), {}};
     if (!QFileInfo::exists(made.file())) {
         tell(name);
@@ -53,6 +56,10 @@ Book fileBook(const QString& name, const database::BookSizes& sizes) {
         QDir(half).removeRecursively();
         database::createBook(half, Catalogue);
         database::fillSample(half, Catalogue, sizes, AsOf);
+        if (more) {
+            ado::sqlite::BulkAccess book(database::bookFile(half, Catalogue));
+            more(book);
+        }
         QDir().rename(half, made.folder);
     }
     return made;
@@ -62,7 +69,7 @@ Book serverBook(const QString& name) {
     return {Engine::Postgres, BenchServer::instance().folder(), name};
 }
 
-Book serverBook(const QString& name, const database::BookSizes& sizes) {
+Book serverBook(const QString& name, const database::BookSizes& sizes, const Fill& more) {
     const Book made = serverBook(name);
     ado::postgres::BulkAccess server(serverBook(u"postgres"_s).server());
     if (server.number(
@@ -77,6 +84,7 @@ Book serverBook(const QString& name, const database::BookSizes& sizes) {
     {
         // The rows of a book that grew by itself lie in the order of their numbers.
         ado::postgres::BulkAccess book(half.server());
+        if (more) more(book);
         book.execute("CLUSTER tbZelmar_Movimentos USING tbZelmar_Movimentos_pkey");
         book.execute("VACUUM ANALYZE");
     }
@@ -85,8 +93,30 @@ Book serverBook(const QString& name, const database::BookSizes& sizes) {
     return made;
 }
 
-Book book(Engine engine, const QString& name, const database::BookSizes& sizes) {
-    return engine == Engine::Sqlite ? fileBook(name, sizes) : serverBook(name, sizes);
+Book book(Engine engine, const QString& name, const database::BookSizes& sizes,
+          const Fill& more = {}) {
+    return engine == Engine::Sqlite ? fileBook(name, sizes, more) : serverBook(name, sizes, more);
+}
+
+/// Adds what HeavyMember has beside the sample.
+void addHeavyMember(ado::BulkAccess& book) {
+    const QByteArray member = QByteArray::number(HeavyMember);
+    const QByteArray rubric = QByteArray::number(franchiseRubric());
+    const auto countTo = [](int count) {
+        return "WITH RECURSIVE n (i) AS (SELECT 1 UNION ALL SELECT i + 1 FROM n WHERE i < " +
+               QByteArray::number(count) + ") ";
+    };
+    book.execute(countTo(HeavyMovements) +
+                 "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, "
+                 "data, tipo, doc_data, doc_no, doc_valor, doc_iva, incidencia, comparticipacao, "
+                 "iliquido, liquido, credito, debito, modo_pagamento) SELECT 100000 + i, " +
+                 member + ", 'A', " + rubric +
+                 ", '2026-03-01 00:00:00', 'DOC', '2026-02-01 00:00:00', 'P1', 20, 3, 20, 12, 12, "
+                 "12, 12, 12, 'TRF' FROM n");
+    book.execute(countTo(HeavyAccumulators) +
+                 "INSERT INTO tbSocios_Acumulados (socio_id, codABC, rubrica_id, rubrica_id_main, "
+                 "debito_ac, credito_ac, no_docs) SELECT " +
+                 member + ", 'A', 100000 + i, 100000 + i / 20, 1, 1, 1 FROM n");
 }
 
 std::vector<Case> cases(const Book& book, const QByteArray& query) {
@@ -121,6 +151,19 @@ QString Book::connectionString() const {
 
 Book sampleBook(Engine engine) {
     return book(engine, u"sample"_s, {});
+}
+
+Book heavyBook(Engine engine) {
+    return book(engine, u"heavy"_s, {}, addHeavyMember);
+}
+
+qint32 franchiseRubric() {
+    static const auto rubric =
+        static_cast<qint32>(bareSqlite(sampleBook())
+                                ->run("SELECT rubrica_id FROM tbZelmar_Plafonds WHERE franquia > 0 "
+                                      "AND rubrica_id_main IS NOT "
+                                      "NULL"));
+    return rubric;
 }
 
 Book largeBook(Engine engine) {

@@ -2,12 +2,12 @@
 // From the call of an operation until its screen is painted.
 #include <QApplication>
 #include <QElapsedTimer>
-#include <QEvent>
 #include <algorithm>
 #include <vector>
 
 #include "benchmarks/Benches.h"
 #include "benchmarks/Books.h"
+#include "benchmarks/PaintWatch.h"
 #include "boundary/General.h"
 #include "platform/forms/Form.h"
 
@@ -16,23 +16,6 @@ using namespace Qt::StringLiterals;
 namespace benchmarks {
 
 namespace {
-
-/// Notes that a window was painted.
-class PaintWatch : public QObject {
-public:
-    explicit PaintWatch(const QString& window) : window_(window) { qApp->installEventFilter(this); }
-    bool painted() const { return painted_; }
-
-protected:
-    bool eventFilter(QObject* watched, QEvent* event) override {
-        if (event->type() == QEvent::Paint && watched->objectName() == window_) painted_ = true;
-        return false;
-    }
-
-private:
-    QString window_;
-    bool painted_ = false;
-};
 
 forms::Form* entryScreen() {
     for (QWidget* each : QApplication::topLevelWidgets())
@@ -46,9 +29,10 @@ forms::Form* entryScreen() {
 double openEntry(General& general) {
     QElapsedTimer clock;
     clock.start();
-    const PaintWatch watch(u"frmMovimentos"_s);
+    bool isPainted = false;
+    const PaintWatch watch(u"frmMovimentos"_s, [&](QWidget*) { isPainted = true; });
     general.NewMovimento(false);
-    while (!watch.painted()) QCoreApplication::processEvents();
+    while (!isPainted) QCoreApplication::processEvents();
     const double milliseconds = static_cast<double>(clock.nsecsElapsed()) / 1e6;
     entryScreen()->Unload();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);

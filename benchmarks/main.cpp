@@ -21,6 +21,10 @@ public:
 }  // namespace
 
 int main(int argc, char** argv) {
+    if (argc > 1 && benchmarks::UntilListStands == QLatin1StringView(argv[1])) {
+        const QApplication application(argc, argv);
+        return benchmarks::tellWhenListStands();
+    }
     const QTemporaryDir registry;
     qputenv("ZELMARS_REGISTRY", registry.path().toUtf8());
     const QApplication application(argc, argv);
@@ -38,6 +42,7 @@ int main(int argc, char** argv) {
         benchmarks::measurePrinting(report);
         benchmarks::measureScreens(report);
         benchmarks::measureSearches(report);
+        benchmarks::measureWaits(report);
         benchmarks::measureWorkstations(report);
     } catch (const std::exception& failure) {
         std::fprintf(stderr, "%s\n", failure.what());

@@ -1,0 +1,164 @@
+// SPDX-License-Identifier: MIT
+// What a person waits for: windows on a display of their own, from the key until they are painted,
+// and the program from its start.
+#include <QApplication>
+#include <QElapsedTimer>
+#include <QProcess>
+#include <QTableView>
+#include <algorithm>
+#include <cstdio>
+#include <stdexcept>
+#include <vector>
+
+#include "benchmarks/Benches.h"
+#include "benchmarks/Books.h"
+#include "benchmarks/PaintWatch.h"
+#include "boundary/environment/dtZelmars.h"
+#include "companions/search/frmProcurar.h"
+#include "coverage/TryOut.h"
+#include "host/frmPrincipal.h"
+#include "platform/forms/Form.h"
+#include "platform/forms/MsgBoxes.h"
+#include "platform/printing/DataReport.h"
+#include "reports/ExtractQuery.h"
+#include "reports/ExtractReports.h"
+#include "reports/ReportRows.h"
+
+using namespace Qt::StringLiterals;
+
+namespace benchmarks {
+
+namespace {
+
+constexpr int Workstations = 6;
+
+/// A display without a window manager, for programs that are started.
+class Display {
+public:
+    Display() {
+        server_.start(u"Xvfb"_s, {u"-displayfd"_s, u"1"_s, u"-screen"_s, u"0"_s, u"1280x800x24"_s,
+                                  u"-nolisten"_s, u"tcp"_s});
+        if (!server_.waitForReadyRead()) throw std::runtime_error("no virtual display");
+        name_ = u':' + QString::fromLatin1(server_.readAll()).trimmed();
+    }
+    ~Display() {
+        server_.terminate();
+        server_.waitForFinished();
+    }
+    Display(const Display&) = delete;
+    Display& operator=(const Display&) = delete;
+    const QString& name() const { return name_; }
+
+private:
+    QProcess server_;
+    QString name_;
+};
+
+/// Milliseconds until the last of so many programs, started at once, has painted its list.
+double startAtOnce(int count, const Display& display) {
+    QProcessEnvironment surroundings = QProcessEnvironment::systemEnvironment();
+    surroundings.insert(u"DISPLAY"_s, display.name());
+    surroundings.insert(u"QT_QPA_PLATFORM"_s, u"xcb"_s);
+    std::vector<std::unique_ptr<QProcess>> programs;
+    QElapsedTimer clock;
+    clock.start();
+    for (int at = 0; at < count; ++at) {
+        auto& program = programs.emplace_back(std::make_unique<QProcess>());
+        program->setProcessEnvironment(surroundings);
+        program->setProcessChannelMode(QProcess::ForwardedErrorChannel);
+        program->start(QCoreApplication::applicationFilePath(), {UntilListStands});
+    }
+    double last = 0;
+    for (const auto& program : programs) {
+        // The one word that it says.
+        if (!program->waitForReadyRead(60'000)) throw std::runtime_error("no list");
+        last = std::max(last, static_cast<double>(clock.nsecsElapsed()) / 1e6);
+    }
+    for (const auto& program : programs) program->kill();
+    for (const auto& program : programs) program->waitForFinished();
+    return last;
+}
+
+void measureStarts(Report& report) {
+    for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) {
+        const auto row = [&](const QString& what, int count, double limit) {
+            const QString name = u"wait/%1, %2"_s.arg(what, nameOf(engine));
+            if (!report.wanted(name)) return;
+            use(largeBook(engine));
+            const Display display;
+            report.value(name, u"ms"_s, limit,
+                         report.medianOf(5, [&] { return startAtOnce(count, display); }));
+        };
+        row(u"start until the list is painted"_s, 1, 500);
+        row(u"six starts at once"_s, Workstations, 2000);
+    }
+}
+
+/// Milliseconds from the call until the window of that name is painted; it is left then.
+double untilPainted(const QString& window, const std::function<void()>& call) {
+    QElapsedTimer clock;
+    double spent = 0;
+    const PaintWatch watch(window, [&](QWidget* painted) {
+        spent = static_cast<double>(clock.nsecsElapsed()) / 1e6;
+        QMetaObject::invokeMethod(
+            painted, [form = qobject_cast<forms::Form*>(painted)] { form->Unload(); },
+            Qt::QueuedConnection);
+    });
+    clock.start();
+    call();
+    while (spent == 0) QCoreApplication::processEvents();
+    QCoreApplication::processEvents();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    return spent;
+}
+
+void measureWindows(Report& report, Engine engine) {
+    const auto row = [&](const QString& what, double limit, Book (*book)(Engine),
+                         const std::function<double()>& measure) {
+        const QString name = u"wait/%1, %2"_s.arg(what, nameOf(engine));
+        if (!report.wanted(name)) return;
+        use(book(engine));
+        report.value(name, u"ms"_s, limit, report.medianOf(7, measure));
+    };
+    row(u"search window painted"_s, 100, largeBook, [] {
+        return untilPainted(u"frmProcurar"_s, [] {
+            companions::frmProcurar::choose(environment::dtZelmars::instance().MSAccess());
+        });
+    });
+    row(u"extract of 50,000 movements, first page"_s, 500, heavyBook, [] {
+        return untilPainted(reports::rptExtrato2().name, [] {
+            const printing::DataReport extract(reports::rptExtrato2());
+            const ado::RecordsetPtr rows = reports::openReportRows(
+                extract.design().dataMember, reports::extractQuery({.socio_id = HeavyMember,
+                                                                    .detailed = false,
+                                                                    .byDocument = false,
+                                                                    .first = QDate(2026, 1, 1),
+                                                                    .last = QDate(2026, 12, 31),
+                                                                    .doc_no = {}}));
+            extract.Show(rows, printing::DataReport::Wait::Modal);
+            rows->Close();
+        });
+    });
+}
+
+}  // namespace
+
+int tellWhenListStands() {
+    forms::install();
+    host::frmPrincipal window;
+    const PaintWatch watch(u"Lista"_s, [](QWidget* painted) {
+        const auto* list = qobject_cast<QTableView*>(painted->parentWidget());
+        if (!list || list->model()->rowCount() == 0) return;
+        std::puts("painted");
+        std::fflush(stdout);
+    });
+    window.show();
+    return QApplication::exec();
+}
+
+void measureWaits(Report& report) {
+    measureStarts(report);
+    for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) measureWindows(report, engine);
+}
+
+}  // namespace benchmarks
