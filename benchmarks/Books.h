@@ -30,14 +30,12 @@ Book sampleBook(Engine engine = Engine::Sqlite);
 /// 100,000 members, 1,000,000 movements, 1,000,000 accumulator rows.
 Book largeBook(Engine engine = Engine::Sqlite);
 
-/// The sample with a member who has very much: HeavyMovements movements on a rubric with a
-/// franchise and HeavyAccumulators accumulator rows.
+/// The sample with two members who have very much: one has 50,000 movements on a rubric with a
+/// franchise, the other 6,000 accumulator rows.
 Book heavyBook(Engine engine = Engine::Sqlite);
-inline constexpr qint32 HeavyMember = 1;
-inline constexpr int HeavyMovements = 50'000;
-inline constexpr int HeavyAccumulators = 6'000;
-/// A rubric with a franchise. The member's movements are its.
-qint32 franchiseRubric();
+inline constexpr qint32 MemberOfMovements = 1;
+inline constexpr qint32 MemberOfAccumulators = 3;
+inline constexpr qint32 FranchiseRubric = 5;
 
 /// Whether copies lie in memory. Waiting for a disk hides what a layer adds to its engine, and on a
 /// slow one a hundred thousand commits take minutes: the figures are those without it, on both

@@ -178,6 +178,20 @@ void compareWithBare(Report& report, const QString& name, Engine engine, int cal
         [&] { theirs(*engineAlone, theirTurn.next()); });
 }
 
+void measureHeavyMembers(Report& report, Engine engine) {
+    const auto row = [&](const QString& what, double limit, const Case& of) {
+        const QString name = u"try-out, member with %1, %2"_s.arg(what, nameOf(engine));
+        if (!report.wanted(name)) return;
+        use(heavyBook(engine));
+        const ado::RecordsetPtr record = pendingRow();
+        report.value(name, u"ms"_s, limit, report.medianOf(15, [&] {
+            return report.median(5, [&] { runTryOut(of, record); });
+        }));
+    };
+    row(u"50,000 movements"_s, 5, {MemberOfMovements, u"A"_s, FranchiseRubric});
+    row(u"6,000 accumulators"_s, 2, {MemberOfAccumulators, u"A"_s, FranchiseRubric});
+}
+
 }  // namespace
 
 void measureCoverage(Report& report) {
@@ -190,6 +204,7 @@ void measureCoverage(Report& report) {
             runTryOut(of, record);
         };
         compareWithBare(report, u"try-out"_s + on, engine, 200, tryOut, runBareTryOut);
+        measureHeavyMembers(report, engine);
         compareWithBare(report, u"posting"_s + on, engine, 20, runPosting, runBarePosting);
     }
     compareBooks(report, u"large-book/try-out"_s, false);

@@ -129,7 +129,7 @@ void measureWindows(Report& report, Engine engine) {
         return untilPainted(reports::rptExtrato2().name, [] {
             const printing::DataReport extract(reports::rptExtrato2());
             const ado::RecordsetPtr rows = reports::openReportRows(
-                extract.design().dataMember, reports::extractQuery({.socio_id = HeavyMember,
+                extract.design().dataMember, reports::extractQuery({.socio_id = MemberOfMovements,
                                                                     .detailed = false,
                                                                     .byDocument = false,
                                                                     .first = QDate(2026, 1, 1),

@@ -17,8 +17,9 @@ CREATE TABLE tbZelmar_Movimentos (
     {movement},
     upsize_ts         BIGINT                              -- row version of the former server; unused
 );
--- Franchise of the try-out: WHERE socio_id = ? AND rubrica_id = ?; statements: WHERE socio_id = ?
-CREATE INDEX ixMovimentos_socio ON tbZelmar_Movimentos (socio_id, rubrica_id);
+-- Franchise of the try-out: Sum(liquido), Sum(credito) WHERE socio_id = ? AND rubrica_id = ?, from
+-- the index alone, because a member may have very many; extracts: WHERE socio_id = ?
+CREATE INDEX ixMovimentos_socio ON tbZelmar_Movimentos (socio_id, rubrica_id, liquido, credito);
 -- Payment listings, hospital listing: WHERE data >= ? AND data <= ?
 CREATE INDEX ixMovimentos_data ON tbZelmar_Movimentos (data);
 
@@ -62,9 +63,12 @@ CREATE TABLE tbSocios_Acumulados (
     credito_ac      REAL,
     no_docs         INTEGER
 );
--- Try-out and posting: WHERE rubrica_id = ? AND socio_id = ? AND codABC = ?; all sums of a member:
--- WHERE socio_id = ?
+-- Try-out and posting: WHERE rubrica_id = ? AND socio_id = ? AND codABC = ?
 CREATE INDEX ixAcumulados_socio ON tbSocios_Acumulados (socio_id, rubrica_id, codABC);
+-- Sums of the try-out, from the index alone: WHERE rubrica_id_main = ? AND socio_id = ?; the balance:
+-- WHERE socio_id = ?
+CREATE INDEX ixAcumulados_grupo
+    ON tbSocios_Acumulados (socio_id, rubrica_id_main, codABC, credito_ac, debito_ac);
 
 -- The year close writes one of the two sums here and leaves the other to its default.
 CREATE TABLE tbSocios_Acumulados_Inactivos (

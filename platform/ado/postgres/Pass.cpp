@@ -20,12 +20,12 @@ constexpr auto FetchLater = "FETCH 1000 FROM linhas";
 // Rows that were asked for ahead wait on the server until somebody wants them, maybe over lunch.
 constexpr auto NoTimeout = "SET LOCAL statement_timeout = 0";
 
-/// True when a statement may say by itself how many rows it wants.
-bool limits(const Query& statement) {
+/// True when a statement may say by itself how many rows it wants, or when asking for the first ones
+/// alone saves nothing: all rows of a union are found and compared before the first one is known.
+bool wantsCursor(const Query& statement) {
     for (int i = 0; i < statement.count(); ++i)
-        if (statement.is(i, "limit"_L1) || statement.is(i, "fetch"_L1) ||
-            statement.is(i, "offset"_L1) || statement.is(i, "for"_L1))
-            return true;
+        for (const auto word : {"limit"_L1, "fetch"_L1, "offset"_L1, "for"_L1, "union"_L1})
+            if (statement.is(i, word)) return true;
     return false;
 }
 
@@ -34,7 +34,7 @@ bool limits(const Query& statement) {
 Pass::Pass(std::shared_ptr<Session> session, const Query& statement, bool withIdentity)
     : session_(std::move(session)), reader_(session_->takeReader()), withIdentity_(withIdentity) {
     try {
-        if (limits(statement) || !isShort(statement)) {
+        if (wantsCursor(statement) || !isShort(statement)) {
             declare_ = "DECLARE linhas NO SCROLL CURSOR FOR " +
                        session_->translated(statement, withIdentity);
             fetchFirst(Begin);
