@@ -4,7 +4,6 @@
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
 #include "boundary/environment/dtZelmars.h"
-#include "coverage/Queries.h"
 #include "coverage/annulment.h"
 #include "data/NewMovement.h"
 #include "platform/core/MsgBox.h"
@@ -47,56 +46,58 @@ void runReceipt(qint32 socio_id) {
 
 /// Finds a row, holds it, reads it as it is then, writes it and lets it go. Gives its first column
 /// as it was before.
-double writeHeld(Bare& bare, const QByteArray& select, const QByteArray& update) {
-    double first = bare.run(select);
-    if (bare.hold(select)) first = bare.run(select);
-    bare.run(update);
-    bare.letGo(select);
+double writeHeld(Bare& bare, const QByteArray& row, const QByteArray& select,
+                 const QByteArray& update, const Bare::Values& values) {
+    double first = bare.run(select, values);
+    if (bare.hold(row)) first = bare.run(select, values);
+    bare.run(update, values);
+    bare.letGo(row);
     return first;
 }
 
-QByteArray drawNumber(Bare& bare) {
-    const double number = writeHeld(bare, "SELECT zelmars FROM tbContadores",
-                                    "UPDATE tbContadores SET zelmars = zelmars + 1");
-    return QByteArray::number(number, 'f', 0);
+qint64 drawNumber(Bare& bare) {
+    return static_cast<qint64>(writeHeld(bare, "counter", "SELECT zelmars FROM tbContadores",
+                                         "UPDATE tbContadores SET zelmars = zelmars + 1", {}));
 }
 
 void runBareReceipt(Bare& bare, qint32 socio_id) {
-    const QByteArray member = QByteArray::number(socio_id);
+    const qint64 member = socio_id;
     bare.run("SELECT * FROM tbZelmar_Movimentos WHERE movimento_id = 0");
     bare.run(
         "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, data, tipo, modo_pagamento, "
-        "doc_valor, debito, credito) VALUES (" +
-        drawNumber(bare) + ", " + member + ", '2026-11-20 00:00:00', 'PAG', 'CHQ', 0, 0, 40)");
-    const QByteArray where =
-        " tbSocios_Acumulados WHERE (socio_id=" + member + ") and (rubrica_id_main=0)";
-    writeHeld(bare, "SELECT * FROM" + where,
-              "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac + 40 WHERE socio_id = " +
-                  member + " AND rubrica_id_main = 0");
+        "doc_valor, debito, credito) VALUES ($1, $2, '2026-11-20 00:00:00', 'PAG', 'CHQ', 0, 0, "
+        "40)",
+        {drawNumber(bare), member});
+    writeHeld(bare, "accumulator",
+              "SELECT * FROM tbSocios_Acumulados WHERE socio_id = $1 AND rubrica_id_main = 0",
+              "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac + 40 WHERE socio_id = $1 AND "
+              "rubrica_id_main = 0",
+              {member});
 }
 
 void runBareAnnulment(Bare& bare, const ado::Recordset& shown) {
-    const auto value = [&](const QString& column) {
-        return core::toText(shown.Collect(column)).toUtf8();
+    const auto number = [&](const QString& column) {
+        return qint64{core::toLong(shown.Collect(column))};
     };
-    const QByteArray key = " WHERE movimento_id = " + value(u"movimento_id"_s);
-    writeHeld(bare, "SELECT * FROM tbZelmar_Movimentos" + key,
-              "UPDATE tbZelmar_Movimentos SET tipo = 'ANL', modo_pagamento = 'ANL'" + key);
+    const QByteArray person = core::toText(shown.Collect(u"codABC"_s)).toUtf8();
+    const qint64 member = number(u"socio_id"_s);
+    const qint64 rubric = number(u"rubrica_id"_s);
+    writeHeld(bare, "movement", "SELECT * FROM tbZelmar_Movimentos WHERE movimento_id = $1",
+              "UPDATE tbZelmar_Movimentos SET tipo = 'ANL', modo_pagamento = 'ANL' WHERE "
+              "movimento_id = $1",
+              {number(u"movimento_id"_s)});
     bare.run(
         "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, data, tipo, "
-        "doc_no, doc_data, doc_valor, credito, debito) VALUES (" +
-        drawNumber(bare) + ", " + value(u"socio_id"_s) + ", '" + value(u"codABC"_s) + "', " +
-        value(u"rubrica_id"_s) +
-        ", '2026-11-20 00:00:00', 'COR', '1234', '2026-11-20 00:00:00', 40, -28, -28)");
-    const QByteArray own =
-        coverage::queries::accumulator(shown.Collect(u"rubrica_id"_s),
-                                       core::toLong(shown.Collect(u"socio_id"_s)),
-                                       core::toText(shown.Collect(u"codABC"_s)))
-            .toUtf8();
-    writeHeld(bare, own,
-              "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac - 28, debito_ac = debito_ac "
-              "- 28, no_docs = no_docs - 1" +
-                  own.mid(own.indexOf(" WHERE")));
+        "doc_no, doc_data, doc_valor, credito, debito) VALUES ($1, $2, $3, $4, '2026-11-20 "
+        "00:00:00', 'COR', '1234', '2026-11-20 00:00:00', 40, -28, -28)",
+        {drawNumber(bare), member, person.constData(), rubric});
+    writeHeld(
+        bare, "accumulator",
+        "SELECT * FROM tbSocios_Acumulados WHERE rubrica_id = $1 AND socio_id = $2 AND codABC "
+        "= $3",
+        "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac - 28, debito_ac = debito_ac "
+        "- 28, no_docs = no_docs - 1 WHERE rubrica_id = $1 AND socio_id = $2 AND codABC = $3",
+        {rubric, member, person.constData()});
 }
 
 void measureOn(Report& report, Engine engine) {

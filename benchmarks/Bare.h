@@ -23,15 +23,16 @@ public:
     virtual const char* text(int column) const = 0;
 };
 
-/// An engine's client library without anything around it.
+/// An engine's client library without anything around it, as somebody would write it who wants to
+/// be faster: everything stays prepared, and nothing is converted that nobody asked for.
 class Bare {
 public:
     virtual ~Bare() = default;
 
-    /// Prepares, runs and drops one query; reads `column` of its first row.
-    virtual double run(const QByteArray& query, int column = 0) = 0;
-    /// Runs and commits a write that stays prepared; its values are $1 and so on.
-    virtual void write(const QByteArray& query, const std::vector<BareValue>& values) = 0;
+    using Values = std::vector<BareValue>;
+    /// Runs a query or write, which stays prepared; its values are $1 and so on, in this order.
+    /// Reads `column` of its first row; a write is committed.
+    virtual double run(const QByteArray& query, const Values& values = {}, int column = 0) = 0;
     /// A pass over a query, on a connection of its own.
     virtual std::unique_ptr<BareRows> rows(const QByteArray& query) = 0;
 

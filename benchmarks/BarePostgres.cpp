@@ -68,25 +68,21 @@ public:
     explicit BarePostgres(const Book& book) : book_(book), connection_(connect(book)) {}
     ~BarePostgres() override { PQfinish(connection_); }
 
-    double run(const QByteArray& query, int column) override {
-        PGresult* result = benchmarks::run(connection_, query);
-        const double value =
-            PQntuples(result) > 0 ? std::strtod(PQgetvalue(result, 0, column), nullptr) : 0;
-        PQclear(result);
-        return value;
-    }
-
-    void write(const QByteArray& query, const std::vector<BareValue>& values) override {
+    double run(const QByteArray& query, const Values& values, int column) override {
         const QByteArray name = prepared(query);
         std::vector<QByteArray> texts;
         for (const BareValue& value : values) texts.push_back(textOf(value));
         std::vector<const char*> pointers;
         for (const QByteArray& text : texts) pointers.push_back(text.constData());
-        PQclear(
+        PGresult* result =
             checked(connection_,
                     PQexecPrepared(connection_, name.constData(), static_cast<int>(pointers.size()),
                                    pointers.data(), nullptr, nullptr, 0),
-                    query));
+                    query);
+        const double found =
+            PQntuples(result) > 0 ? std::strtod(PQgetvalue(result, 0, column), nullptr) : 0;
+        PQclear(result);
+        return found;
     }
 
     std::unique_ptr<BareRows> rows(const QByteArray& query) override {
@@ -94,10 +90,10 @@ public:
     }
 
     bool hold(const QByteArray& row) override {
-        write(Hold, {row.constData()});
+        run(Hold, {row.constData()}, 0);
         return true;
     }
-    void letGo(const QByteArray& row) override { write(LetGo, {row.constData()}); }
+    void letGo(const QByteArray& row) override { run(LetGo, {row.constData()}, 0); }
 
     void touch(const QByteArray& row, const QByteArray& query) override {
         const QByteArray names[] = {prepared(Hold), prepared(query), prepared(LetGo)};

@@ -36,28 +36,22 @@ class BareSqlite final : public Bare {
 public:
     explicit BareSqlite(const QString& file) : file_(file), handle_(connect()) {}
     ~BareSqlite() override {
-        for (sqlite3_stmt* write : writes_) sqlite3_finalize(write);
+        for (sqlite3_stmt* each : kept_) sqlite3_finalize(each);
         sqlite3_close(handle_);
     }
 
-    double run(const QByteArray& query, int column) override {
-        sqlite3_stmt* prepared = prepare(handle_, query);
-        double value = 0;
-        int step = sqlite3_step(prepared);
-        if (step == SQLITE_ROW) value = sqlite3_column_double(prepared, column);
-        while (step == SQLITE_ROW) step = sqlite3_step(prepared);
-        if (step != SQLITE_DONE) stop(handle_, query);
-        sqlite3_finalize(prepared);
-        return value;
-    }
-
-    void write(const QByteArray& query, const std::vector<BareValue>& values) override {
-        sqlite3_stmt*& prepared = writes_[query];
-        if (!prepared) prepared = prepare(handle_, query);
+    double run(const QByteArray& query, const Values& values, int column) override {
+        sqlite3_stmt*& kept = kept_[query];
+        if (!kept) kept = prepare(handle_, query);
         int place = 0;
-        for (const BareValue& value : values) bind(prepared, ++place, value);
-        if (sqlite3_step(prepared) != SQLITE_DONE) stop(handle_, query);
-        sqlite3_reset(prepared);
+        for (const BareValue& value : values) bind(kept, ++place, value);
+        double found = 0;
+        int step = sqlite3_step(kept);
+        if (step == SQLITE_ROW) found = sqlite3_column_double(kept, column);
+        while (step == SQLITE_ROW) step = sqlite3_step(kept);
+        if (step != SQLITE_DONE) stop(handle_, query);
+        sqlite3_reset(kept);
+        return found;
     }
 
     std::unique_ptr<BareRows> rows(const QByteArray& query) override {
@@ -101,7 +95,7 @@ private:
 
     QString file_;
     sqlite3* handle_;
-    QHash<QByteArray, sqlite3_stmt*> writes_;
+    QHash<QByteArray, sqlite3_stmt*> kept_;
 };
 
 }  // namespace

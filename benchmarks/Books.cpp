@@ -174,7 +174,9 @@ bool copiesInMemory() {
 BookCopy::BookCopy(const Book& original) : book_(original) {
     if (book_.engine == Engine::Sqlite) {
         if (copiesInMemory())
-            book_.folder = Memory + u"/zelmars-bench-%1"_s.arg(QCoreApplication::applicationPid());
+            book_.folder =
+                Memory + u"/zelmars-bench-%1-%2"_s.arg(QCoreApplication::applicationPid())
+                             .arg(QFileInfo(original.folder).fileName());
         book_.folder += u"-copy"_s;
         QDir(book_.folder).removeRecursively();
         QDir().mkpath(book_.folder);

@@ -159,7 +159,7 @@ void fillDocument(ado::Recordset& row, int number) {
 void insertBare(Bare& bare, qint64 number) {
     const BareValue amount = 28.5;
     const char* const day = "2026-11-20 00:00:00";
-    bare.write(
+    bare.run(
         "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, data, tipo, "
         "doc_data, doc_no, doc_valor, recebido, incidencia, comparticipacao, iliquido, liquido, "
         "credito, debito, modo_pagamento, created_by) VALUES ($1, $2, $3, $4, $5, $6, $7, $8, $9, "
@@ -207,9 +207,8 @@ void measureUpdates(Report& report, Engine engine) {
     const auto theirs = [&] {
         for (int step = 1; step <= steps && theirRows->next(); ++step)
             if (step % 10 == 0)
-                engineAlone->write(
-                    "UPDATE tbZelmar_Movimentos SET obs = $1 WHERE movimento_id = $2",
-                    {"medido", theirRows->integer(Id)});
+                engineAlone->run("UPDATE tbZelmar_Movimentos SET obs = $1 WHERE movimento_id = $2",
+                                 {"medido", theirRows->integer(Id)});
     };
     compareStretches(report, withCount(name, writes, Updates), ours, theirs);
 }
