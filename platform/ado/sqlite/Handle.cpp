@@ -163,7 +163,7 @@ void Handle::keep(std::unique_ptr<SqliteQuery> query) {
     sqlite3_clear_bindings(query->statement.get());
     if (queries_.size() >= CachedStatements) queries_.clear();
     QString key = query->key;
-    queries_.insert_or_assign(std::move(key), std::move(query));
+    queries_.emplace(std::move(key), std::move(query));
 }
 
 sqlite3_stmt* Handle::cached(const QByteArray& text) {

@@ -90,7 +90,8 @@ private:
     std::optional<core::Wait> waiting_;
     bool isGivenUp_ = false;  ///< by the operator, what the engine was asked for last
     QHash<QByteArray, std::shared_ptr<sqlite3_stmt>> cache_;
-    std::unordered_map<QString, std::unique_ptr<SqliteQuery>> queries_;
+    /// Of a query that is open twice at a time there are two.
+    std::unordered_multimap<QString, std::unique_ptr<SqliteQuery>> queries_;
 };
 
 }  // namespace ado::sqlite
