@@ -34,7 +34,7 @@ void readFirstRows() {
 }
 
 void readAll() {
-    host::MovementBook(host::BookSettings::read()).all({});
+    host::MovementBook(host::BookSettings::read()).all({}, [](int) {});
 }
 
 void readMembers() {

@@ -54,7 +54,7 @@ void measureMemberSearch(Report& report, const Book& large) {
 void measureMovementSearch(Report& report, const Book& large) {
     use(large);
     const host::MovementBook book(host::BookSettings::read());
-    const std::shared_ptr<host::MovementSearch> all = book.all({});
+    const std::shared_ptr<host::MovementSearch> all = book.all({}, [](int) {});
     report.value(u"filter keystroke, movements (slowest)"_s, u"ms"_s, 100,
                  slowest([&](const QString& typed) {
                      const std::vector<quint32> found = all->find(typed);

@@ -177,7 +177,9 @@ QDate MovementBook::lastDay(const QString& table) const {
     return day;
 }
 
-std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
+std::shared_ptr<MovementSearch> MovementBook::all(const std::stop_token& stop,
+                                                  const Progress& progress) const {
+    constexpr int MovementsBetween = 50'000;
     auto search = std::make_shared<MovementSearch>();
     const auto each = [&](const QString& query, const auto& take) {
         const auto row = ado::Recordset::create();
@@ -202,6 +204,7 @@ std::shared_ptr<MovementSearch> MovementBook::all(std::stop_token stop) const {
             MovementKey key = reader.read(row);
             key.activo = activo;
             search->append(key);
+            if (search->size() % MovementsBetween == 0) progress(int(search->size()));
         });
     }
     search->sort();

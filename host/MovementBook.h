@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QVariant>
+#include <functional>
 #include <memory>
 #include <stop_token>
 #include <vector>
@@ -39,8 +40,11 @@ public:
 
     /// The newest movements, at most `count`, with the names of their persons.
     std::shared_ptr<MovementSearch> newest(int count) const;
+    /// Told how many movements have been read, every now and then.
+    using Progress = std::function<void(int movements)>;
     /// All movements and the names of all persons; null when it was stopped.
-    std::shared_ptr<MovementSearch> all(std::stop_token stop) const;
+    std::shared_ptr<MovementSearch> all(const std::stop_token& stop,
+                                        const Progress& progress) const;
     /// Takes in what was posted since, and what those rows annul; returns how many movements were
     /// posted.
     int takeNewer(MovementSearch& search) const;

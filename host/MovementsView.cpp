@@ -18,8 +18,6 @@ namespace host {
 
 namespace {
 
-constexpr int FirstMovements = 300;  // more than any screen shows
-
 /// Why a movement has no screen to be looked at on; empty for those that have one.
 QString reasonNotToOpen(const QString& tipo) {
     if (tipo == "ANL"_L1) return u"foi anulado."_s;
@@ -71,6 +69,11 @@ void MovementsView::connectParts() {
     list_->installEventFilter(this);
     connect(filter_, &QLineEdit::textChanged, this, &MovementsView::filterChanged);
     connect(list_, &QTableView::doubleClicked, this, &MovementsView::chooseCurrent);
+    connect(loader_, &MovementLoader::begun, this, &MovementsView::takeBegun);
+    connect(loader_, &MovementLoader::progressed, this, [this](int movements) {
+        read_ = movements;
+        showCount();
+    });
     connect(loader_, &MovementLoader::loaded, this, &MovementsView::takeLoaded);
     connect(list_, &MovementTable::copied, this, [this](int rows, bool all) {
         const QString text = rows == 1 ? u"Uma linha copiada."_s : u"%1 linhas copiadas."_s;
@@ -87,27 +90,40 @@ void MovementsView::connectParts() {
 }
 
 void MovementsView::open(const BookSettings& settings) {
+    const bool isSame = settings.connectionString() == settings_.connectionString();
     settings_ = settings;
-    sorter_->forget();
-    movements_->setBook({}, {});
-    book_.reset();
-    isSample_ = false;
+    read_ = 0;
+    loader_->stop();
+    if (!isSame || !book_ || !settings.isComplete || !settings.unreadable.isEmpty()) forgetBook();
     if (!settings.unreadable.isEmpty())
         return showNotice(u"As definições não se deixam ler:\n"_s + settings.unreadable,
                           u"F5 tenta de novo."_s);
     if (!settings.isComplete)
         return showNotice(u"Ainda não há um livro para este utilizador."_s,
                           u"Um livro novo faz-se com: zelmars init PASTA"_s);
+    loader_->start(settings);
+    stack_->setCurrentIndex(0);
+    showCount();
+}
+
+void MovementsView::forgetBook() {
+    sorter_->forget();
+    movements_->setBook({}, {});
+    book_.reset();
+    isSample_ = false;
+}
+
+void MovementsView::takeBegun(const std::shared_ptr<MovementSearch>& newest, bool isSample) {
     try {
-        book_ = std::make_shared<MovementBook>(settings);
-        isSample_ = book_->isSample();
-        movements_->setBook(book_, book_->newest(FirstMovements));
-        loader_->start(settings);
-        stack_->setCurrentIndex(0);
+        sorter_->forget();
+        book_ = std::make_shared<MovementBook>(settings_);
+        isSample_ = isSample;
+        movements_->setBook(book_, newest);
         list_->standOn(0);
         movements_->read(0);
         sortAgain();
         showCount();
+        emit opened();
     } catch (const core::Failure& failure) {
         showUnreadable(failure.text());
     }
@@ -275,13 +291,18 @@ void MovementsView::showCount() {
     if (!movements_->filter().simplified().isEmpty())
         text =
             u"%1 de %2 movimentos"_s.arg(core::grouped(shown), core::grouped(movements_->total()));
-    if (loader_->isReading()) text += u" (a ler os restantes…)"_s;
+    if (!book_)
+        text = u"(a ler o livro…)"_s;
+    else if (loader_->isReading())
+        text += read_ == 0 ? u" (a ler os restantes…)"_s
+                           : u" (a ler os restantes: %1…)"_s.arg(core::grouped(read_));
     if (sorter_->isBusy()) text += u" (a ordenar…)"_s;
     emit countChanged(text);
     showEmptyText();
 }
 
 void MovementsView::showEmptyText() {
+    if (!book_) return list_->setEmptyText(u"A ler o livro…"_s, {});
     if (movements_->filter().simplified().isEmpty())
         return list_->setEmptyText(u"Este livro ainda não tem movimentos."_s,
                                    u"Ctrl+N começa um documento, Ctrl+R um recebimento."_s);

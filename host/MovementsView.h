@@ -22,7 +22,8 @@ class MovementsView : public QWidget {
 public:
     MovementsView();
 
-    /// Shows the newest movements of a book at once and reads the others beside it.
+    /// Reads a book beside the window: the newest movements are shown as soon as they are there,
+    /// and what was shown of the same book until then.
     void open(const BookSettings& settings);
     /// Shows what was posted or annulled since, here or at another workstation.
     void takeNewer();
@@ -39,6 +40,8 @@ public:
     void setColumns(const QByteArray& columns);
 
 signals:
+    /// The newest movements of the book are shown.
+    void opened();
     /// Enter or a double click on a movement.
     void chosen(qint32 movimento_id);
     /// How many movements are shown, for the status line.
@@ -57,6 +60,8 @@ private:
     bool keyInFilter(int key);
     bool keyInList(const QKeyEvent& key);
     void filterChanged(const QString& text);
+    void forgetBook();
+    void takeBegun(const std::shared_ptr<MovementSearch>& newest, bool isSample);
     void takeLoaded(const std::shared_ptr<MovementSearch>& search);
     void sortBy(int column, Qt::SortOrder order);
     void sortAgain();
@@ -71,6 +76,7 @@ private:
     void showEmptyText();
 
     BookSettings settings_;
+    int read_ = 0;  ///< movements that have been read of a book that is being read
     bool isSample_ = false;
     std::shared_ptr<MovementBook> book_;
     MovementList* movements_;

@@ -80,6 +80,8 @@ frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
     connect(movements_, &MovementsView::countChanged, this, &frmPrincipal::showCount);
     connect(movements_, &MovementsView::chosen, this,
             [this](qint32 key) { run(Operations::movement(key, this)); });
+    connect(movements_, &MovementsView::opened, this,
+            [this] { sample_->setVisible(movements_->isSample()); });
     connect(movements_, &MovementsView::bookRead, this, &frmPrincipal::offerToFinish,
             Qt::QueuedConnection);
     connect(movements_, &MovementsView::told, this,

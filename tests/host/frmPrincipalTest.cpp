@@ -191,11 +191,17 @@ TEST_F(PrincipalWindow, NewMovementsOfMembersWhoLeftAreNotTakenForAllOfTheirs) {
         u"insert into tbZelmar_Movimentos_Inactivos (movimento_id, movimento_no, socio_id, "
         "data, tipo) values (1, 7, 1, '2020-01-01', 'DOC')"_s);
     for (int number = 10; number < 310; ++number) post(number, member_, "DOC", 1);
+    bool wasBack = false;
+    QObject::connect(window_.findChild<host::MovementsView*>(), &host::MovementsView::opened, [&] {
+        EXPECT_TRUE(count().contains(u"a ler"_s));
+        EXPECT_EQ(rows(), 300);
+        QEvent back(QEvent::WindowActivate);
+        QCoreApplication::sendEvent(&window_, &back);
+        EXPECT_EQ(rows(), 300);
+        wasBack = true;
+    });
     window_.reload();
-    QEvent back(QEvent::WindowActivate);
-    QCoreApplication::sendEvent(&window_, &back);
-    ASSERT_TRUE(count().contains(u"a ler"_s));
-    EXPECT_EQ(rows(), 300);
+    person_.waitUntil([&] { return wasBack; }, u"the newest are read"_s);
     EXPECT_EQ(cell(0, 0), u"309"_s);
     person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
     EXPECT_EQ(rows(), 304);
@@ -430,8 +436,9 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
 TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
     book_.exec(u"drop view vwZelmars_Movimentos_Vigor"_s);
     person_.press(Qt::Key_F5);
-    EXPECT_TRUE(
-        person_.find<QLabel>(u"Aviso"_s)->text().contains(u"vwZelmars"_s, Qt::CaseInsensitive));
+    auto* notice = window_.findChild<QLabel*>(u"Aviso"_s);
+    person_.waitUntil([&] { return notice->isVisible(); }, u"the failure is told"_s);
+    EXPECT_TRUE(notice->text().contains(u"vwZelmars"_s, Qt::CaseInsensitive));
     EXPECT_TRUE(window_.isVisible());
 
     QFile settings(book_.registryFolder() + u"/HKEY_LOCAL_MACHINE.ini"_s);
