@@ -16,6 +16,7 @@
 #include "boundary/environment/dtZelmars.h"
 #include "companions/search/frmProcurar.h"
 #include "coverage/TryOut.h"
+#include "host/MovementsView.h"
 #include "host/frmPrincipal.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/MsgBoxes.h"
@@ -124,6 +125,18 @@ void measureWindows(Report& report, Engine engine) {
         return untilPainted(u"frmProcurar"_s, [] {
             companions::frmProcurar::choose(environment::dtZelmars::instance().MSAccess());
         });
+    });
+    row(u"window closed while it reads"_s, 200, largeBook, [] {
+        auto window = std::make_unique<host::frmPrincipal>();
+        bool isOpen = false;
+        QObject::connect(window->findChild<host::MovementsView*>(), &host::MovementsView::opened,
+                         [&] { isOpen = true; });
+        window->show();
+        while (!isOpen) QCoreApplication::processEvents();
+        QElapsedTimer clock;
+        clock.start();
+        window.reset();
+        return static_cast<double>(clock.nsecsElapsed()) / 1e6;
     });
     row(u"extract of 50,000 movements, first page"_s, 500, heavyBook, [] {
         return untilPainted(reports::rptExtrato2().name, [] {
