@@ -48,10 +48,9 @@ void runReceipt(qint32 socio_id) {
 /// as it was before.
 double writeHeld(Bare& bare, const QByteArray& row, const QByteArray& select,
                  const QByteArray& update, const Bare::Values& values) {
-    double first = bare.run(select, values);
-    if (bare.hold(row)) first = bare.run(select, values);
-    bare.run(update, values);
-    bare.letGo(row);
+    bare.run(select, values);
+    const double first = bare.runLocked(row, Bare::Lock::Hold, select, values);
+    bare.runLocked(row, Bare::Lock::LetGo, update, values);
     return first;
 }
 

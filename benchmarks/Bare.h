@@ -36,11 +36,14 @@ public:
     /// A pass over a query, on a connection of its own.
     virtual std::unique_ptr<BareRows> rows(const QByteArray& query) = 0;
 
-    // A row held against other workstations. On SQLite nothing is held, which costs no query.
-    virtual bool hold(const QByteArray&) { return false; }
-    virtual void letGo(const QByteArray&) {}
-    /// Holds a row, reads it and lets it go again, all in one round trip.
-    virtual void touch(const QByteArray&, const QByteArray& /*query*/) {}
+    /// What goes along with a query or write on a row, in the same round trip.
+    enum class Lock { Hold, LetGo, Both };
+    /// The same beside a row that is held against other workstations. On SQLite nothing is held,
+    /// which costs no query.
+    virtual double runLocked(const QByteArray& /*row*/, Lock /*lock*/, const QByteArray& query,
+                             const Values& values = {}) {
+        return run(query, values);
+    }
 };
 
 std::unique_ptr<Bare> bareSqlite(const Book& book);

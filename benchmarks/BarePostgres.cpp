@@ -69,19 +69,39 @@ public:
     ~BarePostgres() override { PQfinish(connection_); }
 
     double run(const QByteArray& query, const Values& values, int column) override {
-        const QByteArray name = prepared(query);
-        std::vector<QByteArray> texts;
-        for (const BareValue& value : values) texts.push_back(textOf(value));
-        std::vector<const char*> pointers;
-        for (const QByteArray& text : texts) pointers.push_back(text.constData());
-        PGresult* result =
-            checked(connection_,
-                    PQexecPrepared(connection_, name.constData(), static_cast<int>(pointers.size()),
-                                   pointers.data(), nullptr, nullptr, 0),
-                    query);
+        const Call call(*this, query, values);
+        PGresult* result = checked(connection_,
+                                   PQexecPrepared(connection_, call.name.constData(), call.count(),
+                                                  call.pointers.data(), nullptr, nullptr, 0),
+                                   query);
         const double found =
             PQntuples(result) > 0 ? std::strtod(PQgetvalue(result, 0, column), nullptr) : 0;
         PQclear(result);
+        return found;
+    }
+
+    double runLocked(const QByteArray& row, Lock lock, const QByteArray& query,
+                     const Values& values) override {
+        std::vector<Call> calls;
+        if (lock != Lock::LetGo) calls.emplace_back(*this, Hold, Values{row.constData()});
+        const std::size_t wanted = calls.size();
+        calls.emplace_back(*this, query, values);
+        if (lock != Lock::Hold) calls.emplace_back(*this, LetGo, Values{row.constData()});
+        PQenterPipelineMode(connection_);
+        for (const Call& call : calls)
+            PQsendQueryPrepared(connection_, call.name.constData(), call.count(),
+                                call.pointers.data(), nullptr, nullptr, 0);
+        PQpipelineSync(connection_);
+        double found = 0;
+        for (std::size_t at = 0; at < calls.size(); ++at) {
+            PGresult* result = checked(connection_, PQgetResult(connection_), query);
+            if (at == wanted && PQntuples(result) > 0)
+                found = std::strtod(PQgetvalue(result, 0, 0), nullptr);
+            PQclear(result);
+            PQgetResult(connection_);  // the end of its rows
+        }
+        PQclear(PQgetResult(connection_));
+        PQexitPipelineMode(connection_);
         return found;
     }
 
@@ -89,31 +109,23 @@ public:
         return std::make_unique<BarePostgresRows>(book_, query);
     }
 
-    bool hold(const QByteArray& row) override {
-        run(Hold, {row.constData()}, 0);
-        return true;
-    }
-    void letGo(const QByteArray& row) override { run(LetGo, {row.constData()}, 0); }
-
-    void touch(const QByteArray& row, const QByteArray& query) override {
-        const QByteArray names[] = {prepared(Hold), prepared(query), prepared(LetGo)};
-        const char* const value = row.constData();
-        PQenterPipelineMode(connection_);
-        for (const QByteArray& name : names)
-            PQsendQueryPrepared(connection_, name.constData(), name == names[1] ? 0 : 1, &value,
-                                nullptr, nullptr, 0);
-        PQpipelineSync(connection_);
-        for (int answers = 0; answers < 3; ++answers) {
-            PQclear(checked(connection_, PQgetResult(connection_), query));
-            PQgetResult(connection_);  // the end of its rows
-        }
-        PQclear(PQgetResult(connection_));
-        PQexitPipelineMode(connection_);
-    }
-
 private:
     static constexpr auto Hold = "SELECT pg_advisory_lock(hashtextextended($1, 1))";
     static constexpr auto LetGo = "SELECT pg_advisory_unlock(hashtextextended($1, 1))";
+
+    /// A prepared statement with its values as the library takes them.
+    struct Call {
+        Call(BarePostgres& bare, const QByteArray& query, const Values& values)
+            : name(bare.prepared(query)) {
+            for (const BareValue& value : values) texts.push_back(textOf(value));
+            for (const QByteArray& text : texts) pointers.push_back(text.constData());
+        }
+        int count() const { return static_cast<int>(pointers.size()); }
+
+        QByteArray name;
+        std::vector<QByteArray> texts;
+        std::vector<const char*> pointers;
+    };
 
     QByteArray prepared(const QByteArray& query) {
         QByteArray& name = names_[query];

@@ -87,14 +87,11 @@ constexpr auto Balance =
     "SELECT sum(debito_ac), sum(credito_ac) FROM tbSocios_Acumulados WHERE socio_id = $1";
 
 /// Looks a row up as a pessimistic row set does: finds it, holds it, reads it as it is then, and
-/// lets it go. Gives its first column.
-double lookUpHeld(Bare& bare, const QByteArray& row, const QByteArray& query,
-                  const Bare::Values& values) {
-    const double found = bare.run(query, values);
-    if (!bare.hold(row)) return found;
-    const double held = bare.run(query, values);
-    bare.letGo(row);
-    return held;
+/// lets it go.
+void lookUpHeld(Bare& bare, const QByteArray& row, const QByteArray& query,
+                const Bare::Values& values) {
+    bare.run(query, values);
+    bare.runLocked(row, Bare::Lock::Both, query, values);
 }
 
 /// The queries and locks of one try-out.
@@ -122,9 +119,11 @@ void runBarePosting(Bare& bare, const Case& of) {
     const QByteArray person = of.codABC.toUtf8();
     const Bare::Values own{qint64{of.rubrica_id}, member, person.constData()};
     bare.run("SELECT * FROM tbSocios WHERE socio_id = $1", {member});
-    const auto number =
-        static_cast<qint64>(lookUpHeld(bare, "counter", "SELECT zelmars FROM tbContadores", {}));
-    bare.run("UPDATE tbContadores SET zelmars = $1", {number + 1});
+    const QByteArray counter = "SELECT zelmars FROM tbContadores";
+    bare.run(counter);
+    const auto number = static_cast<qint64>(bare.runLocked("counter", Bare::Lock::Hold, counter));
+    bare.runLocked("counter", Bare::Lock::LetGo, "UPDATE tbContadores SET zelmars = $1",
+                   {number + 1});
     bare.run(
         "INSERT INTO tbZelmar_Movimentos (movimento_no, socio_id, codABC, rubrica_id, data, tipo, "
         "doc_data, doc_no, doc_valor, recebido, incidencia, comparticipacao, saldo_plafond, "
@@ -132,8 +131,10 @@ void runBarePosting(Bare& bare, const Case& of) {
         "($1, $2, $3, $4, '2026-11-20 00:00:00', 'DOC', '2026-11-20 00:00:00', '1234', 40, 0, 40, "
         "28, 100, 0, 28, 28, 28, 28, 'TRF', 'ana')",
         {number, member, person.constData(), qint64{of.rubrica_id}});
-    lookUpHeld(bare, "accumulator", Accumulator, own);
-    bare.run(
+    bare.run(Accumulator, own);
+    bare.runLocked("accumulator", Bare::Lock::Hold, Accumulator, own);
+    bare.runLocked(
+        "accumulator", Bare::Lock::LetGo,
         "UPDATE tbSocios_Acumulados SET credito_ac = credito_ac + 28, debito_ac = debito_ac + "
         "28, no_docs = no_docs + 1 WHERE rubrica_id = $1 AND socio_id = $2 AND codABC = $3",
         own);

@@ -270,7 +270,8 @@ public:
     void run(int pairs, std::vector<double>& ours, std::vector<double>& theirs) {
         const auto own = [&] { session_->lock(Table, 1, 30, fresh_); };
         const auto other = [&] {
-            bare_->touch("1", "SELECT zelmars FROM tbContadores WHERE _linha = 1");
+            bare_->runLocked("1", Bare::Lock::Both,
+                             "SELECT zelmars FROM tbContadores WHERE _linha = 1");
         };
         own();
         other();
