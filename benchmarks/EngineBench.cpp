@@ -270,8 +270,7 @@ public:
     void run(int pairs, std::vector<double>& ours, std::vector<double>& theirs) {
         const auto own = [&] { session_->lock(Table, 1, 30, fresh_); };
         const auto other = [&] {
-            bare_->runLocked("1", Bare::Lock::Both,
-                             "SELECT zelmars FROM tbContadores WHERE _linha = 1");
+            bare_->runLocked("1", Bare::Lock::Both, "SELECT zelmars FROM tbContadores");
         };
         own();
         other();

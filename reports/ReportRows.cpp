@@ -15,8 +15,8 @@ ado::RecordsetPtr openReportRows(const QString& name, const QString& text) {
     // A modeless preview of the same report may have left it open.
     if (rows->State() != ado::adStateClosed) rows->Close();
     environment.Commands(name).CommandText = text;
-    // Intentional: not queried again. All rows are read in this moment already, and a second reading
-    // would make whoever waits for a long report wait twice.
+    // Intentional: not queried again. All rows are read in this moment already, and a second
+    // reading would make whoever waits for a long report wait twice.
     rows->Open(text, environment.SqlServer());
     return rows;
 }
