@@ -18,7 +18,6 @@ namespace {
 
 /// Idle readers that are kept open for the next pass.
 constexpr std::size_t IdleReaders = 4;
-constexpr int MillisecondsBetweenLooks = 100;
 
 QByteArray quoted(QStringView name) {
     QByteArray text = name.toUtf8();
@@ -132,11 +131,7 @@ void Session::setTimeout(int seconds) {
 }
 
 std::shared_ptr<ado::Pass> Session::open(const Query& statement, const QString& table) {
-    // Whoever only reads may read a book that was replaced for a moment; a write looks each time.
-    if (!looked_.isValid() || looked_.hasExpired(MillisecondsBetweenLooks)) {
-        file_.refuseChanged();
-        looked_.start();
-    }
+    file_.refuseChanged();
     const bool withIdentity = !table.isEmpty();
     return std::make_shared<Pass>(shared_from_this(), statement, withIdentity);
 }

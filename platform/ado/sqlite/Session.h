@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QElapsedTimer>
-
 #include "platform/ado/sqlite/BookFile.h"
 #include "platform/ado/sqlite/Dialect.h"
 #include "platform/ado/sqlite/Handle.h"
@@ -59,7 +57,6 @@ private:
     std::optional<ColumnType> viewColumnType(QStringView view, QStringView column);
 
     BookFile file_;
-    QElapsedTimer looked_;  ///< since the file was last looked at for a reader
     int timeout_;
     std::vector<std::shared_ptr<Handle>> readers_;  ///< idle ones
     std::unique_ptr<Handle> writer_;                ///< opened by the first write
