@@ -81,7 +81,7 @@ void frmMovimentos::connectFieldHandlers() {
     Text6->onGotFocus = [this] { Text6->SelectAll(); };
     Text6->onValidate = [this](bool& cancel) { Text6_Validate(cancel); };
     Text9->onGotFocus = [this] { Text9->SelectAll(); };
-    Text9->onValidate = [this](bool&) { emptyBecomesNull(Text9); };
+    Text9->onValidate = [this](bool&) { Text9->storeNullIfEmpty(); };
     Text11->onValidate = [this](bool& cancel) { Text11_Validate(cancel); };
     onBoxClosed = [this](const QString& text) { return fieldNamedBy(text); };
     // A rubric or hospital that was wiped is held as 0, not as null.
@@ -192,16 +192,10 @@ void frmMovimentos::Text5_GotFocus() {
     Text5->SelectAll();
 }
 
-/// A bound box by itself could not do it: an empty text is not a number.
-void frmMovimentos::emptyBecomesNull(forms::TextBox* box) {
-    if (box->Text().isEmpty() && Adodc1->hasField(box->DataField()))
-        Adodc1->Recordset()->setCollect(box->DataField(), QVariant());
-}
-
 void frmMovimentos::Text6_Validate(bool& cancel) {
     if (bShowing()) return;
     if (Text6->Text().isEmpty()) {
-        emptyBecomesNull(Text6);
+        Text6->storeNullIfEmpty();
         return;
     }
     // A value that is no number is refused by the binding, right after this.

@@ -99,7 +99,6 @@ private:
     void Text1_Validate(bool& cancel);
     void Text5_GotFocus();
     void Text6_Validate(bool& cancel);
-    void emptyBecomesNull(forms::TextBox* box);
     void Text11_Validate(bool& cancel);
     void Command4_Click();
     void Command5_Click();

@@ -67,7 +67,8 @@ bool isNumber(const QVariant& value) {
 
 QString formattedNumber(const QVariant& value, QStringView format, const QLocale& locale) {
     const bool isAmount = format.startsWith(format::Amount);
-    if (format != format::Money && !isAmount && format != format::Rate)
+    const bool isFraction = format == format::Fraction;
+    if (format != format::Money && !isAmount && format != format::Rate && !isFraction)
         return toText(value).replace(u'.', decimalMark(locale));
     const Cents rounded = cents(value);
     // What shows as nothing has no sign.
@@ -78,7 +79,8 @@ QString formattedNumber(const QVariant& value, QStringView format, const QLocale
     }
     const QString sign = negative ? QStringLiteral("-") : QString();
     if (!isAmount)
-        return sign + rounded.whole.rightJustified(2, u'0') + decimalMark(locale) + rounded.part;
+        return sign + rounded.whole.rightJustified(isFraction ? 1 : 2, u'0') + decimalMark(locale) +
+               rounded.part;
     const QStringView unit = format.sliced(format::Amount.size());
     return sign + shown(rounded, locale) + unit.toString();
 }

@@ -14,6 +14,7 @@ inline constexpr QStringView Money = u"€ #,##0.00;(€ #,##0.00)";
 inline constexpr QStringView Amount = u"#,##0.00";
 inline constexpr QStringView Escudos = u"#,##0.00 Esc";
 inline constexpr QStringView Rate = u"00.00";
+inline constexpr QStringView Fraction = u"0$00";
 inline constexpr QStringView Date = u"dd-MM-yyyy";
 inline constexpr QStringView Number = u"@@@@@.@";
 }  // namespace format

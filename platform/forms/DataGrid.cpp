@@ -3,6 +3,8 @@
 
 #include <QAbstractTableModel>
 #include <QHeaderView>
+#include <QKeyEvent>
+#include <algorithm>
 
 #include "platform/core/Format.h"
 #include "platform/forms/Form.h"
@@ -32,6 +34,11 @@ public:
             connect(set_.get(), &ado::Recordset::currentRowChanged, this, [this] { rowWritten(); });
         }
         readAnew();
+    }
+
+    /// Makes a line the set's current row.
+    void moveTo(int row) {
+        if (isOpen() && row >= 0 && row < count_) set_->MoveTo(row);
     }
 
     int rowCount(const QModelIndex& parent = {}) const override {
@@ -104,6 +111,7 @@ DataGrid::DataGrid(const QString& name, QWidget* parent)
     setModel(rows_);
     settleTable(*this);
     horizontalHeader()->setStretchLastSection(true);
+    connect(rows_, &QAbstractItemModel::modelReset, this, [this] { mark(marked_); });
 }
 
 void DataGrid::setColumns(const std::vector<GridColumn>& columns) {
@@ -114,8 +122,34 @@ void DataGrid::setColumns(const std::vector<GridColumn>& columns) {
 }
 
 void DataGrid::setRecordset(const ado::RecordsetPtr& recordset) {
+    marked_ = 0;
     rows_->setRecordset(recordset);
-    if (rows_->rowCount() > 0) selectRow(0);
+}
+
+void DataGrid::mark(int row) {
+    if (rows_->rowCount() == 0) return;
+    marked_ = std::clamp(row, 0, rows_->rowCount() - 1);
+    selectRow(marked_);
+    handle([this] { rows_->moveTo(marked_); });
+}
+
+void DataGrid::currentChanged(const QModelIndex& current, const QModelIndex& previous) {
+    QTableView::currentChanged(current, previous);
+    if (!current.isValid() || current.row() == marked_) return;
+    marked_ = current.row();
+    handle([this] { rows_->moveTo(marked_); });
+}
+
+void DataGrid::keyPressEvent(QKeyEvent* event) {
+    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        emit chosen();
+    else
+        QTableView::keyPressEvent(event);
+}
+
+void DataGrid::mouseDoubleClickEvent(QMouseEvent* event) {
+    QTableView::mouseDoubleClickEvent(event);
+    if (event->button() == Qt::LeftButton) emit chosen();
 }
 
 }  // namespace forms

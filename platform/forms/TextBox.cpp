@@ -41,7 +41,7 @@ void TextBox::setFormat(QStringView format) {
 
 bool TextBox::isNumeric() const {
     return format_ == core::format::Money || format_ == core::format::Amount ||
-           format_ == core::format::Rate;
+           format_ == core::format::Rate || format_ == core::format::Fraction;
 }
 
 bool TextBox::isDate() const {
@@ -52,6 +52,10 @@ void TextBox::limitToColumn() {
     if (!hasRow()) return;
     const int size = DataSource()->Recordset()->Fields(DataField()).DefinedSize();
     if (size > 0) setMaxLength(size);
+}
+
+void TextBox::storeNullIfEmpty() {
+    if (hasRow() && text().isEmpty()) writeRow({});
 }
 
 void TextBox::setLocked(bool locked) {

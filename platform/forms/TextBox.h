@@ -43,6 +43,9 @@ public:
 
     /// A display format of core/Format.h. Number formats align right.
     void setFormat(QStringView format);
+    /// An empty bound box stores null. By itself a box stores what it shows only when a person has
+    /// changed it. Fails as writing to the column does.
+    void storeNullIfEmpty();
     /// Cuts what is typed to the length of the bound column (Field::DefinedSize).
     void limitToColumn();
     /// Locked: shown and selectable, but nobody can type into it. Code still can.
