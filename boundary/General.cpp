@@ -9,6 +9,8 @@
 #include "boundary/environment/LoginState.h"
 #include "boundary/environment/dtZelmars.h"
 #include "entry/EntryRoute.h"
+#include "masterdata/frmHospitais.h"
+#include "masterdata/frmPlafonds.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/MsgBoxes.h"
@@ -85,6 +87,32 @@ void showModal() {
     forms::DefaultInstance<Screen>::get().ShowModal();
 }
 
+/// On a server the screens that change what documents are judged by are not for everybody. Some of
+/// their failures say nothing, so that nobody may come as far as that.
+bool mayManageOrRefused(const QString& table) {
+    if (environment::dtZelmars::instance().MSAccess()->mayWrite(table)) return true;
+    core::MsgBox(
+        u"Não tem o direito de alterar esta tabela; nada foi alterado. No servidor esse direito é "
+        "dos gestores do livro: peça-o a quem cuida do servidor."_s,
+        core::Icon::Critical);
+    return false;
+}
+
+/// A list of what the caller's query gives.
+template <class Screen>
+void showList(const QString& table, const QString* strConMember, const QString* strSQL) {
+    const Operation running;
+    if (!loggedInOrRefused() || !mayManageOrRefused(table)) return;
+    requireApplication();
+    const QString member = strConMember ? *strConMember : QString();
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->Open(strSQL ? *strSQL : QString(),
+               environment::dtZelmars::instance().Connections(member));
+    auto& screen = forms::DefaultInstance<Screen>::get();
+    screen.setRows(rows);
+    screen.ShowModal();
+}
+
 /// An operation whose screen is still to come.
 void openLater() {
     const Operation running;
@@ -111,12 +139,12 @@ General::General() {
     forms::install();
 }
 
-void General::CallPlafonds(QString*, QString*) {
-    openLater();
+void General::CallPlafonds(QString* strConMember, QString* strSQL) {
+    showList<masterdata::frmPlafonds>(u"tbZelmar_Plafonds"_s, strConMember, strSQL);
 }
 
-void General::CallHospitais(QString*, QString*) {
-    openLater();
+void General::CallHospitais(QString* strConMember, QString* strSQL) {
+    showList<masterdata::frmHospitais>(u"tbHospitais"_s, strConMember, strSQL);
 }
 
 void General::CallManutencaoDados() {

@@ -89,6 +89,7 @@ private:
         makesCatalogue_ =
             !has("SELECT FROM pg_database WHERE datname = " + server_.literal(catalogue_.catalog));
         makesOwner_ = !hasRole(owner());
+        makesManager_ = !hasRole(manager());
         makesOperator_ = !hasRole(worker_.user);
     }
 
@@ -138,6 +139,7 @@ private:
     void makeRoles(BulkAccess& book) {
         const QByteArray ownerName = book.name(owner());
         if (makesOwner_) book.execute("CREATE ROLE " + ownerName + " NOLOGIN");
+        if (makesManager_) book.execute("CREATE ROLE " + book.name(manager()) + " NOLOGIN");
         if (makesOperator_)
             book.execute(
                 "CREATE ROLE " + book.name(worker_.user) + " LOGIN PASSWORD " +
@@ -151,7 +153,8 @@ private:
     QByteArray rights(BulkAccess& book) const {
         return schemaText(u"roles.sql"_s)
             .replace("{catalogue}", book.name(catalogue_.catalog))
-            .replace("{operator}", book.name(worker_.user));
+            .replace("{operator}", book.name(worker_.user))
+            .replace("{manager}", book.name(manager()));
     }
 
     void enterAsOperator() {
@@ -173,6 +176,7 @@ private:
             if (madeBook_ && makesOperator_)
                 server_.execute("DROP ROLE " + server_.name(worker_.user));
             if (madeBook_ && makesOwner_) server_.execute("DROP ROLE " + server_.name(owner()));
+            if (madeBook_ && makesManager_) server_.execute("DROP ROLE " + server_.name(manager()));
         } catch (const core::Failure&) {
         }
     }
@@ -180,6 +184,7 @@ private:
     void takeBookBack() {
         BulkAccess book(catalogue_);
         book.execute("DROP OWNED BY " + book.name(owner()));
+        if (makesManager_) book.execute("DROP OWNED BY " + book.name(manager()));
         book.execute("REVOKE ALL ON DATABASE " + book.name(catalogue_.catalog) + " FROM " +
                      book.name(worker_.user));
         book.execute("REVOKE ALL ON SCHEMA public FROM " + book.name(worker_.user));
@@ -188,6 +193,7 @@ private:
     }
 
     QString owner() const { return catalogue_.catalog + u"_dono"_s; }
+    QString manager() const { return catalogue_.catalog + u"_gestor"_s; }
 
     Address catalogue_;
     ServerOperator worker_;
@@ -195,6 +201,7 @@ private:
     QString mark_;
     bool makesCatalogue_ = false;
     bool makesOwner_ = false;
+    bool makesManager_ = false;
     bool makesOperator_ = false;
     bool madeCatalogue_ = false;
     bool madeBook_ = false;

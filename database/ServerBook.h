@@ -25,10 +25,11 @@ struct ServerOperator {
 
 /// `zelmars init --server`: makes the catalogue if it is missing, the book in it, with or without
 /// the sample content, a role that owns the book (the catalogue's name and "_dono"; nobody logs in
-/// as it), and the operator, who may do what the screens do and nothing else. Logs in as the
-/// operator to see that it works, and writes the five values that name the book. `catalogue` is
-/// entered by its user, who must be an administrator of the server. Nothing stays behind a failure;
-/// a call that was cut off is ended by the same call.
+/// as it), a role for those who manage it ("_gestor", which the administrator gives), and the
+/// operator, who may do what the daily screens do and nothing else. Logs in as the operator to see
+/// that it works, and writes the five values that name the book. `catalogue` is entered by its
+/// user, who must be an administrator of the server. Nothing stays behind a failure; a call that
+/// was cut off is ended by the same call.
 void initBook(const ado::postgres::Address& catalogue, const ServerOperator& worker, bool sample);
 
 }  // namespace database

@@ -16,11 +16,21 @@ struct Signature {
 };
 
 constexpr Signature Signatures[] = {
-    {"CallPlafonds", 0, 2},      {"CallHospitais", 0, 2},      {"CallManutencaoDados", 0, 0},
-    {"CallIRS", 0, 0},           {"CallFechoAno", 0, 0},       {"Login", 0, 5, true},
-    {"Registo", 1, 1, true},     {"NewMovimento", 0, 3, true}, {"Correcao", 0, 2, true},
-    {"Recebimento", 0, 2, true}, {"Extratos", 0, 2, true},     {"LPagamentos", 0, 0},
-    {"Ldividas", 0, 0},          {"Lcartasdividas", 0, 0},     {"Lhospitais", 0, 0},
+    {"CallPlafonds", 0, 2, true},
+    {"CallHospitais", 0, 2, true},
+    {"CallManutencaoDados", 0, 0},
+    {"CallIRS", 0, 0},
+    {"CallFechoAno", 0, 0},
+    {"Login", 0, 5, true},
+    {"Registo", 1, 1, true},
+    {"NewMovimento", 0, 3, true},
+    {"Correcao", 0, 2, true},
+    {"Recebimento", 0, 2, true},
+    {"Extratos", 0, 2, true},
+    {"LPagamentos", 0, 0},
+    {"Ldividas", 0, 0},
+    {"Lcartasdividas", 0, 0},
+    {"Lhospitais", 0, 0},
 };
 
 /// "true" and "false", also in Portuguese.

@@ -52,6 +52,28 @@ GRANT UPDATE (
         code_postal1, localidade1)
     ON tbSocios TO {operator};
 
+-- The manager writes, besides, what documents are judged by: rubrics and hospitals, but for their
+-- keys.
+GRANT CONNECT ON DATABASE {catalogue} TO {manager};
+GRANT USAGE ON SCHEMA public TO {manager};
+REVOKE ALL ON ALL TABLES IN SCHEMA public FROM {manager};
+DO $do$
+DECLARE
+    managed record;
+BEGIN
+    FOR managed IN
+        SELECT attrelid::regclass AS relation, string_agg(attname, ', ') AS columns
+          FROM pg_attribute
+         WHERE attrelid IN ('tbZelmar_Plafonds'::regclass, 'tbHospitais'::regclass)
+           AND attnum > 0 AND NOT attisdropped AND attname NOT IN ('rubrica_id', 'hospital_id')
+         GROUP BY attrelid
+    LOOP
+        EXECUTE format('GRANT SELECT, INSERT (%s), UPDATE (%s), DELETE ON %s TO %s',
+                       managed.columns, managed.columns, managed.relation,
+                       $name${manager}$name$);
+    END LOOP;
+END $do$;
+
 -- The journal of operations, whose rows ride in the commits of other writes. A posting's row goes
 -- once nothing is missing any more.
 GRANT INSERT (

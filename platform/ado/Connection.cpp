@@ -75,6 +75,10 @@ const std::shared_ptr<Session>& Connection::session() const {
     return session_;
 }
 
+bool Connection::mayWrite(const QString& table) const {
+    return session()->mayWrite(table);
+}
+
 bool Connection::hasTable(QStringView name) const {
     return session()->isTable(name);
 }

@@ -36,6 +36,8 @@ public:
     const std::shared_ptr<Session>& session() const;
     /// True when the book has a table of that name, which books of older programs may lack.
     bool hasTable(QStringView name) const;
+    /// True when its user has the right to add, change and delete rows of a table.
+    bool mayWrite(const QString& table) const;
     /// True when the provider of the connection string shapes.
     bool shapes() const;
 

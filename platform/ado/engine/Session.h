@@ -59,6 +59,8 @@ public:
 
     /// True when rows of that name can be written: an existing table, not a view.
     virtual bool isTable(QStringView name) = 0;
+    /// True when this user has the right to add, change and delete rows of a table.
+    virtual bool mayWrite(const QString& /*table*/) { return true; }
 
     /// Reads one row of a table afresh and appends it, in the order of the table's columns; false
     /// when it is gone.

@@ -20,8 +20,9 @@ constexpr auto FetchLater = "FETCH 1000 FROM linhas";
 // Rows that were asked for ahead wait on the server until somebody wants them, maybe over lunch.
 constexpr auto NoTimeout = "SET LOCAL statement_timeout = 0";
 
-/// True when a statement may say by itself how many rows it wants, or when asking for the first ones
-/// alone saves nothing: all rows of a union are found and compared before the first one is known.
+/// True when a statement may say by itself how many rows it wants, or when asking for the first
+/// ones alone saves nothing: all rows of a union are found and compared before the first one is
+/// known.
 bool wantsCursor(const Query& statement) {
     for (int i = 0; i < statement.count(); ++i)
         for (const auto word : {"limit"_L1, "fetch"_L1, "offset"_L1, "for"_L1, "union"_L1})

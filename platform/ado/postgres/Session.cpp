@@ -203,6 +203,15 @@ bool Session::isTable(QStringView name) {
     return !identity(name).isEmpty();
 }
 
+bool Session::mayWrite(const QString& table) {
+    // Adding and changing are rights to columns; whoever has those of a whole table may delete,
+    // too.
+    const Result answer = noticing([&] {
+        return writer().run("SELECT has_table_privilege($1, 'DELETE')", {table.toLower().toUtf8()});
+    });
+    return PQgetvalue(answer.get(), 0, 0)[0] == 't';
+}
+
 QString Session::identity(QStringView name) {
     const Table* table = find(name);
     return table ? table->identity : QString();

@@ -29,6 +29,7 @@ public:
 
     std::shared_ptr<ado::Pass> open(const Query& statement, const QString& table) override;
     bool isTable(QStringView name) override;
+    bool mayWrite(const QString& table) override;
     bool read(const QString& table, RowIdentity row, RowStore& into) override;
     RowIdentity insert(const QString& table, const QStringList& columns,
                        const std::vector<QVariant>& values, const Accompaniment& with) override;
