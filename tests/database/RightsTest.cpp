@@ -231,6 +231,29 @@ TEST_F(Rights, ReachNothingBesideTheBook) {
     });
 }
 
+TEST_F(Rights, OfTheManagerAreRubricsAndHospitalsButForTheirKeys) {
+    BulkAccess administration(catalogue(support::Server::User));
+    administration.execute("GRANT direitos_gestor TO posto");
+    expectTaken({
+        "INSERT INTO tbZelmar_Plafonds (code, rubrica_id_main, percent) VALUES ('x', 1, 1)",
+        "UPDATE tbZelmar_Plafonds SET percent = 1, agregado = NULL, franquia = 3",
+        "DELETE FROM tbZelmar_Plafonds",
+        "INSERT INTO tbHospitais (code, nome) VALUES ('x', 'y')",
+        "UPDATE tbHospitais SET nome = 'x'",
+        "DELETE FROM tbHospitais",
+    });
+    expectRefused({
+        "UPDATE tbZelmar_Plafonds SET rubrica_id = 1",
+        "INSERT INTO tbHospitais (hospital_id) VALUES (1)",
+        "TRUNCATE tbHospitais",
+        "DELETE FROM tbZelmar_Movimentos",
+        "DELETE FROM tbSocios_Acumulados",
+        "UPDATE tbZelmar_Movimentos_Historico SET credito = 1",
+    });
+    administration.execute("REVOKE direitos_gestor FROM posto");
+    expectRefused({"DELETE FROM tbHospitais"});
+}
+
 TEST_F(Rights, FindTheBooksOwnTablesWhateverStandsElsewhere) {
     BulkAccess administration(catalogue(support::Server::User));
     EXPECT_EQ(administration.number("SELECT count(*) FROM pg_db_role_setting WHERE setrole ="
