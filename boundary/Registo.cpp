@@ -39,6 +39,8 @@ void openRegisto(const QVariant& Pkey, QObject* Caller) {
     if (rows->atEnd()) return;
     const QString type = core::toText(rows->Collect(u"tipo"_s));
     const bool isDocument = type == tipo::Document || type == tipo::Hospital;
+    // Intentional: of any other type nothing is shown, and the entry screen keeps what it has, so
+    // that a view that is open stays.
     if (!isDocument && type != tipo::Receipt && type != tipo::Reposition) return;
     // Before anything is attached, so that a refusal leaves the screens as they are.
     if (isUnderWay(type))
