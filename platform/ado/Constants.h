@@ -8,6 +8,7 @@ enum ObjectState { adStateClosed = 0, adStateOpen = 1 };
 
 enum CursorType {
     adOpenUnspecified = -1,  ///< a forward pass over the rows as they are when read
+    adOpenKeyset = 1,        ///< here the same as static
     adOpenDynamic = 2,       ///< sees later writes: each move reads the row afresh
     adOpenStatic = 3,        ///< the rows as they were when opened
 };

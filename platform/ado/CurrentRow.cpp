@@ -10,9 +10,14 @@ using namespace Qt::StringLiterals;
 void CurrentRow::leave() {
     isNew_ = isDeleted_ = isOutdated_ = false;
     changes_.clear();
-    if (isFresh()) fresh_.clear();
+    forgetFresh();
     lock_.reset();
     hold_ = Hold::None;
+}
+
+void CurrentRow::forgetFresh() {
+    if (isFresh()) fresh_.clear();
+    written_.clear();
 }
 
 void CurrentRow::standOn(At at, bool isOutdated, qint64 inserted) {
@@ -47,7 +52,7 @@ void CurrentRow::cancel(bool isOutdated) {
 
 void CurrentRow::noteStored(bool isOutdated) {
     isOutdated_ = isOutdated || isOutdated_ || isFresh();
-    fresh_.clear();
+    forgetFresh();
     changes_.clear();
 }
 
@@ -61,7 +66,7 @@ void CurrentRow::look(const TableRow& row, bool pessimistic) {
         read(row);
         return;
     }
-    fresh_.clear();
+    forgetFresh();
     lock_ = row.session->lock(row.table, row.identity, row.timeoutSeconds, fresh_);
     hold_ = Hold::Taken;
     isOutdated_ = false;
@@ -69,7 +74,7 @@ void CurrentRow::look(const TableRow& row, bool pessimistic) {
 
 bool CurrentRow::read(const TableRow& row) {
     isOutdated_ = false;
-    fresh_.clear();
+    forgetFresh();
     return row.session->read(row.table, row.identity, fresh_);
 }
 

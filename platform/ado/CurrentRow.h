@@ -45,6 +45,14 @@ public:
     void cancel(bool isOutdated);
     /// The changes are stored; whoever looks at the row sees what stands in the table.
     void noteStored(bool isOutdated);
+    /// The changes of a row that was read afresh are stored among gathered writes, during which
+    /// nobody looks at the table: the row is as it was read and written here.
+    void noteGathered() {
+        for (const auto& [column, value] : changes_) put(written_, column, value);
+        changes_.clear();
+    }
+    /// The value that was stored so; null for none.
+    const QVariant* written(int column) const { return find(written_, column); }
 
     /// True when the values were read afresh.
     bool isFresh() const { return fresh_.count() > 0; }
@@ -71,6 +79,8 @@ public:
     void holdAgain(const TableRow& row);
 
 private:
+    void forgetFresh();
+
     enum class Hold { None, Taken, LetGo };
 
     At at_ = At::Nothing;
@@ -78,7 +88,8 @@ private:
     bool isNew_ = false;
     bool isDeleted_ = false;  ///< the current row, by this set
     Changes changes_;
-    RowStore fresh_;  ///< empty, or the row
+    RowStore fresh_;   ///< empty, or the row
+    Changes written_;  ///< stored since the row was read afresh
     bool isOutdated_ = false;
     Hold hold_ = Hold::None;
     std::unique_ptr<RowLock> lock_;  ///< of Hold::Taken; none where it could not be taken again

@@ -148,6 +148,10 @@ int Recordset::columnCount() const {
     return d->rows->columns().columnCount();
 }
 
+int Recordset::columnOf(const QString& name) const {
+    return d->columnOf(name);
+}
+
 bool Recordset::hasColumn(const QString& name) const {
     return d->rows && d->find(name) >= 0;
 }

@@ -65,7 +65,8 @@ public:
     void MoveFirst();
     void MoveLast();
     void MoveNext();
-    /// Rows of the set; -1 as long as nobody has come to the end of a long one, as MoveLast does.
+    /// Rows of the set; -1 of a long one without a static or keyset cursor as long as nobody has
+    /// come to its end, as MoveLast does.
     qint64 RecordCount() const;
 
     /// Starts a new row and makes it current. Columns not written read as null and take the
@@ -86,6 +87,8 @@ public:
     Field Fields(const QString& name);
     Field Fields(int column);
     int columnCount() const;
+    /// Place of a column, for passes over very many rows. Fails as Fields does.
+    int columnOf(const QString& name) const;
     /// True when the set has a column of that name.
     bool hasColumn(const QString& name) const;
 

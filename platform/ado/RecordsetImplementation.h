@@ -58,11 +58,19 @@ struct Recordset::Implementation {
     void standOnInserted(qint64 which) {
         current.standOn(which < own.insertedCount() ? At::Inserted : At::Nothing, true, which);
     }
-    bool isDynamic() const { return cursor == adOpenDynamic && !table.isEmpty(); }
+    /// While writes are gathered nobody else is looked for.
+    bool isDynamic() const { return cursor == adOpenDynamic && !table.isEmpty() && !isGathering(); }
+    bool isGathering() const {
+        return connection && connection->State() == adStateOpen &&
+               connection->session()->isGathering();
+    }
     /// True for a row of the query that may be another by now.
     bool isOutdated(qint64 row) const { return isDynamic() || own.isMarked(row); }
     bool isOutdated() const { return current.at() != At::Queried || isOutdated(rows->row()); }
-    qint64 recordCount() const { return rows->count() < 0 ? -1 : own.shownOf(rows->count()); }
+    qint64 recordCount() const {
+        if (cursor == adOpenStatic || cursor == adOpenKeyset) rows->countAll();
+        return rows->count() < 0 ? -1 : own.shownOf(rows->count());
+    }
     qint64 rowsInMemory() const { return rows && rows->inMemory() ? recordCount() : 0; }
 
     // Reading.

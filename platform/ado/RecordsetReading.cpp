@@ -167,6 +167,7 @@ QVariant Recordset::Implementation::value(int column) {
     if (current.isNew()) return {};
     look();
     const ColumnType type = rows->columns().column(column).type;
+    if (const QVariant* written = current.written(column)) return *written;
     if (current.isFresh()) return toVariant(current.cell(column), type);
     if (current.at() == At::Inserted) return {};  // deleted by somebody else since
     if (const QVariant* known = own.stored(rows->row(), column)) return *known;
@@ -189,8 +190,11 @@ QVariant Recordset::Implementation::valueAt(qint64 place, int column) {
 
 TableRow Recordset::Implementation::tableRow() {
     const bool isInserted = current.at() == At::Inserted;
-    return {session(), table, isInserted ? own.inserted(current.inserted()) : rows->identity(),
-            connection->CommandTimeout};
+    const RowIdentity identity = isInserted ? own.inserted(current.inserted()) : rows->identity();
+    if (identity == NoRow)
+        throw core::Failure(core::InvalidCall,
+                            u"A linha acrescentada só se pode ler depois de gravadas todas."_s);
+    return {session(), table, identity, connection->CommandTimeout};
 }
 
 // --- Requirements

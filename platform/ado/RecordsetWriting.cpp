@@ -51,7 +51,8 @@ void Recordset::Implementation::update(const Accompaniment& with) {
     } catch (const core::Failure& failure) {
         throw explained(failure, (current.isNew() ? u"INSERT INTO "_s : u"UPDATE "_s) + table);
     }
-    current.letGo();
+    // Gathered writes follow each other without anybody between them.
+    if (!isGathering()) current.letGo();
 }
 
 std::pair<QStringList, std::vector<QVariant>> Recordset::Implementation::written() const {
@@ -86,6 +87,7 @@ void Recordset::Implementation::updateCurrent(const Accompaniment& with) {
                             u"A linha foi entretanto apagada por outro posto; não foi gravada."_s);
     if (current.at() == At::Queried)
         own.noteStored(rows->row(), current.changes(), rows->inMemory());
+    if (isGathering() && current.isFresh()) return current.noteGathered();
     current.noteStored(isOutdated());
 }
 

@@ -68,10 +68,14 @@ bool Rows::toNext() {
     return seek(row_);
 }
 
+void Rows::countAll() {
+    if (count_ < 0) seek(std::numeric_limits<qint64>::max());
+}
+
 // The last row becomes the current one without being read: whoever only wants the count goes back
 // to the first.
 bool Rows::toLast() {
-    if (count_ < 0) seek(std::numeric_limits<qint64>::max());
+    countAll();
     row_ = count_ - 1;
     return count_ > 0;
 }

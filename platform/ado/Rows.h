@@ -22,6 +22,8 @@ public:
     bool toLast();
     /// Number of rows; -1 as long as nobody has seen the last one.
     qint64 count() const { return count_; }
+    /// Sees the last one; the place stays.
+    void countAll();
     /// Place of the current row, from 0.
     qint64 row() const { return row_; }
 

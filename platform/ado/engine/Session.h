@@ -81,6 +81,17 @@ public:
     virtual std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                           RowStore& into) = 0;
 
+    /// From here on writes may be gathered: they reach the disk together, in their order, so that
+    /// what stands after a kill or a power cut is a beginning of them. A write that fails leaves
+    /// those before it standing, and may be told by a later one. Whatever is opened or read
+    /// through this session meanwhile sees all of them. Not every engine can tell how a row that is
+    /// added so is identified: it then has none (NoRow).
+    virtual void gather() = 0;
+    /// Everything that was gathered is on the disk; the writes from here on are commits of their
+    /// own again. Fails with what a gathered write failed with, and gathers no more all the same.
+    virtual void settle() = 0;
+    virtual bool isGathering() const = 0;
+
     /// Seconds that a query may wait for another program before it fails.
     virtual void setTimeout(int seconds) = 0;
 

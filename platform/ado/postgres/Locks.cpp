@@ -62,6 +62,7 @@ std::unique_ptr<RowLock> Session::lock(const QString& table, RowIdentity row, in
     auto lock = std::make_unique<AdvisoryLock>(shared_from_this(), key);
     if (lock->heldByThisThread()) refuseRow(table, row, OtherWindow);
     setTimeout(timeoutSeconds);
+    if (isGathering_) sendGathered(Reach::Disk);
     const Call fresh = selectRow(table, row);
     Handle& handle = writer();
     // From here on the row is let go whatever happens.
@@ -99,6 +100,7 @@ bool Session::isHeld(const QByteArray& key) const {
 }
 
 Handle& Session::writerOf(const QString& table, RowIdentity row) {
+    if (isGathering_) sendGathered(Reach::Disk);
     Handle& handle = writer();
     if (broken_.contains(keyOf(table, row)))
         throw core::Failure(core::RowInUse,

@@ -38,6 +38,9 @@ public:
     bool remove(const QString& table, RowIdentity row) override;
     std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                   RowStore& into) override;
+    void gather() override;
+    void settle() override;
+    bool isGathering() const override { return isGathering_; }
     void setTimeout(int seconds) override { timeout_ = seconds; }
     const QString& book() const override { return book_; }
 
@@ -78,6 +81,15 @@ private:
     template <class Work>
     Result noticing(const Work& work);
     Result write(Handle& handle, const std::vector<Call>& calls);
+    /// Keeps a write for later, and sends those before it when there are enough.
+    void keepForLater(Call call);
+    enum class Reach { Memory, Disk };
+    /// Sends what is gathered, to reach the server's memory or its disk.
+    void sendGathered(Reach reach);
+    /// Sends writes in one commit. When one of them fails those before it are stored, one by one,
+    /// and its failure is told.
+    void sendTogether(const std::vector<Call>& calls);
+    void setReach(Reach reach);
     Call selectRow(const QString& table, RowIdentity row);
     /// Appends the one row that was found, if any; false when there is none.
     static bool append(const PGresult* found, RowIdentity row, RowStore& into);
@@ -92,6 +104,8 @@ private:
     std::unique_ptr<Handle> writer_;                ///< made by its first use
     QSet<QByteArray> locked_;                       ///< keys of the rows held
     QSet<QByteArray> broken_;                       ///< of those that went with a connection
+    bool isGathering_ = false;
+    std::vector<Call> gathered_;  ///< writes that were not sent yet
 };
 
 }  // namespace ado::postgres

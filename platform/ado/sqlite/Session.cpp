@@ -2,6 +2,7 @@
 #include "platform/ado/sqlite/Session.h"
 
 #include <QDir>
+#include <QThread>
 
 #include "platform/ado/dialect/LiftedQuery.h"
 #include "platform/ado/engine/EngineTexts.h"
@@ -18,6 +19,16 @@ namespace {
 
 /// Idle readers that are kept open for the next pass.
 constexpr std::size_t IdleReaders = 4;
+
+/// Milliseconds after which gathered writes are committed: as long as that others wait for the
+/// book, and so much is done again after a kill.
+constexpr qint64 LongestGathering = 1000;
+/// Milliseconds between two gatherings: those who wait look at the book every second or third one.
+constexpr unsigned long Between = 4;
+/// Gathered writes go to all places of the indexes; pages of the book that are kept for them, in
+/// KiB as the engine takes it, and for single writes.
+constexpr auto LargeCache = "PRAGMA cache_size=-49152";
+constexpr auto SmallCache = "PRAGMA cache_size=-2000";
 
 QByteArray quoted(QStringView name) {
     QByteArray text = name.toUtf8();
@@ -132,6 +143,7 @@ void Session::setTimeout(int seconds) {
 
 std::shared_ptr<ado::Pass> Session::open(const Query& statement, const QString& table) {
     file_.refuseChanged();
+    commitGathered();
     const bool withIdentity = !table.isEmpty();
     return std::make_shared<Pass>(shared_from_this(), statement, withIdentity);
 }
@@ -196,7 +208,8 @@ std::optional<ColumnType> Session::viewColumnType(QStringView view, QStringView 
 
 bool Session::read(const QString& table, RowIdentity row, RowStore& into) {
     file_.refuseChanged();
-    Handle& handle = reader();
+    // What is gathered only the writer sees.
+    Handle& handle = holdsGathered_ ? writer() : reader();
     sqlite3_stmt* statement = handle.cached("SELECT * FROM " + quoted(table) + " WHERE _rowid_=?1");
     sqlite3_bind_int64(statement, 1, row);
     const int result = handle.step(statement);
@@ -223,7 +236,7 @@ RowIdentity Session::insert(const QString& table, const QStringList& columns,
         row = sqlite3_last_insert_rowid(writer().get());
     };
     if (!with)
-        committing(add);
+        alone(add);
     else
         together([&] {
             add();
@@ -244,7 +257,7 @@ bool Session::update(const QString& table, RowIdentity row, const QStringList& c
             execute("UPDATE " + quoted(table) + " SET " + changes + " WHERE _rowid_=?", bound) > 0;
     };
     if (!with)
-        committing(change);
+        alone(change);
     else
         together([&] {
             change();
@@ -253,8 +266,53 @@ bool Session::update(const QString& table, RowIdentity row, const QStringList& c
     return isThere;
 }
 
+template <class Write>
+void Session::alone(const Write& write) {
+    if (!isGathering_) return committing(write);
+    Handle& handle = writer();
+    if (!holdsGathered_) {
+        handle.run(handle.cached("BEGIN IMMEDIATE"));
+        holdsGathered_ = true;
+        gathered_.start();
+    }
+    try {
+        write();
+    } catch (...) {
+        // Some failures, of the disk above all, end the transaction and what it gathered.
+        holdsGathered_ = sqlite3_get_autocommit(handle.get()) == 0;
+        throw;
+    }
+    if (!gathered_.hasExpired(LongestGathering)) return;
+    commitGathered();
+    QThread::msleep(Between);
+}
+
+void Session::commitGathered() {
+    if (!holdsGathered_) return;
+    Handle& handle = writer();
+    holdsGathered_ = false;
+    try {
+        committing([&] { handle.run(handle.cached("COMMIT")); });
+    } catch (...) {
+        sqlite3_exec(handle.get(), "ROLLBACK", nullptr, nullptr, nullptr);
+        throw;
+    }
+}
+
+void Session::gather() {
+    sqlite3_exec(writer().get(), LargeCache, nullptr, nullptr, nullptr);
+    isGathering_ = true;
+}
+
+void Session::settle() {
+    isGathering_ = false;
+    commitGathered();
+    sqlite3_exec(writer().get(), SmallCache, nullptr, nullptr, nullptr);
+}
+
 template <class Writes>
 void Session::together(const Writes& writes) {
+    commitGathered();
     Handle& handle = writer();
     handle.run(handle.cached("BEGIN IMMEDIATE"));
     try {
@@ -288,7 +346,7 @@ void Session::accompany(const Accompanying& with, RowIdentity row) {
 
 bool Session::remove(const QString& table, RowIdentity row) {
     int removed = 0;
-    committing([&] {
+    alone([&] {
         removed = execute("DELETE FROM " + quoted(table) + " WHERE _rowid_=?", {QVariant(row)});
     });
     return removed > 0;

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QElapsedTimer>
+
 #include "platform/ado/sqlite/BookFile.h"
 #include "platform/ado/sqlite/Dialect.h"
 #include "platform/ado/sqlite/Handle.h"
@@ -28,6 +30,9 @@ public:
     bool remove(const QString& table, RowIdentity row) override;
     std::unique_ptr<RowLock> lock(const QString& table, RowIdentity row, int timeoutSeconds,
                                   RowStore& into) override;
+    void gather() override;
+    void settle() override;
+    bool isGathering() const override { return isGathering_; }
     void setTimeout(int seconds) override;
     const QString& book() const override { return file_.path(); }
 
@@ -52,6 +57,11 @@ private:
     /// Runs writes in one commit; none of them stands when one fails.
     template <class Writes>
     void together(const Writes& writes);
+    /// Runs a write of one statement, which commits unless it is gathered.
+    template <class Write>
+    void alone(const Write& write);
+    /// Commits what is gathered so far.
+    void commitGathered();
     void accompany(const Accompanying& with, RowIdentity row);
     /// Declared type of a view's column.
     std::optional<ColumnType> viewColumnType(QStringView view, QStringView column);
@@ -69,6 +79,10 @@ private:
         QByteArray text;
     };
     Insert inserted_;
+
+    bool isGathering_ = false;
+    bool holdsGathered_ = false;  ///< the writer is in the midst of a transaction
+    QElapsedTimer gathered_;      ///< since that began
 };
 
 }  // namespace ado::sqlite
