@@ -35,8 +35,7 @@ frmProgresso::frmProgresso(int total, const QString& message, const QString& tit
     setWindowTitle(title);
     setAttribute(Qt::WA_ShowWithoutActivating);
     setFrameShape(QFrame::StyledPanel);
-    ProgressBar1->setRange(0, std::max(1, total));
-    ProgressBar1->setValue(0);
+    ProgressBar1->setMaximum(total);
     layOut(message, title);
     show();
     paintNow();

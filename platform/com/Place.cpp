@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "platform/com/Place.h"
 
+#include <dlfcn.h>
 #include <grp.h>
 #include <pwd.h>
 #include <sys/stat.h>
@@ -54,6 +55,12 @@ void refuseOpenPlace(const QString& file) {
             throw refusal(file, u"«%1» pertence a outro utilizador."_s.arg(place));
         if (place == u"/"_s) return;
     }
+}
+
+QString folderOf(const void* function) {
+    Dl_info place{};
+    if (dladdr(function, &place) == 0) return {};
+    return QFileInfo(QFile::decodeName(place.dli_fname)).canonicalPath();
 }
 
 }  // namespace com

@@ -15,4 +15,7 @@ namespace com {
 /// @param file  an existing file, without links on its way
 void refuseOpenPlace(const QString& file);
 
+/// The folder of the shared object, or program, that a function belongs to.
+QString folderOf(const void* function);
+
 }  // namespace com

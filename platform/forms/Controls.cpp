@@ -75,6 +75,13 @@ void Frame::initStyleOption(QStyleOptionGroupBox* option) const {
 
 ProgressBar::ProgressBar(const QString& name, QWidget* parent) : QProgressBar(parent) {
     setObjectName(name);
+    setValue(0);
+}
+
+void ProgressBar::setMaximum(int maximum) {
+    maximum_ = maximum;
+    setRange(0, qMax(1, maximum));
+    setValue(qMax(0, value()));
 }
 
 Timer::Timer(const QString& name, int milliseconds, QObject* parent) : QTimer(parent) {

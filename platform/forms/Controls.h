@@ -65,6 +65,14 @@ class ProgressBar : public QProgressBar {
     Q_OBJECT
 public:
     explicit ProgressBar(const QString& name, QWidget* parent = nullptr);
+    /// 0 leaves the bar empty; it does not begin to move to and fro.
+    void setMaximum(int maximum);
+    int maximum() const { return maximum_; }
+    /// One step further.
+    void advance() { setValue(value() + 1); }
+
+private:
+    int maximum_ = 100;
 };
 
 /// Fires again and again while enabled. It is made disabled; a new interval counts from now on;
