@@ -16,6 +16,8 @@
 #include "platform/forms/MsgBoxes.h"
 #include "receipts/ReceiptRoute.h"
 #include "reports/frmExtratos.h"
+#include "yearend/frmFechoAno.h"
+#include "yearend/frmManutencaoDados.h"
 
 using namespace Qt::StringLiterals;
 
@@ -78,24 +80,26 @@ void openNew(QString* strConMember, QString* strSQL,
     open(strConMember ? *strConMember : leftOut[0], strSQL ? *strSQL : leftOut[1]);
 }
 
-/// A screen that the operation waits for.
-template <class Screen>
-void showModal() {
-    const Operation running;
-    if (!loggedInOrRefused()) return;
-    requireApplication();
-    forms::DefaultInstance<Screen>::get().ShowModal();
-}
-
-/// On a server the screens that change what documents are judged by are not for everybody. Some of
-/// their failures say nothing, so that nobody may come as far as that.
+/// On a server what documents are judged by, the repair of the book and its close are not for
+/// everybody. Some of their failures say nothing, so that nobody may come as far as that.
 bool mayManageOrRefused(const QString& table) {
     if (environment::dtZelmars::instance().MSAccess()->mayWrite(table)) return true;
     core::MsgBox(
-        u"Não tem o direito de alterar esta tabela; nada foi alterado. No servidor esse direito é "
-        "dos gestores do livro: peça-o a quem cuida do servidor."_s,
+        u"Não tem o direito de fazer este trabalho; nada foi alterado. No servidor esse direito é dos "
+        "gestores do livro: peça-o a quem cuida do servidor."_s,
         core::Icon::Critical);
     return false;
+}
+
+/// A screen that the operation waits for.
+/// @param managed  a table that only managers write, for their work; empty for everybody's
+template <class Screen>
+void showModal(const QString& managed = {}) {
+    const Operation running;
+    if (!loggedInOrRefused()) return;
+    if (!managed.isEmpty() && !mayManageOrRefused(managed)) return;
+    requireApplication();
+    forms::DefaultInstance<Screen>::get().ShowModal();
 }
 
 /// A list of what the caller's query gives.
@@ -148,7 +152,7 @@ void General::CallHospitais(QString* strConMember, QString* strSQL) {
 }
 
 void General::CallManutencaoDados() {
-    openLater();
+    showModal<yearend::frmManutencaoDados>(u"tbSocios_Acumulados"_s);
 }
 
 void General::CallIRS() {
@@ -156,7 +160,7 @@ void General::CallIRS() {
 }
 
 void General::CallFechoAno() {
-    openLater();
+    showModal<yearend::frmFechoAno>(u"tbZelmar_Movimentos"_s);
 }
 
 bool General::Login(QString*, QString*, QString*, QString*, QString*) {

@@ -92,6 +92,15 @@ Operation operationOf(const ado::Recordset& row) {
     return operation;
 }
 
+void closeWhere(const QString& condition) {
+    const ado::RecordsetPtr rows = openToWrite(u"select * from tbOperacoes where "_s + condition);
+    for (; !rows->atEnd(); rows->MoveNext()) {
+        rows->setCollect(u"passo"_s, QVariant());
+        rows->setCollect(u"concluida"_s, now());
+        rows->Update();
+    }
+}
+
 std::vector<Operation> operationsWhere(const QString& condition) {
     std::vector<Operation> found;
     if (!exists()) return found;
@@ -148,12 +157,13 @@ Accompaniment finishedLater(const Operation& operation) {
 }
 
 void close(const Operation& operation) {
-    const ado::RecordsetPtr row =
-        openToWrite(u"select * from tbOperacoes where operacao_id = '"_s + operation.id + u"'"_s);
-    if (row->atEnd()) return;
-    row->setCollect(u"passo"_s, QVariant());
-    row->setCollect(u"concluida"_s, now());
-    row->Update();
+    closeWhere(u"operacao_id = '"_s + operation.id + u"'"_s);
+}
+
+void closeAccumulations(bool ofMembers) {
+    if (!exists()) return;
+    closeWhere(u"passo = '%1' and ficheiro %2 '%3'"_s.arg(
+        AwaitsAccumulator, ofMembers ? u"="_s : u"<>"_s, ficheiro::Active.toString()));
 }
 
 std::optional<Operation> find(const QString& id) {

@@ -100,6 +100,9 @@ ado::Accompaniment finished(const Operation& operation);
 ado::Accompaniment finishedLater(const Operation& operation);
 /// Notes that there is nothing left to do.
 void close(const Operation& operation);
+/// The same for every operation that has yet to be added to the accumulators, of the members or of
+/// those who have left: they have been emptied, and whatever fills them counts all movements.
+void closeAccumulations(bool ofMembers);
 
 std::optional<Operation> find(const QString& id);
 /// The last annulment of a movement that was begun.

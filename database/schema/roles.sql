@@ -74,6 +74,33 @@ BEGIN
     END LOOP;
 END $do$;
 
+-- The manager's bulk jobs: the repair of null amounts, the accumulators made anew, and the close,
+-- which moves all movements to history and opens the new year. What is in history stays there.
+DO $do$
+DECLARE
+    movements record;
+BEGIN
+    FOR movements IN
+        SELECT attrelid::regclass AS relation, string_agg(attname, ', ') AS columns
+          FROM pg_attribute
+         WHERE attrelid IN ('tbZelmar_Movimentos'::regclass,
+                            'tbZelmar_Movimentos_Inactivos'::regclass,
+                            'tbZelmar_Movimentos_Historico'::regclass)
+           AND attnum > 0 AND NOT attisdropped
+           AND attname NOT IN ('movimento_id', 'upsize_ts', '_linha')
+         GROUP BY attrelid
+    LOOP
+        EXECUTE format('GRANT SELECT, INSERT (%s), UPDATE (incidencia, recebido, doc_valor, debito,'
+                       ' credito) ON %s TO %s',
+                       movements.columns, movements.relation, $name${manager}$name$);
+    END LOOP;
+END $do$;
+GRANT DELETE ON tbZelmar_Movimentos, tbZelmar_Movimentos_Inactivos TO {manager};
+GRANT SELECT, INSERT (socio_id, codABC, rubrica_id, rubrica_id_main, debito_ac, credito_ac, no_docs),
+    DELETE
+    ON tbSocios_Acumulados, tbSocios_Acumulados_Inactivos TO {manager};
+GRANT SELECT, INSERT (zelmars), UPDATE (zelmars) ON tbContadores TO {manager};
+
 -- The journal of operations, whose rows ride in the commits of other writes. A posting's row goes
 -- once nothing is missing any more.
 GRANT INSERT (

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tests/masterdata/Manager.h"
+#include "tests/support/Manager.h"
 
 using namespace Qt::StringLiterals;
 
@@ -133,7 +133,7 @@ TEST_F(Hospitals, OfThisYearsMovementsStayAndOthersGo) {
 TEST_F(Hospitals, AreNotForOperatorsOfAServer) {
     if (!isOnServer()) return;
     give("revoke");
-    person.expectBox({.text = u"Não tem o direito de alterar esta tabela; nada foi alterado."_s,
+    person.expectBox({.text = u"Não tem o direito de fazer este trabalho; nada foi alterado."_s,
                       .icon = core::Icon::Critical,
                       .partly = true});
     QString connection = u"MSAccess"_s;

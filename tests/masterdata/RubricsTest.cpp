@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tests/masterdata/Manager.h"
+#include "tests/support/Manager.h"
 
 using namespace Qt::StringLiterals;
 

@@ -10,7 +10,7 @@
 #include "tests/support/Book.h"
 #include "tests/support/Operator.h"
 
-/// A person with the right to change what documents are judged by, at a book of her own.
+/// A person with the rights of a manager, at a book of her own.
 class Manager : public testing::Test {
 protected:
     Manager() { give("grant"); }
