@@ -156,13 +156,6 @@ CopySummary carry(BulkAccess& from, BulkAccess& into, const CopyListener& listen
     return summary;
 }
 
-std::unique_ptr<BulkAccess> opened(const BookPlace& place) {
-    if (place.isOnServer()) return std::make_unique<ado::postgres::BulkAccess>(place.server);
-    const QString file = bookFile(place.folder, place.name);
-    if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
-    return std::make_unique<ado::sqlite::BulkAccess>(file);
-}
-
 CopySummary copied(const BookPlace& from, const BookPlace& into, const CopyListener& listener) {
     const std::unique_ptr<BulkAccess> source = opened(from);
     source->begin(BulkAccess::Purpose::Reading);
@@ -180,6 +173,13 @@ CopySummary copied(const BookPlace& from, const BookPlace& into, const CopyListe
 }
 
 }  // namespace
+
+std::unique_ptr<BulkAccess> opened(const BookPlace& place) {
+    if (place.isOnServer()) return std::make_unique<ado::postgres::BulkAccess>(place.server);
+    const QString file = bookFile(place.folder, place.name);
+    if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
+    return std::make_unique<ado::sqlite::BulkAccess>(file);
+}
 
 BookPlace BookPlace::parsed(const QString& text) {
     const QString engine = text.section(u':', 0, 0);

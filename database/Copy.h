@@ -3,6 +3,9 @@
 
 #include <functional>
 
+#include <memory>
+
+#include "platform/ado/engine/BulkAccess.h"
 #include "platform/ado/postgres/Address.h"
 
 /// Carries a whole book from one engine to the other.
@@ -20,6 +23,9 @@ struct BookPlace {
     bool isOnServer() const { return !server.host.isEmpty(); }
     QString shown() const;
 };
+
+/// Opens an existing book for bulk work.
+std::unique_ptr<ado::BulkAccess> opened(const BookPlace& place);
 
 /// How far a copy is.
 struct CopyProgress {

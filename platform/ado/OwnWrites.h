@@ -48,6 +48,8 @@ public:
             for (const auto& [column, value] : values) put(stored_[row], column, value);
     }
     void noteDeleted(qint64 row) {
+        // Mostly a table is gone through from its first row to the last.
+        if (deleted_.empty() || row > deleted_.back()) return deleted_.push_back(row);
         deleted_.insert(std::upper_bound(deleted_.begin(), deleted_.end(), row), row);
     }
     void noteInserted(RowIdentity identity) { inserted_.push_back(identity); }
@@ -64,7 +66,8 @@ public:
         return place < marked_.size() && marked_[place];
     }
     bool isDeleted(qint64 row) const {
-        return std::binary_search(deleted_.begin(), deleted_.end(), row);
+        return !deleted_.empty() && row <= deleted_.back() &&
+               std::binary_search(deleted_.begin(), deleted_.end(), row);
     }
     qint64 insertedCount() const { return static_cast<qint64>(inserted_.size()); }
     RowIdentity inserted(qint64 which) const { return inserted_[static_cast<std::size_t>(which)]; }

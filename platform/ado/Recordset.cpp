@@ -183,6 +183,10 @@ void Recordset::setValue(int column, const QVariant& value) {
     if (d->setValue(column, value)) emit fieldChanged(column);
 }
 
+void Recordset::copyValue(int column, const Recordset& from, int fromColumn) {
+    if (!d->copyCell(column, *from.d, fromColumn)) setValue(column, from.value(fromColumn));
+}
+
 RecordsetPtr Recordset::Chapter(const QString& name) const {
     d->requireOpen();
     if (!d->chapter || d->chapter->name.compare(name, Qt::CaseInsensitive) != 0)

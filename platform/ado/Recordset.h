@@ -105,6 +105,9 @@ public:
     Cell readCell(int column) const;
     QVariant value(int column) const;
     void setValue(int column, const QVariant& value);
+    /// The same as setValue(column, from.value(fromColumn)). Where a new row gets the values of
+    /// another query of the book, nothing is converted on the way, and fieldChanged is not told.
+    void copyValue(int column, const Recordset& from, int fromColumn);
 
     /// The child set of the current row of a SHAPE query, by the name of its chapter. Of a set
     /// without rows it is an empty one that knows its columns.

@@ -40,7 +40,9 @@ struct Recordset::Implementation {
         QString text;
         int column = -1;
     };
-    mutable Name names[64];  ///< names found lately, by the place of their text
+    mutable Name names[64];           ///< names found lately, by the place of their text
+    std::vector<int> writtenColumns;  ///< of the last write
+    QStringList writtenNames;
 
     // Opening.
     void openRows();
@@ -105,10 +107,13 @@ struct Recordset::Implementation {
     /// The session to write through; fails when the rows came from another book.
     std::shared_ptr<Session> session() const;
     bool setValue(int column, const QVariant& value);
+    /// False when the value has to be converted, or is not simply what a query read.
+    bool copyCell(int column, const Implementation& from, int fromColumn);
     void addNew();
     void update(const Accompaniment& with);
-    /// The changes by the names of their columns.
-    std::pair<QStringList, std::vector<QVariant>> written() const;
+    /// The changes: the names of their columns, which rows that are added one after the other have
+    /// in common, and the values beside them.
+    std::pair<QStringList, std::vector<QVariant>> written();
     void insertNew(const Accompaniment& with);
     void updateCurrent(const Accompaniment& with);
     void remove();

@@ -18,6 +18,26 @@ QString keyOf(const Cell& cell) {
     return cell.kind == Cell::Null ? QString() : core::toText(toVariant(cell, ColumnType::Other));
 }
 
+/// A change, which may be a value that was copied as the engine keeps it.
+QVariant converted(const QVariant& change, ColumnType type) {
+    Cell cell;
+    const QByteArray text =
+        change.typeId() == QMetaType::QByteArray ? change.toByteArray() : QByteArray();
+    if (!text.isNull()) {
+        cell.kind = Cell::Text;
+        cell.text = {text.constData(), static_cast<std::size_t>(text.size())};
+    } else if (change.typeId() == QMetaType::Double) {
+        cell.kind = Cell::Real;
+        cell.real = change.toDouble();
+    } else if (change.typeId() == QMetaType::LongLong) {
+        cell.kind = Cell::Integer;
+        cell.integer = change.toLongLong();
+    } else {
+        return change;
+    }
+    return toVariant(cell, type);
+}
+
 int requireColumn(const Pass& pass, const QString& name) {
     const int column = pass.indexOf(name);
     if (column < 0) throw core::Failure(core::NoSuchItem, u"A coluna «%1» não existe."_s.arg(name));
@@ -50,7 +70,7 @@ void Recordset::Implementation::openQuery(const Query& query) {
     Session& engine = *connection->session();
     if (!readOnly()) table = query.singleTable();
     if (!table.isEmpty() && !engine.isTable(table)) table.clear();
-    rows = std::make_unique<Rows>(engine.open(query, table), clientSide);
+    rows = std::make_unique<Rows>(engine.open(query, table), clientSide, query.groups());
     // A counter without its row: of all that find none, one alone adds it; the others wait here
     // and find it then.
     const bool isCounter = cursor == adOpenDynamic && lockType == adLockPessimistic;
@@ -97,6 +117,7 @@ void Recordset::Implementation::close() {
     table.clear();
     book.clear();
     for (Name& name : names) name = {};
+    writtenColumns.clear();
 }
 
 // --- Moving
@@ -163,7 +184,8 @@ int Recordset::Implementation::columnOf(const QString& name) const {
 
 QVariant Recordset::Implementation::value(int column) {
     requireRow();
-    if (const QVariant* change = ado::find(current.changes(), column)) return *change;
+    if (const QVariant* change = ado::find(current.changes(), column))
+        return converted(*change, rows->columns().column(column).type);
     if (current.isNew()) return {};
     look();
     const ColumnType type = rows->columns().column(column).type;

@@ -34,6 +34,57 @@ bool Recordset::Implementation::setValue(int column, const QVariant& value) {
     return true;
 }
 
+namespace {
+
+/// True for what a column of that type keeps, and no other type would.
+bool isKeptIn(ColumnType type, Cell::Kind kind) {
+    switch (type) {
+        case ColumnType::Integer16:
+        case ColumnType::Integer32:
+        case ColumnType::Integer64:
+            return kind == Cell::Integer;
+        case ColumnType::Single:
+        case ColumnType::Double:
+            return kind == Cell::Real;
+        case ColumnType::Money:
+            return kind == Cell::Real || kind == Cell::Text;  // as the engine keeps amounts
+        case ColumnType::DateTime:
+        case ColumnType::Text:
+            return kind == Cell::Text;
+        case ColumnType::Other:
+            break;
+    }
+    return false;
+}
+
+QVariant asItIs(const Cell& cell) {
+    switch (cell.kind) {
+        case Cell::Integer:
+            return cell.integer;
+        case Cell::Real:
+            return cell.real;
+        case Cell::Text:
+            return QByteArray(cell.text.data(), static_cast<qsizetype>(cell.text.size()));
+        case Cell::Null:
+            break;
+    }
+    return {};
+}
+
+}  // namespace
+
+bool Recordset::Implementation::copyCell(int column, const Implementation& from, int fromColumn) {
+    const bool isRead = from.rows && from.table.isEmpty() && from.current.at() == At::Queried;
+    if (!current.isNew() || !isRead || from.book != book) return false;
+    const Column& target = rows->columns().column(column);
+    const Column& given = from.rows->columns().column(fromColumn);
+    if (target.type != given.type || target.definedSize != given.definedSize) return false;
+    const Cell cell = from.rows->cell(fromColumn);
+    if (cell.kind != Cell::Null && !isKeptIn(target.type, cell.kind)) return false;
+    current.change(column, asItIs(cell));
+    return true;
+}
+
 void Recordset::Implementation::addNew() {
     requireOpen();
     requireTable();
@@ -55,13 +106,19 @@ void Recordset::Implementation::update(const Accompaniment& with) {
     if (!isGathering()) current.letGo();
 }
 
-std::pair<QStringList, std::vector<QVariant>> Recordset::Implementation::written() const {
-    std::pair<QStringList, std::vector<QVariant>> written;
+std::pair<QStringList, std::vector<QVariant>> Recordset::Implementation::written() {
+    std::vector<int> columns;
+    std::vector<QVariant> values;
     for (const auto& [column, value] : current.changes()) {
-        written.first += rows->columns().column(column).name;
-        written.second.push_back(value);
+        columns.push_back(column);
+        values.push_back(value);
     }
-    return written;
+    if (columns != writtenColumns) {
+        writtenNames.clear();
+        for (const int column : columns) writtenNames += rows->columns().column(column).name;
+        writtenColumns = std::move(columns);
+    }
+    return {writtenNames, std::move(values)};
 }
 
 void Recordset::Implementation::insertNew(const Accompaniment& with) {

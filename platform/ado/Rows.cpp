@@ -9,11 +9,13 @@ namespace {
 
 /// Rows that are taken in at once; a set with no more of them holds on to nothing.
 constexpr qint64 FewRows = 32;
+/// Bytes that the rows of a dear query may take when they are counted.
+constexpr std::size_t MostCounted = 64 << 20;
 
 }  // namespace
 
-Rows::Rows(std::shared_ptr<Pass> pass, bool all)
-    : pass_(std::move(pass)), store_(std::make_shared<RowStore>()) {
+Rows::Rows(std::shared_ptr<Pass> pass, bool all, bool isDear)
+    : pass_(std::move(pass)), store_(std::make_shared<RowStore>()), isDear_(isDear) {
     take(all ? std::numeric_limits<qint64>::max() : FewRows);
 }
 
@@ -69,7 +71,23 @@ bool Rows::toNext() {
 }
 
 void Rows::countAll() {
-    if (count_ < 0) seek(std::numeric_limits<qint64>::max());
+    if (count_ >= 0) return;
+    const qint64 first = store_->count();
+    if (isDear_ && passRow_ == first - 1) {
+        store_->reserve(MostCounted);
+        while (store_->bytes() < MostCounted) {
+            if (!pass_->step()) {
+                count_ = store_->count();
+                complete_ = true;
+                pass_->release();
+                return;
+            }
+            store_->append(*pass_);
+            ++passRow_;
+        }
+        store_->shrinkTo(first);
+    }
+    seek(std::numeric_limits<qint64>::max());
 }
 
 // The last row becomes the current one without being read: whoever only wants the count goes back

@@ -10,8 +10,11 @@ namespace ado {
 /// grow with the table.
 class Rows {
 public:
-    /// @param all  takes in every row, however many
-    Rows(std::shared_ptr<Pass> pass, bool all);
+    /// @param all     takes in every row, however many
+    /// @param isDear  the query is dear to run a second time, and gives few and narrow rows for
+    /// what
+    ///                it reads
+    Rows(std::shared_ptr<Pass> pass, bool all, bool isDear = false);
     /// Rows that are in memory already; `description` tells their columns.
     Rows(std::shared_ptr<Pass> description, std::shared_ptr<RowStore> store);
 
@@ -51,6 +54,7 @@ private:
 
     std::shared_ptr<Pass> pass_;
     std::shared_ptr<RowStore> store_;
+    bool isDear_ = false;
     bool complete_ = false;  ///< all rows are in the store
     qint64 count_ = -1;
     qint64 row_ = 0;

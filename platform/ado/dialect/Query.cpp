@@ -158,6 +158,12 @@ bool Query::isMarkedText(int i) const {
     return before.at + before.length == tokens_[i].at && (isWord(i - 1) || is(i - 1, "&"_L1));
 }
 
+bool Query::groups() const {
+    for (int i = 0; i < count(); ++i)
+        if (is(i, "group"_L1)) return true;
+    return false;
+}
+
 QString Query::singleTable() const {
     if (!is(0, "select"_L1) || !is(1, "*"_L1) || !is(2, "from"_L1)) return {};
     if (count() > 4 && !is(4, "where"_L1) && !is(4, "order"_L1)) return {};

@@ -49,6 +49,8 @@ public:
     void requireQuery(bool shapes) const;
     /// The table of a `SELECT * FROM table …` over one table; empty for anything else.
     QString singleTable() const;
+    /// True when it groups its rows.
+    bool groups() const;
 
 private:
     void tokenize();

@@ -41,6 +41,16 @@ void RowStore::clear() {
     identities_.clear();
 }
 
+void RowStore::shrinkTo(qint64 count) {
+    const auto left = static_cast<std::size_t>(count);
+    if (left < starts_.size()) bytes_.resize(starts_[left]);
+    starts_.resize(std::min(left, starts_.size()));
+    identities_.resize(starts_.size());
+    bytes_.shrink_to_fit();
+    starts_.shrink_to_fit();
+    identities_.shrink_to_fit();
+}
+
 void RowStore::append(const Pass& pass) {
     beginRow(pass.identity());
     const int columns = pass.columnCount();

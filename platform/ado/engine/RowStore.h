@@ -13,6 +13,14 @@ class RowStore {
 public:
     qint64 count() const { return static_cast<qint64>(starts_.size()); }
     void clear();
+    /// Room for so many bytes without moving what is there; it is taken as it is used.
+    void reserve(std::size_t bytes) { bytes_.reserve(bytes); }
+    /// Bytes of all rows and of what is known of each.
+    std::size_t bytes() const {
+        return bytes_.size() + starts_.size() * (sizeof starts_[0] + sizeof identities_[0]);
+    }
+    /// Drops the rows behind the first so many, and their room.
+    void shrinkTo(qint64 count);
     /// True when both keep the same rows with the same values.
     bool operator==(const RowStore&) const = default;
 

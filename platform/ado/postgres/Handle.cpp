@@ -6,6 +6,7 @@
 
 #include <QRegularExpression>
 #include <QtEndian>
+#include <mutex>
 #include <utility>
 
 #include "platform/ado/engine/RowHolders.h"
@@ -51,6 +52,16 @@ Said withoutCode(const QString& verbose) {
     return {verbose.left(match.capturedStart()) + u": "_s + match.captured(2), match.captured(1)};
 }
 
+/// Connections of this process, in all its threads.
+struct Backends {
+    std::mutex guard;
+    QSet<int> numbers;
+};
+Backends& backends() {
+    static Backends all;
+    return all;
+}
+
 bool isFailure(const PGresult* result) {
     const ExecStatusType status = PQresultStatus(result);
     return status == PGRES_FATAL_ERROR || status == PGRES_BAD_RESPONSE;
@@ -90,10 +101,20 @@ Handle::Handle(const Address& address, Role role)
         PQfinish(connection_);
         throw;
     }
+    backend_ = PQbackendPID(connection_);
+    const std::lock_guard guard(backends().guard);
+    backends().numbers.insert(backend_);
 }
 
 Handle::~Handle() {
     PQfinish(connection_);
+    const std::lock_guard guard(backends().guard);
+    backends().numbers.remove(backend_);
+}
+
+QSet<int> Handle::ownBackends() {
+    const std::lock_guard guard(backends().guard);
+    return backends().numbers;
 }
 
 PGconn* Handle::connected(const Address& address) {

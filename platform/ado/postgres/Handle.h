@@ -6,6 +6,7 @@
 #include <QByteArray>
 #include <QDeadlineTimer>
 #include <QHash>
+#include <QSet>
 #include <QString>
 #include <functional>
 #include <memory>
@@ -47,6 +48,8 @@ public:
     Handle(const Handle&) = delete;
     Handle& operator=(const Handle&) = delete;
 
+    /// The server's numbers of all connections of this process.
+    static QSet<int> ownBackends();
     /// A bare connection, for work of another kind than a workstation's; the caller's own.
     static PGconn* connected(const Address& address);
 
@@ -103,6 +106,7 @@ private:
     [[noreturn]] void lose(const QString& text, const QString& code = QStringLiteral("08006"));
 
     PGconn* connection_ = nullptr;
+    int backend_ = 0;  ///< the server's number of it
     QString place_;
     QString awaited_;  ///< what the operator reads while an answer is waited for
     bool lost_ = false;

@@ -142,6 +142,8 @@ std::optional<QByteArray> parameterOf(const QVariant& value) {
             return shortest(value.toDouble());
         case QMetaType::QDateTime:
             return storedForm(value.toDateTime()).toLatin1();
+        case QMetaType::QByteArray:
+            return value.toByteArray();
         default:
             return value.toString().toUtf8();
     }

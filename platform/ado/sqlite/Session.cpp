@@ -20,9 +20,11 @@ namespace {
 /// Idle readers that are kept open for the next pass.
 constexpr std::size_t IdleReaders = 4;
 
-/// Milliseconds after which gathered writes are committed: as long as that others wait for the
-/// book, and so much is done again after a kill.
-constexpr qint64 LongestGathering = 1000;
+/// Gathered writes are committed when there are so many, or after so many milliseconds: as long as
+/// that others wait for the book. Each commit writes every page again that its rows touched, which
+/// in an index are nearly all.
+constexpr int MostGathered = 50'000;
+constexpr qint64 LongestGathering = 4000;
 /// Milliseconds between two gatherings: those who wait look at the book every second or third one.
 constexpr unsigned long Between = 4;
 /// Gathered writes go to all places of the indexes; pages of the book that are kept for them, in
@@ -271,8 +273,10 @@ void Session::alone(const Write& write) {
     if (!isGathering_) return committing(write);
     Handle& handle = writer();
     if (!holdsGathered_) {
+        file_.refuseChanged();
         handle.run(handle.cached("BEGIN IMMEDIATE"));
         holdsGathered_ = true;
+        gatheredWrites_ = 0;
         gathered_.start();
     }
     try {
@@ -282,7 +286,7 @@ void Session::alone(const Write& write) {
         holdsGathered_ = sqlite3_get_autocommit(handle.get()) == 0;
         throw;
     }
-    if (!gathered_.hasExpired(LongestGathering)) return;
+    if (++gatheredWrites_ < MostGathered && !gathered_.hasExpired(LongestGathering)) return;
     commitGathered();
     QThread::msleep(Between);
 }
@@ -345,15 +349,16 @@ void Session::accompany(const Accompanying& with, RowIdentity row) {
 }
 
 bool Session::remove(const QString& table, RowIdentity row) {
+    if (removed_.table != table)
+        removed_ = {table, "DELETE FROM " + quoted(table) + " WHERE _rowid_=?"};
     int removed = 0;
-    alone([&] {
-        removed = execute("DELETE FROM " + quoted(table) + " WHERE _rowid_=?", {QVariant(row)});
-    });
+    alone([&] { removed = execute(removed_.text, {QVariant(row)}); });
     return removed > 0;
 }
 
 int Session::execute(const QByteArray& text, const std::vector<QVariant>& values) {
-    file_.refuseChanged();
+    // In the midst of a transaction the file was looked at when that began.
+    if (!holdsGathered_) file_.refuseChanged();
     Handle& handle = writer();
     sqlite3_stmt* statement = handle.cached(text);
     int parameter = 0;

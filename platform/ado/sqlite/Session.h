@@ -72,17 +72,23 @@ private:
     std::unique_ptr<Handle> writer_;                ///< opened by the first write
     Locks locks_;
 
-    /// The insert that was made last.
+    /// The insert and the removal that were made last.
     struct Insert {
         QString table;
         QStringList columns;
         QByteArray text;
     };
     Insert inserted_;
+    struct Removal {
+        QString table;
+        QByteArray text;
+    };
+    Removal removed_;
 
     bool isGathering_ = false;
     bool holdsGathered_ = false;  ///< the writer is in the midst of a transaction
-    QElapsedTimer gathered_;      ///< since that began
+    int gatheredWrites_ = 0;      ///< in it
+    QElapsedTimer gathered_;      ///< since it began
 };
 
 }  // namespace ado::sqlite

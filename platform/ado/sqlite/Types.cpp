@@ -113,6 +113,12 @@ void bind(sqlite3_stmt* statement, int parameter, const QVariant& value) {
             case QMetaType::QDateTime:
                 bindText(statement, parameter, storedForm(value.toDateTime()));
                 break;
+            case QMetaType::QByteArray: {
+                const QByteArray text = value.toByteArray();
+                sqlite3_bind_text(statement, parameter, text.constData(),
+                                  static_cast<int>(text.size()), SQLITE_TRANSIENT);
+                break;
+            }
             case QMetaType::QString:
                 bindText(statement, parameter, value.toString());
                 break;
