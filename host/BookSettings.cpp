@@ -24,6 +24,14 @@ BookSettings BookSettings::readOrTell() {
     }
 }
 
+database::BookPlace BookSettings::place() const {
+    if (!isComplete) throw core::Failure(core::InvalidCall, u"Não há nenhum livro escolhido."_s);
+    database::BookPlace place = database::BookPlace::parsed(dtDataSource + u'/' + dtInitialCatalog);
+    place.server.user = dtUser;
+    place.server.password = dtPassword;
+    return place;
+}
+
 QString BookSettings::bookText() const {
     const QString warning =
         ado::isReadableOnTheWay(dtDataSource) ? u", ligação não cifrada"_s : QString();

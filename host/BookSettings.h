@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "database/Copy.h"
 #include "platform/registry/LoginValues.h"
 
 namespace host {
@@ -15,6 +16,8 @@ struct BookSettings : registry::LoginValues {
     /// The same for a window, which tells of the failure where the book should stand.
     static BookSettings readOrTell();
 
+    /// Where the book lies, and who enters it. Fails when no book is set up.
+    database::BookPlace place() const;
     /// Where the book lies, for people; without the password.
     QString bookText() const;
 };

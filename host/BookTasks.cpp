@@ -5,7 +5,9 @@
 
 #include <csignal>
 
+#include "database/Backup.h"
 #include "database/Book.h"
+#include "database/Check.h"
 #include "database/Copy.h"
 #include "database/ServerBook.h"
 #include "host/BookSettings.h"
@@ -60,7 +62,49 @@ void showProgress(const database::CopyProgress& progress) {
         say(line);
 }
 
+const QString Administrator = u"postgres"_s;
+
+/// The book that the line names, else that of the settings, with who enters it.
+database::BookPlace placeOf(const CommandLine& line, bool asAdministrator) {
+    database::BookPlace place =
+        line.book.isEmpty() ? BookSettings::read().place() : database::BookPlace::parsed(line.book);
+    const bool isKnown = line.book.isEmpty() && line.admin.isEmpty() && !asAdministrator;
+    if (place.isOnServer() && !isKnown)
+        enterAsAdministrator(place, line.admin.isEmpty() ? Administrator : line.admin);
+    return place;
+}
+
 }  // namespace
+
+int checkBook(const CommandLine& line) {
+    constexpr int CouldNotLook = 2;
+    try {
+        const database::BookPlace place = placeOf(line, false);
+        const std::unique_ptr<ado::BulkAccess> book = database::opened(place);
+        say(u"Livro: %1"_s.arg(place.shown()));
+        const database::CheckSummary summary =
+            database::checkBook(*book, [](const QString& finding) { say(finding); });
+        say(database::summaryText(summary));
+        return summary.findings == 0 ? 0 : 1;
+    } catch (const core::Failure& failure) {
+        complain(failure.text());
+        return CouldNotLook;
+    }
+}
+
+void backUpBook(const CommandLine& line) {
+    const database::BookPlace place = placeOf(line, false);
+    const QString file = QFileInfo(line.file).absoluteFilePath();
+    database::backUpBook(place, file);
+    say(u"Cópia de segurança de %1 em %2"_s.arg(place.shown(), file));
+}
+
+void restoreBook(const CommandLine& line) {
+    const database::BookPlace place = placeOf(line, true);
+    const QString file = QFileInfo(line.file).absoluteFilePath();
+    database::restoreBook(file, place, line.replace);
+    say(u"Livro %1 reposto a partir de %2"_s.arg(place.shown(), file));
+}
 
 void makeBook(const CommandLine& line) {
     const QString folder = QDir(line.folder).absolutePath();

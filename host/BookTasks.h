@@ -11,5 +11,10 @@ void makeServerBook(const CommandLine& line);
 /// Shows how far the copying has come. Ctrl+C ends it as a failure does: nothing stays in the
 /// target.
 void copyBook(const CommandLine& line);
+/// Proves the book; says what is wrong, line by line.
+/// @return 0 for a book without faults, 1 for one with, 2 when it cannot be looked at
+int checkBook(const CommandLine& line);
+void backUpBook(const CommandLine& line);
+void restoreBook(const CommandLine& line);
 
 }  // namespace host

@@ -107,6 +107,24 @@ CommandLine copyLine(const QStringList& all) {
     return words.ended(line);
 }
 
+CommandLine checkLine(const QStringList& all) {
+    Words words(all);
+    CommandLine line{.task = CommandLine::Task::Check};
+    words.value(u"--book"_s, line.book);
+    words.value(u"--admin"_s, line.admin);
+    return words.ended(line);
+}
+
+CommandLine backupLine(const QStringList& all, CommandLine::Task task) {
+    Words words(all);
+    CommandLine line{.task = task};
+    words.value(u"--book"_s, line.book);
+    words.value(u"--admin"_s, line.admin);
+    if (task == CommandLine::Task::Restore) line.replace = words.flag(u"--replace"_s);
+    line.file = words.next(u"o ficheiro da cópia de segurança"_s);
+    return words.ended(line);
+}
+
 CommandLine registerLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::Register};
@@ -130,6 +148,9 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     const QString& first = words.first();
     if (first == "init"_L1) return initLine(words);
     if (first == "copy"_L1) return copyLine(words);
+    if (first == "check"_L1) return checkLine(words);
+    if (first == "backup"_L1) return backupLine(words, Task::Backup);
+    if (first == "restore"_L1) return backupLine(words, Task::Restore);
     if (first == "register"_L1) return registerLine(words);
     if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
     if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});

@@ -9,7 +9,20 @@ namespace host {
 
 /// What a command line asks for.
 struct CommandLine {
-    enum class Task { Window, Operation, Init, InitServer, Copy, Register, Help, Version, Wrong };
+    enum class Task {
+        Window,
+        Operation,
+        Init,
+        InitServer,
+        Copy,
+        Check,
+        Backup,
+        Restore,
+        Register,
+        Help,
+        Version,
+        Wrong
+    };
     Task task = Task::Window;
     QString wrong = {};       ///< of Wrong: the word that is wrong or missing, in a sentence
     OperationCall call = {};  ///< of Operation
@@ -18,12 +31,16 @@ struct CommandLine {
     QString server = {};      ///< of InitServer: "postgresql:HOST[:PORT]"
     QString catalogue = {};   ///< of InitServer
     QString user = {};        ///< of InitServer: the operator
-    QString admin = {};       ///< of InitServer and Copy: the server's administrator
-    QString from = {};        ///< of Copy, as database::BookPlace reads it
+    QString admin = {};  ///< the server's administrator; of Check and Backup empty for the user
+                         ///< that the settings name
+    QString from = {};   ///< of Copy, as database::BookPlace reads it
     QString into = {};
+    QString book = {};  ///< of Check, Backup and Restore, likewise; empty for that of the settings
+    QString file = {};  ///< of Backup and Restore
     bool sample = false;    ///< of Init and InitServer: with the sample content
     bool ifNeeded = false;  ///< of Init: only when no book is set up for this user
     bool undo = false;      ///< of Register
+    bool replace = false;   ///< of Restore: the book that is there may be lost
 
     /// @param words  without the program's name
     static CommandLine parsed(const QStringList& words);

@@ -18,9 +18,9 @@ struct Signature {
 constexpr Signature Signatures[] = {
     {"CallPlafonds", 0, 2, true},
     {"CallHospitais", 0, 2, true},
-    {"CallManutencaoDados", 0, 0},
+    {"CallManutencaoDados", 0, 0, true},
     {"CallIRS", 0, 0},
-    {"CallFechoAno", 0, 0},
+    {"CallFechoAno", 0, 0, true},
     {"Login", 0, 5, true},
     {"Registo", 1, 1, true},
     {"NewMovimento", 0, 3, true},

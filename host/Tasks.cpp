@@ -80,6 +80,14 @@ int performUntrapped(const CommandLine& line) {
         case Task::Copy:
             copyBook(line);
             return Done;
+        case Task::Check:
+            return checkBook(line);
+        case Task::Backup:
+            backUpBook(line);
+            return Done;
+        case Task::Restore:
+            restoreBook(line);
+            return Done;
         case Task::Register:
             registerComponents(line.undo);
             return Done;

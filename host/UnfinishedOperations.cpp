@@ -4,9 +4,9 @@
 #include <QMessageBox>
 #include <QPushButton>
 
-#include "boundary/environment/dtZelmars.h"
 #include "host/BookSettings.h"
 #include "host/Finishing.h"
+#include "host/RulesConnection.h"
 #include "platform/core/Failure.h"
 
 using namespace Qt::StringLiterals;
@@ -16,23 +16,6 @@ namespace host {
 namespace {
 
 constexpr qsizetype LinesShown = 12;  ///< a box with more would not fit the screen
-
-/// Opens a connection for the rules of this program, whose data environment is not that of the
-/// component, and closes it at its end.
-class RulesConnection {
-public:
-    explicit RulesConnection(const BookSettings& settings)
-        : connection_(environment::dtZelmars::instance().MSAccess()) {
-        connection_->ConnectionString = settings.connectionString();
-        connection_->Open();
-    }
-    ~RulesConnection() { connection_->Close(); }
-    RulesConnection(const RulesConnection&) = delete;
-    RulesConnection& operator=(const RulesConnection&) = delete;
-
-private:
-    ado::ConnectionPtr connection_;
-};
 
 QString listed(const QStringList& lines) {
     QString text;

@@ -14,7 +14,10 @@
 #include "data/Procedures.h"
 #include "host/BookSettings.h"
 #include "host/MovementsView.h"
+#include "host/RulesConnection.h"
 #include "host/UnfinishedOperations.h"
+#include "host/frmPrepararFecho.h"
+#include "host/frmVerificacao.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/RecordScreen.h"
 
@@ -127,7 +130,11 @@ void frmPrincipal::addYearMenus() {
     QMenu* year = menuBar()->addMenu(u"&Anual"_s);
     addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
     addOperation(year, u"&Manutenção de dados"_s, {}, {u"CallManutencaoDados"_s, {}});
-    addOperation(year, u"&Fecho do ano"_s, {}, {u"CallFechoAno"_s, {}});
+    addItem(year, u"Verificar"_s, u"&Verificar o livro"_s, {},
+            [this] { once([this] { checkBook(); }); });
+    year->addSeparator();
+    addItem(year, u"CallFechoAno"_s, u"&Fecho do ano"_s, {},
+            [this] { once([this] { closeYear(); }); });
 }
 
 void frmPrincipal::addHelpMenu() {
@@ -213,6 +220,24 @@ void frmPrincipal::login() {
     else
         core::MsgBox(u"Não foi possível ligar ao livro: faltam valores na configuração."_s,
                      core::Icon::Critical);
+}
+
+void frmPrincipal::checkBook() {
+    auto* shown = new frmVerificacao(checkedBook());
+    shown->ShowModal();
+}
+
+/// Whoever may not close a year is told so by the component.
+void frmPrincipal::closeYear() {
+    const bool isManager = RulesConnection(BookSettings::read()).mayWrite(u"tbZelmar_Movimentos"_s);
+    if (isManager) {
+        const QPointer<frmPrepararFecho> prepared = new frmPrepararFecho;
+        prepared->ShowModal();
+        const bool goesOn = prepared && prepared->mayGoOn();
+        if (prepared) prepared->Unload();
+        if (!goesOn) return;
+    }
+    runUnguarded({u"CallFechoAno"_s, {}});
 }
 
 void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {

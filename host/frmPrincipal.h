@@ -52,6 +52,8 @@ private:
     void runUnguarded(const OperationCall& call);
     void once(const std::function<void()>& handler);
     void login();
+    void checkBook();
+    void closeYear();
     void offerToFinish();
     void showCount(const QString& text);
     void restoreLook();

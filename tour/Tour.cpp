@@ -2,6 +2,7 @@
 #include "tour/Tour.h"
 
 #include <QAbstractButton>
+#include <QAction>
 #include <QDir>
 #include <QLabel>
 #include <QLineEdit>
@@ -75,6 +76,14 @@ std::function<bool(QWidget*)> listBeginsWith(const QString& text) {
         for (int column = 0; column < rows.columnCount(); ++column)
             if (rows.index(0, column).data().toString() == text) return true;
         return false;
+    };
+}
+
+/// A condition: the screen's list has rows.
+std::function<bool(QWidget*)> hasRows() {
+    return [](QWidget* screen) {
+        const auto* list = screen->findChild<QTableView*>();
+        return list && list->model() && list->model()->rowCount() > 0;
     };
 }
 
@@ -164,10 +173,55 @@ public:
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
+    /// A group of rubrics, one of its rubrics, a hospital.
+    void masterData() {
+        open({}, Operations::rubrics());
+        player_.step(u"frmPlafonds"_s, u"19-rubricas"_s, typing({u"<Down>"_s, u"<Alt+T>"_s}));
+        player_.step(u"frmPlafonds_Main"_s, u"20-grupo-de-rubricas"_s, typing({u"<Alt+E>"_s}),
+                     hasRows());
+        player_.step(u"frmPlafonds_record"_s, u"21-rubrica"_s, typing({u"<Escape>"_s}));
+        leaveList(u"frmPlafonds_Main"_s);
+        leaveList(u"frmPlafonds"_s);
+        open({}, Operations::hospitals());
+        player_.step(u"frmHospitais"_s, u"22-hospitais"_s, typing({u"<Alt+T>"_s}), hasRows());
+        player_.step(u"frmHospitais_record"_s, u"23-hospital"_s, typing({u"<Escape>"_s}));
+        leaveList(u"frmHospitais"_s);
+    }
+
+    /// The repair of the book and the close of the year.
+    void yearEnd(const QString& backup) {
+        open({}, {u"CallManutencaoDados"_s, {}});
+        player_.step(u"frmManutencaoDados"_s, {}, typing({u"<Alt+I>"_s}));
+        player_.step(u"box:Manutenção de Dados Concluída."_s, {}, typing({u"<Return>"_s}));
+        player_.step(u"frmManutencaoDados"_s, u"24-manutencao"_s, typing({u"<Alt+F>"_s}));
+        choose(u"Verificar"_s);
+        player_.step(u"frmVerificacao"_s, u"25-verificacao"_s, typing({u"<Alt+S>"_s}));
+        choose(u"CallFechoAno"_s);
+        player_.step(u"frmPrepararFecho"_s, u"26-preparar-o-fecho"_s,
+                     typing({u"<Ctrl+A>"_s, backup, u"<Alt+F>"_s}));
+        player_.step(u"frmFechoAno"_s, {}, typing({u"<Alt+F>"_s}));
+        player_.step(u"box:Tem a certeza"_s, u"27-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Procedimentos de Fim de Ano"_s, {}, typing({u"<Return>"_s}));
+        player_.step(u"frmFechoAno"_s, u"28-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmPrincipal"_s, {}, {});
+    }
+
 private:
     void open(const QString& picture, const host::OperationCall& call) {
         player_.step(u"frmPrincipal"_s, picture,
                      [this, call](QWidget*) { operations_.call(call); });
+    }
+
+    /// Leaves a list whose record has just been left; its button takes a press once it has returned.
+    void leaveList(const QString& list) {
+        player_.step(list, {}, {});
+        player_.step(list, {}, typing({u"<Alt+S>"_s}));
+    }
+
+    /// Chooses an entry of the main window's menu.
+    void choose(const QString& entry) {
+        player_.step(u"frmPrincipal"_s, {},
+                     [entry](QWidget* screen) { screen->findChild<QAction*>(entry)->trigger(); });
     }
 
     /// Types the member's number and answers the question about his premiums, which always comes.
@@ -224,6 +278,8 @@ bool play(const QString& folder) {
     const QString extract = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);
     QFile::remove(extract);
     script.extract(extract);
+    script.masterData();
+    script.yearEnd(own.filePath(u"antes-do-fecho.copia"_s));
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
     return played;

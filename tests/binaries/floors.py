@@ -32,11 +32,12 @@ FLOORS = GROUND | {
     "payments": ROOM,
     "reports": ROOM,
     "receipts": ROOM,
+    "yearend": ROOM,
     "entry": ROOM + " coverage payments reports",
-    "boundary": ROOM + " coverage masterdata payments reports receipts entry",
+    "boundary": ROOM + " coverage masterdata payments reports receipts yearend entry",
     "companions": BASE + " platform/forms",
     "database": BASE + " platform/ado/sqlite platform/ado/postgres",
-    "host": ROOM + " coverage receipts database",
+    "host": ROOM + " coverage receipts reports database",
     "tour": ROOM + " database host",
 }
 # The plan's arithmetic, on plain values, serves the sample books as well.
