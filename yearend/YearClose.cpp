@@ -82,7 +82,7 @@ public:
         }
     }
     void copy(const ado::Recordset& movement, ado::Recordset& into) const {
-        for (const auto& [from, to] : pairs_) into.setValue(to, movement.value(from));
+        for (const auto& [from, to] : pairs_) into.copyValue(to, movement, from);
     }
 
 private:
