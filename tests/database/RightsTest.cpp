@@ -231,7 +231,7 @@ TEST_F(Rights, ReachNothingBesideTheBook) {
     });
 }
 
-TEST_F(Rights, OfTheManagerAreRubricsAndHospitalsButForTheirKeys) {
+TEST_F(Rights, OfTheManagerAreMasterDataAndTheTurnOfTheYear) {
     BulkAccess administration(catalogue(support::Server::User));
     administration.execute("GRANT direitos_gestor TO posto");
     expectTaken({
@@ -241,14 +241,24 @@ TEST_F(Rights, OfTheManagerAreRubricsAndHospitalsButForTheirKeys) {
         "INSERT INTO tbHospitais (code, nome) VALUES ('x', 'y')",
         "UPDATE tbHospitais SET nome = 'x'",
         "DELETE FROM tbHospitais",
+        "UPDATE tbZelmar_Movimentos_Historico SET credito = 1, debito = 0, recebido = 0",
+        "INSERT INTO tbZelmar_Movimentos_Historico (ano, socio_id, no_kor) VALUES (2025, 1, '1')",
+        "DELETE FROM tbZelmar_Movimentos",
+        "DELETE FROM tbZelmar_Movimentos_Inactivos",
+        "INSERT INTO tbZelmar_Movimentos_Inactivos (socio_id, tipo, debito) VALUES (1, 'SA', 1)",
+        "DELETE FROM tbSocios_Acumulados",
+        "DELETE FROM tbSocios_Acumulados_Inactivos",
+        "INSERT INTO tbSocios_Acumulados_Inactivos (socio_id, no_docs) VALUES (1, 2)",
     });
     expectRefused({
         "UPDATE tbZelmar_Plafonds SET rubrica_id = 1",
         "INSERT INTO tbHospitais (hospital_id) VALUES (1)",
         "TRUNCATE tbHospitais",
-        "DELETE FROM tbZelmar_Movimentos",
-        "DELETE FROM tbSocios_Acumulados",
-        "UPDATE tbZelmar_Movimentos_Historico SET credito = 1",
+        "DELETE FROM tbZelmar_Movimentos_Historico",
+        "UPDATE tbZelmar_Movimentos_Historico SET ano = 1",
+        "UPDATE tbZelmar_Movimentos SET movimento_id = 1",
+        "DELETE FROM tbContadores",
+        "DELETE FROM tbSocios",
     });
     administration.execute("REVOKE direitos_gestor FROM posto");
     expectRefused({"DELETE FROM tbHospitais"});

@@ -170,9 +170,9 @@ TEST_F(PrincipalWindow, EveryOperationIsInTheMenuWithItsArguments) {
          u"CallHospitais MSAccess select tbHospitais.*, code_postal as Codigo_Postal from "
          "tbHospitais order by nome"_s},
     };
-    for (const QString& name : {u"Recebimento"_s, u"Correcao"_s, u"LPagamentos"_s, u"Extratos"_s,
-                                u"Lhospitais"_s, u"Ldividas"_s, u"Lcartasdividas"_s, u"CallIRS"_s,
-                                u"CallManutencaoDados"_s, u"CallFechoAno"_s, u"Login"_s})
+    for (const QString& name :
+         {u"Recebimento"_s, u"Correcao"_s, u"LPagamentos"_s, u"Extratos"_s, u"Lhospitais"_s,
+          u"Ldividas"_s, u"Lcartasdividas"_s, u"CallIRS"_s, u"CallManutencaoDados"_s, u"Login"_s})
         calls[name] = name;
     for (const auto& [name, call] : calls) {
         auto* action = window_.findChild<QAction*>(name);

@@ -52,7 +52,8 @@ Said withoutCode(const QString& verbose) {
     return {verbose.left(match.capturedStart()) + u": "_s + match.captured(2), match.captured(1)};
 }
 
-/// Connections of this process, in all its threads.
+/// Connections of this process, in all its threads. Those that were closed stay among them: the
+/// server takes a moment to let go of one.
 struct Backends {
     std::mutex guard;
     QSet<int> numbers;
@@ -101,15 +102,10 @@ Handle::Handle(const Address& address, Role role)
         PQfinish(connection_);
         throw;
     }
-    backend_ = PQbackendPID(connection_);
-    const std::lock_guard guard(backends().guard);
-    backends().numbers.insert(backend_);
 }
 
 Handle::~Handle() {
     PQfinish(connection_);
-    const std::lock_guard guard(backends().guard);
-    backends().numbers.remove(backend_);
 }
 
 QSet<int> Handle::ownBackends() {
@@ -159,6 +155,8 @@ void Handle::connect(const Address& address) {
     if (PQserverVersion(connection_) < OldestServer)
         throw fail(u"O servidor tem a versão %1; é precisa a 14 ou mais recente."_s.arg(
             PQserverVersion(connection_) / 10000));
+    const std::lock_guard guard(backends().guard);
+    backends().numbers.insert(PQbackendPID(connection_));
 }
 
 void Handle::start(const Address& address, const Address::Found& found) {

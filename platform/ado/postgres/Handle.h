@@ -48,7 +48,7 @@ public:
     Handle(const Handle&) = delete;
     Handle& operator=(const Handle&) = delete;
 
-    /// The server's numbers of all connections of this process.
+    /// The server's numbers of all connections that this process has or had.
     static QSet<int> ownBackends();
     /// A bare connection, for work of another kind than a workstation's; the caller's own.
     static PGconn* connected(const Address& address);
@@ -106,7 +106,6 @@ private:
     [[noreturn]] void lose(const QString& text, const QString& code = QStringLiteral("08006"));
 
     PGconn* connection_ = nullptr;
-    int backend_ = 0;  ///< the server's number of it
     QString place_;
     QString awaited_;  ///< what the operator reads while an answer is waited for
     bool lost_ = false;
