@@ -85,7 +85,8 @@ void openNew(QString* strConMember, QString* strSQL,
 bool mayManageOrRefused(const QString& table) {
     if (environment::dtZelmars::instance().MSAccess()->mayWrite(table)) return true;
     core::MsgBox(
-        u"Não tem o direito de fazer este trabalho; nada foi alterado. No servidor esse direito é dos "
+        u"Não tem o direito de fazer este trabalho; nada foi alterado. No servidor esse direito é "
+        u"dos "
         "gestores do livro: peça-o a quem cuida do servidor."_s,
         core::Icon::Critical);
     return false;

@@ -212,7 +212,8 @@ private:
                      [this, call](QWidget*) { operations_.call(call); });
     }
 
-    /// Leaves a list whose record has just been left; its button takes a press once it has returned.
+    /// Leaves a list whose record has just been left; its button takes a press once it has
+    /// returned.
     void leaveList(const QString& list) {
         player_.step(list, {}, {});
         player_.step(list, {}, typing({u"<Alt+S>"_s}));

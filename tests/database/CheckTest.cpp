@@ -99,8 +99,8 @@ TEST_P(Proved, ABackupIsWholeAndPutsTheBookBack) {
         QString all;
         for (const auto* table : {"tbZelmar_Movimentos", "tbSocios", "tbSocios_Acumulados",
                                   "tbZelmar_Movimentos_Historico", "tbContadores"})
-            for (const QStringList& row : handle->rows(
-                     u"select * from %1 order by 1"_s.arg(QLatin1StringView(table))))
+            for (const QStringList& row :
+                 handle->rows(u"select * from %1 order by 1"_s.arg(QLatin1StringView(table))))
                 all += row.join(u'|') + u'\n';
         return all;
     };
