@@ -14,6 +14,9 @@ QLayout* listWithButtons(forms::DataGrid* grid, const ListButtons& buttons) {
     auto* foot = new QHBoxLayout;
     for (forms::Button* button : {buttons.add, buttons.change, buttons.remove})
         foot->addWidget(button);
+    // What a button opened has closed by then, and the next key is for the list again.
+    for (const forms::Button* button : {buttons.add, buttons.change, buttons.remove})
+        QObject::connect(button, &QAbstractButton::clicked, grid, [grid] { grid->setFocus(); });
     foot->addStretch(1);
     foot->addWidget(buttons.leave);
     auto* all = new QVBoxLayout;

@@ -143,6 +143,10 @@ void DataGrid::currentChanged(const QModelIndex& current, const QModelIndex& pre
 void DataGrid::keyPressEvent(QKeyEvent* event) {
     if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
         emit chosen();
+    else if (event->key() == Qt::Key_Home)  // rows are chosen here, not cells
+        mark(0);
+    else if (event->key() == Qt::Key_End)
+        mark(rows_->rowCount() - 1);
     else
         QTableView::keyPressEvent(event);
 }

@@ -6,6 +6,7 @@ import os
 import sqlite3
 import struct
 import subprocess
+from contextlib import closing
 
 
 def single(value):
@@ -45,13 +46,13 @@ class SqliteBook:
         self.file = folder + "/zelmars.db"
 
     def rows(self, query, *values):
-        with sqlite3.connect(f"file:{self.file}?mode=ro", uri=True) as book:
+        with closing(sqlite3.connect(f"file:{self.file}?mode=ro", uri=True)) as book:
             book.row_factory = sqlite3.Row
             return [{name.lower(): row[name] for name in row.keys()}
                     for row in book.execute(query, values)]
 
     def write(self, queries):
-        with sqlite3.connect(self.file) as book:
+        with closing(sqlite3.connect(self.file)) as book:
             book.executescript(queries)
 
     def row(self, query, *values):

@@ -87,6 +87,21 @@ TEST_F(Rubrics, AreMadeOfAMainOneAndChildren) {
     EXPECT_EQ(book.count(u"tbZelmar_Plafonds"_s), 2);
 }
 
+TEST_F(Rubrics, AreChosenByTheKeysOfTheList) {
+    for (const auto& code : {u"01"_s, u"02"_s, u"03"_s}) book.rubric({.code = code});
+    const auto opened = [&](Qt::Key key) {
+        QString code;
+        person.press(key);
+        openMain([&] { code = box("Text1")->text(); });
+        return code;
+    };
+    visit([&] {
+        EXPECT_EQ(opened(Qt::Key_End), u"03"_s);
+        EXPECT_EQ(opened(Qt::Key_Up), u"02"_s);
+        EXPECT_EQ(opened(Qt::Key_Home), u"01"_s);
+    });
+}
+
 TEST_F(Rubrics, NewMainOnesAreStoredOnLeavingAlsoWhenEmpty) {
     visit([&] {
         person.onScreen(u"frmPlafonds_Main"_s, [&] { person.escape(); });
