@@ -238,6 +238,7 @@ void frmPrincipal::closeYear() {
         if (!goesOn) return;
     }
     runUnguarded({u"CallFechoAno"_s, {}});
+    reload();  // nothing of what the list showed may be there any more
 }
 
 void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {

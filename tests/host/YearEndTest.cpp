@@ -3,8 +3,10 @@
 #include <gtest/gtest.h>
 
 #include <QAction>
+#include <QLabel>
 #include <QPlainTextEdit>
 #include <QProcess>
+#include <QTableView>
 
 #include "host/frmPrincipal.h"
 #include "platform/com/Component.h"
@@ -22,7 +24,11 @@ class Closing : public QObject {
     Q_OBJECT
 public:
     static inline int calls = 0;
-    Q_INVOKABLE void CallFechoAno() { ++calls; }
+    static inline support::Book* closed = nullptr;
+    Q_INVOKABLE void CallFechoAno() {
+        ++calls;
+        closed->exec(u"delete from tbZelmar_Movimentos"_s);
+    }
 };
 
 class YearEnd : public testing::Test {
@@ -30,6 +36,7 @@ protected:
     YearEnd() {
         forms::install();
         Closing::calls = 0;
+        Closing::closed = &book;
         com::registerRunning(u"Zelmars.General"_s, [] { return new Closing; });
         if (support::onServer()) book.exec(u"grant vazio_gestor to %1"_s.arg(book.user()));
         const qint64 debtor = book.member({.no_kor = u"100015"_s});
@@ -54,10 +61,15 @@ protected:
         book.insert(u"tbSocios_Acumulados"_s,
                     {{"socio_id", socio}, {"credito_ac", credito}, {"debito_ac", debito}});
     }
-    void choose(const QString& entry) {
+    /// Chooses an entry of the menu; how many movements the list shows then.
+    int choose(const QString& entry) {
         host::frmPrincipal window;
         window.show();
         window.findChild<QAction*>(entry)->trigger();
+        const auto* count = window.findChild<QLabel*>(u"Contagem"_s);
+        person.waitUntil([&] { return !count->text().contains(u"a ler"_s); },
+                         u"the list is read"_s);
+        return window.findChild<QTableView*>(u"Lista"_s)->model()->rowCount();
     }
     QString shown(const QString& box) { return person.peek<forms::TextBox>(box)->text(); }
 
@@ -94,7 +106,7 @@ TEST_F(YearEnd, IsPreparedByALookAndABackup) {
         person.press(Qt::Key_Space);  // the focus is on what has to be ticked
         person.accelerator(u'F');
     });
-    choose(u"CallFechoAno"_s);
+    EXPECT_EQ(choose(u"CallFechoAno"_s), 0);
     EXPECT_TRUE(QFile::exists(file));
     EXPECT_EQ(Closing::calls, 1);
     other.kill();
@@ -118,7 +130,7 @@ TEST_F(YearEnd, GoesNoFurtherWithoutItsBackup) {
         person.accelerator(u'F');
         person.escape();
     });
-    choose(u"CallFechoAno"_s);
+    EXPECT_EQ(choose(u"CallFechoAno"_s), 4);
     EXPECT_EQ(taken.size(), 0);
     EXPECT_EQ(Closing::calls, 0);
 }
