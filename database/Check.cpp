@@ -20,6 +20,9 @@ using core::Money;
 
 namespace {
 
+/// Room for the accumulators of a large book from the beginning: growing costs more than looking.
+constexpr std::size_t ManyHolders = 1 << 20;
+
 /// Rounding of single steps of the calculation, in ten-thousandths.
 constexpr qint64 Rounding = 100;
 
@@ -183,6 +186,7 @@ private:
 
     void readMovements(const char* table, const char* accumulators) {
         AllSums sums;
+        sums.reserve(ManyHolders);
         eachRow(book_, shapes_, table,
                 {"movimento_id", "movimento_no", "socio_id", "codABC", "rubrica_id", "hospital_id",
                  "tipo", "incidencia", "comparticipacao", "saldo_plafond", "credito", "debito"},

@@ -87,7 +87,8 @@ void Rows::countAll() {
         }
         store_->shrinkTo(first);
     }
-    seek(std::numeric_limits<qint64>::max());
+    count_ = pass_->rowsInAll();
+    passRow_ = count_;
 }
 
 // The last row becomes the current one without being read: whoever only wants the count goes back

@@ -37,6 +37,9 @@ public:
     virtual RowIdentity identity() const = 0;
     /// Stands before the first row again; the rows are the same, whatever was written since.
     virtual void restart() = 0;
+    /// How many rows it gives, from the first to the last. After that only restart() and release()
+    /// are left.
+    virtual qint64 rowsInAll() = 0;
     /// Lets go of the engine; no row can be stepped to any more.
     virtual void release() = 0;
 };

@@ -5,6 +5,7 @@
 
 #include <QRegularExpression>
 #include <charconv>
+#include <cstring>
 
 #include "platform/ado/postgres/Dialect.h"
 #include "platform/ado/postgres/Failures.h"
@@ -77,23 +78,61 @@ QByteArray textAt(const PGresult* row, int column) {
     return {PQgetvalue(row, 0, column), PQgetlength(row, 0, column)};
 }
 
-BulkValue valueAt(const PGresult* row, int column, ColumnType type) {
-    const Cell cell = cellOf(row, 0, column, type);
-    switch (cell.kind) {
-        case Cell::Null:
-            return {};
-        case Cell::Integer:
-            return cell.integer;
-        case Cell::Real:
-            return cell.real;
-        default:
-            break;
-    }
-    const QByteArray text = textAt(row, column);
-    if (type != ColumnType::Money) return text;
-    if (const auto money = core::Money::fromPlainText(QString::fromLatin1(text))) return *money;
+BulkValue valueOf(std::string_view text, ColumnType type) {
+    const Cell cell = cellOf(text, type);
+    if (cell.kind == Cell::Integer) return cell.integer;
+    if (cell.kind == Cell::Real) return cell.real;
+    const QByteArray bytes(text.data(), static_cast<qsizetype>(text.size()));
+    if (type != ColumnType::Money) return bytes;
+    if (const auto money = core::Money::fromPlainText(QString::fromLatin1(bytes))) return *money;
     throw core::Failure(core::Overflow,
-                        u"O montante %1 é grande de mais."_s.arg(QLatin1StringView(text)));
+                        u"O montante %1 é grande de mais."_s.arg(QLatin1StringView(bytes)));
+}
+
+/// What stands between two separators of a line of the server's, without its marks; they are taken
+/// out in place.
+std::string_view withoutMarks(char* text, std::size_t length) {
+    char* end = text;
+    for (const char* at = text; at < text + length; ++at) {
+        if (*at == '\\') switch (*++at) {
+                case 't':
+                    *end++ = '\t';
+                    continue;
+                case 'n':
+                    *end++ = '\n';
+                    continue;
+                case 'r':
+                    *end++ = '\r';
+                    continue;
+                case 'b':
+                    *end++ = '\b';
+                    continue;
+                case 'f':
+                    *end++ = '\f';
+                    continue;
+                case 'v':
+                    *end++ = '\v';
+                    continue;
+                default:  // the letter itself
+                    break;
+            }
+        *end++ = *at;
+    }
+    return {text, static_cast<std::size_t>(end - text)};
+}
+
+/// The values of a line that the server sent, in the form in which it also takes them. The line is
+/// used up.
+void split(char* line, const std::vector<ColumnType>& types, BulkRow& values) {
+    for (std::size_t at = 0; at < values.size(); ++at) {
+        const std::size_t length = std::strcspn(line, "\t\n");
+        const std::string_view text(line, length);
+        if (text == "\\N")
+            values[at] = {};
+        else
+            values[at] = valueOf(withoutMarks(line, length), types[at]);
+        line += length + 1;
+    }
 }
 
 /// A text in the form in which the server takes lines: what parts columns and lines is marked.
@@ -212,14 +251,17 @@ std::vector<TableShape> BulkAccess::tables() {
 }
 
 void BulkAccess::eachRow(const TableShape& shape, const std::function<void(const BulkRow&)>& row) {
+    PQclear(
+        checked(PQexec(connection_, "COPY (SELECT " + shape.columnList() + " FROM " + shape.name +
+                                        " ORDER BY " + order_.at(shape.name) + ") TO STDOUT")));
     BulkRow values(shape.types.size());
-    eachResult("SELECT " + shape.columnList() + " FROM " + shape.name + " ORDER BY " +
-                   order_.at(shape.name),
-               [&](const PGresult* next) {
-                   for (std::size_t at = 0; at < values.size(); ++at)
-                       values[at] = valueAt(next, static_cast<int>(at), shape.types[at]);
-                   row(values);
-               });
+    char* line = nullptr;
+    while (PQgetCopyData(connection_, &line, 0) > 0) {
+        const std::unique_ptr<char, Free> kept(line);
+        split(line, shape.types, values);
+        row(values);
+    }
+    while (PGresult* end = PQgetResult(connection_)) PQclear(checked(end));
 }
 
 Totals BulkAccess::totals(const TableShape& shape) {
@@ -335,6 +377,7 @@ PGresult* BulkAccess::checked(PGresult* result) const {
         case PGRES_TUPLES_OK:
         case PGRES_SINGLE_TUPLE:
         case PGRES_COPY_IN:
+        case PGRES_COPY_OUT:
             return result;
         default:
             const Result failed(result);

@@ -17,6 +17,7 @@ constexpr auto OnlyFirst = " LIMIT 64";
 constexpr auto Begin = "BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY";
 constexpr auto FetchFirst = "FETCH 64 FROM linhas";
 constexpr auto FetchLater = "FETCH 1000 FROM linhas";
+constexpr auto MoveBehindLast = "MOVE FORWARD ALL FROM linhas";
 // Rows that were asked for ahead wait on the server until somebody wants them, maybe over lunch.
 constexpr auto NoTimeout = "SET LOCAL statement_timeout = 0";
 
@@ -57,6 +58,7 @@ bool Pass::isShort(const Query& statement) {
 void Pass::fetchFirst(const QByteArray& before) {
     reader_->ask({before, declare_, FetchFirst});
     batch_ = reader_->answer();
+    before_ = 0;
     row_ = -1;
     first_ = true;
     if (count() < FirstRows) release();
@@ -84,6 +86,7 @@ bool Pass::step() {
     }
     if (isWhole()) return false;
     if (first_) reader_->ask({NoTimeout, FetchLater});
+    before_ += count();
     batch_ = reader_->answer();
     first_ = false;
     row_ = 0;
@@ -105,6 +108,17 @@ void Pass::restart() {
         row_ = -1;
     else
         fetchFirst("CLOSE linhas");
+}
+
+// The server counts without sending the rows.
+qint64 Pass::rowsInAll() {
+    if (isWhole()) return before_ + count();
+    qint64 rows = before_ + count();
+    if (!first_) rows += PQntuples(reader_->answer().get());
+    reader_->ask({NoTimeout, MoveBehindLast});
+    rows += QByteArray(PQcmdTuples(reader_->answer().get())).toLongLong();
+    first_ = false;
+    return rows;
 }
 
 void Pass::release() {

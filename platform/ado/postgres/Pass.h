@@ -22,6 +22,7 @@ public:
     Cell cell(int column) const override;
     RowIdentity identity() const override;
     void restart() override;
+    qint64 rowsInAll() override;
     void release() override;
 
 private:
@@ -42,6 +43,7 @@ private:
     QByteArray declare_;
     bool withIdentity_;
     Result batch_;
+    qint64 before_ = 0;  ///< rows of the batches before this one
     int row_ = -1;       ///< within the batch
     bool first_ = true;  ///< the batch is the first one
     std::vector<Column> columns_;

@@ -101,32 +101,37 @@ Cell cellOf(const PGresult* result, int row, int column) {
 }
 
 Cell cellOf(const PGresult* result, int row, int column, ColumnType type) {
+    if (PQgetisnull(result, row, column)) return {};
+    return cellOf({PQgetvalue(result, row, column),
+                   static_cast<std::size_t>(PQgetlength(result, row, column))},
+                  type);
+}
+
+Cell cellOf(std::string_view text, ColumnType type) {
+    const char* const end = text.data() + text.size();
     Cell cell;
-    if (PQgetisnull(result, row, column)) return cell;
-    const char* text = PQgetvalue(result, row, column);
-    const auto length = static_cast<std::size_t>(PQgetlength(result, row, column));
     switch (type) {
         case ColumnType::Integer16:
         case ColumnType::Integer32:
         case ColumnType::Integer64:
             cell.kind = Cell::Integer;
-            std::from_chars(text, text + length, cell.integer);
+            std::from_chars(text.data(), end, cell.integer);
             break;
         case ColumnType::Single: {
             // Rounded once: by way of a 64-bit float it could come to a neighbour.
             float single = 0;
             cell.kind = Cell::Real;
-            std::from_chars(text, text + length, single);
+            std::from_chars(text.data(), end, single);
             cell.real = single;
             break;
         }
         case ColumnType::Double:
             cell.kind = Cell::Real;
-            std::from_chars(text, text + length, cell.real);
+            std::from_chars(text.data(), end, cell.real);
             break;
         default:
             cell.kind = Cell::Text;
-            cell.text = {text, length};
+            cell.text = text;
     }
     return cell;
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QVariant>
+#include <string_view>
 
 #include "platform/ado/engine/Session.h"
 #include "platform/ado/postgres/Handle.h"
@@ -15,6 +16,8 @@ ColumnType typeOf(Oid type, int modifier);
 /// A column of an answer.
 Column describe(const PGresult* result, int column);
 
+/// A value in the server's text form that is not null; good as long as the text lives.
+Cell cellOf(std::string_view text, ColumnType type);
 /// A value of an answer, good as long as the answer lives.
 Cell cellOf(const PGresult* result, int row, int column, ColumnType type);
 Cell cellOf(const PGresult* result, int row, int column);

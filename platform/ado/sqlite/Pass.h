@@ -21,10 +21,12 @@ public:
         return first_ == 0 ? 0 : sqlite3_column_int64(statement_, 0);
     }
     void restart() override;
+    qint64 rowsInAll() override;
     void release() override;
 
 private:
     void describeAnew();
+    void hold();
 
     std::shared_ptr<Session> session_;
     std::shared_ptr<Handle> reader_;  ///< outlives the query, also when others step on it

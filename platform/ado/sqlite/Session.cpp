@@ -27,10 +27,15 @@ constexpr int MostGathered = 50'000;
 constexpr qint64 LongestGathering = 4000;
 /// Milliseconds between two gatherings: those who wait look at the book every second or third one.
 constexpr unsigned long Between = 4;
-/// Gathered writes go to all places of the indexes; pages of the book that are kept for them, in
-/// KiB as the engine takes it, and for single writes.
-constexpr auto LargeCache = "PRAGMA cache_size=-49152";
-constexpr auto SmallCache = "PRAGMA cache_size=-2000";
+/// Pages of the book that are kept, in KiB as the engine takes it. Gathered writes go to all places
+/// of the indexes, and what is read meanwhile are whole tables with those they are joined to.
+constexpr auto CacheOfGatheredWrites = "PRAGMA cache_size=-49152";
+constexpr auto CacheOfLongReading = "PRAGMA cache_size=-24576";
+constexpr auto DailyCache = "PRAGMA cache_size=-2000";
+
+void setCache(Handle& handle, const char* size) {
+    sqlite3_exec(handle.get(), size, nullptr, nullptr, nullptr);
+}
 
 QByteArray quoted(QStringView name) {
     QByteArray text = name.toUtf8();
@@ -113,6 +118,7 @@ std::shared_ptr<Handle> Session::takeReader() {
     reader();
     std::shared_ptr<Handle> taken = std::move(readers_.back());
     readers_.pop_back();
+    if (isGathering_) setCache(*taken, CacheOfLongReading);
     return taken;
 }
 
@@ -304,14 +310,15 @@ void Session::commitGathered() {
 }
 
 void Session::gather() {
-    sqlite3_exec(writer().get(), LargeCache, nullptr, nullptr, nullptr);
+    setCache(writer(), CacheOfGatheredWrites);
     isGathering_ = true;
 }
 
 void Session::settle() {
     isGathering_ = false;
+    for (const std::shared_ptr<Handle>& reader : readers_) setCache(*reader, DailyCache);
     commitGathered();
-    sqlite3_exec(writer().get(), SmallCache, nullptr, nullptr, nullptr);
+    setCache(writer(), DailyCache);
 }
 
 template <class Writes>
