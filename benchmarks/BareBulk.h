@@ -24,6 +24,9 @@ public:
     virtual ~BareBulk() = default;
     /// The rows are those of the moment; they are read on a connection of their own.
     virtual void each(const QByteArray& query, const std::vector<BareWrite>& writes) = 0;
+    /// Reads what a query gives, and looks at each value once.
+    /// @return  rows
+    virtual qint64 read(const QByteArray& query) = 0;
     /// Everything is on the disk.
     virtual void finish() = 0;
 };

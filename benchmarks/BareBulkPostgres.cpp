@@ -43,6 +43,16 @@ public:
         PQfinish(reader);
     }
 
+    qint64 read(const QByteArray& query) override {
+        PQclear(PQexec(writer_, "COPY (" + query + ") TO STDOUT"));
+        qint64 count = 0;
+        char* line = nullptr;
+        for (; PQgetCopyData(writer_, &line, 0) > 0; ++count) PQfreemem(line);
+        PQclear(checked(writer_, PQgetResult(writer_)));
+        PQclear(PQgetResult(writer_));
+        return count;
+    }
+
     void finish() override {
         run(writer_, "SET synchronous_commit = on");
         run(writer_, "CREATE TEMPORARY TABLE last (x integer)");

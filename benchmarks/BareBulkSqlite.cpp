@@ -42,6 +42,16 @@ public:
         sqlite3_close(reader);
     }
 
+    qint64 read(const QByteArray& query) override {
+        sqlite3_stmt* const rows = prepare(writer_, query);
+        qint64 count = 0;
+        for (; sqlite3_step(rows) == SQLITE_ROW; ++count)
+            for (int column = 0; column < sqlite3_column_count(rows); ++column)
+                seen_ += sqlite3_value_bytes(sqlite3_column_value(rows, column));
+        sqlite3_finalize(rows);
+        return count;
+    }
+
     void finish() override { run("COMMIT"); }
 
 private:
@@ -76,6 +86,7 @@ private:
     QByteArray file_;
     sqlite3* writer_;
     int written_ = 0;  ///< since the last commit
+    qint64 seen_ = 0;  ///< bytes; that the values are really taken
 };
 
 }  // namespace

@@ -142,6 +142,11 @@ ado::postgres::Address Book::server() const {
     return {folder, {}, QString::fromLatin1(BenchServer::User), {}, catalogue};
 }
 
+database::BookPlace Book::place() const {
+    if (engine == Engine::Sqlite) return {folder, {}, Catalogue};
+    return {{}, server(), catalogue};
+}
+
 QString Book::connectionString() const {
     const bool isFile = engine == Engine::Sqlite;
     return u"Provider=SQLOLEDB.1;User ID=%1;Initial Catalog=%2;Data Source=%3:%4"_s.arg(

@@ -4,6 +4,7 @@
 #include <QString>
 #include <vector>
 
+#include "database/Copy.h"
 #include "database/ServerBook.h"
 
 namespace benchmarks {
@@ -21,6 +22,7 @@ struct Book {
 
     QString file() const;                   ///< of an SQLite book
     ado::postgres::Address server() const;  ///< of a server's book
+    database::BookPlace place() const;      ///< for bulk work
     /// What a connection opens it by.
     QString connectionString() const;
 };

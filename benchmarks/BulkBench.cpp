@@ -9,6 +9,7 @@
 #include "benchmarks/BareBulk.h"
 #include "benchmarks/Benches.h"
 #include "boundary/environment/dtZelmars.h"
+#include "database/Check.h"
 #include "platform/ado/GatheredWrites.h"
 #include "yearend/Rebuild.h"
 #include "yearend/YearClose.h"
@@ -214,10 +215,47 @@ void compare(Report& report, Engine engine, const QString& name, const QString& 
     report.value(row + u", memory"_s, u"MB"_s, Megabytes, watch.most());
 }
 
+/// What the check looks at, read once and not looked at further.
+void readBare(BareBulk& bare) {
+    const QByteArray movement =
+        "SELECT movimento_id, movimento_no, socio_id, codABC, rubrica_id, hospital_id, tipo, "
+        "incidencia, comparticipacao, saldo_plafond, credito, debito FROM tbZelmar_Movimentos";
+    const QByteArray accumulator =
+        "SELECT socio_id, codABC, rubrica_id, debito_ac, credito_ac, no_docs FROM "
+        "tbSocios_Acumulados";
+    qint64 rows = 0;
+    for (const QByteArray left : {"", "_Inactivos"}) {
+        rows += bare.read("SELECT socio_id FROM tbSocios" + left);
+        rows += bare.read(movement + left);
+        rows += bare.read(accumulator + left);
+    }
+    bare.read("SELECT rubrica_id FROM tbZelmar_Plafonds");
+    bare.read("SELECT hospital_id FROM tbHospitais");
+    bare.read("SELECT ano, debito, credito FROM tbZelmar_Movimentos_Historico");
+    if (rows < 1'000'000) throw std::runtime_error("too little was read");
+}
+
+void compareCheck(Report& report, Engine engine) {
+    const QString row = u"check, 1,000,000 movements/"_s + nameOf(engine);
+    if (!report.wanted(row)) return;
+    const Book book = largeBook(engine);
+    std::vector<double> ours;
+    std::vector<double> bare;
+    for (int round = 0; round < 3; ++round) {
+        ours.push_back(1000 * seconds([&] {
+                           database::checkBook(*database::opened(book.place()),
+                                               [](const QString&) {});
+                       }));
+        bare.push_back(1000 * seconds([&] { readBare(*bareBulk(book)); }));
+    }
+    report.ratio(row, 2, ours, bare);
+}
+
 }  // namespace
 
 void measureBulk(Report& report) {
     for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) {
+        compareCheck(report, engine);
         compare(
             report, engine, u"rebuild, 1,000,000 movements"_s,
             u"select count(*) as linhas, sum(debito_ac) as soma from tbSocios_Acumulados"_s,

@@ -13,10 +13,12 @@
 #include "benchmarks/Benches.h"
 #include "benchmarks/Books.h"
 #include "benchmarks/PaintWatch.h"
+#include "boundary/General.h"
 #include "boundary/environment/dtZelmars.h"
 #include "companions/search/frmProcurar.h"
 #include "coverage/TryOut.h"
 #include "host/MovementsView.h"
+#include "host/Operations.h"
 #include "host/frmPrincipal.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/MsgBoxes.h"
@@ -95,14 +97,15 @@ void measureStarts(Report& report) {
     }
 }
 
-/// Milliseconds from the call until the window of that name is painted; it is left then.
+/// Milliseconds from the call until the window or the list of that name is painted; its window is
+/// left then.
 double untilPainted(const QString& window, const std::function<void()>& call) {
     QElapsedTimer clock;
     double spent = 0;
     const PaintWatch watch(window, [&](QWidget* painted) {
         spent = static_cast<double>(clock.nsecsElapsed()) / 1e6;
         QMetaObject::invokeMethod(
-            painted, [form = qobject_cast<forms::Form*>(painted)] { form->Unload(); },
+            painted, [form = qobject_cast<forms::Form*>(painted->window())] { form->Unload(); },
             Qt::QueuedConnection);
     });
     clock.start();
@@ -111,6 +114,28 @@ double untilPainted(const QString& window, const std::function<void()>& call) {
     QCoreApplication::processEvents();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     return spent;
+}
+
+/// The time from the operation until the rows of a table of so many main rubrics are painted.
+void measureRubrics(Report& report, Engine engine) {
+    constexpr int Rubrics = 2000;
+    const QString name = u"wait/list of 2,000 rubrics painted, "_s + nameOf(engine);
+    if (!report.wanted(name)) return;
+    const BookCopy copy(sampleBook(engine));
+    use(copy.book());
+    const auto rows = database::opened(copy.book().place());
+    for (int rubric = 0; rubric < Rubrics; ++rubric)
+        rows->execute(
+            "INSERT INTO tbZelmar_Plafonds (code, descrit, percent, agregado, socio) "
+            "VALUES ('N" +
+            QByteArray::number(rubric) + "', 'Rubrica', 0.8, 1000, 500)");
+    report.value(name, u"ms"_s, 100, report.medianOf(7, [] {
+        return untilPainted(u"DataGrid1"_s, [] {
+            QString member = u"MSAccess"_s;
+            QString query = host::Operations::rubrics().arguments.back().toString();
+            General().CallPlafonds(&member, &query);
+        });
+    }));
 }
 
 void measureWindows(Report& report, Engine engine) {
@@ -171,7 +196,10 @@ int tellWhenListStands() {
 
 void measureWaits(Report& report) {
     measureStarts(report);
-    for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) measureWindows(report, engine);
+    for (const Engine engine : {Engine::Sqlite, Engine::Postgres}) {
+        measureWindows(report, engine);
+        measureRubrics(report, engine);
+    }
 }
 
 }  // namespace benchmarks
