@@ -74,12 +74,16 @@ void frmHospitais_record::connectHandlers() {
     Text2->onGotFocus = [this] { limitFocused(); };
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Unload(); };
+    // However the screen is left, nobody waits for the row any longer.
+    onUnload = [this] { core::passingOver([this] { Adodc1->Recordset()->Close(); }); };
     setCancelButton(Command2);
     letEnterGoOn(Command1);
 }
 
-/// Intentional: of the box that has the focus, whichever changed.
+/// Intentional: of the box that has the focus, whichever changed. None has it before the screen is
+/// up, though boxes are filled by then.
 void frmHospitais_record::limitFocused() {
+    if (!isVisible()) return;
     core::passingOver([this] {
         if (auto* box = qobject_cast<TextBox*>(ActiveControl())) box->limitToColumn();
     });
@@ -93,7 +97,6 @@ void frmHospitais_record::Command1_Click() {
     } catch (const core::Failure& failure) {
         core::MsgBox(failure.text());
     }
-    core::passingOver([&] { rows->Close(); });
     Unload();
     core::passingOver([] {
         if (forms::DefaultInstance<frmHospitais>::isLoaded())

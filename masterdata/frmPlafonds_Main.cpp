@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "masterdata/frmPlafonds_Main.h"
 
+#include <QCloseEvent>
 #include <QGridLayout>
 
 #include "data/RowSets.h"
@@ -107,12 +108,35 @@ void frmPlafonds_Main::setChildren(const ado::RecordsetPtr& children) {
     DataGrid1->setRecordset(children);
 }
 
+ado::Recordset& frmPlafonds_Main::rubric() const {
+    if (!Adodc1->Recordset())
+        throw core::Failure(core::NoCurrentRow, u"Não foi possível abrir a rubrica."_s);
+    return *Adodc1->Recordset();
+}
+
+/// False where what is typed is refused, which was said then.
+bool frmPlafonds_Main::leaveField() {
+    auto* field = dynamic_cast<forms::Validating*>(ActiveControl());
+    return !field || field->leave();
+}
+
+// Leaving is saving, also by Esc and by the window's own button: a field that refuses what is typed
+// holds the screen as it holds the focus.
+void frmPlafonds_Main::reject() {
+    if (leaveField()) Form::reject();
+}
+
+void frmPlafonds_Main::closeEvent(QCloseEvent* event) {
+    if (leaveField())
+        Form::closeEvent(event);
+    else
+        event->ignore();
+}
+
 /// Intentional: nobody is told of what fails here.
 void frmPlafonds_Main::save() {
-    core::passingOver([this] {
-        if (auto* field = dynamic_cast<forms::Validating*>(ActiveControl())) field->leave();
-    });
-    core::passingOver([this] { Adodc1->Recordset()->Update(); });
+    core::passingOver([this] { rubric().Update(); });
+    core::passingOver([this] { rubric().Close(); });
     core::passingOver([] {
         if (forms::DefaultInstance<frmPlafonds>::isLoaded())
             forms::DefaultInstance<frmPlafonds>::get().Adodc1->Recordset()->Requery();
@@ -121,8 +145,8 @@ void frmPlafonds_Main::save() {
 
 /// A rubric that was never saved has no key yet, which its children need.
 void frmPlafonds_Main::Command1_Click() {
-    const ado::RecordsetPtr& main = Adodc1->Recordset();
-    if (core::isNull(main->Collect(Key))) core::passingOver([&] { main->Update(); });
+    ado::Recordset& main = rubric();
+    if (core::isNull(main.Collect(Key))) core::passingOver([&] { main.Update(); });
     keyOf(*Adodc1, Key);
     auto& screen = forms::DefaultInstance<frmPlafonds_record>::get();
     const ado::RecordsetPtr rows = data::openToWrite(rubricQuery(0));

@@ -23,6 +23,11 @@ public:
 private:
     void layOut();
     void bindControls();
+    /// The row of the main rubric. Fails when it could not be opened.
+    ado::Recordset& rubric() const;
+    bool leaveField();
+    void reject() override;
+    void closeEvent(QCloseEvent* event) override;
     void save();
     void Command1_Click();
     void Command2_Click();

@@ -27,6 +27,9 @@ void follow(TextBox* one, TextBox* other) {
     const auto tell = [](TextBox* from, TextBox* to) {
         QObject::connect(from, &QLineEdit::textEdited, to,
                          [to](const QString& text) { to->QLineEdit::setText(text); });
+        // What is typed may be the value that the row has already, and then nothing else tells.
+        QObject::connect(from, &QLineEdit::editingFinished, to,
+                         [to] { emit to->DataSource()->fieldChanged(to->DataField()); });
     };
     tell(one, other);
     tell(other, one);
@@ -156,6 +159,8 @@ void frmPlafonds_record::connectHandlers() {
     Text3->onValidate = [this](bool& cancel) { Text3_Validate(cancel); };
     Command1->onClick = [this] { Command1_Click(); };
     Command2->onClick = [this] { Unload(); };
+    // However the screen is left, nobody waits for the row any longer.
+    onUnload = [this] { core::passingOver([this] { Adodc1->Recordset()->Close(); }); };
     setCancelButton(Command2);
     letEnterGoOn(Command1);
 }
@@ -184,7 +189,6 @@ void frmPlafonds_record::Command1_Click() {
         rows->setCollect(u"rubrica_id_main"_s, group.Adodc1->Recordset()->Collect(u"rubrica_id"_s));
     });
     core::passingOver([&] { rows->Update(); });
-    core::passingOver([&] { rows->Close(); });
     Unload();
     core::passingOver([&] {
         if (group.Adodc2->Recordset()) group.Adodc2->Recordset()->Requery();

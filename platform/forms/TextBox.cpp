@@ -51,7 +51,11 @@ bool TextBox::isDate() const {
 void TextBox::limitToColumn() {
     if (!hasRow()) return;
     const int size = DataSource()->Recordset()->Fields(DataField()).DefinedSize();
-    if (size > 0) setMaxLength(size);
+    if (size <= 0 || size == maxLength()) return;
+    // The toolkit puts the caret at the end whenever a length is set.
+    const int caret = cursorPosition();
+    setMaxLength(size);
+    setCursorPosition(caret);
 }
 
 void TextBox::storeNullIfEmpty() {

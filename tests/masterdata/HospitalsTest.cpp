@@ -60,6 +60,23 @@ TEST_F(Hospitals, AreAddedChangedAndGivenUp) {
     EXPECT_EQ(stored(), "H01|Hospital da Luz Nova|213|NULL");
 }
 
+TEST_F(Hospitals, GivenUpAreFreeForTheNextChange) {
+    book.hospital(u"H01"_s, u"Hospital da Luz"_s);
+    visit([&] {
+        person.onScreen(u"frmHospitais_record"_s, [&] { person.escape(); });
+        person.accelerator(u'T');
+        person.onScreen(u"frmHospitais_record"_s, [&] {
+            person.put(u"Text1"_s, u"Hospital da Lz"_s);
+            person.press(Qt::Key_Left);
+            // In the midst of a text: each letter beside the last one.
+            person.type(u"uuu"_s);
+            person.accelerator(u'O');
+        });
+        person.accelerator(u'T');
+        EXPECT_EQ(listed(), "H01|Hospital da Luuuz||");
+    });
+}
+
 TEST_F(Hospitals, KeepTheirTextsToTheLengthOfTheColumns) {
     visit([&] {
         person.onScreen(u"frmHospitais_record"_s, [&] {

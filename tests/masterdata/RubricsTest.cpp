@@ -110,6 +110,41 @@ TEST_F(Rubrics, NewMainOnesAreStoredOnLeavingAlsoWhenEmpty) {
     EXPECT_EQ(rubrics(), "NULL|NULL|NULL|NULL|NULL");
 }
 
+TEST_F(Rubrics, GivenUpAreFreeForTheNextChange) {
+    const qint64 main = book.rubric({.code = u"09"_s});
+    book.childRubric({.rubrica_id_main = main, .code = u"9.01"_s});
+    visit([&] {
+        openMain([&] {
+            for (const QString& description : {QString(), u"Lentes"_s}) {
+                person.onScreen(u"frmPlafonds_record"_s, [&] {
+                    if (description.isEmpty()) return person.escape();
+                    person.fill(u"Text2"_s, description);
+                    person.fill(u"Text3"_s, u"0,8"_s);
+                    person.accelerator(u'O');
+                });
+                person.accelerator(u'E');
+            }
+            EXPECT_TRUE(listed().starts_with("9.01|Lentes|0,80|"));
+        });
+    });
+}
+
+TEST_F(Rubrics, HoldTheMainOneWhileAFieldIsRefused) {
+    book.rubric({.code = u"09"_s});
+    visit([&] {
+        openMain([&] {
+            person.put(u"Text4"_s, u"12x"_s);
+            person.expectBox(
+                {.text = u"«12x» não é um valor válido."_s, .icon = core::Icon::Exclamation});
+            person.escape();
+            person.expectNoBoxesLeft();
+            person.put(u"Text4"_s, u"12"_s);
+            person.escape();
+        });
+    });
+    EXPECT_EQ(book.count(u"tbZelmar_Plafonds"_s, u"agregado = 12"_s), 1);
+}
+
 TEST_F(Rubrics, TakeAPercentageFromNoneToAll) {
     const qint64 main = book.rubric({.code = u"09"_s});
     book.childRubric({.rubrica_id_main = main, .code = u"9.01"_s, .percent = 0.5});
@@ -172,6 +207,9 @@ TEST_F(Rubrics, ShowBothBoxesOfAColumnAlikeWhileOneIsTyped) {
             person.put(QString::fromLatin1(one), u"12,5"_s);
             EXPECT_EQ(box(other)->Text(), u"12,5"_s);
             person.tab();
+            EXPECT_EQ(box(other)->Text(), u"€ 12,50"_s) << other;
+            // The value that the row has already.
+            person.fill(QString::fromLatin1(one), u"12,5"_s);
             EXPECT_EQ(box(other)->Text(), u"€ 12,50"_s) << other;
         }
         person.accelerator(u'O');
