@@ -11,6 +11,7 @@
 #include "entry/EntryRoute.h"
 #include "masterdata/frmHospitais.h"
 #include "masterdata/frmPlafonds.h"
+#include "payments/frmTRFs.h"
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/MsgBoxes.h"
@@ -199,7 +200,7 @@ void General::Extratos(QString*, QString*) {
 }
 
 void General::LPagamentos() {
-    openLater();
+    showModal<payments::frmTRFs>();
 }
 
 bool General::Ldividas() {

@@ -27,7 +27,7 @@ constexpr Signature Signatures[] = {
     {"Correcao", 0, 2, true},
     {"Recebimento", 0, 2, true},
     {"Extratos", 0, 2, true},
-    {"LPagamentos", 0, 0},
+    {"LPagamentos", 0, 0, true},
     {"Ldividas", 0, 0},
     {"Lcartasdividas", 0, 0},
     {"Lhospitais", 0, 0},

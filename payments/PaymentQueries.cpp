@@ -36,7 +36,7 @@ QString chequeListQuery(const QDate& first, const QDate& last) {
            "tbZelmar_Movimentos_Inactivos.Socio_ID = tbSocios_Inactivos.Socio_ID "_s +
            listed(u"tbZelmar_Movimentos_Inactivos"_s, first, last,
                   mode.arg(u"tbZelmar_Movimentos_Inactivos"_s)) +
-           u"GROUP BY tbZelmar_Movimentos_Inactivos.socio_id, "
+           u"GROUP BY tbZelmar_Movimentos_Inactivos.socio_id,"
            "tbZelmar_Movimentos_Inactivos.cheque, tbSocios_Inactivos.no_kor, "
            "tbSocios_Inactivos.nome_guerra "
            "HAVING SUM(tbZelmar_Movimentos_Inactivos.Credito) > 0.1 ORDER BY no_kor"_s;

@@ -37,22 +37,28 @@ Field field(double x, double y, double width, const QString& column, QStringView
             .style = style};
 }
 
-void addLetterhead(Section& section, const QString& title) {
+void addTitle(Section& section, const QString& title) {
     constexpr double BandHeight = 9;
     const double top = section.height;
-    const double band = top + 13;
+    section.items.insert(section.items.end(),
+                         {Band{QRectF(0, top, page::InnerWidth, BandHeight)},
+                          Label{{},
+                                QRectF(3, top, page::InnerWidth - 6, BandHeight),
+                                title,
+                                {.points = 13, .bold = true}}});
+    section.height += BandHeight;
+}
+
+void addLetterhead(Section& section, const QString& title) {
+    const double top = section.height;
     section.items.insert(
         section.items.end(),
         {Label{
              {}, QRectF(0, top, 120, 7), OrganisationName.toString(), {.points = 14, .bold = true}},
          label(0, top + 7, 120, OrganisationAddress.toString()),
-         label(120, top + 1.5, page::InnerWidth - 120, u"%D"_s, {.align = Align::Right}),
-         Band{QRectF(0, band, page::InnerWidth, BandHeight)},
-         Label{{},
-               QRectF(3, band, page::InnerWidth - 6, BandHeight),
-               title,
-               {.points = 13, .bold = true}}});
-    section.height = band + BandHeight;
+         label(120, top + 1.5, page::InnerWidth - 120, u"%D"_s, {.align = Align::Right})});
+    section.height += 13;
+    addTitle(section, title);
 }
 
 Section pageFooter() {
@@ -64,6 +70,14 @@ Section pageFooter() {
             .items = {Rule{QLineF(0, 2.5, page::InnerWidth, 2.5)},
                       label(0, 3.2, Half, u"Processado por Computador"_s, small),
                       label(Half, 3.2, Half, u"Página: %p / %P"_s, smallRight)}};
+}
+
+Section datedPageFooter() {
+    Section footer = pageFooter();
+    constexpr double Third = page::InnerWidth / 3;
+    footer.items.emplace_back(
+        label(Third, 3.2, Third, u"%D"_s, {.points = 8, .align = Align::Centre}));
+    return footer;
 }
 
 void addTitles(Section& section, const std::vector<Column>& columns) {

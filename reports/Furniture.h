@@ -24,11 +24,17 @@ printing::Label label(double x, double y, double width, const QString& caption,
 printing::Field field(double x, double y, double width, const QString& column,
                       QStringView format = {}, const printing::Style& style = {});
 
+/// The title on a band.
+void addTitle(printing::Section& section, const QString& title);
+
 /// Name and address of the organisation, the day of printing at the right, the title on a band.
 void addLetterhead(printing::Section& section, const QString& title);
 
 /// A rule, "Processado por Computador", and at the right page and number of pages.
 printing::Section pageFooter();
+
+/// The same with the day of printing in the middle, for listings without a letterhead.
+printing::Section datedPageFooter();
 
 /// A column of a listing.
 struct Column {

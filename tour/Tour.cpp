@@ -188,21 +188,38 @@ public:
         leaveList(u"frmHospitais"_s);
     }
 
+    /// What is paid by transfer since the beginning of the year, and the screen that types it into
+    /// the bank's program.
+    void payments() {
+        const QString newYear = core::today().toString(u"01-01-yyyy"_s);
+        open({}, {u"LPagamentos"_s, {}});
+        player_.step(u"frmTRFs"_s, {},
+                     typing({newYear, u"<Tab>"_s, u"<Tab>"_s, u"<Tab>"_s, u"<Space>"_s}));
+        player_.step(u"frmTRFs"_s, u"24-pagamentos"_s, typing({u"<Alt+O>"_s}),
+                     unticked(u"Check1"_s));
+        player_.step(u"Print_frmTRF_TRF"_s, u"25-transferencias"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        open({}, {u"LPagamentos"_s, {}});
+        player_.step(u"frmTRFs"_s, {}, typing({u"<Alt+B>"_s}));
+        player_.step(u"frmBanca"_s, u"26-banca"_s, typing({u"<Alt+A>"_s}));
+        player_.step(u"box:Deseja abortar"_s, {}, typing({u"<Alt+S>"_s}));
+    }
+
     /// The repair of the book and the close of the year.
     void yearEnd(const QString& backup) {
         open({}, {u"CallManutencaoDados"_s, {}});
         player_.step(u"frmManutencaoDados"_s, {}, typing({u"<Alt+I>"_s}));
         player_.step(u"box:Manutenção de Dados Concluída."_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmManutencaoDados"_s, u"24-manutencao"_s, typing({u"<Alt+F>"_s}));
+        player_.step(u"frmManutencaoDados"_s, u"27-manutencao"_s, typing({u"<Alt+F>"_s}));
         choose(u"Verificar"_s);
-        player_.step(u"frmVerificacao"_s, u"25-verificacao"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmVerificacao"_s, u"28-verificacao"_s, typing({u"<Alt+S>"_s}));
         choose(u"CallFechoAno"_s);
-        player_.step(u"frmPrepararFecho"_s, u"26-preparar-o-fecho"_s,
+        player_.step(u"frmPrepararFecho"_s, u"29-preparar-o-fecho"_s,
                      typing({u"<Ctrl+A>"_s, backup, u"<Alt+F>"_s}));
         player_.step(u"frmFechoAno"_s, {}, typing({u"<Alt+F>"_s}));
-        player_.step(u"box:Tem a certeza"_s, u"27-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Tem a certeza"_s, u"30-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"box:Procedimentos de Fim de Ano"_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmFechoAno"_s, u"28-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmFechoAno"_s, u"31-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
@@ -280,6 +297,7 @@ bool play(const QString& folder) {
     QFile::remove(extract);
     script.extract(extract);
     script.masterData();
+    script.payments();
     script.yearEnd(own.filePath(u"antes-do-fecho.copia"_s));
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
