@@ -248,7 +248,10 @@ void frmBanca::finish() {
 void frmBanca::OKButton_Click() {
     if (OKButton->Caption() == Leave) {
         core::passingOver([this] { Unload(); });
-        core::passingOver([] { automation::AppActivate(bank::InterbankWindow.toString()); });
+        // The screens that were left bring the main window to the front, and that is not wanted.
+        forms::afterwards([] {
+            core::passingOver([] { automation::AppActivate(bank::InterbankWindow.toString()); });
+        });
         return;
     }
     if (core::MsgBox(u"Deseja abortar o processamento da banca eletrónica"_s, core::Icon::Question,

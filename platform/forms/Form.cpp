@@ -27,6 +27,7 @@ namespace {
 /// Handlers and modal screens on the stack: while one runs, it may use a screen that was unloaded.
 int running = 0;
 std::vector<QPointer<Form>> unloadedScreens;
+std::vector<std::function<void()>> workAfterwards;
 
 class Running {
 public:
@@ -36,6 +37,10 @@ public:
         for (const QPointer<Form>& screen : unloadedScreens)
             if (screen) screen->deleteLater();
         unloadedScreens.clear();
+        const auto works = std::exchange(workAfterwards, {});
+        if (works.empty()) return;
+        QGuiApplication::sync();
+        for (const std::function<void()>& work : works) handle(work);
     }
     Running(const Running&) = delete;
     Running& operator=(const Running&) = delete;
@@ -70,6 +75,11 @@ bool handle(const std::function<void()>& handler) {
 
 bool handlePlainly(const std::function<void()>& handler) {
     return run(handler, core::Icon::None);
+}
+
+void afterwards(const std::function<void()>& work) {
+    const Running scope;
+    workAfterwards.push_back(work);
 }
 
 namespace {

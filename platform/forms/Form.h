@@ -21,6 +21,11 @@ bool handle(const std::function<void()>& handler);
 /// The same with a plain box, for handlers that report their failures themselves.
 bool handlePlainly(const std::function<void()>& handler);
 
+/// Runs work once all handlers and modal screens that are under way have returned and the windows
+/// that come to the front by that have been asked to; for what is to come to the front in their
+/// place. What fails in it is shown as a handler's failure is.
+void afterwards(const std::function<void()>& work);
+
 /// The turn of a handler: a screen runs one at a time. It is taken where a handler begins. As long
 /// as it is held, also while the handler's box or a modal screen is open, other handlers of the
 /// same owner do not get theirs and have to do nothing: five clicks that a program makes on "&OK"

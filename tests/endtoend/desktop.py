@@ -14,9 +14,9 @@ class Failed(Exception):
     pass
 
 
-def wait_until(what, condition):
+def wait_until(what, condition, patience=PATIENCE):
     """Waits until condition() gives something true, and gives that."""
-    deadline = time.monotonic() + PATIENCE
+    deadline = time.monotonic() + patience
     while time.monotonic() < deadline:
         found = condition()
         if found:
