@@ -149,7 +149,9 @@ def lost_window(desktop, host, bank, expected):
     compare(bank.transfers(), expected[:6])
     wait_until("the module is there again", lambda: desktop.run(
         ["xdotool", "search", "--onlyvisible", "--name", f"^{expected[6]['module']}$"]))
+    desktop.at(expected[6]["module"])
     desktop.turn_to(desktop.window_of(host, BANK))
+    desktop.at(BANK)
     desktop.keys("alt+c")
     wait_until("all rows are typed again", lambda: bank.rows_done() == 6 + len(expected))
     desktop.at("Transferências")
