@@ -12,6 +12,7 @@
 
 #include "benchmarks/Benches.h"
 #include "benchmarks/Books.h"
+#include "benchmarks/Display.h"
 #include "benchmarks/PaintWatch.h"
 #include "boundary/General.h"
 #include "boundary/environment/dtZelmars.h"
@@ -35,39 +36,14 @@ namespace {
 
 constexpr int Workstations = 6;
 
-/// A display without a window manager, for programs that are started.
-class Display {
-public:
-    Display() {
-        server_.start(u"Xvfb"_s, {u"-displayfd"_s, u"1"_s, u"-screen"_s, u"0"_s, u"1280x800x24"_s,
-                                  u"-nolisten"_s, u"tcp"_s});
-        if (!server_.waitForReadyRead()) throw std::runtime_error("no virtual display");
-        name_ = u':' + QString::fromLatin1(server_.readAll()).trimmed();
-    }
-    ~Display() {
-        server_.terminate();
-        server_.waitForFinished();
-    }
-    Display(const Display&) = delete;
-    Display& operator=(const Display&) = delete;
-    const QString& name() const { return name_; }
-
-private:
-    QProcess server_;
-    QString name_;
-};
-
 /// Milliseconds until the last of so many programs, started at once, has painted its list.
 double startAtOnce(int count, const Display& display) {
-    QProcessEnvironment surroundings = QProcessEnvironment::systemEnvironment();
-    surroundings.insert(u"DISPLAY"_s, display.name());
-    surroundings.insert(u"QT_QPA_PLATFORM"_s, u"xcb"_s);
     std::vector<std::unique_ptr<QProcess>> programs;
     QElapsedTimer clock;
     clock.start();
     for (int at = 0; at < count; ++at) {
         auto& program = programs.emplace_back(std::make_unique<QProcess>());
-        program->setProcessEnvironment(surroundings);
+        program->setProcessEnvironment(display.surroundings());
         program->setProcessChannelMode(QProcess::ForwardedErrorChannel);
         program->start(QCoreApplication::applicationFilePath(), {UntilListStands});
     }

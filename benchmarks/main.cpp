@@ -25,6 +25,10 @@ int main(int argc, char** argv) {
         const QApplication application(argc, argv);
         return benchmarks::tellWhenListStands();
     }
+    if (argc > 1 && benchmarks::TypeKeys == QLatin1StringView(argv[1])) {
+        const QApplication application(argc, argv);
+        return benchmarks::typeKeys();
+    }
     const QTemporaryDir registry;
     qputenv("ZELMARS_REGISTRY", registry.path().toUtf8());
     const QApplication application(argc, argv);
@@ -39,6 +43,7 @@ int main(int argc, char** argv) {
         benchmarks::measureAccounts(report);
         benchmarks::measureBulk(report);
         benchmarks::measureEngines(report);
+        benchmarks::measureKeys(report);
         benchmarks::measureLists(report);
         benchmarks::measurePrinting(report);
         benchmarks::measureScreens(report);

@@ -78,7 +78,10 @@ void Keyboard::letGoOfModifiers() {
 }
 
 void Keyboard::press(const Key& key, const Stroke& stroke) {
-    bool shift = key.shift != (isCapsLocked_ && isLetter(stroke.symbol));
+    // Caps Lock changes what a letter writes. With Ctrl or Alt it writes nothing, and Shift would
+    // make another accelerator of it.
+    const bool isWritten = !stroke.ctrl && !stroke.alt;
+    bool shift = key.shift != (isCapsLocked_ && isWritten && isLetter(stroke.symbol));
     shift |= stroke.shift;
     std::vector<xcb_keycode_t> held;
     if (shift) held.push_back(keyFor(XK_Shift_L).code);
