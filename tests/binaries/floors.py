@@ -37,7 +37,8 @@ FLOORS = GROUND | {
     "boundary": ROOM + " coverage masterdata payments reports receipts yearend entry",
     "companions": BASE + " platform/forms",
     "database": BASE + " platform/ado/sqlite platform/ado/postgres",
-    "host": ROOM + " coverage receipts reports database",
+    "host/bankfile": BASE + " payments",
+    "host": ROOM + " coverage receipts reports database host/bankfile",
     "tour": ROOM + " database host",
 }
 # The plan's arithmetic, on plain values, serves the sample books as well.
