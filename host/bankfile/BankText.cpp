@@ -2,6 +2,7 @@
 #include "host/bankfile/BankText.h"
 
 #include <QHash>
+#include <array>
 
 using namespace Qt::StringLiterals;
 
@@ -11,6 +12,15 @@ namespace {
 
 constexpr QStringView Taken =
     u"abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789/-?:().,'+ ";
+
+bool isTaken(char32_t letter) {
+    static const auto taken = [] {
+        std::array<bool, 0x80> letters{};
+        for (const QChar each : Taken) letters[each.unicode()] = true;
+        return letters;
+    }();
+    return letter < taken.size() && taken[letter];
+}
 
 /// What letters become that are not letters with an accent.
 const QHash<char32_t, QString>& likenesses() {
@@ -34,7 +44,7 @@ QString likenessOf(char32_t letter) {
     for (const QChar part :
          QString::fromUcs4(&letter, 1).normalized(QString::NormalizationForm_KD)) {
         if (part.isMark()) continue;
-        plain += Taken.contains(part) ? part : QChar(u'.');
+        plain += isTaken(part.unicode()) ? part : QChar(u'.');
         if (part.isLowSurrogate()) plain.chop(1);  // one letter, one point
     }
     return plain;
@@ -53,7 +63,11 @@ QString withoutOuterSlashes(const QString& text) {
 
 QString bankText(const QString& text, qsizetype most) {
     QString plain;
-    for (const char32_t letter : text.toUcs4()) plain += likenessOf(letter);
+    for (const char32_t letter : text.toUcs4())
+        if (isTaken(letter))
+            plain += QChar(static_cast<char16_t>(letter));
+        else
+            plain += likenessOf(letter);
     while (plain.contains("//"_L1)) plain.replace("//"_L1, "/"_L1);
     return withoutOuterSlashes(withoutOuterSlashes(plain.simplified()).left(most));
 }

@@ -19,7 +19,7 @@ constexpr qsizetype MostOfIdentifier = 35;
 /// Writes the parts of one file, in the order that its form demands.
 class Writer {
 public:
-    Writer(const CreditTransferFile& file, QIODevice& device) : file_(file), xml_(&device) {
+    Writer(const CreditTransferFile& file, QByteArray& text) : file_(file), xml_(&text) {
         core::Money sum;
         for (const Payment& payment : file.payments) sum = sum + payment.row.amount;
         sum_ = amountText(sum);
@@ -128,7 +128,11 @@ private:
 }  // namespace
 
 void CreditTransferFile::write(QIODevice& device) const {
-    Writer(*this, device).write();
+    // In one piece: a device takes a million pieces of some letters very slowly.
+    QByteArray text;
+    Writer(*this, text).write();
+    if (device.write(text) != text.size())
+        throw core::Failure(core::InvalidCall, device.errorString());
 }
 
 QString amountText(core::Money amount) {
