@@ -76,7 +76,11 @@ QString referenceOf(const std::vector<qint64>& numbers, qsizetype most) {
 QString shownAmount(core::Money amount) {
     if (amount.units() % UnitsOfACent == 0)
         return core::formatted(QVariant::fromValue(amount), core::format::Money);
-    return u"€ "_s + amount.toPlainText().replace(u'.', core::decimalMark());
+    const QString plain = amount.toPlainText();
+    const qsizetype point = plain.indexOf(u'.');
+    const QString sign = plain.startsWith(u'-') ? u"-"_s : QString();
+    const qint64 whole = plain.left(point).mid(sign.size()).toLongLong();
+    return u"€ "_s + sign + core::grouped(whole) + core::decimalMark() + plain.mid(point + 1);
 }
 
 core::Money Batch::sum() const {

@@ -12,12 +12,16 @@ struct Payment {
     QString name;         ///< as the bank takes it
     QString reference;    ///< from end to end; names the movements, unique in its file
     QString explanation;  ///< what the member reads in the account
+
+    friend bool operator==(const Payment&, const Payment&) = default;
 };
 
 /// A line that cannot go.
 struct Refused {
     TransferRow row;
     QString why;  ///< in Portuguese, for people
+
+    friend bool operator==(const Refused&, const Refused&) = default;
 };
 
 /// The lines of the list, parted in those that go and those that cannot.
@@ -27,6 +31,8 @@ struct Batch {
 
     core::Money sum() const;
     core::Money refusedSum() const;
+
+    friend bool operator==(const Batch&, const Batch&) = default;
 };
 
 /// No amount is ever rounded: one with more than two decimals is refused.

@@ -27,6 +27,8 @@ struct TransferRow {
     core::Money amount = {};
     std::vector<MovementKey> movements = {};
     std::vector<qint64> numbers = {};  ///< of those movements that have one, in the same order
+
+    friend bool operator==(const TransferRow&, const TransferRow&) = default;
 };
 
 /// Exactly the lines of the list of transfers between two days, in its order. `connection` is a

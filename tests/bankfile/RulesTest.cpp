@@ -90,7 +90,8 @@ TEST(Batch, TellsWhyALineCannotGo) {
         EXPECT_EQ(batch.refused.empty() ? QString() : batch.refused.front().why, why);
     }
     EXPECT_EQ(shownAmount(core::Money::fromUnits(12'345'000)), u"€ 1.234,50"_s);
-    EXPECT_EQ(shownAmount(core::Money::fromUnits(12'345'050)), u"€ 1234,5050"_s);
+    EXPECT_EQ(shownAmount(core::Money::fromUnits(12'345'050)), u"€ 1.234,5050"_s);
+    EXPECT_EQ(shownAmount(core::Money::fromUnits(-5'001)), u"€ -0,5001"_s);
 }
 
 TEST(Batch, NamesTheMovementsOfEachLineOnce) {
