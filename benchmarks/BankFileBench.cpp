@@ -50,11 +50,11 @@ double timedFile(const Book& book, const QString& file) {
     clock.start();
     const bankfile::Batch batch =
         bankfile::batchOf(bankfile::readTransferRows(book.connectionString(), Day, Day));
-    const bool isMade = bankfile::makeBankFile(
+    const auto made = bankfile::makeBankFile(
         {.batch = batch, .payer = payer(), .book = book.place().shown(), .file = file},
-        [](const std::vector<bankfile::Repeated>&) { return false; });
+        [](const std::vector<bankfile::Repeated>&) { return bankfile::Repetition::None; });
     const double milliseconds = static_cast<double>(clock.nsecsElapsed()) / 1e6;
-    if (!isMade || batch.payments.size() != Transfers || !batch.refused.empty())
+    if (!made || made->payments != Transfers || !batch.refused.empty())
         throw core::Failure(core::InvalidCall, u"the file does not hold all transfers"_s);
     return milliseconds;
 }

@@ -36,13 +36,18 @@ void tellRefused(const Batch& batch) {
                                                  bankfile::shownAmount(each.row.amount), each.why));
 }
 
-bool tellRepeated(const std::vector<bankfile::Repeated>& repeated, bool again) {
+bankfile::Repetition tellRepeated(const std::vector<bankfile::Repeated>& repeated,
+                                  const CommandLine& line) {
+    using bankfile::Repetition;
     for (const bankfile::Repeated& each : repeated) complain(u"Já enviada: "_s + each.text());
-    if (!again)
-        complain(
-            u"Nenhum ficheiro foi feito: %1 transferências têm movimentos que já estão noutro "
-            "ficheiro. Para as enviar outra vez, acrescente «--again»."_s.arg(repeated.size()));
-    return again;
+    if (line.again) return Repetition::SendAgain;
+    if (line.withoutSent) return Repetition::LeaveOut;
+    complain(
+        u"Nenhum ficheiro foi feito: %1 transferências têm movimentos que já estão noutro "
+        u"ficheiro. "
+        "Para o fazer sem elas, acrescente «--without-sent»; para as enviar outra vez, "
+        "«--again»."_s.arg(repeated.size()));
+    return Repetition::None;
 }
 
 }  // namespace
@@ -61,16 +66,16 @@ bool makeBankFile(const CommandLine& line) {
         return false;
     }
     const QString file = QFileInfo(line.file).absoluteFilePath();
-    const bool isMade =
+    const auto made =
         bankfile::makeBankFile({.batch = batch, .payer = payer, .book = book, .file = file},
                                [&](const std::vector<bankfile::Repeated>& repeated) {
-                                   return tellRepeated(repeated, line.again);
+                                   return tellRepeated(repeated, line);
                                });
-    if (isMade)
+    if (made)
         say(u"%1 transferências, %2, em %3"_s.arg(
-            core::grouped(static_cast<qint64>(batch.payments.size())),
-            bankfile::shownAmount(batch.sum()), file));
-    return isMade;
+            core::grouped(static_cast<qint64>(made->payments)), bankfile::shownAmount(made->sum),
+            file));
+    return made.has_value();
 }
 
 }  // namespace host

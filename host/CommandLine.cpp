@@ -143,7 +143,10 @@ CommandLine bankFileLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::BankFile};
     line.withoutRefused = words.flag(u"--without-refused"_s);
+    line.withoutSent = words.flag(u"--without-sent"_s);
     line.again = words.flag(u"--again"_s);
+    words.require(!line.again || !line.withoutSent,
+                  u"«--again» e «--without-sent» não vão juntos."_s);
     words.value(u"--version"_s, line.version);
     bankfile::Version version{};
     words.require(line.version.isEmpty() || bankfile::readVersion(line.version, version),

@@ -43,6 +43,7 @@ struct CommandLine {
     QDate last = {};
     QString version = {};         ///< of BankFile; empty for that of the settings
     bool withoutRefused = false;  ///< of BankFile: also where lines cannot go
+    bool withoutSent = false;     ///< of BankFile: leaves out what was sent before
     bool again = false;           ///< of BankFile: also what was sent before
     bool sample = false;          ///< of Init and InitServer: with the sample content
     bool ifNeeded = false;        ///< of Init: only when no book is set up for this user

@@ -5,6 +5,8 @@
 #include <QFileDialog>
 #include <QFileInfo>
 #include <QGridLayout>
+#include <QMessageBox>
+#include <QPushButton>
 #include <QStandardPaths>
 #include <QTabWidget>
 
@@ -269,16 +271,29 @@ bool frmFicheiroBanco::goesWithoutRefused() {
                core::Icon::Question, Caption(), core::Buttons::NoYes) == core::Answer::Yes;
 }
 
-bool frmFicheiroBanco::mayRepeat(const std::vector<bankfile::Repeated>& repeated) {
+bankfile::Repetition frmFicheiroBanco::askRepetition(
+    const std::vector<bankfile::Repeated>& repeated) {
     QString lines;
     for (std::size_t at = 0; at < std::min(repeated.size(), LinesShown); ++at)
         lines += u"• "_s + repeated[at].text() + u'\n';
     if (repeated.size() > LinesShown)
         lines += u"… e mais %1.\n"_s.arg(repeated.size() - LinesShown);
-    return core::MsgBox(
-               u"Há movimentos que já foram para um ficheiro:\n\n%1\nSe esse ficheiro foi "
-               "para o banco, são pagos duas vezes. Fazer o ficheiro mesmo assim?"_s.arg(lines),
-               core::Icon::Exclamation, Caption(), core::Buttons::NoYes) == core::Answer::Yes;
+    QMessageBox question(
+        QMessageBox::Warning, Caption(),
+        u"Há movimentos que já foram para um ficheiro:\n\n%1\nSe esse ficheiro foi para o banco e "
+        "forem outra vez, são pagos duas vezes."_s.arg(lines),
+        QMessageBox::Yes | QMessageBox::Apply | QMessageBox::No, this);
+    question.setTextFormat(Qt::PlainText);
+    question.button(QMessageBox::Yes)->setText(u"&Deixar de fora"_s);
+    question.button(QMessageBox::Apply)->setText(u"&Enviar outra vez"_s);
+    question.button(QMessageBox::No)->setText(u"&Cancelar"_s);
+    question.setDefaultButton(QMessageBox::No);
+    question.setEscapeButton(QMessageBox::No);
+    const int answer = question.exec();
+    activateWindow();  // without a window manager nobody else gives the focus back
+    if (answer == QMessageBox::Yes) return bankfile::Repetition::LeaveOut;
+    return answer == QMessageBox::Apply ? bankfile::Repetition::SendAgain
+                                        : bankfile::Repetition::None;
 }
 
 QString frmFicheiroBanco::chosenFile() {
@@ -298,17 +313,18 @@ void frmFicheiroBanco::Command2_Click() {
     if (!goesWithoutRefused()) return;
     const QString file = chosenFile();
     if (file.isEmpty()) return;
-    const bool isMade = bankfile::makeBankFile(
-        {.batch = batch_,
-         .payer = typedAccount(),
-         .book = BookSettings::read().place().shown(),
-         .file = file},
-        [this](const std::vector<bankfile::Repeated>& repeated) { return mayRepeat(repeated); });
-    if (!isMade) return;
+    const auto made =
+        bankfile::makeBankFile({.batch = batch_,
+                                .payer = typedAccount(),
+                                .book = BookSettings::read().place().shown(),
+                                .file = file},
+                               [this](const std::vector<bankfile::Repeated>& repeated) {
+                                   return askRepetition(repeated);
+                               });
+    if (!made) return;
     showFiles();
-    core::MsgBox(
-        u"Ficheiro feito, com %1:\n%2"_s.arg(counted(batch_.payments.size(), batch_.sum()), file),
-        core::Icon::Information, Caption());
+    core::MsgBox(u"Ficheiro feito, com %1:\n%2"_s.arg(counted(made->payments, made->sum), file),
+                 core::Icon::Information, Caption());
 }
 
 }  // namespace host

@@ -36,7 +36,7 @@ private:
     void showFiles();
     bool isAsShown();
     bool goesWithoutRefused();
-    bool mayRepeat(const std::vector<bankfile::Repeated>& repeated);
+    bankfile::Repetition askRepetition(const std::vector<bankfile::Repeated>& repeated);
     QString chosenFile();
     void Command1_Click();
     void Command2_Click();

@@ -4,6 +4,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QRandomGenerator>
+#include <QSet>
 
 #include "host/bankfile/CreditTransferFile.h"
 #include "platform/core/Clock.h"
@@ -52,6 +53,18 @@ SentFile recordOf(const Order& order, const QDateTime& when) {
     return record;
 }
 
+/// Fails when nothing is left.
+void leaveOut(Batch& batch, const std::vector<Repeated>& repeated) {
+    QSet<QString> references;  // no two lines of a file have the same
+    for (const Repeated& each : repeated) references.insert(each.reference);
+    std::erase_if(batch.payments,
+                  [&](const Payment& payment) { return references.contains(payment.reference); });
+    if (batch.payments.empty())
+        throw core::Failure(core::InvalidCall,
+                            u"Todas estas transferências já foram enviadas. Nenhum ficheiro foi "
+                            "feito."_s);
+}
+
 void writeFile(const Order& order, const QString& message, const QDateTime& when) {
     const QString what = u"Não foi possível fazer o ficheiro «%1»."_s.arg(order.file);
     const core::NewFile made(order.file, what);
@@ -88,12 +101,17 @@ QString Repeated::text() const {
         earlier.when.toString(u"dd-MM-yyyy HH:mm"_s), state);
 }
 
-bool makeBankFile(const Order& order, const MayRepeat& mayRepeat) {
-    refuseWhatCannotBeMade(order);
+std::optional<Made> makeBankFile(const Order& asked, const AskRepetition& ask) {
+    refuseWhatCannotBeMade(asked);
     SentTransfers sent;
     sent.lock();
+    Order order = asked;
     const std::vector<Repeated> repeated = repeatedOf(order.batch, sent.movementsOf(order.book));
-    if (!repeated.empty() && !mayRepeat(repeated)) return false;
+    if (!repeated.empty()) {
+        const Repetition answer = ask(repeated);
+        if (answer == Repetition::None) return std::nullopt;
+        if (answer == Repetition::LeaveOut) leaveOut(order.batch, repeated);
+    }
     const QDateTime when(core::today(), QTime::currentTime());
     const QString message = messageName(when);
     SentFile record = recordOf(order, when);
@@ -106,7 +124,7 @@ bool makeBankFile(const Order& order, const MayRepeat& mayRepeat) {
     }
     record.isDone = true;
     sent.keep(message, record);
-    return true;
+    return Made{order.batch.payments.size(), order.batch.sum()};
 }
 
 }  // namespace bankfile

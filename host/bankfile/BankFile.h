@@ -23,19 +23,31 @@ struct Repeated {
 
 /// What a file is made of.
 struct Order {
-    const Batch& batch;
+    Batch batch;
     PayingAccount payer;
     QString book;  ///< where it lies, for the record
     QString file;
 };
 
-/// Asked before a file is made in which movements stand that were sent before.
-using MayRepeat = std::function<bool(const std::vector<Repeated>&)>;
+/// What becomes of lines of which movements were sent before.
+enum class Repetition {
+    None,       ///< no file is made
+    LeaveOut,   ///< one is made without them
+    SendAgain,  ///< one is made with them
+};
+/// Asked before a file is made in which such lines stand.
+using AskRepetition = std::function<Repetition(const std::vector<Repeated>&)>;
+
+/// What stands in a file that was made.
+struct Made {
+    std::size_t payments;
+    core::Money sum;
+};
 
 /// Makes the file, of the lines that can go, and keeps a record of it. The record stands before the
 /// file does, as one that is begun, so that no file is ever there without it. Never writes over a
 /// file.
-/// @return false, with nothing made, when `mayRepeat` says no
-bool makeBankFile(const Order& order, const MayRepeat& mayRepeat);
+/// @return nothing, with nothing made, when `ask` says so
+std::optional<Made> makeBankFile(const Order& order, const AskRepetition& ask);
 
 }  // namespace bankfile

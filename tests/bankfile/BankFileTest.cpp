@@ -201,13 +201,19 @@ TEST_F(BankFile, WarnsOfMovementsThatWereSentBefore) {
         << again.errors.toStdString();
     EXPECT_FALSE(again.errors.contains(u"Rui"_s));
     EXPECT_FALSE(QFile::exists(path(u"b.xml"_s)));
+    // The others go alone, once.
+    EXPECT_EQ(make(u"rest.xml"_s, {u"--without-sent"_s}).status, 0);
+    EXPECT_EQ(checked(path(u"rest.xml"_s)).output, u"09 1\nM3|7.00|Rui|PT50%1\n"_s.arg(Nib));
+    const Outcome none = make(u"none.xml"_s, {u"--without-sent"_s});
+    EXPECT_EQ(none.status, 1);
+    EXPECT_TRUE(none.errors.contains(u"Todas estas transferências já foram enviadas"_s));
     // What was not sent yet goes; another year's movement of the same number is another one.
     EXPECT_EQ(make(u"c.xml"_s, {}, {u"2026-03-16"_s, u"2026-03-18"_s}).status, 0);
     book.exec(u"update tbZelmar_Movimentos set movimento_id = movimento_id + 100"_s);
     EXPECT_EQ(make(u"d.xml"_s).status, 0);
     EXPECT_EQ(make(u"e.xml"_s, {u"--again"_s}).status, 0);
     const std::vector<SentFile> files = SentTransfers().files();
-    ASSERT_EQ(files.size(), 4u);
+    ASSERT_EQ(files.size(), 5u);
     EXPECT_EQ(files.back().file, path(u"a.xml"_s));
     EXPECT_EQ(files.back().transfers.front().movements, (std::vector<MovementKey>{{false, 9001}}));
     EXPECT_EQ(files.front().sum(), core::Money::fromUnits(220'000));

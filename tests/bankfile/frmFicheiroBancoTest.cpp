@@ -82,6 +82,10 @@ protected:
         person.expectBox({.text = u"Não podem ir: 1 transferência, € 30,00."_s,
                           .answer = Answer::Yes,
                           .partly = true});
+        if (leavesOut)
+            person.expectBox({.text = u"Há movimentos que já foram para um ficheiro"_s,
+                              .answer = Answer::Yes,
+                              .partly = true});
         person.expectBox(end);
         person.onScreen(u"QFileDialog"_s, [this, file] {
             EXPECT_TRUE(QRegularExpression(u"\\Atransferencias-20260315-\\d{4}.xml\\z"_s)
@@ -96,6 +100,7 @@ protected:
     support::Book book;
     support::Operator person;
     qint64 ana = 0;
+    bool leavesOut = false;  ///< what was sent before, when a file is saved
 };
 
 }  // namespace
@@ -124,10 +129,19 @@ TEST_F(BankFileWindow, ShowsWhatGoesAndWhatCannotAndMakesTheFile) {
               .answer = Answer::No,
               .partly = true});
         EXPECT_FALSE(QFile::exists(book.folder() + u"/outro.xml"_s));
+        // What is new goes alone.
+        const qint64 eva =
+            book.member({.no_kor = u"100031"_s, .nome_guerra = u"Eva"_s, .nib = Nib});
+        pay(eva, 4, 3, u"2026-03-15 00:00:00"_s);
+        person.accelerator(u'M');
+        leavesOut = true;
+        save(book.folder() + u"/outro.xml"_s,
+             {.text = u"Ficheiro feito, com 1 transferência, € 3,00:\n"_s + book.folder() +
+                      u"/outro.xml"_s});
         person.accelerator(u'F');
     });
     EXPECT_EQ(bankfile::PayingAccount::read().iban(), u"PT50"_s + Nib);
-    EXPECT_EQ(bankfile::SentTransfers().files().size(), 1u);
+    EXPECT_EQ(bankfile::SentTransfers().files().size(), 2u);
 }
 
 TEST_F(BankFileWindow, SendsOnlyWhatWasSeen) {
