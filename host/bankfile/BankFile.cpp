@@ -114,16 +114,14 @@ std::optional<Made> makeBankFile(const Order& asked, const AskRepetition& ask) {
     }
     const QDateTime when(core::today(), QTime::currentTime());
     const QString message = messageName(when);
-    SentFile record = recordOf(order, when);
-    sent.keep(message, record);
+    sent.begin(message, recordOf(order, when));
     try {
         writeFile(order, message, when);
     } catch (const core::Failure&) {
-        sent.remove(message);  // there is no such file
+        sent.giveUp(message);
         throw;
     }
-    record.isDone = true;
-    sent.keep(message, record);
+    sent.finish(message);
     return Made{order.batch.payments.size(), order.batch.sum()};
 }
 

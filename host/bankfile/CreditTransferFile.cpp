@@ -19,7 +19,7 @@ constexpr qsizetype MostOfIdentifier = 35;
 /// Writes the parts of one file, in the order that its form demands.
 class Writer {
 public:
-    Writer(const CreditTransferFile& file, QByteArray& text) : file_(file), xml_(&text) {
+    Writer(const CreditTransferFile& file, QString& text) : file_(file), xml_(&text) {
         core::Money sum;
         for (const Payment& payment : file.payments) sum = sum + payment.row.amount;
         sum_ = amountText(sum);
@@ -28,8 +28,7 @@ public:
 
     void write() {
         xml_.setAutoFormatting(true);
-        xml_.setAutoFormattingIndent(1);
-        xml_.writeStartDocument();
+        xml_.setAutoFormattingIndent(0);  // a line an element
         xml_.writeStartElement(u"Document"_s);
         xml_.writeDefaultNamespace(u"urn:iso:std:iso:20022:tech:xsd:pain.001.001."_s +
                                    nameOf(file_.payer.version));
@@ -129,9 +128,10 @@ private:
 
 void CreditTransferFile::write(QIODevice& device) const {
     // In one piece: a device takes a million pieces of some letters very slowly.
-    QByteArray text;
+    QString text = u"<?xml version=\"1.0\" encoding=\"UTF-8\"?>"_s;
     Writer(*this, text).write();
-    if (device.write(text) != text.size())
+    const QByteArray bytes = text.toUtf8();
+    if (device.write(bytes) != bytes.size())
         throw core::Failure(core::InvalidCall, device.errorString());
 }
 

@@ -20,6 +20,7 @@ namespace {
 
 constexpr int Patience = 5'000;  // milliseconds
 const QString Ending = u".json"_s;
+const QString Begun = u".iniciado.json"_s;  // of a record whose file is not known to be there
 
 // The two tables of movements, as a record names them.
 const QString Active = u"tbZelmar_Movimentos"_s;
@@ -52,7 +53,6 @@ QJsonObject written(const SentFile& sent) {
             {u"quem"_s, sent.who},
             {u"ficheiro"_s, sent.file},
             {u"livro"_s, sent.book},
-            {u"estado"_s, sent.isDone ? u"feito"_s : u"iniciado"_s},
             {u"transferencias"_s, transfers}};
 }
 
@@ -72,7 +72,7 @@ public:
                       .who = text(record, u"quem"_s),
                       .file = text(record, u"ficheiro"_s),
                       .book = text(record, u"livro"_s),
-                      .isDone = text(record, u"estado"_s) == "feito"_L1};
+                      .isDone = !path_.endsWith(Begun)};
         for (const QJsonValue& each : array(record, u"transferencias"_s))
             sent.transfers.push_back(transfer(each.toObject()));
         return sent;
@@ -153,8 +153,8 @@ SentMovements SentTransfers::movementsOf(const QString& book) const {
     return movements;
 }
 
-void SentTransfers::keep(const QString& name, const SentFile& sent) const {
-    QSaveFile target(pathOf(name));
+void SentTransfers::begin(const QString& name, const SentFile& sent) const {
+    QSaveFile target(begunPath(name));
     const QByteArray record = QJsonDocument(written(sent)).toJson(QJsonDocument::Compact);
     if (!target.open(QIODevice::WriteOnly) || !target.setPermissions(core::OwnerOnly) ||
         target.write(record) != record.size() || !target.commit())
@@ -164,12 +164,20 @@ void SentTransfers::keep(const QString& name, const SentFile& sent) const {
     core::toDisk(folder_);
 }
 
-void SentTransfers::remove(const QString& name) const {
-    QFile::remove(pathOf(name));
+void SentTransfers::finish(const QString& name) const {
+    if (!QFile::rename(begunPath(name), folder_ + u'/' + name + Ending))
+        throw core::Failure(
+            core::InvalidCall,
+            u"O ficheiro está feito, mas o registo «%1» ficou por acabar."_s.arg(begunPath(name)));
+    core::toDisk(folder_);
 }
 
-QString SentTransfers::pathOf(const QString& name) const {
-    return folder_ + u'/' + name + Ending;
+void SentTransfers::giveUp(const QString& name) const {
+    QFile::remove(begunPath(name));
+}
+
+QString SentTransfers::begunPath(const QString& name) const {
+    return folder_ + u'/' + name + Begun;
 }
 
 }  // namespace bankfile

@@ -39,8 +39,9 @@ struct EarlierFile {
 using SentMovements = std::map<MovementKey, EarlierFile>;
 
 /// What this user has made for the bank, on this machine: one record a file, below
-/// `$XDG_DATA_HOME/zelmars/transferencias`, readable by its owner only. A record is replaced in one
-/// go, so that none is ever half written. Failures are core::Failure.
+/// `$XDG_DATA_HOME/zelmars/transferencias`, readable by its owner only. A record appears in one go,
+/// so that none is ever half written; whether its file was begun or done is told by its own name.
+/// Failures are core::Failure.
 class SentTransfers {
 public:
     /// Fails when the folder cannot be made.
@@ -55,13 +56,17 @@ public:
     /// The movements of a book that stand in a file, each with the newest such file.
     SentMovements movementsOf(const QString& book) const;
 
-    /// Keeps a record, in the place of the one of that name.
-    /// @param name  of the record; letters, digits and "-"
-    void keep(const QString& name, const SentFile& sent) const;
-    void remove(const QString& name) const;
+    // A record's name: letters, digits and "-".
+
+    /// Keeps a record of a file that is about to be made.
+    void begin(const QString& name, const SentFile& sent) const;
+    /// The file is there.
+    void finish(const QString& name) const;
+    /// There is no such file.
+    void giveUp(const QString& name) const;
 
 private:
-    QString pathOf(const QString& name) const;
+    QString begunPath(const QString& name) const;
     QString folder_;
     QLockFile lock_;
 };
