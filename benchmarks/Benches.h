@@ -8,6 +8,7 @@
 namespace benchmarks {
 
 void measureAccounts(Report& report);
+void measureBankFiles(Report& report);
 void measureBulk(Report& report);
 void measureCoverage(Report& report);
 void measureEngines(Report& report);

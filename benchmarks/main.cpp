@@ -41,6 +41,7 @@ int main(int argc, char** argv) {
     try {
         benchmarks::measureCoverage(report);
         benchmarks::measureAccounts(report);
+        benchmarks::measureBankFiles(report);
         benchmarks::measureBulk(report);
         benchmarks::measureEngines(report);
         benchmarks::measureKeys(report);

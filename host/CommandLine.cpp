@@ -3,6 +3,8 @@
 
 #include <QFile>
 
+#include "host/bankfile/PayingAccount.h"
+
 using namespace Qt::StringLiterals;
 
 // A static library's resource is linked in only when it is asked for, and that from outside any
@@ -49,6 +51,18 @@ public:
             if (!isSwitch(rest_[at]) && !rest_[at].isEmpty()) return rest_.takeAt(at);
         note(u"falta %1."_s.arg(meaning));
         return {};
+    }
+    /// Takes the next word, which has to be a day.
+    QDate nextDay(const QString& meaning) {
+        const QString word = next(meaning);
+        const QDate day = QDate::fromString(word, u"yyyy-MM-dd"_s);
+        if (!word.isEmpty() && !day.isValid())
+            note(u"«%1» não é um dia; a forma é aaaa-mm-dd."_s.arg(word));
+        return day;
+    }
+    /// Notes what is wrong when it is.
+    void require(bool isRight, const QString& why) {
+        if (!isRight) note(why);
     }
     /// The line as it was read, or a refusal when something is missing in it or left over.
     CommandLine ended(const CommandLine& line) {
@@ -125,6 +139,25 @@ CommandLine backupLine(const QStringList& all, CommandLine::Task task) {
     return words.ended(line);
 }
 
+CommandLine bankFileLine(const QStringList& all) {
+    Words words(all);
+    CommandLine line{.task = CommandLine::Task::BankFile};
+    line.withoutRefused = words.flag(u"--without-refused"_s);
+    line.withoutSent = words.flag(u"--without-sent"_s);
+    line.again = words.flag(u"--again"_s);
+    words.require(!line.again || !line.withoutSent,
+                  u"«--again» e «--without-sent» não vão juntos."_s);
+    words.value(u"--version"_s, line.version);
+    bankfile::Version version{};
+    words.require(line.version.isEmpty() || bankfile::readVersion(line.version, version),
+                  u"não há a versão «%1»; há 03 e 09."_s.arg(line.version));
+    line.first = words.nextDay(u"o primeiro dia"_s);
+    line.last = words.nextDay(u"o último dia"_s);
+    line.file = words.next(u"o ficheiro a fazer"_s);
+    words.require(line.first <= line.last, u"o último dia é anterior ao primeiro."_s);
+    return words.ended(line);
+}
+
 CommandLine registerLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::Register};
@@ -151,6 +184,7 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     if (first == "check"_L1) return checkLine(words);
     if (first == "backup"_L1) return backupLine(words, Task::Backup);
     if (first == "restore"_L1) return backupLine(words, Task::Restore);
+    if (first == "bankfile"_L1) return bankFileLine(words);
     if (first == "register"_L1) return registerLine(words);
     if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
     if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <QDate>
 #include <QStringList>
 
 #include "host/Operations.h"
@@ -18,6 +19,7 @@ struct CommandLine {
         Check,
         Backup,
         Restore,
+        BankFile,
         Register,
         Help,
         Version,
@@ -36,11 +38,17 @@ struct CommandLine {
     QString from = {};   ///< of Copy, as database::BookPlace reads it
     QString into = {};
     QString book = {};  ///< of Check, Backup and Restore, likewise; empty for that of the settings
-    QString file = {};  ///< of Backup and Restore
-    bool sample = false;    ///< of Init and InitServer: with the sample content
-    bool ifNeeded = false;  ///< of Init: only when no book is set up for this user
-    bool undo = false;      ///< of Register
-    bool replace = false;   ///< of Restore: the book that is there may be lost
+    QString file = {};  ///< of Backup, Restore and BankFile
+    QDate first = {};   ///< of BankFile: the days that are paid
+    QDate last = {};
+    QString version = {};         ///< of BankFile; empty for that of the settings
+    bool withoutRefused = false;  ///< of BankFile: also where lines cannot go
+    bool withoutSent = false;     ///< of BankFile: leaves out what was sent before
+    bool again = false;           ///< of BankFile: also what was sent before
+    bool sample = false;          ///< of Init and InitServer: with the sample content
+    bool ifNeeded = false;        ///< of Init: only when no book is set up for this user
+    bool undo = false;            ///< of Register
+    bool replace = false;         ///< of Restore: the book that is there may be lost
 
     /// @param words  without the program's name
     static CommandLine parsed(const QStringList& words);

@@ -3,6 +3,7 @@
 
 #include <QLibrary>
 
+#include "host/BankFileTask.h"
 #include "host/BookTasks.h"
 #include "host/Console.h"
 #include "host/frmPrincipal.h"
@@ -88,6 +89,8 @@ int performUntrapped(const CommandLine& line) {
         case Task::Restore:
             restoreBook(line);
             return Done;
+        case Task::BankFile:
+            return makeBankFile(line) ? Done : Failed;
         case Task::Register:
             registerComponents(line.undo);
             return Done;

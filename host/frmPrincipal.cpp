@@ -16,6 +16,7 @@
 #include "host/MovementsView.h"
 #include "host/RulesConnection.h"
 #include "host/UnfinishedOperations.h"
+#include "host/frmFicheiroBanco.h"
 #include "host/frmPrepararFecho.h"
 #include "host/frmVerificacao.h"
 #include "platform/core/MsgBox.h"
@@ -115,6 +116,8 @@ void frmPrincipal::addEntryMenu() {
 void frmPrincipal::addListingMenus() {
     QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
     addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
+    addItem(payments, u"FicheiroBanco"_s, u"&Ficheiro para o banco…"_s, {},
+            [this] { once([this] { makeBankFile(); }); });
     QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
     addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
     addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
@@ -224,6 +227,11 @@ void frmPrincipal::login() {
 
 void frmPrincipal::checkBook() {
     auto* shown = new frmVerificacao(checkedBook());
+    shown->ShowModal();
+}
+
+void frmPrincipal::makeBankFile() {
+    auto* shown = new frmFicheiroBanco;
     shown->ShowModal();
 }
 

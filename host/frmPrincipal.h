@@ -53,6 +53,7 @@ private:
     void once(const std::function<void()>& handler);
     void login();
     void checkBook();
+    void makeBankFile();
     void closeYear();
     void offerToFinish();
     void showCount(const QString& text);

@@ -65,6 +65,13 @@ QString transferListQuery(const QDate& first, const QDate& last) {
            "HAVING SUM(tbZelmar_Movimentos_Inactivos.debito) > 1 ORDER BY no_kor"_s;
 }
 
+QString transferMovementsQuery(const QDate& first, const QDate& last, bool left) {
+    const QString table = left ? u"tbZelmar_Movimentos_Inactivos"_s : u"tbZelmar_Movimentos"_s;
+    return u"SELECT movimento_id, movimento_no, socio_id, debito FROM "_s + table + u' ' +
+           listed(table, first, last, u") AND (%1.modo_pagamento = 'TRF') "_s.arg(table)) +
+           u"ORDER BY movimento_id"_s;
+}
+
 QString typedTransfersQuery(const QDate& first, const QDate& last) {
     const auto day = [](const QDate& date) { return date.toString(u"M/d/yyyy"_s); };
     return u"SELECT tbZelmar_Movimentos.socio_id, tbSocios.no_kor, tbSocios.nome_guerra, "

@@ -19,6 +19,10 @@ QString chequeListQuery(const QDate& first, const QDate& last);
 /// above 1.
 QString transferListQuery(const QDate& first, const QDate& last);
 
+/// The movements that the sums of that list are made of, of members or of those who have left: a
+/// row is one movement.
+QString transferMovementsQuery(const QDate& first, const QDate& last, bool left);
+
 /// The transfers that are typed into the bank's program: those of the list above, in the order of
 /// the tables and without those who have left. A date that is not there leaves a query that fails.
 QString typedTransfersQuery(const QDate& first, const QDate& last);

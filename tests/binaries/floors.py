@@ -21,6 +21,7 @@ GROUND = {
                     "platform/ado/postgres",
     "platform/forms": "platform/core platform/ado platform/ado/engine",
     "platform/printing": "platform/core platform/ado platform/ado/engine platform/forms",
+    "platform/automation": "platform/core",
 }
 BASE = "platform/core platform/registry platform/com platform/ado platform/ado/engine"
 ROOM = BASE + " platform/forms platform/printing boundary/environment data"
@@ -29,7 +30,7 @@ FLOORS = GROUND | {
     "data": BASE + " boundary/environment",
     "coverage": ROOM,
     "masterdata": ROOM,
-    "payments": ROOM,
+    "payments": ROOM + " platform/automation reports",
     "reports": ROOM,
     "receipts": ROOM,
     "yearend": ROOM,
@@ -37,7 +38,8 @@ FLOORS = GROUND | {
     "boundary": ROOM + " coverage masterdata payments reports receipts yearend entry",
     "companions": BASE + " platform/forms",
     "database": BASE + " platform/ado/sqlite platform/ado/postgres",
-    "host": ROOM + " coverage receipts reports database",
+    "host/bankfile": BASE + " payments",
+    "host": ROOM + " coverage receipts reports database host/bankfile",
     "tour": ROOM + " database host",
 }
 # The plan's arithmetic, on plain values, serves the sample books as well.

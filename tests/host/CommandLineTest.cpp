@@ -26,6 +26,8 @@ TEST(CommandLine, NamesOneTask) {
          Task::InitServer},
         {u"copy sqlite:pasta/livro postgresql:srv/livro"_s, Task::Copy},
         {u"copy --admin ana postgresql:srv/livro sqlite:pasta/livro"_s, Task::Copy},
+        {u"bankfile --version 03 --without-refused --again 2026-01-01 2026-01-31 f.xml"_s,
+         Task::BankFile},
         {u"callplafonds MSAccess x"_s, Task::Operation},
     };
     for (const auto& [words, task] : cases)
@@ -47,6 +49,11 @@ TEST(CommandLine, NamesTheWordThatIsWrongAndDoesNothing) {
         {u"init --catalog livro pasta"_s, u"«--catalog»"_s},
         {u"copy sqlite:pasta/livro"_s, u"para onde se copia"_s},
         {u"copy --force sqlite:pasta/livro"_s, u"«--force»"_s},
+        {u"bankfile 2026-01-01 2026-01-31"_s, u"o ficheiro a fazer"_s},
+        {u"bankfile 2026-02-30 2026-03-01 f"_s, u"«2026-02-30»"_s},
+        {u"bankfile 2026-03-02 2026-03-01 f"_s, u"anterior"_s},
+        {u"bankfile --version 02 2026-01-01 2026-01-31 f"_s, u"«02»"_s},
+        {u"bankfile --again --without-sent 2026-01-01 2026-01-31 f"_s, u"não vão juntos"_s},
         {u"register --sample"_s, u"«--sample»"_s},
         {u"Despesas"_s, u"«Despesas»"_s},
         {u"NewMovimento talvez"_s, u"«talvez»"_s},

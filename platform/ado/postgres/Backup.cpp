@@ -6,12 +6,12 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QProcess>
-#include <QScopeGuard>
 #include <QStandardPaths>
 
 #include "platform/ado/engine/RowHolders.h"
 #include "platform/ado/postgres/Handle.h"
 #include "platform/core/Failure.h"
+#include "platform/core/NewFile.h"
 
 namespace ado::postgres {
 
@@ -63,24 +63,13 @@ bool canBackUp() {
 
 void backUp(const Address& book, const QString& file) {
     const QString what = u"Não foi possível fazer a cópia de segurança «%1»."_s.arg(file);
-    const QString staged = file + u".novo"_s;
-    if (QFile::exists(file))
-        throw core::Failure(core::InvalidCall,
-                            u"Já existe o ficheiro «%1». Não foi alterado."_s.arg(file));
-    QFile::remove(staged);
-    const auto cleanUp = qScopeGuard([&] { QFile::remove(staged); });
-    // Whoever makes it reads it, and nobody else: it holds what the book holds.
-    QFile made(staged);
-    if (!made.open(QIODevice::WriteOnly | QIODevice::NewOnly,
-                   QFileDevice::ReadOwner | QFileDevice::WriteOwner))
-        throw core::Failure(core::InvalidCall, what + u' ' + made.errorString());
-    made.close();
+    const core::NewFile made(file, what);
     // The journal of operations has policies, which let everybody read it.
     run(Dump,
         placeOf(book) << u"--format=custom"_s << u"--enable-row-security"_s << u"--file"_s
-                      << staged,
+                      << made.staged(),
         book.password, what);
-    if (!QFile::rename(staged, file)) throw core::Failure(core::InvalidCall, what);
+    made.commit();
 }
 
 void prove(const QString& file, const QStringList& tables) {

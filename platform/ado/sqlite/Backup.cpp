@@ -1,18 +1,17 @@
 // SPDX-License-Identifier: MIT
 #include "platform/ado/sqlite/Backup.h"
 
-#include <fcntl.h>
 #include <sqlite3.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <QFile>
 #include <QFileInfo>
-#include <QScopeGuard>
 #include <QSet>
 
 #include "platform/ado/sqlite/BookFile.h"
 #include "platform/core/Failure.h"
+#include "platform/core/NewFile.h"
 
 namespace ado::sqlite {
 
@@ -78,13 +77,6 @@ void copy(const Opened& from, const Opened& into, const QString& what) {
     if (result != SQLITE_DONE) throw failure(into.get(), what);
 }
 
-void sync(const QString& path, int flags) {
-    const int file = ::open(QFile::encodeName(path).constData(), flags | O_CLOEXEC);
-    if (file < 0) return;
-    ::fsync(file);
-    ::close(file);
-}
-
 /// The program and its user, as far as the system tells them.
 QString nameOf(const QString& process) {
     QFile comm(u"/proc/%1/comm"_s.arg(process));
@@ -98,31 +90,16 @@ QString nameOf(const QString& process) {
 
 void backUp(const QString& book, const QString& file) {
     const QString what = u"Não foi possível fazer a cópia de segurança «%1»."_s.arg(file);
-    const QString staged = file + u".novo"_s;
-    if (QFile::exists(file))
-        throw core::Failure(core::InvalidCall,
-                            u"Já existe o ficheiro «%1». Não foi alterado."_s.arg(file));
-    QFile::remove(staged);
-    const auto cleanUp = qScopeGuard([&] { QFile::remove(staged); });
-    // Whoever makes it reads it, and nobody else: it holds what the book holds.
-    const int made = ::open(QFile::encodeName(staged).constData(),
-                            O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0600);
-    if (made < 0) throw core::Failure(core::InvalidCall, what + u' ' + qt_error_string(errno));
-    ::close(made);
+    const core::NewFile made(file, what);
     {
         BookFile(book).refuseForeignJournal();
         const Opened from(book, SQLITE_OPEN_READWRITE, what);
-        const Opened into(staged, SQLITE_OPEN_READWRITE, what);
+        const Opened into(made.staged(), SQLITE_OPEN_READWRITE, what);
         copy(from, into, what);
         // One file, without others beside it.
         into.execute("PRAGMA journal_mode=DELETE");
     }
-    sync(staged, O_RDONLY);
-    const bool isNamed =
-        ::link(QFile::encodeName(staged).constData(), QFile::encodeName(file).constData()) == 0 ||
-        QFile::rename(staged, file);
-    if (!isNamed) throw core::Failure(core::InvalidCall, what);
-    sync(QFileInfo(file).path(), O_RDONLY | O_DIRECTORY);
+    made.commit();
 }
 
 void prove(const QString& file, const QStringList& tables) {
