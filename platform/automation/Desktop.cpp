@@ -16,18 +16,18 @@ namespace automation {
 
 namespace {
 
-/// A window manager brings a window to the front within some ten milliseconds.
-constexpr Milliseconds UntilInFront{2000};
+/// A window manager brings a window to the front within some ten milliseconds, and on a machine
+/// that is at work within seconds.
+constexpr Milliseconds UntilInFront{5000};
 /// A program that is at work answers late; one that never does is given the pause below.
 constexpr Milliseconds UntilAnswered{5000};
-constexpr Milliseconds BetweenLooks{50};
 constexpr unsigned long PauseWithoutAnswer = 150;
 /// A program answers a question as soon as it has come; the keys before it may still be on their
 /// way to a control then. At the second answer, a little later, they have been dealt with.
 constexpr int Answers = 2;
 constexpr unsigned long BetweenAnswers = 2;
 constexpr Milliseconds UntilManaged{1000};
-constexpr Milliseconds UntilSettled{500};
+constexpr Milliseconds UntilSettled{2000};
 /// Windows that come to the front one after the other by one key.
 constexpr int MostWindows = 5;
 
@@ -139,6 +139,9 @@ void Desktop::type(const std::vector<Stroke>& strokes) {
 
 /// The question that window managers ask to know whether a program is still at work.
 Desktop::Answer Desktop::ping(Window window) {
+    // A window that the keys close goes without an answer; its end is told instead.
+    const uint32_t itsEnd = XCB_EVENT_MASK_STRUCTURE_NOTIFY;
+    xcb_change_window_attributes(display_, window, XCB_CW_EVENT_MASK, &itsEnd);
     const std::vector<quint32> protocols = numbers(window, "WM_PROTOCOLS");
     const quint32 question = display_.atom("_NET_WM_PING");
     if (std::find(protocols.begin(), protocols.end(), question) == protocols.end())
@@ -152,17 +155,21 @@ Desktop::Answer Desktop::ping(Window window) {
     }
     const uint32_t number = ++lastPing_;
     tell(window, window, XCB_EVENT_MASK_NO_EVENT, "WM_PROTOCOLS", {question, number, window});
-    const auto isAnswer = [&](const xcb_generic_event_t& event) {
+    Answer answer = Answer::None;
+    display_.wait(UntilAnswered, [&](const xcb_generic_event_t& event) {
+        const auto* end = as<xcb_destroy_notify_event_t>(event, XCB_DESTROY_NOTIFY);
+        if (end && end->window == window) {
+            answer = Answer::Gone;
+            return true;
+        }
         const auto* message = as<xcb_client_message_event_t>(event, XCB_CLIENT_MESSAGE);
-        return message && message->data.data32[0] == question &&
-               message->data.data32[1] == number && message->data.data32[2] == window;
-    };
-    const QDeadlineTimer deadline(UntilAnswered);
-    while (!deadline.hasExpired()) {
-        if (display_.wait(BetweenLooks, isAnswer)) return Answer::Came;
-        if (!isThere(window)) return Answer::Gone;
-    }
-    return Answer::None;
+        if (!message || message->data.data32[0] != question || message->data.data32[1] != number ||
+            message->data.data32[2] != window)
+            return false;
+        answer = Answer::Came;
+        return true;
+    });
+    return answer;
 }
 
 /// The window manager deals with one thing after the other: once it answers, what was opened or

@@ -24,12 +24,18 @@ NAMES = ["Zé d'Além", 'A "Grande"', "Çãõ Éü", "+^%~(){}[]", "x'; DROP TAB
          "{ENTER}", "50% +1", "Ana & Rui <x>", "  dois  espaços", "ñ ß œ"]
 
 
+# Seconds: until the rows begin, with all that is late, and for a row. Much more than it takes, for a
+# machine with other work.
+BEFORE_ROWS = 90
+A_ROW = 5
+
+
 class Bank:
     """The stand-in as programs.ini names it, with manners of its own for each run."""
 
     def __init__(self, desktop, programs):
         self.desktop = desktop
-        self.program = os.path.join(programs, "bank_terminal")
+        self.program = os.path.join(os.path.abspath(programs), "bank_terminal")
         self.folder = desktop.environment["XDG_CONFIG_HOME"]
         self.runs = 0
 
@@ -54,7 +60,7 @@ class Bank:
         return len(self.lines()) - len(self.transfers())
 
     def quit(self):
-        self.desktop.run(["pkill", "-x", "bank_terminal"])
+        self.desktop.run(["pkill", "-f", "--", f"--record {self.record} "])
 
 
 def pay(book, rows):
@@ -132,7 +138,7 @@ def whole_run(desktop, host, bank, expected):
     bank.behave("--login-after", "2500", "--modules-after", "4000")
     start(desktop)
     wait_until("all rows are typed", lambda: bank.rows_done() == len(expected),
-               30 + len(expected))
+               BEFORE_ROWS + A_ROW * len(expected))
     desktop.at("Transferências")
     desktop.settled("Transferências")
     compare(bank.transfers(), expected)
@@ -144,7 +150,7 @@ def whole_run(desktop, host, bank, expected):
 def lost_window(desktop, host, bank, expected):
     bank.behave("--login-after", "100", "--lose-window-at", "7")
     start(desktop)
-    wait_until("six rows are typed", lambda: bank.rows_done() == 6)
+    wait_until("six rows are typed", lambda: bank.rows_done() == 6, BEFORE_ROWS + A_ROW * 6)
     desktop.settled("")  # a moment in which more could be typed
     compare(bank.transfers(), expected[:6])
     wait_until("the module is there again", lambda: desktop.run(
@@ -153,7 +159,8 @@ def lost_window(desktop, host, bank, expected):
     desktop.turn_to(desktop.window_of(host, BANK))
     desktop.at(BANK)
     desktop.keys("alt+c")
-    wait_until("all rows are typed again", lambda: bank.rows_done() == 6 + len(expected))
+    wait_until("all rows are typed again", lambda: bank.rows_done() == 6 + len(expected),
+               BEFORE_ROWS + A_ROW * len(expected))
     desktop.at("Transferências")
     desktop.settled("Transferências")
     compare(bank.transfers(), expected[:6] + expected)
