@@ -72,9 +72,9 @@ bool makeBankFile(const CommandLine& line) {
                                    return tellRepeated(repeated, line);
                                });
     if (made)
-        say(u"%1 transferências, %2, em %3"_s.arg(
+        say(u"%1 transferências, %2%3, em %4"_s.arg(
             core::grouped(static_cast<qint64>(made->payments)), bankfile::shownAmount(made->sum),
-            file));
+            made->rounding, file));
     return made.has_value();
 }
 

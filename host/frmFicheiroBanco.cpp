@@ -220,15 +220,16 @@ void frmFicheiroBanco::show(Batch batch) {
     batch_ = std::move(batch);
     std::vector<QStringList> goes;
     for (const bankfile::Payment& each : batch_.payments)
-        goes.push_back({each.row.staffNumber, each.name, each.iban, shownAmount(each.row.amount),
-                        each.reference});
+        goes.push_back(
+            {each.row.staffNumber, each.name, each.iban, shownAmount(each.amount), each.reference});
     std::vector<QStringList> refused;
     for (const bankfile::Refused& each : batch_.refused)
         refused.push_back({each.row.staffNumber, each.row.name, each.row.nib,
                            shownAmount(each.row.amount), each.why});
     Table1->setRows(std::move(goes));
     Table2->setRows(std::move(refused));
-    Label1->setText(u"Vão no ficheiro: "_s + counted(batch_.payments.size(), batch_.sum()));
+    Label1->setText(u"Vão no ficheiro: "_s + counted(batch_.payments.size(), batch_.sum()) +
+                    bankfile::shownRounding(batch_.payments));
     Label2->setText(u"Não podem ir: "_s + counted(batch_.refused.size(), batch_.refusedSum()));
 }
 

@@ -48,8 +48,8 @@ std::vector<Repeated> repeatedOf(const Batch& batch, const SentMovements& sent) 
 SentFile recordOf(const Order& order, const QDateTime& when) {
     SentFile record{.when = when, .who = who(), .file = order.file, .book = order.book};
     for (const Payment& payment : order.batch.payments)
-        record.transfers.push_back({payment.row.staffNumber, payment.row.amount, payment.reference,
-                                    payment.row.movements});
+        record.transfers.push_back(
+            {payment.row.staffNumber, payment.amount, payment.reference, payment.row.movements});
     return record;
 }
 
@@ -122,7 +122,8 @@ std::optional<Made> makeBankFile(const Order& asked, const AskRepetition& ask) {
         throw;
     }
     sent.finish(message);
-    return Made{order.batch.payments.size(), order.batch.sum()};
+    return Made{order.batch.payments.size(), order.batch.sum(),
+                shownRounding(order.batch.payments)};
 }
 
 }  // namespace bankfile

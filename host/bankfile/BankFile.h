@@ -42,6 +42,7 @@ using AskRepetition = std::function<Repetition(const std::vector<Repeated>&)>;
 struct Made {
     std::size_t payments;
     core::Money sum;
+    QString rounding;  ///< as shownRounding() tells it
 };
 
 /// Makes the file, of the lines that can go, and keeps a record of it. The record stands before the

@@ -25,17 +25,21 @@ bool namesSomebody(const QString& name) {
     return std::any_of(name.begin(), name.end(), [](QChar c) { return c.isLetterOrNumber(); });
 }
 
+/// As the printed list shows it and as a bank can pay it: to the nearest cent, halves up.
+core::Money toCents(core::Money amount) {
+    const qint64 half = amount.units() < 0 ? -UnitsOfACent / 2 : UnitsOfACent / 2;
+    return core::Money::fromUnits((amount.units() + half) / UnitsOfACent * UnitsOfACent);
+}
+
 /// Why a line cannot go; empty when it can.
-QString fault(const TransferRow& row, const QString& name) {
+QString fault(const TransferRow& row, core::Money amount, const QString& name) {
     if (row.nib.isEmpty()) return u"não tem NIB"_s;
     const bool areDigits =
         std::all_of(row.nib.begin(), row.nib.end(), [](QChar c) { return c >= u'0' && c <= u'9'; });
     if (row.nib.size() != NibLength || !areDigits) return u"o NIB não tem 21 algarismos"_s;
     if (!isNib(row.nib)) return u"os algarismos de controlo do NIB não estão certos"_s;
-    if (row.amount <= core::Money()) return u"o montante não é superior a zero"_s;
-    if (row.amount.units() % UnitsOfACent != 0)
-        return u"o montante tem mais de duas casas decimais"_s;
-    if (row.amount > Largest) return u"o montante é superior a 999.999.999,99"_s;
+    if (amount <= core::Money()) return u"o montante não é superior a zero"_s;
+    if (amount > Largest) return u"o montante é superior a 999.999.999,99"_s;
     if (!namesSomebody(name)) return u"não tem nome"_s;
     return {};
 }
@@ -83,9 +87,19 @@ QString shownAmount(core::Money amount) {
     return u"€ "_s + sign + core::grouped(whole) + core::decimalMark() + plain.mid(point + 1);
 }
 
+QString shownRounding(const std::vector<Payment>& payments) {
+    core::Money rounding;
+    for (const Payment& payment : payments)
+        rounding = rounding + (payment.amount - payment.row.amount);
+    if (rounding == core::Money()) return {};
+    const bool isMore = rounding > core::Money();
+    return u" (arredondadas ao cêntimo: %1 a %2)"_s.arg(shownAmount(isMore ? rounding : -rounding),
+                                                        isMore ? u"mais"_s : u"menos"_s);
+}
+
 core::Money Batch::sum() const {
     core::Money sum;
-    for (const Payment& payment : payments) sum = sum + payment.row.amount;
+    for (const Payment& payment : payments) sum = sum + payment.amount;
     return sum;
 }
 
@@ -99,8 +113,9 @@ Batch batchOf(std::vector<TransferRow> rows) {
     Batch batch;
     QSet<QString> references;
     for (TransferRow& row : rows) {
+        const core::Money amount = toCents(row.amount);
         const QString name = bankText(row.name, MostOfName);
-        const QString why = fault(row, name);
+        const QString why = fault(row, amount, name);
         if (!why.isEmpty()) {
             batch.refused.push_back({std::move(row), why});
             continue;
@@ -108,7 +123,7 @@ Batch batchOf(std::vector<TransferRow> rows) {
         const QString reference = uniqueReference(row.numbers, references);
         const QString explanation = explanationOf(row, reference);
         const QString iban = ibanOf(row.nib);
-        batch.payments.push_back({std::move(row), iban, name, reference, explanation});
+        batch.payments.push_back({std::move(row), amount, iban, name, reference, explanation});
     }
     return batch;
 }

@@ -8,6 +8,7 @@ namespace bankfile {
 /// A line that goes to the bank.
 struct Payment {
     TransferRow row;
+    core::Money amount;  ///< of the row, to the nearest cent as the printed list shows it
     QString iban;
     QString name;         ///< as the bank takes it
     QString reference;    ///< from end to end; names the movements, unique in its file
@@ -35,8 +36,11 @@ struct Batch {
     friend bool operator==(const Batch&, const Batch&) = default;
 };
 
-/// No amount is ever rounded: one with more than two decimals is refused.
 Batch batchOf(std::vector<TransferRow> rows);
+
+/// What rounding to cents comes to, to stand behind the sum of the payments; empty where it is
+/// nothing.
+QString shownRounding(const std::vector<Payment>& payments);
 
 /// An amount for people, with all of its decimals where it has more than two.
 QString shownAmount(core::Money amount);

@@ -21,7 +21,7 @@ class Writer {
 public:
     Writer(const CreditTransferFile& file, QString& text) : file_(file), xml_(&text) {
         core::Money sum;
-        for (const Payment& payment : file.payments) sum = sum + payment.row.amount;
+        for (const Payment& payment : file.payments) sum = sum + payment.amount;
         sum_ = amountText(sum);
         count_ = QString::number(file.payments.size());
     }
@@ -109,7 +109,7 @@ private:
             within(u"Amt"_s, [&] {
                 within(u"InstdAmt"_s, [&] {
                     xml_.writeAttribute(u"Ccy"_s, u"EUR"_s);
-                    xml_.writeCharacters(amountText(payment.row.amount));
+                    xml_.writeCharacters(amountText(payment.amount));
                 });
             });
             within(u"Cdtr"_s, [&] { text(u"Nm"_s, payment.name); });

@@ -78,8 +78,6 @@ TEST(Batch, TellsWhyALineCannotGo) {
          u"os algarismos de controlo do NIB não estão certos"_s},
         {row(GoodNib, 0), u"o montante não é superior a zero"_s},
         {row(GoodNib, -20'000), u"o montante não é superior a zero"_s},
-        {row(GoodNib, 20'050), u"o montante tem mais de duas casas decimais"_s},
-        {row(GoodNib, 20'001), u"o montante tem mais de duas casas decimais"_s},
         {row(GoodNib, 10'000'000'000'000), u"o montante é superior a 999.999.999,99"_s},
         {row(GoodNib, 20'000, {}), u"não tem nome"_s},
         {row(GoodNib, 20'000, u" «-» "_s), u"não tem nome"_s},
@@ -89,6 +87,13 @@ TEST(Batch, TellsWhyALineCannotGo) {
         EXPECT_EQ(batch.payments.size(), why.isEmpty() ? 1u : 0u) << why.toStdString();
         EXPECT_EQ(batch.refused.empty() ? QString() : batch.refused.front().why, why);
     }
+    const Batch rounded = batchOf({row(GoodNib, 20'050), row(GoodNib, 20'049)});
+    EXPECT_EQ(rounded.sum(), core::Money::fromUnits(20'100 + 20'000));
+    EXPECT_EQ(bankfile::shownRounding(rounded.payments),
+              u" (arredondadas ao cêntimo: € 0,0001 a mais)"_s);
+    EXPECT_EQ(bankfile::shownRounding(batchOf({row(GoodNib, 20'049)}).payments),
+              u" (arredondadas ao cêntimo: € 0,0049 a menos)"_s);
+    EXPECT_EQ(bankfile::shownRounding(batchOf({row(GoodNib, 20'000)}).payments), QString());
     EXPECT_EQ(shownAmount(core::Money::fromUnits(12'345'000)), u"€ 1.234,50"_s);
     EXPECT_EQ(shownAmount(core::Money::fromUnits(12'345'050)), u"€ 1.234,5050"_s);
     EXPECT_EQ(shownAmount(core::Money::fromUnits(-5'001)), u"€ -0,5001"_s);
