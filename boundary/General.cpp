@@ -15,8 +15,12 @@
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/MsgBoxes.h"
+#include "platform/printing/DataReport.h"
 #include "receipts/ReceiptRoute.h"
+#include "reports/DebtReports.h"
+#include "reports/ReportRows.h"
 #include "reports/frmExtratos.h"
+#include "reports/frmIRS.h"
 #include "yearend/frmFechoAno.h"
 #include "yearend/frmManutencaoDados.h"
 
@@ -119,12 +123,6 @@ void showList(const QString& table, const QString* strConMember, const QString* 
     screen.ShowModal();
 }
 
-/// An operation whose screen is still to come.
-void openLater() {
-    const Operation running;
-    if (loggedInOrRefused()) throw core::Failure(core::InvalidCall, NotYet);
-}
-
 /// One of the operations whose failures say nothing and give false. That its screen is still to
 /// come is said in a box, as nobody would hear of it otherwise.
 bool openLaterInSilence() {
@@ -136,6 +134,18 @@ bool openLaterInSilence() {
         // Intentional: the result alone tells the host.
     }
     return false;
+}
+
+/// A preview that the operation does not wait for, of the rows as the command is designed. What
+/// fails is passed over: the result is false then, and the pending error says why.
+bool showDebts(const printing::Report& design) {
+    const Operation running;
+    return core::passingOver([&] {
+        openingPreamble();
+        requireApplication();
+        const ado::RecordsetPtr rows = reports::openReportRows(design.dataMember);
+        printing::DataReport(design).Show(rows, printing::DataReport::Wait::Modeless);
+    });
 }
 
 }  // namespace
@@ -158,7 +168,7 @@ void General::CallManutencaoDados() {
 }
 
 void General::CallIRS() {
-    openLater();
+    showModal<reports::frmIRS>();
 }
 
 void General::CallFechoAno() {
@@ -204,11 +214,11 @@ void General::LPagamentos() {
 }
 
 bool General::Ldividas() {
-    return openLaterInSilence();
+    return showDebts(reports::Print_frmListagemDividas());
 }
 
 bool General::Lcartasdividas() {
-    return openLaterInSilence();
+    return showDebts(reports::Print_frmCartasDividas());
 }
 
 bool General::Lhospitais() {

@@ -19,7 +19,7 @@ constexpr Signature Signatures[] = {
     {"CallPlafonds", 0, 2, true},
     {"CallHospitais", 0, 2, true},
     {"CallManutencaoDados", 0, 0, true},
-    {"CallIRS", 0, 0},
+    {"CallIRS", 0, 0, true},
     {"CallFechoAno", 0, 0, true},
     {"Login", 0, 5, true},
     {"Registo", 1, 1, true},
@@ -28,8 +28,8 @@ constexpr Signature Signatures[] = {
     {"Recebimento", 0, 2, true},
     {"Extratos", 0, 2, true},
     {"LPagamentos", 0, 0, true},
-    {"Ldividas", 0, 0},
-    {"Lcartasdividas", 0, 0},
+    {"Ldividas", 0, 0, true},
+    {"Lcartasdividas", 0, 0, true},
     {"Lhospitais", 0, 0},
 };
 

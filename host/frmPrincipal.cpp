@@ -19,6 +19,7 @@
 #include "host/frmFicheiroBanco.h"
 #include "host/frmPrepararFecho.h"
 #include "host/frmVerificacao.h"
+#include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/RecordScreen.h"
 
@@ -211,8 +212,19 @@ void frmPrincipal::runUnguarded(const OperationCall& call) {
         // Only after the box has closed, because that gives the focus back to this window.
         return bringForward(entry);
     }
-    forms::handle([&] { operations_.call(call); });
+    forms::handle([&] {
+        const QVariant result = operations_.call(call);
+        if (result.typeId() == QMetaType::Bool && !result.toBool()) tellWhyNot();
+    });
     movements_->takeNewer();
+}
+
+/// Some operations fail without a word; why, they leave behind as the pending error.
+void frmPrincipal::tellWhyNot() {
+    const QString why = core::err().description();
+    statusBar()->showMessage(
+        u"Não foi possível executar o pedido."_s + (why.isEmpty() ? QString() : u' ' + why),
+        MessageTime);
 }
 
 void frmPrincipal::login() {

@@ -51,6 +51,7 @@ private:
     void guardKeys();
     void runUnguarded(const OperationCall& call);
     void once(const std::function<void()>& handler);
+    void tellWhyNot();
     void login();
     void checkBook();
     void makeBankFile();

@@ -205,21 +205,38 @@ public:
         player_.step(u"box:Deseja abortar"_s, {}, typing({u"<Alt+S>"_s}));
     }
 
+    /// Who owes, and what was borne in a closed year.
+    void debtsAndTaxes() {
+        open({}, {u"Ldividas"_s, {}});
+        player_.step(u"Print_frmListagemDividas"_s, u"27-dividas"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        open({}, {u"Lcartasdividas"_s, {}});
+        player_.step(u"Print_frmCartasDividas"_s, u"28-cartas"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        open({}, {u"CallIRS"_s, {}});
+        player_.step(u"frmIRS"_s, {},
+                     typing({u"<Tab>"_s, u"<Space>"_s, u"<Tab>"_s, u"<Ctrl+A>"_s}));
+        player_.step(u"frmIRS"_s, u"29-irs"_s, typing({u"<Alt+I>"_s}));
+        player_.step(u"prtIRS"_s, u"30-declaracao"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        leaveList(u"frmIRS"_s);
+    }
+
     /// The repair of the book and the close of the year.
     void yearEnd(const QString& backup) {
         open({}, {u"CallManutencaoDados"_s, {}});
         player_.step(u"frmManutencaoDados"_s, {}, typing({u"<Alt+I>"_s}));
         player_.step(u"box:Manutenção de Dados Concluída."_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmManutencaoDados"_s, u"27-manutencao"_s, typing({u"<Alt+F>"_s}));
+        player_.step(u"frmManutencaoDados"_s, u"31-manutencao"_s, typing({u"<Alt+F>"_s}));
         choose(u"Verificar"_s);
-        player_.step(u"frmVerificacao"_s, u"28-verificacao"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmVerificacao"_s, u"32-verificacao"_s, typing({u"<Alt+S>"_s}));
         choose(u"CallFechoAno"_s);
-        player_.step(u"frmPrepararFecho"_s, u"29-preparar-o-fecho"_s,
+        player_.step(u"frmPrepararFecho"_s, u"33-preparar-o-fecho"_s,
                      typing({u"<Ctrl+A>"_s, backup, u"<Alt+F>"_s}));
         player_.step(u"frmFechoAno"_s, {}, typing({u"<Alt+F>"_s}));
-        player_.step(u"box:Tem a certeza"_s, u"30-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Tem a certeza"_s, u"34-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"box:Procedimentos de Fim de Ano"_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmFechoAno"_s, u"31-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmFechoAno"_s, u"35-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
@@ -229,8 +246,8 @@ private:
                      [this, call](QWidget*) { operations_.call(call); });
     }
 
-    /// Leaves a list whose record has just been left; its button takes a press once it has
-    /// returned.
+    /// Leaves a screen whose record or preview has just been left; its button takes a press once it
+    /// has returned.
     void leaveList(const QString& list) {
         player_.step(list, {}, {});
         player_.step(list, {}, typing({u"<Alt+S>"_s}));
@@ -298,6 +315,7 @@ bool play(const QString& folder) {
     script.extract(extract);
     script.masterData();
     script.payments();
+    script.debtsAndTaxes();
     script.yearEnd(own.filePath(u"antes-do-fecho.copia"_s));
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
