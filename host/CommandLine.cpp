@@ -158,6 +158,33 @@ CommandLine bankFileLine(const QStringList& all) {
     return words.ended(line);
 }
 
+CommandLine documentsLine(const QStringList& all) {
+    Words words(all);
+    CommandLine line{.task = CommandLine::Task::Documents};
+    line.together = words.flag(u"--together"_s);
+    line.wish.detailed = words.flag(u"--detailed"_s);
+    const QString kind = words.next(u"o que se faz: letters, declarations ou extracts"_s);
+    if (kind == "letters"_L1) {
+        line.wish.kind = documents::Kind::Letters;
+    } else if (kind == "declarations"_L1) {
+        line.wish.kind = documents::Kind::Declarations;
+        const QString year = words.next(u"o ano"_s);
+        line.wish.year = year.toInt();
+        words.require(line.wish.year > 0, u"«%1» não é um ano."_s.arg(year));
+    } else if (kind == "extracts"_L1) {
+        line.wish.first = words.nextDay(u"o primeiro dia"_s);
+        line.wish.last = words.nextDay(u"o último dia"_s);
+        words.require(line.wish.first <= line.wish.last, u"o último dia é anterior ao primeiro."_s);
+    } else {
+        words.require(false,
+                      u"não há documentos «%1»; há letters, declarations e extracts."_s.arg(kind));
+    }
+    words.require(!line.wish.detailed || line.wish.kind == documents::Kind::Extracts,
+                  u"«--detailed» é só dos extratos."_s);
+    line.file = words.next(line.together ? u"o ficheiro a fazer"_s : u"a pasta"_s);
+    return words.ended(line);
+}
+
 CommandLine registerLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::Register};
@@ -185,6 +212,7 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     if (first == "backup"_L1) return backupLine(words, Task::Backup);
     if (first == "restore"_L1) return backupLine(words, Task::Restore);
     if (first == "bankfile"_L1) return bankFileLine(words);
+    if (first == "documents"_L1) return documentsLine(words);
     if (first == "register"_L1) return registerLine(words);
     if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
     if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});

@@ -5,6 +5,7 @@
 #include <QStringList>
 
 #include "host/Operations.h"
+#include "host/documents/MemberDocuments.h"
 
 namespace host {
 
@@ -20,6 +21,7 @@ struct CommandLine {
         Backup,
         Restore,
         BankFile,
+        Documents,
         Register,
         Help,
         Version,
@@ -38,13 +40,15 @@ struct CommandLine {
     QString from = {};   ///< of Copy, as database::BookPlace reads it
     QString into = {};
     QString book = {};  ///< of Check, Backup and Restore, likewise; empty for that of the settings
-    QString file = {};  ///< of Backup, Restore and BankFile
+    QString file = {};  ///< of Backup, Restore, BankFile and Documents
     QDate first = {};   ///< of BankFile: the days that are paid
     QDate last = {};
     QString version = {};         ///< of BankFile; empty for that of the settings
     bool withoutRefused = false;  ///< of BankFile: also where lines cannot go
     bool withoutSent = false;     ///< of BankFile: leaves out what was sent before
     bool again = false;           ///< of BankFile: also what was sent before
+    documents::Wish wish = {};    ///< of Documents; `file` is the folder, or the one file
+    bool together = false;        ///< of Documents: all in one file
     bool sample = false;          ///< of Init and InitServer: with the sample content
     bool ifNeeded = false;        ///< of Init: only when no book is set up for this user
     bool undo = false;            ///< of Register

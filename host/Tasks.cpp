@@ -6,6 +6,7 @@
 #include "host/BankFileTask.h"
 #include "host/BookTasks.h"
 #include "host/Console.h"
+#include "host/DocumentsTask.h"
 #include "host/frmPrincipal.h"
 #include "platform/com/Place.h"
 #include "platform/core/Failure.h"
@@ -51,6 +52,9 @@ int showOperation(const OperationCall& call) {
     forms::handle([&] {
         const QVariant result = operations.call(call);
         isDone = result.typeId() != QMetaType::Bool || result.toBool();
+        // The operations that fail without a word leave the reason behind.
+        if (!isDone)
+            complain(u"Não foi possível executar o pedido. "_s + core::err().description());
     });
     if (!hasWindow()) return isDone ? Done : Failed;
     LastWindow last;
@@ -88,6 +92,9 @@ int performUntrapped(const CommandLine& line) {
             return Done;
         case Task::Restore:
             restoreBook(line);
+            return Done;
+        case Task::Documents:
+            makeDocuments(line);
             return Done;
         case Task::BankFile:
             return makeBankFile(line) ? Done : Failed;

@@ -16,6 +16,7 @@
 #include "host/MovementsView.h"
 #include "host/RulesConnection.h"
 #include "host/UnfinishedOperations.h"
+#include "host/frmDocumentos.h"
 #include "host/frmFicheiroBanco.h"
 #include "host/frmPrepararFecho.h"
 #include "host/frmVerificacao.h"
@@ -122,6 +123,8 @@ void frmPrincipal::addListingMenus() {
     QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
     addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
     addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
+    addItem(extracts, u"Documentos"_s, u"&Documentos de todos os associados…"_s, {},
+            [this] { once([this] { makeDocuments(); }); });
     QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
     addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
     addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});
@@ -244,6 +247,11 @@ void frmPrincipal::checkBook() {
 
 void frmPrincipal::makeBankFile() {
     auto* shown = new frmFicheiroBanco;
+    shown->ShowModal();
+}
+
+void frmPrincipal::makeDocuments() {
+    auto* shown = new frmDocumentos;
     shown->ShowModal();
 }
 

@@ -55,6 +55,7 @@ private:
     void login();
     void checkBook();
     void makeBankFile();
+    void makeDocuments();
     void closeYear();
     void offerToFinish();
     void showCount(const QString& text);

@@ -27,6 +27,11 @@ int main(int argc, char** argv) {
     QStringList words;
     for (int at = 1; at < argc; ++at) words.append(QString::fromLocal8Bit(argv[at]));
     const host::CommandLine line = host::CommandLine::parsed(words);
+    if (line.task == host::CommandLine::Task::Documents) {
+        // Pages are laid out with the fonts of a screen, and shown on none.
+        qputenv("QT_QPA_PLATFORM", "offscreen");
+        return performWith(std::make_unique<QApplication>(argc, argv), line);
+    }
     if (!line.needsScreen())
         return performWith(std::make_unique<QCoreApplication>(argc, argv), line);
     if (!hasScreen()) {

@@ -2,6 +2,7 @@
 #include "reports/ExtractReports.h"
 
 #include "platform/core/Format.h"
+#include "platform/core/Values.h"
 #include "reports/Furniture.h"
 
 using namespace Qt::StringLiterals;
@@ -145,6 +146,22 @@ Report rptExtrato2() {
     addTotal(footer, Total::Of::Sum, u"Total Recebido:"_s, u"debito"_s, Money);
     addTotal(footer, Total::Of::Sum, u"Total em Dívida:"_s, u"saldo"_s, Money);
     addTotal(footer, Total::Of::Sum, u"Escudos"_s, u"euros"_s, Escudos);
+    return report;
+}
+
+DataReport extractOf(const ado::Recordset& member, bool detailed) {
+    DataReport report(detailed ? prtExtrato1() : rptExtrato2());
+    const auto text = [&member](const QString& column) {
+        return core::toText(member.Collect(column));
+    };
+    const std::pair<QString, QString> captions[] = {
+        {u"nib"_s, text(u"nib"_s)},
+        {u"no_kor"_s, text(u"no_kor"_s)},
+        {u"nome"_s, text(u"nome"_s)},
+        {u"morada"_s, text(u"morada1"_s)},
+        {u"localidade"_s, text(u"code_postal1"_s) + u' ' + text(u"localidade1"_s)},
+    };
+    for (const auto& [label, caption] : captions) report.setCaption(u"Section4"_s, label, caption);
     return report;
 }
 

@@ -228,22 +228,9 @@ void frmExtratos::Imprimir_Click() {
 }
 
 void frmExtratos::print(const ado::Recordset& member) {
-    DataReport report(Check2->Value() ? prtExtrato1() : rptExtrato2());
+    const DataReport report = extractOf(member, Check2->Value());
     const ado::RecordsetPtr rows =
         openReportRows(report.design().dataMember, extractQuery(selection()));
-
-    const auto text = [&member](const QString& column) {
-        return core::toText(member.Collect(column));
-    };
-    const std::pair<QString, QString> captions[] = {
-        {u"nib"_s, text(u"nib"_s)},
-        {u"no_kor"_s, text(u"no_kor"_s)},
-        {u"nome"_s, text(u"nome"_s)},
-        {u"morada"_s, text(u"morada1"_s)},
-        {u"localidade"_s, text(u"code_postal1"_s) + u' ' + text(u"localidade1"_s)},
-    };
-    for (const auto& [label, caption] : captions) report.setCaption(u"Section4"_s, label, caption);
-
     if (Check1->Value())
         report.PrintReport(rows);
     else

@@ -220,6 +220,8 @@ public:
         player_.step(u"prtIRS"_s, u"30-declaracao"_s, typing({u"<Escape>"_s}),
                      says(u"Estado"_s, u"Página 1"_s));
         leaveList(u"frmIRS"_s);
+        choose(u"Documentos"_s);
+        player_.step(u"frmDocumentos"_s, u"31-documentos"_s, typing({u"<Escape>"_s}));
     }
 
     /// The repair of the book and the close of the year.
@@ -227,16 +229,16 @@ public:
         open({}, {u"CallManutencaoDados"_s, {}});
         player_.step(u"frmManutencaoDados"_s, {}, typing({u"<Alt+I>"_s}));
         player_.step(u"box:Manutenção de Dados Concluída."_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmManutencaoDados"_s, u"31-manutencao"_s, typing({u"<Alt+F>"_s}));
+        player_.step(u"frmManutencaoDados"_s, u"32-manutencao"_s, typing({u"<Alt+F>"_s}));
         choose(u"Verificar"_s);
-        player_.step(u"frmVerificacao"_s, u"32-verificacao"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmVerificacao"_s, u"33-verificacao"_s, typing({u"<Alt+S>"_s}));
         choose(u"CallFechoAno"_s);
-        player_.step(u"frmPrepararFecho"_s, u"33-preparar-o-fecho"_s,
+        player_.step(u"frmPrepararFecho"_s, u"34-preparar-o-fecho"_s,
                      typing({u"<Ctrl+A>"_s, backup, u"<Alt+F>"_s}));
         player_.step(u"frmFechoAno"_s, {}, typing({u"<Alt+F>"_s}));
-        player_.step(u"box:Tem a certeza"_s, u"34-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Tem a certeza"_s, u"35-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"box:Procedimentos de Fim de Ano"_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmFechoAno"_s, u"35-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmFechoAno"_s, u"36-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
