@@ -17,6 +17,7 @@
 #include "platform/forms/MsgBoxes.h"
 #include "receipts/ReceiptRoute.h"
 #include "reports/frmExtratos.h"
+#include "reports/frmListagemHospitais.h"
 #include "yearend/frmFechoAno.h"
 #include "yearend/frmManutencaoDados.h"
 
@@ -212,5 +213,14 @@ bool General::Lcartasdividas() {
 }
 
 bool General::Lhospitais() {
-    return openLaterInSilence();
+    const Operation running;
+    try {
+        openingPreamble();
+        requireApplication();
+        forms::DefaultInstance<reports::frmListagemHospitais>::get().ShowModal();
+        return true;
+    } catch (const std::exception&) {
+        // Intentional: the result alone tells the host.
+        return false;
+    }
 }

@@ -12,7 +12,6 @@
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Fields.h"
-#include "platform/printing/DataReport.h"
 #include "reports/ExtractQuery.h"
 #include "reports/ExtractReports.h"
 #include "reports/ReportRows.h"
@@ -229,9 +228,6 @@ void frmExtratos::Imprimir_Click() {
 
 void frmExtratos::print(const ado::Recordset& member) {
     DataReport report(Check2->Value() ? prtExtrato1() : rptExtrato2());
-    const ado::RecordsetPtr rows =
-        openReportRows(report.design().dataMember, extractQuery(selection()));
-
     const auto text = [&member](const QString& column) {
         return core::toText(member.Collect(column));
     };
@@ -244,11 +240,7 @@ void frmExtratos::print(const ado::Recordset& member) {
     };
     for (const auto& [label, caption] : captions) report.setCaption(u"Section4"_s, label, caption);
 
-    if (Check1->Value())
-        report.PrintReport(rows);
-    else
-        report.Show(rows, DataReport::Wait::Modal);
-    rows->Close();
+    printOrShow(report, extractQuery(selection()), Check1->Value());
 }
 
 void frmExtratos::Command4_Click() {
