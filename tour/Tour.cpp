@@ -205,6 +205,16 @@ public:
         player_.step(u"box:Deseja abortar"_s, {}, typing({u"<Alt+S>"_s}));
     }
 
+    /// What each hospital's bills came to since the beginning of the year.
+    void hospitalList() {
+        const QString newYear = core::today().toString(u"01-01-yyyy"_s);
+        open({}, {u"Lhospitais"_s, {}});
+        player_.step(u"frmListagemHospitais"_s, {}, typing({newYear, u"<Tab>"_s}));
+        player_.step(u"frmListagemHospitais"_s, u"32-hospitais-listagem"_s, typing({u"<Alt+O>"_s}));
+        player_.step(u"Print_frmListagemHospitais"_s, u"33-hospitais-mapa"_s,
+                     typing({u"<Escape>"_s}), says(u"Estado"_s, u"Página 1"_s));
+    }
+
     /// The repair of the book and the close of the year.
     void yearEnd(const QString& backup) {
         open({}, {u"CallManutencaoDados"_s, {}});
@@ -298,6 +308,7 @@ bool play(const QString& folder) {
     script.extract(extract);
     script.masterData();
     script.payments();
+    script.hospitalList();
     script.yearEnd(own.filePath(u"antes-do-fecho.copia"_s));
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);
