@@ -12,6 +12,7 @@ void measureBankFiles(Report& report);
 void measureBulk(Report& report);
 void measureCoverage(Report& report);
 void measureEngines(Report& report);
+void measureHospitals(Report& report);
 void measureKeys(Report& report);
 void measureLists(Report& report);
 void measurePrinting(Report& report);

@@ -44,6 +44,7 @@ int main(int argc, char** argv) {
         benchmarks::measureBankFiles(report);
         benchmarks::measureBulk(report);
         benchmarks::measureEngines(report);
+        benchmarks::measureHospitals(report);
         benchmarks::measureKeys(report);
         benchmarks::measureLists(report);
         benchmarks::measurePrinting(report);

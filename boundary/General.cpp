@@ -21,6 +21,7 @@
 #include "reports/ReportRows.h"
 #include "reports/frmExtratos.h"
 #include "reports/frmIRS.h"
+#include "reports/frmListagemHospitais.h"
 #include "yearend/frmFechoAno.h"
 #include "yearend/frmManutencaoDados.h"
 
@@ -46,8 +47,6 @@ public:
 private:
     core::HandlerScope scope_;
 };
-
-const QString NotYet = u"Esta operação ainda não está disponível nesta versão."_s;
 
 /// How every operation but the login begins.
 void openingPreamble() {
@@ -123,26 +122,20 @@ void showList(const QString& table, const QString* strConMember, const QString* 
     screen.ShowModal();
 }
 
-/// One of the operations whose failures say nothing and give false. That its screen is still to
-/// come is said in a box, as nobody would hear of it otherwise.
-bool openLaterInSilence() {
-    const Operation running;
-    try {
-        openingPreamble();
-        core::MsgBox(NotYet, core::Icon::Critical);
-    } catch (const std::exception&) {
-        // Intentional: the result alone tells the host.
-    }
-    return false;
-}
-
-/// A preview that the operation does not wait for, of the rows as the command is designed. What
-/// fails is passed over: the result is false then, and the pending error says why.
-bool showDebts(const printing::Report& design) {
+/// One of the operations whose failures are passed over: the result is false then, and the pending
+/// error says why.
+bool inSilence(const std::function<void()>& show) {
     const Operation running;
     return core::passingOver([&] {
         openingPreamble();
         requireApplication();
+        show();
+    });
+}
+
+/// A preview that the operation does not wait for, of the rows as the command is designed.
+bool showDebts(const printing::Report& design) {
+    return inSilence([&] {
         const ado::RecordsetPtr rows = reports::openReportRows(design.dataMember);
         printing::DataReport(design).Show(rows, printing::DataReport::Wait::Modeless);
     });
@@ -222,5 +215,6 @@ bool General::Lcartasdividas() {
 }
 
 bool General::Lhospitais() {
-    return openLaterInSilence();
+    return inSilence(
+        [] { forms::DefaultInstance<reports::frmListagemHospitais>::get().ShowModal(); });
 }

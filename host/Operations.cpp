@@ -12,25 +12,14 @@ struct Signature {
     const char* name;
     int least;
     int most;
-    bool isThere = false;
 };
 
 constexpr Signature Signatures[] = {
-    {"CallPlafonds", 0, 2, true},
-    {"CallHospitais", 0, 2, true},
-    {"CallManutencaoDados", 0, 0, true},
-    {"CallIRS", 0, 0, true},
-    {"CallFechoAno", 0, 0, true},
-    {"Login", 0, 5, true},
-    {"Registo", 1, 1, true},
-    {"NewMovimento", 0, 3, true},
-    {"Correcao", 0, 2, true},
-    {"Recebimento", 0, 2, true},
-    {"Extratos", 0, 2, true},
-    {"LPagamentos", 0, 0, true},
-    {"Ldividas", 0, 0, true},
-    {"Lcartasdividas", 0, 0, true},
-    {"Lhospitais", 0, 0},
+    {"CallPlafonds", 0, 2}, {"CallHospitais", 0, 2},  {"CallManutencaoDados", 0, 0},
+    {"CallIRS", 0, 0},      {"CallFechoAno", 0, 0},   {"Login", 0, 5},
+    {"Registo", 1, 1},      {"NewMovimento", 0, 3},   {"Correcao", 0, 2},
+    {"Recebimento", 0, 2},  {"Extratos", 0, 2},       {"LPagamentos", 0, 0},
+    {"Ldividas", 0, 0},     {"Lcartasdividas", 0, 0}, {"Lhospitais", 0, 0},
 };
 
 /// "true" and "false", also in Portuguese.
@@ -66,12 +55,6 @@ QStringList Operations::names() {
     QStringList names;
     for (const Signature& signature : Signatures) names.append(QString::fromLatin1(signature.name));
     return names;
-}
-
-bool Operations::isThere(const QString& operation) {
-    return std::any_of(std::begin(Signatures), std::end(Signatures), [&](const Signature& each) {
-        return each.isThere && operation == QLatin1StringView(each.name);
-    });
 }
 
 std::optional<OperationCall> Operations::parsed(const QStringList& words) {

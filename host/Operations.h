@@ -24,9 +24,6 @@ public:
     /// Nothing when there is no such operation or the arguments do not fit it.
     static std::optional<OperationCall> parsed(const QStringList& words);
 
-    /// False for an operation whose screen is still to come.
-    static bool isThere(const QString& operation);
-
     /// The lists of master data that this program opens.
     static OperationCall rubrics();
     static OperationCall hospitals();

@@ -179,21 +179,18 @@ void frmPrincipal::addStatusLine() {
     statusBar()->addPermanentWidget(user_);
 }
 
-QAction* frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& caption,
-                               const QString& shortcut, const std::function<void()>& handler) {
+void frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& caption,
+                           const QString& shortcut, const std::function<void()>& handler) {
     QAction* action = menu->addAction(caption);
     action->setObjectName(name);
     action->setShortcut(QKeySequence(shortcut));
     connect(action, &QAction::triggered, this, [handler] { forms::handle(handler); });
-    return action;
 }
 
-QAction* frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
-                                    const OperationCall& call, const QString& name) {
-    QAction* action = addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
-                              [this, call] { run(call); });
-    action->setEnabled(Operations::isThere(call.operation));
-    return action;
+void frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
+                                const OperationCall& call, const QString& name) {
+    addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
+            [this, call] { run(call); });
 }
 
 /// A handler whose box or modal screen is still open is not started again, nor is another one: an

@@ -38,10 +38,10 @@ protected:
     void closeEvent(QCloseEvent* event) override;
 
 private:
-    QAction* addItem(QMenu* menu, const QString& name, const QString& caption,
-                     const QString& shortcut, const std::function<void()>& handler);
-    QAction* addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
-                          const OperationCall& call, const QString& name = {});
+    void addItem(QMenu* menu, const QString& name, const QString& caption, const QString& shortcut,
+                 const std::function<void()>& handler);
+    void addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
+                      const OperationCall& call, const QString& name = {});
     void addEntryMenu();
     void addListingMenus();
     void addYearMenus();

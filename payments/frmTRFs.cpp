@@ -11,28 +11,12 @@
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Fields.h"
-#include "platform/printing/DataReport.h"
 #include "reports/PaymentReports.h"
 #include "reports/ReportRows.h"
 
 using namespace Qt::StringLiterals;
 
 namespace payments {
-
-namespace {
-
-void list(const printing::Report& design, const QString& query, bool isPrinted) {
-    using printing::DataReport;
-    const DataReport report(design);
-    const ado::RecordsetPtr rows = reports::openReportRows(design.dataMember, query);
-    if (isPrinted)
-        report.PrintReport(rows);
-    else
-        report.Show(rows, DataReport::Wait::Modal);
-    rows->Close();
-}
-
-}  // namespace
 
 frmTRFs::frmTRFs()
     : Form(u"frmTRFs"_s, u"Listagem de Pagamentos"_s),
@@ -113,10 +97,13 @@ void frmTRFs::Command1_Click() {
     }
     // Intentional: of any other mode nothing is listed, and no box says so.
     const QString mode = core::toText(DataCombo1->BoundText());
+    const auto list = [this](const printing::Report& report, const QString& query) {
+        reports::printOrShow(printing::DataReport(report), query, Check1->Value());
+    };
     if (mode == data::modo::Cheque)
-        list(reports::Print_frmTRF_CHQ(), chequeListQuery(first(), last()), Check1->Value());
+        list(reports::Print_frmTRF_CHQ(), chequeListQuery(first(), last()));
     else if (mode == data::modo::Transfer)
-        list(reports::Print_frmTRF_TRF(), transferListQuery(first(), last()), Check1->Value());
+        list(reports::Print_frmTRF_TRF(), transferListQuery(first(), last()));
     Unload();
 }
 

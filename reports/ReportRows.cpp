@@ -21,4 +21,13 @@ ado::RecordsetPtr openReportRows(const QString& name, const QString& text) {
     return rows;
 }
 
+void printOrShow(const printing::DataReport& report, const QString& text, bool isPrinted) {
+    const ado::RecordsetPtr rows = openReportRows(report.design().dataMember, text);
+    if (isPrinted)
+        report.PrintReport(rows);
+    else
+        report.Show(rows, printing::DataReport::Wait::Modal);
+    rows->Close();
+}
+
 }  // namespace reports

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "platform/ado/Recordset.h"
+#include "platform/printing/DataReport.h"
 
 namespace reports {
 
@@ -11,5 +12,9 @@ ado::RecordsetPtr openReportRows(const QString& name);
 
 /// The same on another text, which the command keeps.
 ado::RecordsetPtr openReportRows(const QString& name, const QString& text);
+
+/// Opens the rows that the report is bound to on another text, prints it unasked or shows it until
+/// the person closes the preview, and closes the rows.
+void printOrShow(const printing::DataReport& report, const QString& text, bool isPrinted);
 
 }  // namespace reports

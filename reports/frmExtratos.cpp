@@ -12,7 +12,6 @@
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Fields.h"
-#include "platform/printing/DataReport.h"
 #include "reports/ExtractQuery.h"
 #include "reports/ExtractReports.h"
 #include "reports/ReportRows.h"
@@ -228,14 +227,7 @@ void frmExtratos::Imprimir_Click() {
 }
 
 void frmExtratos::print(const ado::Recordset& member) {
-    const DataReport report = extractOf(member, Check2->Value());
-    const ado::RecordsetPtr rows =
-        openReportRows(report.design().dataMember, extractQuery(selection()));
-    if (Check1->Value())
-        report.PrintReport(rows);
-    else
-        report.Show(rows, DataReport::Wait::Modal);
-    rows->Close();
+    printOrShow(extractOf(member, Check2->Value()), extractQuery(selection()), Check1->Value());
 }
 
 void frmExtratos::Command4_Click() {

@@ -204,10 +204,7 @@ void frmIRS::Command3_Click() {
     if (Option2->isChecked()) selection.socio_id = socio_id_;
     // Intentional: a failure leaves the button disabled, and the way on is "&Sair".
     Command3->setEnabled(false);
-    const printing::DataReport report(prtIRS());
-    const ado::RecordsetPtr rows = openReportRows(report.design().dataMember, taxQuery(selection));
-    report.Show(rows, printing::DataReport::Wait::Modal);
-    rows->Close();
+    printOrShow(printing::DataReport(prtIRS()), taxQuery(selection), /*isPrinted*/ false);
     Command3->setEnabled(true);
     Command3->setFocus();
 }

@@ -224,21 +224,31 @@ public:
         player_.step(u"frmDocumentos"_s, u"31-documentos"_s, typing({u"<Escape>"_s}));
     }
 
+    /// What each hospital's bills came to since the beginning of the year.
+    void hospitalList() {
+        const QString newYear = core::today().toString(u"01-01-yyyy"_s);
+        open({}, {u"Lhospitais"_s, {}});
+        player_.step(u"frmListagemHospitais"_s, {}, typing({newYear, u"<Tab>"_s}));
+        player_.step(u"frmListagemHospitais"_s, u"32-hospitais-listagem"_s, typing({u"<Alt+O>"_s}));
+        player_.step(u"Print_frmListagemHospitais"_s, u"33-hospitais-mapa"_s,
+                     typing({u"<Escape>"_s}), says(u"Estado"_s, u"Página 1"_s));
+    }
+
     /// The repair of the book and the close of the year.
     void yearEnd(const QString& backup) {
         open({}, {u"CallManutencaoDados"_s, {}});
         player_.step(u"frmManutencaoDados"_s, {}, typing({u"<Alt+I>"_s}));
         player_.step(u"box:Manutenção de Dados Concluída."_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmManutencaoDados"_s, u"32-manutencao"_s, typing({u"<Alt+F>"_s}));
+        player_.step(u"frmManutencaoDados"_s, u"34-manutencao"_s, typing({u"<Alt+F>"_s}));
         choose(u"Verificar"_s);
-        player_.step(u"frmVerificacao"_s, u"33-verificacao"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmVerificacao"_s, u"35-verificacao"_s, typing({u"<Alt+S>"_s}));
         choose(u"CallFechoAno"_s);
-        player_.step(u"frmPrepararFecho"_s, u"34-preparar-o-fecho"_s,
+        player_.step(u"frmPrepararFecho"_s, u"36-preparar-o-fecho"_s,
                      typing({u"<Ctrl+A>"_s, backup, u"<Alt+F>"_s}));
         player_.step(u"frmFechoAno"_s, {}, typing({u"<Alt+F>"_s}));
-        player_.step(u"box:Tem a certeza"_s, u"35-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"box:Tem a certeza"_s, u"37-pergunta-do-fecho"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"box:Procedimentos de Fim de Ano"_s, {}, typing({u"<Return>"_s}));
-        player_.step(u"frmFechoAno"_s, u"36-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmFechoAno"_s, u"38-fecho-do-ano"_s, typing({u"<Alt+S>"_s}));
         player_.step(u"frmPrincipal"_s, {}, {});
     }
 
@@ -318,6 +328,7 @@ bool play(const QString& folder) {
     script.masterData();
     script.payments();
     script.debtsAndTaxes();
+    script.hospitalList();
     script.yearEnd(own.filePath(u"antes-do-fecho.copia"_s));
     const bool played = player.play();
     say(played ? u"Visita completa."_s : u"A visita parou a meio."_s);

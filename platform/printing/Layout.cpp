@@ -129,7 +129,9 @@ void Layout::Implementation::openGroup() {
     childCount = children->rowsInMemory();
     child = 0;
     tallies.startGroup();
-    print(groupHeader, childCount > 0 ? detail.height() : groupFooter.height());
+    // With an only row go the footers behind it: without them it would leave its header alone.
+    print(groupHeader,
+          childCount > 0 ? detail.height() + footersBehindRow() : groupFooter.height());
     inGroup = true;
 }
 

@@ -177,9 +177,6 @@ TEST_F(PrincipalWindow, EveryOperationIsInTheMenuWithItsArguments) {
     for (const auto& [name, call] : calls) {
         auto* action = window_.findChild<QAction*>(name);
         ASSERT_TRUE(action) << name.toStdString();
-        // An operation whose screen is still to come is grey.
-        EXPECT_EQ(action->isEnabled(), host::Operations::isThere(call.section(u' ', 0, 0)));
-        action->setEnabled(true);
         action->trigger();
         EXPECT_EQ(Recorder::calls.last(), call);
     }

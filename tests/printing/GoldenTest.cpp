@@ -1,50 +1,14 @@
 // SPDX-License-Identifier: MIT
-// Whole pages against lists that somebody has looked at: text, place and style of everything on
-// them. ZELMARS_WRITE_GOLDEN=1 writes the lists anew; look at what changed.
-#include <QFile>
-#include <QTextStream>
-
+// Whole pages against lists that somebody has looked at.
 #include "reports/DebtReports.h"
 #include "reports/ExtractReports.h"
 #include "reports/TaxReport.h"
+#include "tests/printing/Golden.h"
 #include "tests/printing/Ledger.h"
 
 using namespace Qt::StringLiterals;
 
 namespace {
-
-QString describe(const printing::Pages& pages) {
-    QString shown;
-    QTextStream out(&shown);
-    out.setRealNumberNotation(QTextStream::FixedNotation);
-    out.setRealNumberPrecision(1);
-    for (int at = 0; at < pages.count(); ++at) {
-        out << "page " << at + 1 << " of " << pages.count() << '\n';
-        const printing::Page page = pages.at(at);
-        for (const auto& [rect, shaded, framed] : page.boxes)
-            out << "box " << rect.left() << ' ' << rect.top() << ' ' << rect.width() << ' '
-                << rect.height() << (shaded ? " shaded" : "") << (framed ? " framed\n" : "\n");
-        for (const auto& [line, width] : page.lines)
-            out << "line " << line.x1() << ' ' << line.y1() << ' ' << line.x2() << ' ' << line.y2()
-                << " width " << width << '\n';
-        for (const printing::TextRun& each : page.texts) {
-            const auto& [place, width, text, style, open] = pages.resolved(each);
-            out << place.x() << ' ' << place.y() << " [" << style.points << (style.bold ? "b" : "")
-                << (style.italic ? "i" : "") << "lcr"[static_cast<int>(style.align)] << "] " << text
-                << '\n';
-        }
-    }
-    return shown;
-}
-
-/// What the file holds; what it ought to hold is written there when that is asked for.
-QString golden(const QString& name, const QString& shown) {
-    QFile file(QStringLiteral(GOLDEN_FOLDER "/") + name + u".txt"_s);
-    if (qEnvironmentVariableIsSet("ZELMARS_WRITE_GOLDEN"))
-        if (file.open(QIODevice::WriteOnly)) file.write(shown.toUtf8()), file.close();
-    return file.open(QIODevice::ReadOnly) ? QString::fromUtf8(file.readAll())
-                                          : u"missing: "_s + file.fileName();
-}
 
 TEST_F(Ledger, PrintsExtractsAsTheyWereSeen) {
     const struct {
