@@ -14,6 +14,7 @@ void measureCoverage(Report& report);
 void measureEngines(Report& report);
 void measureHospitals(Report& report);
 void measureKeys(Report& report);
+void measureListings(Report& report);
 void measureLists(Report& report);
 void measurePrinting(Report& report);
 void measureScreens(Report& report);

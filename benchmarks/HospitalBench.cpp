@@ -3,16 +3,12 @@
 // seen, against the bare engine that reads the rows of the same two queries, and its memory.
 #include <malloc.h>
 
-#include <QAbstractScrollArea>
 #include <QCoreApplication>
-#include <QElapsedTimer>
-#include <QLabel>
 
-#include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
+#include "benchmarks/FirstPage.h"
 #include "platform/core/Failure.h"
 #include "platform/printing/Layout.h"
-#include "platform/printing/Preview.h"
 #include "reports/HospitalQuery.h"
 #include "reports/HospitalReport.h"
 #include "reports/ReportRows.h"
@@ -58,41 +54,9 @@ QByteArrayList bareQueries() {
                    " ORDER BY movimento_id")};
 }
 
-double milliseconds(const QElapsedTimer& clock) {
-    return static_cast<double>(clock.nsecsElapsed()) / 1e6;
-}
-
-double timedBare(const Book& book) {
-    QElapsedTimer clock;
-    clock.start();
-    const std::unique_ptr<Bare> alone = bare(book);
-    qint64 sum = 0;
-    for (const QByteArray& query : bareQueries())
-        for (const std::unique_ptr<BareRows> rows = alone->rows(query); rows->next();)
-            sum += rows->integer(0);
-    if (sum == 0) throw core::Failure(core::InvalidCall, u"the book has no movements"_s);
-    return milliseconds(clock);
-}
-
 ado::RecordsetPtr openListing() {
     return reports::openReportRows(u"Print_frmListagemHospitais"_s,
                                    reports::hospitalListQuery(NewYear, LastDay));
-}
-
-/// Milliseconds from the press on the button until the first page is painted.
-double timedFirstPage() {
-    QElapsedTimer clock;
-    clock.start();
-    const ado::RecordsetPtr rows = openListing();
-    printing::Preview preview(reports::Print_frmListagemHospitais(), rows);
-    preview.Show();
-    const auto* place = preview.findChild<QLabel*>(u"Estado"_s);
-    while (!place->text().startsWith(u"Página 1 "_s)) QCoreApplication::processEvents();
-    preview.findChild<QAbstractScrollArea*>(u"Folhas"_s)->viewport()->repaint();
-    const double spent = milliseconds(clock);
-    preview.Unload();
-    rows->Close();
-    return spent;
 }
 
 /// Megabytes that rows and pages take together, from nothing to the last page.
@@ -124,8 +88,8 @@ void measureHospitals(Report& report) {
         const double memory = memoryOfPages();
         std::vector<double> ours, theirs;
         for (int run = 0; run < Runs; ++run) {
-            ours.push_back(timedFirstPage());
-            theirs.push_back(timedBare(copy.book()));
+            ours.push_back(timedFirstPage(reports::Print_frmListagemHospitais(), openListing));
+            theirs.push_back(timedBareRows(copy.book(), bareQueries()));
         }
         report.ratio(name + u", first page"_s, 1.5, ours, theirs);
         report.value(name + u", memory"_s, u"MB"_s, 150, memory);

@@ -3,20 +3,19 @@
 // memory of a long one, and how soon its first page is seen.
 #include <malloc.h>
 
-#include <QAbstractScrollArea>
 #include <QElapsedTimer>
-#include <QLabel>
 #include <QPainter>
 #include <QPdfWriter>
 #include <QTemporaryDir>
 
 #include "benchmarks/Bare.h"
 #include "benchmarks/Benches.h"
+#include "benchmarks/FirstPage.h"
 #include "boundary/environment/dtZelmars.h"
 #include "platform/printing/Layout.h"
 #include "platform/printing/Output.h"
-#include "platform/printing/Preview.h"
 #include "platform/printing/Typesetting.h"
+#include "reports/DebtReports.h"
 #include "reports/ExtractReports.h"
 
 using namespace Qt::StringLiterals;
@@ -27,6 +26,7 @@ namespace {
 
 constexpr int Movements = 100'000;
 constexpr int ManyPages = 5'000;
+constexpr int Letters = 20'000;
 
 /// The first so many movements, as the extracts of a member select them.
 ado::RecordsetPtr movements(int count) {
@@ -89,10 +89,10 @@ QString pdfOf(const printing::Report& design) {
     return design.name + u" to PDF"_s;
 }
 
-void measurePdf(Report& report, const printing::Report& design, int rounds) {
+void measurePdf(Report& report, const printing::Report& design, const ado::RecordsetPtr& rows,
+                int rounds) {
     const QTemporaryDir folder;
     const QString file = folder.filePath(u"pages.pdf"_s);
-    const ado::RecordsetPtr rows = movements(Movements);
     std::vector<double> ours, theirs;
     double pages = 0, bytes = 0;
     for (int round = 0; round < rounds; ++round) {
@@ -108,6 +108,17 @@ void measurePdf(Report& report, const printing::Report& design, int rounds) {
     }
     report.ratio(pdfOf(design), 1.3, ours, theirs);
     report.value(pdfOf(design) + u", size of a page"_s, u"KB"_s, 4, bytes / pages / 1024);
+}
+
+/// One debtor a letter, whose texts are of usual lengths.
+ado::RecordsetPtr debtors(int count) {
+    const ado::RecordsetPtr rows = ado::Recordset::create();
+    rows->setClientSide(true);
+    rows->Open(
+        u"SELECT no_kor, nome, morada1, code_postal1 + ' ' + localidade1 AS code_completo, "
+        "socio_id AS divida FROM tbSocios WHERE socio_id <= %1 ORDER BY socio_id"_s.arg(count),
+        environment::dtZelmars::instance().SqlServer());
+    return rows;
 }
 
 /// Rows and pages together, from nothing to the last page.
@@ -128,18 +139,8 @@ void measureMemory(Report& report) {
 
 void measureFirstPage(Report& report) {
     const ado::RecordsetPtr rows = movements(ManyPages * 56);
-    const double shown = report.medianOf(3, [&] {
-        QElapsedTimer clock;
-        clock.start();
-        printing::Preview preview(reports::rptExtrato2(), rows);
-        preview.Show();
-        const auto* place = preview.findChild<QLabel*>(u"Estado"_s);
-        while (!place->text().startsWith(u"Página 1 "_s)) QCoreApplication::processEvents();
-        preview.findChild<QAbstractScrollArea*>(u"Folhas"_s)->viewport()->repaint();
-        const double spent = milliseconds(clock);
-        preview.Unload();
-        return spent;
-    });
+    const double shown = report.medianOf(
+        3, [&] { return timedFirstPage(reports::rptExtrato2(), [&] { return rows; }); });
     report.value(FirstPage, u"ms"_s, 300, shown);
 }
 
@@ -153,9 +154,11 @@ void measurePrinting(Report& report) {
     };
     const printing::Report summary = reports::rptExtrato2();
     const printing::Report detailed = reports::prtExtrato1();
-    measure(pdfOf(summary), [&] { measurePdf(report, summary, 3); });
+    measure(pdfOf(summary), [&] { measurePdf(report, summary, movements(Movements), 3); });
     // Six times as many pages.
-    measure(pdfOf(detailed), [&] { measurePdf(report, detailed, 1); });
+    measure(pdfOf(detailed), [&] { measurePdf(report, detailed, movements(Movements), 1); });
+    const printing::Report letters = reports::Print_frmCartasDividas();
+    measure(pdfOf(letters), [&] { measurePdf(report, letters, debtors(Letters), 3); });
     measure(Memory, [&] { measureMemory(report); });
     measure(FirstPage, [&] { measureFirstPage(report); });
 }

@@ -46,6 +46,7 @@ int main(int argc, char** argv) {
         benchmarks::measureEngines(report);
         benchmarks::measureHospitals(report);
         benchmarks::measureKeys(report);
+        benchmarks::measureListings(report);
         benchmarks::measureLists(report);
         benchmarks::measurePrinting(report);
         benchmarks::measureScreens(report);

@@ -92,7 +92,7 @@ TEST_F(HospitalListing, OpensAGroupThroughABillAloneAndListsEverythingUnderIt) {
     movement(luz, u"PAG"_s);       // 2
     movement(luz, u"REP"_s);       // 3
     movement(receipts, u"PAG"_s);  // 4
-    movement(arvore);            // 5
+    movement(arvore);              // 5
     movement(luz, u"HOS"_s, Day, Left);
     movement(receipts, u"ANL"_s);  // 7
     movement(unnamed);             // 8
