@@ -53,8 +53,9 @@ Keyboard::Key Keyboard::keyFor(quint32 symbol) const {
                         .shift = level % 2 == 1,
                         .level3 = level >= 4};
     }
-    throw core::Failure(core::InvalidCall,
-                        u"O teclado não tem a tecla X11 0x%1."_s.arg(symbol, 0, 16));
+    throw core::Failure(
+        core::InvalidCall,
+        u"Falta a este teclado uma tecla que é precisa (X11 0x%1)."_s.arg(symbol, 0, 16));
 }
 
 void Keyboard::send(bool down, xcb_keycode_t code) {
