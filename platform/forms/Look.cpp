@@ -305,9 +305,13 @@ QPalette readable(QPalette palette) {
     const bool dark = palette.color(QPalette::Window).lightness() < 128;
     palette.setColor(QPalette::Highlight, dark ? AccentOnDark : Accent);
     palette.setColor(QPalette::HighlightedText, dark ? TextOnBright : QColor(Qt::white));
-    // Dark desktops leave it near black.
+    // Dark desktops leave these near black.
     palette.setColor(QPalette::PlaceholderText,
                      blended(palette.color(QPalette::Base), palette.color(QPalette::Text), 0.68));
+    const QColor faint = blended(palette.color(QPalette::Active, QPalette::Window),
+                                 palette.color(QPalette::Active, QPalette::WindowText), 0.55);
+    for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText})
+        palette.setColor(QPalette::Disabled, role, faint);
     return palette;
 }
 

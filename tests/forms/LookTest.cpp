@@ -60,6 +60,9 @@ TEST(Look, CanBeReadOnLightAndDarkDesktops) {
                                                           {Role::WindowText, Role::Window}})
             EXPECT_GE(contrast(palette.color(text), palette.color(ground)), 4.5) << text;
         EXPECT_GE(contrast(palette.color(Role::Text), forms::focusedGround(palette)), 4.5);
+        EXPECT_GE(contrast(palette.color(QPalette::Disabled, Role::WindowText),
+                           palette.color(Role::Window)),
+                  3);
 
         QLineEdit line;
         QComboBox list;
