@@ -3,6 +3,7 @@
 
 #include "platform/core/Format.h"
 #include "reports/Furniture.h"
+#include "reports/Organisation.h"
 
 using namespace Qt::StringLiterals;
 
@@ -79,9 +80,9 @@ void addText(Section& letter) {
         2);
     line(u"Com os nossos melhores cumprimentos,"_s, 3);
     line(u"A Direcção"_s, 5);
-    letter.items.emplace_back(label(Left, y, Width, OrganisationName.toString(), Bold));
+    letter.items.emplace_back(label(Left, y, Width, letterForLetter(organisationName()), Bold));
     letter.items.emplace_back(
-        label(Left, y + LineHeight, Width, OrganisationAddress.toString(), Plain));
+        label(Left, y + LineHeight, Width, letterForLetter(organisationAddress()), Plain));
 }
 
 }  // namespace

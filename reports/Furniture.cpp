@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "reports/Furniture.h"
 
+#include "reports/Organisation.h"
+
 using namespace Qt::StringLiterals;
 
 namespace reports {
@@ -53,9 +55,11 @@ void addLetterhead(Section& section, const QString& title) {
     const double top = section.height;
     section.items.insert(
         section.items.end(),
-        {Label{
-             {}, QRectF(0, top, 120, 7), OrganisationName.toString(), {.points = 14, .bold = true}},
-         label(0, top + 7, 120, OrganisationAddress.toString()),
+        {Label{{},
+               QRectF(0, top, 120, 7),
+               letterForLetter(organisationName()),
+               {.points = 14, .bold = true}},
+         label(0, top + 7, 120, letterForLetter(organisationAddress())),
          label(120, top + 1.5, page::InnerWidth - 120, u"%D"_s, {.align = Align::Right})});
     section.height += 13;
     addTitle(section, title);

@@ -9,11 +9,6 @@
 /// already and makes the section that much higher. Lengths are millimetres.
 namespace reports {
 
-/// The organisation, as it stands at the head of what it sends out.
-inline constexpr QStringView OrganisationName = u"Tesmar Nacional";
-/// Its postal address, on one line; a placeholder until the organisation gives its own.
-inline constexpr QStringView OrganisationAddress = u"Lisboa";
-
 /// Height of a line of text at the usual size.
 inline constexpr double LineHeight = 4.8;
 

@@ -3,6 +3,7 @@
 
 #include "platform/core/Format.h"
 #include "reports/Furniture.h"
+#include "reports/Organisation.h"
 
 using namespace Qt::StringLiterals;
 
@@ -35,8 +36,12 @@ double addHead(Section& page) {
     const Style title{.points = 18, .bold = true, .align = Align::Centre};
     const Style under{.points = 11, .bold = true, .align = Align::Centre};
     page.items = {
-        Label{{}, QRectF(0, 0, 120, 7), OrganisationName.toString(), {.points = 14, .bold = true}},
-        label(0, 7, 120, OrganisationAddress.toString()), Rule{QLineF(0, 14, page::InnerWidth, 14)},
+        Label{{},
+              QRectF(0, 0, 120, 7),
+              letterForLetter(organisationName()),
+              {.points = 14, .bold = true}},
+        label(0, 7, 120, letterForLetter(organisationAddress())),
+        Rule{QLineF(0, 14, page::InnerWidth, 14)},
         Label{{}, QRectF(0, 38, page::InnerWidth, 9), u"DECLARAÇÃO"_s, title},
         Label{{}, QRectF(0, 49, page::InnerWidth, 6), u"ZELMAR COLECTIVO DO TESMAR"_s, under}};
     return 74;

@@ -31,8 +31,7 @@ Label& labelOf(Report& report, const QString& section, const QString& label) {
 DataReport::DataReport(const Report& design) : report_(design) {}
 
 void DataReport::setCaption(const QString& section, const QString& label, const QString& caption) {
-    // A "%p" in somebody's name must not turn into the page's number.
-    labelOf(report_, section, label).caption = QString(caption).replace(u'%', u"%%"_s);
+    labelOf(report_, section, label).caption = letterForLetter(caption);
 }
 
 void DataReport::PrintReport(const ado::RecordsetPtr& rows) const {

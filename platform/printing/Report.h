@@ -35,6 +35,12 @@ struct Label {
     int lines = 1;  ///< most lines; a longer text is wrapped, then cut with an ellipsis
 };
 
+/// A text as a label's caption that is printed letter for letter: a "%p" in somebody's name must
+/// not turn into the page's number.
+inline QString letterForLetter(QString text) {
+    return text.replace(u'%', QStringLiteral("%%"));
+}
+
 /// A column of the current row, null being empty: of the row that is printed or, around a page's
 /// rows, of the one about to be. A text too long for its box ends in an ellipsis; a number is set
 /// smaller.
