@@ -122,6 +122,7 @@ Report Print_frmCartasDividas() {
     Report report{.name = u"Print_frmCartasDividas"_s,
                   .caption = u"Cartas de Dívidas"_s,
                   .dataMember = u"Print_frmListagemDividas"_s,
+                  .bookmark = {u"no_kor"_s, u"nome"_s},
                   .reportHeader = {.name = u"Section4"_s},
                   .pageHeader = {.name = u"Section2"_s},
                   .detail = {.name = u"Section1"_s},

@@ -94,6 +94,7 @@ Report Print_frmListagemHospitais() {
                   .caption = title,
                   .dataMember = u"Print_frmListagemHospitais"_s,
                   .chapter = u"Print_frmListagemHospitais_detail"_s,
+                  .bookmark = {u"hospital_code"_s, u"hospital_nome"_s},
                   .reportHeader = {.name = u"Section4"_s},
                   .pageHeader = {.name = u"Section2"_s},
                   .groupHeader = head(),

@@ -112,6 +112,7 @@ Report prtIRS() {
     Report report{.name = u"prtIRS"_s,
                   .caption = u"Declaração de IRS"_s,
                   .dataMember = u"Print_Irs"_s,
+                  .bookmark = {u"no_kor"_s, u"nome"_s},
                   .reportHeader = {.name = u"Section4"_s},
                   .pageHeader = {.name = u"Section2"_s},
                   .detail = {.name = u"Section1"_s},

@@ -44,8 +44,11 @@ void write(const printing::Pages& pages, int from, int to, const QString& file) 
     made.commit();
 }
 
-/// Adds pages with the numbers that they have among their own.
+/// Adds pages with the numbers that they have among their own, and a bookmark for them.
 void append(printing::Pages& all, const Document& document) {
+    QStringList bookmark{document.staffNumber, document.name};
+    bookmark.removeAll({});
+    all.addBookmark({all.count(), bookmark.join(u" - "_s)});
     for (int at = document.from; at <= document.to; ++at) {
         printing::Page page = document.pages.at(at);
         for (printing::TextRun& run : page.texts) {

@@ -4,6 +4,7 @@
 #include <QElapsedTimer>
 
 #include "platform/core/Failure.h"
+#include "platform/core/Format.h"
 #include "platform/printing/Sections.h"
 
 using namespace Qt::StringLiterals;
@@ -15,6 +16,9 @@ namespace {
 /// Heights are compared with this much grace, in millimetres.
 constexpr double Grace = 0.01;
 
+/// A bookmark's most letters: what is longer cannot be read beside the pages.
+constexpr qsizetype LongestBookmark = 200;
+
 }  // namespace
 
 struct Layout::Implementation {
@@ -22,6 +26,11 @@ struct Layout::Implementation {
 
     /// Prints the next section of the body; behind the last one the pages are complete.
     void step();
+    /// How much of the rows is printed, 0..1.
+    double share() const {
+        const qint64 all = grouped ? rowCount : childCount;
+        return all == 0 ? 1 : static_cast<double>(grouped ? row : child) / static_cast<double>(all);
+    }
     bool areRowsClosed() const { return rows->State() == ado::adStateClosed; }
 
 private:
@@ -39,6 +48,8 @@ private:
     /// Prints a section, on a new page if it does not fit together with `more` that belongs to it.
     void print(const PreparedSection& section, double more = 0);
     void put(const PreparedSection& section);
+    /// The bookmark of the row that the sections around the detail read; empty for none.
+    QString bookmarkOfRow() const;
     /// What belongs to the row being printed because nothing but totals follows it.
     double footersBehindRow() const;
 
@@ -62,6 +73,7 @@ private:
     const PreparedSection pageFooter;
     const PreparedSection reportFooter;
     const double bodyBottom;
+    std::vector<size_t> bookmarkPlaces;  ///< among the outer row's values
 
     bool started = false;
     bool inGroup = false;
@@ -69,6 +81,7 @@ private:
     ado::RecordsetPtr children;  ///< the rows that the detail prints
     qint64 childCount = 0;
     qint64 child = 0;
+    QString bookmark;  ///< of the next section of the body that is printed; empty for none
 
     Page page;
     double y = 0;        ///< where the next section goes
@@ -93,6 +106,7 @@ Layout::Implementation::Implementation(const Report& design, ado::RecordsetPtr f
       bodyBottom(page::Height - page::Margin - design.pageFooter.height) {
     rows->readAll();
     rowCount = rows->rowsInMemory();
+    for (const QString& column : design.bookmark) bookmarkPlaces.push_back(outerRow.place(column));
     outerRow.lookUp(*rows);
     if (!grouped) {
         children = rows;
@@ -129,6 +143,7 @@ void Layout::Implementation::openGroup() {
     childCount = children->rowsInMemory();
     child = 0;
     tallies.startGroup();
+    bookmark = bookmarkOfRow();
     // With an only row go the footers behind it: without them it would leave its header alone.
     print(groupHeader,
           childCount > 0 ? detail.height() + footersBehindRow() : groupFooter.height());
@@ -138,6 +153,7 @@ void Layout::Implementation::openGroup() {
 void Layout::Implementation::printDetail() {
     detailRow.read(*children, child);
     tallies.take(detailRow.values());
+    if (!grouped) bookmark = bookmarkOfRow();
     print(detail, footersBehindRow());
     ++child;
 }
@@ -158,6 +174,20 @@ double Layout::Implementation::footersBehindRow() const {
     if (child + 1 < childCount) return 0;
     if (!grouped) return reportFooter.height();
     return groupFooter.height() + (row + 1 < rowCount ? 0 : reportFooter.height());
+}
+
+QString Layout::Implementation::bookmarkOfRow() const {
+    QStringList parts;
+    for (const size_t place : bookmarkPlaces)
+        parts
+            << core::formatted(outerRow.values()[place], {}, core::portugueseLocale()).simplified();
+    parts.removeAll(QString());
+    QString text = parts.join(u" - "_s);
+    if (text.size() > LongestBookmark) {
+        const bool parted = text[LongestBookmark - 2].isHighSurrogate();
+        text = text.first(LongestBookmark - (parted ? 2 : 1)) + u'…';
+    }
+    return text;
 }
 
 // --- Pages
@@ -193,6 +223,9 @@ void Layout::Implementation::print(const PreparedSection& section, double more) 
         startPage();
     }
     put(section);
+    if (bookmark.isEmpty()) return;
+    pages->addBookmark({pages->count(), bookmark});
+    bookmark.clear();
 }
 
 void Layout::Implementation::put(const PreparedSection& section) {
@@ -209,6 +242,10 @@ Layout::Layout(const Report& report, const ado::RecordsetPtr& rows)
 }
 
 Layout::~Layout() = default;
+
+double Layout::share() const {
+    return d->share();
+}
 
 bool Layout::go(int milliseconds) {
     if (!isComplete() && d->areRowsClosed())

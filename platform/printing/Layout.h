@@ -21,6 +21,8 @@ public:
     /// Goes on for about so many milliseconds (or to the end when negative). True when complete.
     /// Fails as reading a row does.
     bool go(int milliseconds);
+    /// How much of the rows is laid out, 0..1.
+    double share() const;
     /// True when all pages are laid out.
     bool isComplete() const { return pages_->isComplete(); }
     /// The pages laid out so far; those who hold them see the following ones come.

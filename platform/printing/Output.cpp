@@ -6,6 +6,7 @@
 #include <QPdfWriter>
 #include <algorithm>
 
+#include "platform/printing/PdfOutline.h"
 #include "platform/printing/SavedFile.h"
 #include "platform/printing/Typesetting.h"
 
@@ -100,6 +101,7 @@ bool writePdf(const Pages& pages, const Sheets& sheets, const QString& file, con
         }
         painter.end();
     }
+    if (done) addOutline(out, pages, sheets.from, sheets.to);
     if (!done || !out.commit()) failToWrite(out);
     return true;
 }

@@ -32,8 +32,9 @@ struct Sheets {
     QPageSize paper;
 };
 
-/// Writes complete pages as PDF, fonts embedded: all of them on A4, or some. False when given up.
-/// Fails, leaving no half file, when the file cannot be written.
+/// Writes complete pages as PDF, fonts embedded, with their bookmarks as its outline: all of them
+/// on A4, or some. False when given up. Fails, leaving no half file, when the file cannot be
+/// written.
 bool writePdf(const Pages& pages, const QString& file, const GoesOn& goesOn = {});
 bool writePdf(const Pages& pages, const Sheets& sheets, const QString& file,
               const GoesOn& goesOn = {});

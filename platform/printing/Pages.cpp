@@ -135,6 +135,18 @@ Page Pages::at(int page) const {
     return result;
 }
 
+void Pages::addBookmark(const Bookmark& bookmark) {
+    bookmarkNames_ += bookmark.text.toUtf8();
+    bookmarks_.push_back({bookmark.page, bookmarkNames_.size()});
+}
+
+Bookmark Pages::bookmark(int at) const {
+    const auto index = static_cast<size_t>(at);
+    const qsizetype begin = index == 0 ? 0 : bookmarks_[index - 1].end;
+    const auto& [page, end] = bookmarks_[index];
+    return {page, QString::fromUtf8(QByteArrayView(bookmarkNames_).sliced(begin, end - begin))};
+}
+
 TextRun Pages::resolved(const TextRun& run) const {
     if (!run.open) return run;
     TextRun result = run;

@@ -41,6 +41,12 @@ struct Page {
     std::vector<TextRun> texts;
 };
 
+/// A place that a reader can jump to by its name.
+struct Bookmark {
+    int page = 0;  ///< counted from 0
+    QString text;
+};
+
 /// The pages laid out so far, packed, so that thousands of them take little memory.
 class Pages {
 public:
@@ -58,11 +64,21 @@ public:
 
     /// Adds the next page.
     void add(const Page& page);
+    /// Names a page, which may be the one that is added next, behind those named before.
+    void addBookmark(const Bookmark& bookmark);
+    int bookmarkCount() const { return static_cast<int>(bookmarks_.size()); }
+    Bookmark bookmark(int at) const;
     /// Tells that no page is to come.
     void complete() { complete_ = true; }
 
 private:
+    struct PackedBookmark {
+        int page;
+        qsizetype end;  ///< of the name among the names
+    };
     std::vector<QByteArray> pages_;
+    std::vector<PackedBookmark> bookmarks_;
+    QByteArray bookmarkNames_;  ///< UTF-8, one after the other
     bool complete_ = false;
 };
 

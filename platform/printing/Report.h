@@ -4,6 +4,7 @@
 #include <QLineF>
 #include <QRectF>
 #include <QString>
+#include <QStringList>
 #include <variant>
 #include <vector>
 
@@ -95,6 +96,9 @@ struct Report {
     /// Chapter whose rows the detail prints, one group for each row of the row set; empty for a
     /// report of one level.
     QString chapter = {};
+    /// Columns whose values, joined by " - ", name a place that a reader of the PDF can jump to:
+    /// one for each group, or for each row of a report of one level. None when empty.
+    QStringList bookmark = {};
     Section reportHeader = {};
     Section pageHeader = {};
     Section groupHeader = {};
