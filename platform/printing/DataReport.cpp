@@ -2,9 +2,11 @@
 #include "platform/printing/DataReport.h"
 
 #include "platform/core/Failure.h"
+#include "platform/core/MsgBox.h"
 #include "platform/printing/Layout.h"
 #include "platform/printing/Output.h"
 #include "platform/printing/Preview.h"
+#include "platform/printing/Progress.h"
 
 using namespace Qt::StringLiterals;
 
@@ -35,9 +37,22 @@ void DataReport::setCaption(const QString& section, const QString& label, const 
 }
 
 void DataReport::PrintReport(const ado::RecordsetPtr& rows) const {
+    if (!isPrinted(rows))
+        core::MsgBox(u"A impressão foi cancelada. Nada foi enviado para a impressora."_s,
+                     core::Icon::Information, report_.caption);
+}
+
+bool DataReport::isPrinted(const ado::RecordsetPtr& rows) const {
+    constexpr int Slice = 50;      // milliseconds until the next look at the person's clicks
+    constexpr int Half = 500'000;  // the pages' preparation, and again the making of the job
+    Progress progress(nullptr, report_.caption, u"A preparar a impressão…"_s, 2 * Half);
     Layout layout(report_, rows);
-    layout.go(-1);
-    printUnasked(*layout.pages());
+    while (!layout.go(Slice))
+        if (!progress.show(static_cast<int>(layout.share() * Half))) return false;
+    const Pages& pages = *layout.pages();
+    return printUnasked(pages, [&](int done) {
+        return progress.show(Half + static_cast<int>(qint64(Half) * done / pages.count()));
+    });
 }
 
 void DataReport::Show(const ado::RecordsetPtr& rows, Wait wait) const {

@@ -24,6 +24,7 @@ public:
     /// Lays all pages out and sends them to the default printer, without a dialog, the report's
     /// caption as the job's title. Without a printer they become a PDF in the person's documents
     /// folder, and a box names the file. Rows are taken from the first on; the row set stays open.
+    /// What takes longer than half a second can be given up; a box then says so.
     void PrintReport(const ado::RecordsetPtr& rows) const;
 
     enum class Wait { Modal, Modeless };
@@ -32,6 +33,9 @@ public:
     void Show(const ado::RecordsetPtr& rows, Wait wait) const;
 
 private:
+    /// False when the person gave up.
+    bool isPrinted(const ado::RecordsetPtr& rows) const;
+
     Report report_;
 };
 

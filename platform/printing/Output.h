@@ -48,8 +48,8 @@ bool print(const Pages& pages, const QPrinter& printer, int from, int to,
 /// Sends complete pages to the default printer, the report's caption as the job's title. Without
 /// one, or when it does not take the job, writes a PDF into the person's documents folder (or,
 /// where that cannot be written, the home folder or the folder for temporary files) beside what is
-/// there already, and says so in a box that names the file.
-void printUnasked(const Pages& pages);
+/// there already, and says so in a box that names the file. False when given up.
+bool printUnasked(const Pages& pages, const GoesOn& goesOn = {});
 
 /// The rows as a text that spreadsheets open: semicolons, decimal comma, texts in quotes, UTF-8
 /// with a mark. One line with the columns that the report shows, one for each detail row; of a

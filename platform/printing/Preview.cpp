@@ -10,6 +10,7 @@
 #include "platform/printing/PreviewFindBar.h"
 #include "platform/printing/PreviewOutput.h"
 #include "platform/printing/PreviewSource.h"
+#include "platform/printing/Progress.h"
 
 using namespace Qt::StringLiterals;
 

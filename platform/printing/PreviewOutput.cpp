@@ -5,40 +5,17 @@
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QPrinterInfo>
-#include <QProgressDialog>
 #include <QStandardPaths>
 
 #include "platform/core/MsgBox.h"
 #include "platform/printing/Output.h"
+#include "platform/printing/Progress.h"
 
 using namespace Qt::StringLiterals;
 
 namespace printing {
 
 namespace {
-
-/// Shows how far long work has come, and lets the person give it up.
-class Progress {
-public:
-    Progress(QWidget* parent, const QString& text, int pages)
-        : dialog_(text, u"&Cancelar"_s, 0, pages, parent) {
-        dialog_.setObjectName(u"Progresso"_s);
-        dialog_.setWindowTitle(parent->windowTitle());
-        dialog_.setMinimumWidth(ProgressWidth);
-        dialog_.setWindowModality(Qt::WindowModal);
-        dialog_.setMinimumDuration(400);
-        dialog_.setValue(0);
-    }
-    GoesOn goesOn() {
-        return [this](int done) {
-            dialog_.setValue(done);
-            return !dialog_.wasCanceled();
-        };
-    }
-
-private:
-    QProgressDialog dialog_;
-};
 
 /// What is being written, as dialogs and file names call it.
 struct Kind {
@@ -106,7 +83,7 @@ QString printAsking(QWidget* parent, const Pages& pages, int current) {
         from = std::max(from, printer.fromPage() - 1);
         to = std::min(to, printer.toPage() - 1);
     }
-    Progress progress(parent, u"A imprimir…"_s, to - from + 1);
+    Progress progress(parent, parent->windowTitle(), u"A imprimir…"_s, to - from + 1);
     if (!print(pages, printer, from, to, progress.goesOn())) return {};
     if (!printer.outputFileName().isEmpty()) return written(printer.outputFileName());
     return u"Enviado para a impressora «%1»"_s.arg(printer.printerName());
@@ -116,7 +93,7 @@ QString savePdfAsking(QWidget* parent, const Pages& pages) {
     const Kind kind{u"FicheiroPdf"_s, u"Guardar PDF"_s, u"Documento PDF (*.pdf)"_s, u"pdf"_s};
     const QString file = askFile(parent, kind, pages.caption);
     if (file.isEmpty()) return {};
-    Progress progress(parent, u"A guardar o PDF…"_s, pages.count());
+    Progress progress(parent, parent->windowTitle(), u"A guardar o PDF…"_s, pages.count());
     return writePdf(pages, file, progress.goesOn()) ? written(file) : QString();
 }
 

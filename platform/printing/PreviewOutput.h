@@ -14,9 +14,6 @@ class QWidget;
 /// those of Output.h.
 namespace printing {
 
-/// Of the dialogs that show how far long work has come, in pixels.
-inline constexpr int ProgressWidth = 320;
-
 /// Asks for printer, pages and copies. Without any printer the pages go where reports that nobody
 /// is asked about go.
 /// @param current  the page in sight, from 0

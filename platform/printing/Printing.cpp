@@ -101,9 +101,9 @@ QString newFile(const QString& folder, const QString& name) {
     }
 }
 
-/// Writes the pages where the person will look for them, or at least somewhere. Fails when there is
-/// no such place.
-QString keep(const Pages& pages) {
+/// Writes the pages where the person will look for them, or at least somewhere. Empty when given
+/// up. Fails when there is no such place.
+QString keep(const Pages& pages, const GoesOn& goesOn) {
     const QString name = fileName(pages.caption) + core::today().toString(u" dd-MM-yyyy"_s);
     QString tried;
     for (const auto place : {QStandardPaths::DocumentsLocation, QStandardPaths::HomeLocation,
@@ -111,8 +111,11 @@ QString keep(const Pages& pages) {
         const QString folder = QStandardPaths::writableLocation(place);
         const QString file = newFile(folder, name);
         if (!file.isEmpty()) {
-            if (core::passingOver([&] { writePdf(pages, file); })) return file;
+            bool complete = true;
+            if (core::passingOver([&] { complete = writePdf(pages, file, goesOn); }) && complete)
+                return file;
             QFile::remove(file);
+            if (!complete) return {};
         }
         tried += u"\n"_s + folder;
     }
@@ -144,21 +147,23 @@ bool print(const Pages& pages, const QPrinter& printer, int from, int to, const 
     return true;
 }
 
-void printUnasked(const Pages& pages) {
+bool printUnasked(const Pages& pages, const GoesOn& goesOn) {
     QString why = u"Não há nenhuma impressora predefinida."_s;
     if (const QPrinterInfo preset = QPrinterInfo::defaultPrinter(); !preset.isNull()) {
         try {
             QPrinter printer(preset, QPrinter::HighResolution);
             printer.setPageSize(QPageSize(QPageSize::A4));
             printer.setDocName(pages.caption);
-            print(pages, printer, 0, pages.count() - 1);
-            return;
+            return print(pages, printer, 0, pages.count() - 1, goesOn);
         } catch (const core::Failure& failure) {
             why = failure.text();
         }
     }
-    core::MsgBox(u"%1\n\nAs páginas ficaram guardadas no ficheiro\n%2"_s.arg(why, keep(pages)),
+    const QString file = keep(pages, goesOn);
+    if (file.isEmpty()) return false;
+    core::MsgBox(u"%1\n\nAs páginas ficaram guardadas no ficheiro\n%2"_s.arg(why, file),
                  core::Icon::Information, pages.caption);
+    return true;
 }
 
 }  // namespace printing

@@ -8,6 +8,7 @@
 #include <QPrinter>
 #include <QPrinterInfo>
 #include <QProcess>
+#include <QProgressBar>
 
 #include "platform/printing/DataReport.h"
 #include "reports/ExtractReports.h"
@@ -111,6 +112,37 @@ TEST_F(ReportOutput, PrintsWholeJobsOrNone) {
                     .text()
                     .startsWith(u"Não foi possível imprimir em «Secretaria»."_s));
     qunsetenv("TMPDIR");
+    report.PrintReport(movements());
+    EXPECT_EQ(server.titles(1).size(), 1);
+    expectExtract(server.file(1));  // the first job that the server got
+}
+
+TEST_F(ReportOutput, IsGivenUpByAClickWhileItIsPrepared) {
+    const ado::RecordsetPtr rows = open(
+        u"SELECT m.*, m.debito - m.credito AS saldo, m.debito AS euros, m.tipo AS rubrica FROM "
+        "tbZelmar_Movimentos m, tbZelmar_Movimentos AS times, tbZelmar_Movimentos AS again"_s);
+    const auto giveUp = [&] {
+        person.expectBox(
+            {.text = u"A impressão foi cancelada. Nada foi enviado para a impressora."_s,
+             .icon = core::Icon::Information,
+             .title = u"Extracto de Lançamentos"_s});
+        report.PrintReport(rows);
+    };
+    const auto whileTheJobIsMade = [&] {
+        auto* bar = person.here()->findChild<QProgressBar*>();
+        QObject::connect(bar, &QProgressBar::valueChanged, bar, [this, bar](int value) {
+            if (value > bar->maximum() / 2) bar->disconnect(), person.click(u"Cancelar"_s);
+        });
+    };
+    person.onScreen(u"Progresso"_s, whileTheJobIsMade);
+    giveUp();  // no printer: a file is written
+    EXPECT_EQ(documents(), QStringList());
+    support::PrintServer server;
+    person.onScreen(u"Progresso"_s, [&] { person.click(u"Cancelar"_s); });
+    giveUp();
+    person.onScreen(u"Progresso"_s, whileTheJobIsMade);
+    giveUp();
+    EXPECT_EQ(rows->State(), ado::adStateOpen);
     report.PrintReport(movements());
     EXPECT_EQ(server.titles(1).size(), 1);
     expectExtract(server.file(1));  // the first job that the server got
