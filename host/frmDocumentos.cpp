@@ -5,7 +5,6 @@
 #include <QFileDialog>
 #include <QGridLayout>
 #include <QLabel>
-#include <QProgressDialog>
 #include <QStandardPaths>
 
 #include "host/BookSettings.h"
@@ -14,6 +13,7 @@
 #include "platform/core/MsgBox.h"
 #include "platform/core/Values.h"
 #include "platform/forms/Fields.h"
+#include "platform/printing/Progress.h"
 
 using namespace Qt::StringLiterals;
 
@@ -166,17 +166,11 @@ void frmDocumentos::Command2_Click() {
 }
 
 void frmDocumentos::make(const QString& where, const Make& make) {
-    QProgressDialog progress(u"A fazer os documentos…"_s, u"&Cancelar"_s, 0, 0, this);
-    progress.setObjectName(u"Progresso"_s);
-    progress.setWindowTitle(Caption());
-    progress.setWindowModality(Qt::WindowModal);
-    progress.setMinimumDuration(500);
+    constexpr int Percent = 100;
+    printing::Progress progress(this, Caption(), u"A fazer os documentos…"_s, Percent);
     const documents::Made made = make([&](qsizetype done, qsizetype all) {
-        progress.setMaximum(static_cast<int>(all));
-        progress.setValue(static_cast<int>(done));
-        return !progress.wasCanceled();
+        return progress.show(static_cast<int>(done * Percent / all));
     });
-    progress.reset();
     if (made.documents == 0)
         core::MsgBox(u"Não há documentos a fazer."_s, core::Icon::Information, Caption());
     else if (made.isWhole)
