@@ -40,7 +40,7 @@ QVariant converted(const QVariant& change, ColumnType type) {
 }
 
 /// Bytes of child rows that are held in memory; very many more are set aside together.
-constexpr std::size_t MostInMemory = 32 << 20;
+constexpr std::size_t MostInMemory = 16 << 20;
 
 int requireColumn(const Pass& pass, const QString& name) {
     const int column = pass.indexOf(name);
