@@ -70,11 +70,10 @@ const char* RowStore::packed(std::size_t start, std::size_t end) const {
                              [](std::size_t at, const auto& piece) { return at < piece.start; });
         const std::size_t endOfPiece = behind == aside_->pieces.end() ? before_ : behind->start;
         const auto& piece = *std::prev(behind);
-        // A reading that fails leaves the former stretch.
-        std::vector<char> stretch(std::max(end - start, std::min(Stretch, endOfPiece - start)));
-        aside_->file->read(piece.place + static_cast<qint64>(start - piece.start), stretch.data(),
-                           stretch.size());
-        aside_->stretch = std::move(stretch);
+        aside_->start = before_;  // of no row, in case the reading fails
+        aside_->stretch.resize(std::max(end - start, std::min(Stretch, endOfPiece - start)));
+        aside_->file->read(piece.place + static_cast<qint64>(start - piece.start),
+                           aside_->stretch.data(), aside_->stretch.size());
         aside_->start = start;
     }
     return aside_->stretch.data() + (start - aside_->start);
