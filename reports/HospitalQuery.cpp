@@ -26,8 +26,7 @@ QString hospitals(const QString& table, const QDate& first, const QDate& last) {
            u"GROUP BY %1.hospital_id, tbHospitais.nome, tbHospitais.code "_s.arg(table);
 }
 
-/// The movements of a table with the members that `suffix` names; its text is told in small
-/// letters, but for the condition.
+/// The movements of all kinds of the tables that end with `suffix`: "" or "_Inactivos".
 QString movements(const QString& suffix, const QDate& first, const QDate& last) {
     return u"SELECT tbzelmar_movimentos%1.*, debito - credito AS divida, tbsocios%1.no_kor, "
            "tbZelmar_Plafonds.code AS rubrica FROM ((tbzelmar_movimentos%1 LEFT OUTER JOIN "

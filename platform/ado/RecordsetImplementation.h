@@ -11,12 +11,19 @@
 
 namespace ado {
 
+class RowFile;
+
 /// Child rows of a SHAPE, by the value that relates them.
 struct ChapterRows {
     QString name;
     int parentColumn = -1;
     std::shared_ptr<Pass> description;
     QHash<QString, std::shared_ptr<RowStore>> byKey;
+    std::size_t bytes = 0;          ///< of all children that are in memory
+    std::shared_ptr<RowFile> file;  ///< where the others are; none while there are none
+
+    /// Keeps the child row that the pass stands on, if it has a parent.
+    void keep(const QString& key);
 };
 
 /// State and work of a row set; Recordset adds the signals.

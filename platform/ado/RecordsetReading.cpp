@@ -4,6 +4,7 @@
 #include "platform/ado/dialect/Query.h"
 #include "platform/ado/engine/ColumnValue.h"
 #include "platform/ado/engine/EngineTexts.h"
+#include "platform/ado/engine/RowFile.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Values.h"
 
@@ -37,6 +38,9 @@ QVariant converted(const QVariant& change, ColumnType type) {
     }
     return toVariant(cell, type);
 }
+
+/// Bytes of child rows that are held in memory; very many more are set aside together.
+constexpr std::size_t MostInMemory = 16 << 20;
 
 int requireColumn(const Pass& pass, const QString& name) {
     const int column = pass.indexOf(name);
@@ -100,12 +104,23 @@ void Recordset::Implementation::openShape(const Query& query) {
     // One pass over the children; those of no parent are not kept.
     chapter->description = engine.open(child, {});
     const int childColumn = requireColumn(*chapter->description, shape.childColumn);
-    while (!chapter->byKey.isEmpty() && chapter->description->step()) {
-        const auto of = chapter->byKey.constFind(keyOf(chapter->description->cell(childColumn)));
-        if (of != chapter->byKey.constEnd()) (*of)->append(*chapter->description);
-    }
+    while (!chapter->byKey.isEmpty() && chapter->description->step())
+        chapter->keep(keyOf(chapter->description->cell(childColumn)));
     chapter->description->release();
     rows = std::move(parents);
+}
+
+void ChapterRows::keep(const QString& key) {
+    const auto of = byKey.constFind(key);
+    if (of == byKey.constEnd()) return;
+    RowStore& rows = **of;
+    const std::size_t before = rows.packedBytes();
+    rows.append(*description);
+    bytes += rows.packedBytes() - before;
+    if (bytes < MostInMemory) return;
+    if (!file) file = std::make_shared<RowFile>();
+    for (const auto& each : byKey) each->setAside(file);
+    bytes = 0;
 }
 
 void Recordset::Implementation::close() {

@@ -36,4 +36,25 @@ TEST_F(Shapes, GiveEachRowItsChildren) {
     EXPECT_EQ(core::toText(children->valueAt(1, 4)), u"30"_s);
 }
 
+TEST_F(Shapes, GiveMoreChildrenThanAreHeldInMemory) {
+    book.exec(u"DELETE FROM tbMov"_s);
+    QStringList values;
+    for (int id = 1; id <= 900; ++id) values << u"(%1, %2)"_s.arg(id).arg(id % 2);
+    book.exec(u"INSERT INTO tbMov(id, socio) VALUES "_s + values.join(u','));
+    const QString text(50'000, u'x');  // forty-five megabytes with all of them
+    const auto rows = open(
+        u"SHAPE {SELECT socio FROM tbMov GROUP BY socio ORDER BY socio} APPEND ({SELECT id, socio, "
+        "'%1' AS longo FROM tbMov ORDER BY id} RELATE 'socio' TO 'socio') AS detalhe"_s.arg(text),
+        shaping);
+    for (int socio : {0, 1}) {
+        rows->MoveTo(socio);
+        const auto children = rows->Chapter(u"detalhe"_s);
+        ASSERT_EQ(children->rowsInMemory(), 450);
+        for (int row = 449; row >= 0; --row) {
+            ASSERT_EQ(core::toLong(children->valueAt(row, 0)), 2 * row + (socio == 0 ? 2 : 1));
+            ASSERT_EQ(core::toText(children->valueAt(row, 2)), text);
+        }
+    }
+}
+
 }  // namespace

@@ -102,8 +102,8 @@ private:
     int operandBehind(int plus) const;
     void orders();
     void orderTerms();
-    void orderTerm(int first, int behind);
-    void orderNulls(int first, int behind);
+    bool orderTerm(int first, int behind);
+    bool orderNulls(int first, int behind);
     bool isIdentity(const ColumnName& column);
     QString orderOfUnion() const;
     QString orderOfGroups();

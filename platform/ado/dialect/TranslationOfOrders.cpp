@@ -6,38 +6,45 @@ namespace ado {
 using namespace Qt::StringLiterals;
 
 void Translation::orderTerms() {
-    // The engine takes an order of its own kind behind a UNION of groups only from around it.
-    if (compound_) {
-        edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
-        edits_.insert(s.token(order_).at, u") AS uniao "_s);
-    }
+    bool plain = true;
     eachTerm(order_ + 2, limit_ > order_ ? limit_ : s.count(),
-             [&](int first, int behind) { orderTerm(first, behind); });
+             [&](int first, int behind) { plain = orderTerm(first, behind) && plain; });
+    // The engine takes an order of its own kind behind a UNION of groups only from around it; a
+    // plain one stays behind it, where the rows are compared and sorted in one go.
+    if (!compound_ || plain) return;
+    edits_.insert(s.token(0).at, u"SELECT * FROM ("_s);
+    edits_.insert(s.token(order_).at, u") AS uniao "_s);
 }
 
-void Translation::orderTerm(int first, int behind) {
-    if (first < behind) orderNulls(first, behind);
+/// True for a column alone that stays ordered as the query has it.
+bool Translation::orderTerm(int first, int behind) {
+    bool plain = first < behind && !orderNulls(first, behind);
     if (s.is(behind - 1, "asc"_L1) || s.is(behind - 1, "desc"_L1)) --behind;
-    if (first >= behind || !s.isWord(first) || columnEnd(first) != behind) return;
+    if (first >= behind || !s.isWord(first) || columnEnd(first) != behind) return false;
     const ColumnName column = columnAt(first);
     const Token& name = s.token(behind - 1);
     const qsizetype end = name.at + name.length;
     // Behind a UNION only the columns of the result have names.
     if (compound_ && !column.qualifier.isEmpty())
         edits_.replace(s.token(first).at, end - s.token(first).at, aliasOf(column));
-    if (const QString order = orderOfTexts(); !order.isEmpty() && isText(first, behind))
+    if (const QString order = orderOfTexts(); !order.isEmpty() && isText(first, behind)) {
         edits_.insert(end, order);
+        plain = false;
+    }
+    return plain;
 }
 
 // Nulls come before all values. A table's identity has none and is found in its order as it is.
-void Translation::orderNulls(int first, int behind) {
+// False when the term has to say nothing of them.
+bool Translation::orderNulls(int first, int behind) {
     const bool descends = s.is(behind - 1, "desc"_L1);
     const QString order = orderOfNulls(descends);
-    if (order.isEmpty()) return;
+    if (order.isEmpty()) return false;
     const int end = descends || s.is(behind - 1, "asc"_L1) ? behind - 1 : behind;
-    if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return;
+    if (s.isWord(first) && columnEnd(first) == end && isIdentity(columnAt(first))) return false;
     const Token& last = s.token(behind - 1);
     edits_.insert(last.at + last.length, order);
+    return true;
 }
 
 bool Translation::isIdentity(const ColumnName& column) {

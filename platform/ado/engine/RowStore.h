@@ -1,14 +1,17 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <memory>
 #include <vector>
 
 #include "platform/ado/engine/Session.h"
 
 namespace ado {
 
+class RowFile;
+
 /// Rows in memory, packed: a byte for a null, nine for a number, a text's bytes and five more. A
-/// value is unpacked when it is asked for.
+/// value is unpacked when it is asked for. Very many rows can be set aside in a file.
 class RowStore {
 public:
     qint64 count() const { return static_cast<qint64>(starts_.size()); }
@@ -30,14 +33,27 @@ public:
     void beginRow(RowIdentity identity);
     void add(const Cell& cell);
 
-    /// Null for a column that the row does not have: the table was altered since.
+    /// Moves the packed rows to a file, from which they are read when they are asked for. Such a
+    /// store can grow, but not shrink.
+    void setAside(const std::shared_ptr<RowFile>& file);
+    /// Bytes of the packed rows that are not set aside.
+    std::size_t packedBytes() const { return bytes_.size(); }
+
+    /// Null for a column that the row does not have: the table was altered since. The text of a row
+    /// that was set aside is good until another row is asked for.
     Cell cell(qint64 row, int column) const;
     RowIdentity identity(qint64 row) const { return identities_[static_cast<std::size_t>(row)]; }
 
 private:
+    struct Aside;
+
+    const char* packed(std::size_t start, std::size_t end) const;
+
     std::vector<char> bytes_;
-    std::vector<std::size_t> starts_;
+    std::vector<std::size_t> starts_;  ///< as if nothing were set aside
     std::vector<RowIdentity> identities_;
+    std::size_t before_ = 0;        ///< bytes that were set aside
+    std::shared_ptr<Aside> aside_;  ///< none while nothing was
 };
 
 }  // namespace ado
