@@ -59,7 +59,10 @@ public:
     Q_INVOKABLE void Extratos() { note(u"Extratos"_s); }
     Q_INVOKABLE void LPagamentos() { note(u"LPagamentos"_s); }
     Q_INVOKABLE bool Login() { return note(u"Login"_s); }
-    Q_INVOKABLE bool Ldividas() { return note(u"Ldividas"_s); }
+    /// As the component's: fails without a word, and leaves the reason behind.
+    Q_INVOKABLE bool Ldividas() {
+        return core::passingOver([] { note(u"Ldividas"_s); });
+    }
     Q_INVOKABLE bool Lcartasdividas() { return note(u"Lcartasdividas"_s); }
     Q_INVOKABLE bool Lhospitais() { return note(u"Lhospitais"_s); }
 
@@ -180,6 +183,17 @@ TEST_F(PrincipalWindow, EveryOperationIsInTheMenuWithItsArguments) {
         action->trigger();
         EXPECT_EQ(Recorder::calls.last(), call);
     }
+}
+
+TEST_F(PrincipalWindow, TellsWhyAnOperationFailedWithoutAWord) {
+    auto* debts = window_.findChild<QAction*>(u"Ldividas"_s);
+    debts->trigger();
+    EXPECT_EQ(window_.statusBar()->currentMessage(), QString());
+    Recorder::failure = u"Falta o livro."_s;
+    debts->trigger();
+    EXPECT_EQ(window_.statusBar()->currentMessage(),
+              u"Não foi possível executar o pedido. Falta o livro."_s);
+    EXPECT_EQ(core::err().number(), 0);
 }
 
 TEST_F(PrincipalWindow, NewMovementsOfMembersWhoLeftAreNotTakenForAllOfTheirs) {
