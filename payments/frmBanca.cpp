@@ -220,10 +220,13 @@ void frmBanca::typeTransfers() {
         Timer1->setInterval(Stopped);
         throw;
     }
-    for (; !rows->atEnd(); rows->MoveNext()) {
+    while (!rows->atEnd()) {
         try {
             bank::typeTransfer(*rows, [this] { Timer1->setInterval(Stopped); });
+            rows->MoveNext();
         } catch (const core::Failure&) {
+            // A press on "&Abortar" that came meanwhile is the way out of a wait without end.
+            undisturbed.end();
             return;
         }
         undisturbed.serve();

@@ -48,13 +48,18 @@ Undisturbed::Undisturbed() {
 }
 
 Undisturbed::~Undisturbed() {
-    QCoreApplication::processEvents();  // what came since the last turn is dropped, too
+    if (!hasEnded_) QCoreApplication::processEvents();  // what came since then is dropped, too
 }
 
 void Undisturbed::serve() {
     if (!served_.hasExpired(MillisecondsBetweenTurns)) return;
     QCoreApplication::processEvents();
     served_.start();
+}
+
+void Undisturbed::end() {
+    qApp->removeEventFilter(this);
+    hasEnded_ = true;
 }
 
 bool Undisturbed::eventFilter(QObject*, QEvent* event) {

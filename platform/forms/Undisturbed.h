@@ -16,12 +16,15 @@ public:
 
     /// To be called often, as at each row; gives the windows their turn now and then.
     void serve();
+    /// Ends it early: what came since the windows' last turn is not dropped but served as usual.
+    void end();
 
 protected:
     bool eventFilter(QObject* receiver, QEvent* event) override;
 
 private:
     QElapsedTimer served_;
+    bool hasEnded_ = false;
 };
 
 }  // namespace forms

@@ -11,6 +11,7 @@
 
 #include "platform/core/Failure.h"
 #include "platform/forms/MsgBoxes.h"
+#include "platform/forms/Undisturbed.h"
 #include "tests/forms/SampleScreen.h"
 #include "tests/support/Operator.h"
 
@@ -146,6 +147,31 @@ TEST_F(ScreenLife, APressIsIgnoredWhileAHandlerOfTheSameScreenRuns) {
     person.expectBox({.text = u"Este Associado não tem NIB!"_s});
     person.fill(u"Livre"_s, u"1"_s);
     EXPECT_EQ(screen.pressed + screen.finished, 2);
+}
+
+TEST(UndisturbedWork, DropsPressesUnlessItEndsEarly) {
+    QPushButton button;
+    int presses = 0;
+    QObject::connect(&button, &QPushButton::clicked, [&presses] { ++presses; });
+    button.show();
+    const auto press = [&button] {
+        for (const QEvent::Type type : {QEvent::KeyPress, QEvent::KeyRelease})
+            QCoreApplication::postEvent(&button,
+                                        new QKeyEvent(type, Qt::Key_Space, Qt::NoModifier));
+    };
+    {
+        forms::Undisturbed work;
+        press();
+    }
+    QCoreApplication::processEvents();
+    EXPECT_EQ(presses, 0);
+    {
+        forms::Undisturbed work;
+        press();
+        work.end();
+    }
+    QCoreApplication::processEvents();
+    EXPECT_EQ(presses, 1);
 }
 
 TEST_F(ScreenLife, ModalScreensNest) {
