@@ -77,7 +77,7 @@ protected:
         EXPECT_EQ(person.find<forms::ListBox>(list)->chosen(), wanted);
     }
     /// What the printed rows come to: number, address and the four amounts.
-    QStringList printed(const QString& pages) {
+    QStringList printed(const QString& pages, const std::function<void()>& press = {}) {
         QStringList lines;
         person.onScreen(u"prtIRS"_s, [&] {
             person.waitUntil([&] { return person.peek<QLabel>(u"Estado"_s)->text() == pages; },
@@ -92,7 +92,7 @@ protected:
             }
             person.escape();
         });
-        person.accelerator(u'I');
+        press ? press() : person.accelerator(u'I');
         EXPECT_TRUE(person.find(u"Command3"_s)->hasFocus());
         return lines;
     }
@@ -158,6 +158,11 @@ TEST_F(Taxes, DeclaresWhatAMemberBoreHimself) {
             person.fill(u"No_Kor"_s, number);
             EXPECT_EQ(printed(u"Página 1 de 1"_s), QStringList());
         }
+        // Enter in the box prints for the number that stands there.
+        choose(u"List2"_s, {u"A - Titular"_s});
+        person.put(u"No_Kor"_s, u"7"_s);
+        EXPECT_EQ(printed(u"Página 1 de 1"_s, [&] { person.enter(); }),
+                  QStringList(u"7 Rua do Ouro, 5 30 100 60 10"_s));
         person.click(u"Option1"_s);  // the number stays and does not count
         choose(u"List2"_s, {u"C1 - 1.º filho(a)"_s});
         EXPECT_EQ(printed(u"Página 1 de 1"_s).size(), 1);
