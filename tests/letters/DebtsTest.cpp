@@ -2,16 +2,21 @@
 // Who owes: list and letters, by the operations that hosts call.
 #include <QApplication>
 #include <QLabel>
+#include <QProcess>
 #include <algorithm>
 
 #include "boundary/General.h"
 #include "boundary/environment/dtZelmars.h"
 #include "platform/core/Failure.h"
 #include "platform/printing/Layout.h"
+#include "platform/printing/Output.h"
 #include "platform/printing/Preview.h"
 #include "reports/DebtReports.h"
 #include "reports/ReportRows.h"
+#include "reports/TaxQuery.h"
+#include "reports/TaxReport.h"
 #include "tests/entry/EntryTest.h"
+#include "tests/support/PrintServer.h"
 
 using namespace Qt::StringLiterals;
 
@@ -43,6 +48,12 @@ protected:
     }
     void waitFor(const QString& pages) {
         person.waitUntil([&] { return person.peek<QLabel>(u"Estado"_s)->text() == pages; }, pages);
+    }
+    static QString textOf(const QString& pdf) {
+        QProcess reader;
+        reader.start(u"pdftotext"_s, {u"-layout"_s, pdf, u"-"_s});
+        EXPECT_TRUE(reader.waitForFinished() && reader.exitCode() == 0) << pdf.toStdString();
+        return QString::fromUtf8(reader.readAllStandardOutput());
     }
     /// Number and debt of each row that both reports show.
     static QStringList debtors() {
@@ -103,6 +114,49 @@ TEST_F(Debts, ASecondListBeforeTheFirstIsLaidOutLeavesBothUsable) {
     person.waitUntil([&] { return std::ranges::count_if(previews(), isWhole) == 1; },
                      u"the pages of the second"_s);
     EXPECT_EQ(previews().size(), 2);
+}
+
+TEST_F(Debts, SayTheSameOnPaperInPdfAndAsRows) {
+    owe(socio, u"1234.5"_s, u"0"_s);
+    owe(4711, u"0.1100"_s, u"0"_s);
+    book.exec(
+        u"insert into tbZelmar_Movimentos_Historico (ano, no_kor, nome, tipo, codABC, doc_valor, "
+        "debito, recebido) values (2025, '100015', 'Ana', 'DOC', 'A', 100, 60, 10)"_s);
+    General general;
+    ASSERT_TRUE(general.Login());
+    const QString debts =
+        environment::dtZelmars::instance().Commands(u"Print_frmListagemDividas"_s).CommandText;
+    const struct {
+        printing::Report report;
+        QString query;
+        QByteArray rows;
+    } cases[] = {
+        {Print_frmListagemDividas(), debts, "\"100015\";\"António Manuel Silva Matos\";1234,5\r\n"},
+        {Print_frmCartasDividas(), debts, "\"António Manuel Silva Matos\";\"100015\";"},
+        {prtIRS(), taxQuery({.year = u"2025"_s, .codes = {u"A"_s}}),
+         "\"Ana\";\"100015\";;2025;30;100;60;10;"}};
+    support::PrintServer printer;
+    int job = 0;
+    for (const auto& each : cases) {
+        SCOPED_TRACE(each.report.name.toStdString());
+        const ado::RecordsetPtr rows = openReportRows(each.report.dataMember, each.query);
+        printing::DataReport(each.report).PrintReport(rows);
+        printing::Layout layout(each.report, rows);
+        layout.go(-1);
+        const QString pdf = book.folder() + u"/%1.pdf"_s.arg(++job);
+        printing::writePdf(*layout.pages(), pdf);
+        const QString text = textOf(pdf);
+        EXPECT_TRUE(text.contains(u"100015"_s)) << text.toStdString();
+        EXPECT_EQ(printer.titles(job).last(), each.report.caption);
+        EXPECT_EQ(textOf(printer.file(job)).toStdString(), text.toStdString());
+        const QString csv = book.folder() + u"/linhas.csv"_s;
+        printing::writeCsv(each.report, rows, csv);
+        QFile file(csv);
+        ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+        const QByteArray lines = file.readAll();
+        EXPECT_TRUE(lines.contains(each.rows)) << lines.toStdString();
+        rows->Close();
+    }
 }
 
 TEST_F(Debts, WithoutAnyTheListIsEmpty) {
