@@ -3,12 +3,8 @@
 
 #include <QAction>
 #include <QCloseEvent>
-#include <QMenu>
-#include <QMenuBar>
 #include <QScopedValueRollback>
 #include <QScreen>
-#include <QSettings>
-#include <QStandardPaths>
 #include <QStatusBar>
 
 #include "data/Procedures.h"
@@ -16,6 +12,7 @@
 #include "host/MovementsView.h"
 #include "host/RulesConnection.h"
 #include "host/UnfinishedOperations.h"
+#include "host/WindowSettings.h"
 #include "host/frmDocumentos.h"
 #include "host/frmFicheiroBanco.h"
 #include "host/frmPrepararFecho.h"
@@ -59,12 +56,6 @@ void bringForward(QWidget* window) {
 constexpr QSize FrameSize(16, 48);  // about what a window manager adds
 constexpr int MessageTime = 8000;   // in milliseconds
 
-QSettings windowSettings() {
-    const QString folder =
-        QStandardPaths::writableLocation(QStandardPaths::GenericConfigLocation) + u"/zelmars"_s;
-    return QSettings(folder + u"/janela.ini"_s, QSettings::IniFormat);
-}
-
 }  // namespace
 
 frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
@@ -100,64 +91,6 @@ frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
 
 frmPrincipal::~frmPrincipal() = default;
 
-void frmPrincipal::addEntryMenu() {
-    QMenu* menu = menuBar()->addMenu(u"&Lançamentos"_s);
-    addOperation(menu, u"&Novo documento"_s, u"Ctrl+N"_s, Operations::newDocument(false));
-    addOperation(menu, u"Novo documento de &hospital"_s, u"Ctrl+H"_s, Operations::newDocument(true),
-                 u"NewMovimentoHospital"_s);
-    addOperation(menu, u"&Recebimento"_s, u"Ctrl+R"_s, {u"Recebimento"_s, {}});
-    addOperation(menu, u"&Correção"_s, u"Ctrl+K"_s, {u"Correcao"_s, {}});
-    menu->addSeparator();
-    addItem(menu, u"Registo"_s, u"&Abrir movimento"_s, u"Ctrl+O"_s,
-            [this] { movements_->chooseCurrent(); });
-    menu->addSeparator();
-    addItem(menu, u"Login"_s, u"&Ligar novamente"_s, {}, [this] { once([this] { login(); }); });
-    addItem(menu, u"Sair"_s, u"&Sair"_s, u"Ctrl+Q"_s, [this] { close(); });
-}
-
-void frmPrincipal::addListingMenus() {
-    QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
-    addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
-    addItem(payments, u"FicheiroBanco"_s, u"&Ficheiro para o banco…"_s, {},
-            [this] { once([this] { makeBankFile(); }); });
-    QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
-    addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
-    addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
-    addItem(extracts, u"Documentos"_s, u"&Documentos de todos os associados…"_s, {},
-            [this] { once([this] { makeDocuments(); }); });
-    QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
-    addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
-    addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});
-}
-
-void frmPrincipal::addYearMenus() {
-    QMenu* tables = menuBar()->addMenu(u"&Tabelas"_s);
-    addOperation(tables, u"&Rubricas e plafonds"_s, {}, Operations::rubrics());
-    addOperation(tables, u"&Hospitais"_s, {}, Operations::hospitals());
-    QMenu* year = menuBar()->addMenu(u"&Anual"_s);
-    addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
-    addOperation(year, u"&Manutenção de dados"_s, {}, {u"CallManutencaoDados"_s, {}});
-    addItem(year, u"Verificar"_s, u"&Verificar o livro"_s, {},
-            [this] { once([this] { checkBook(); }); });
-    year->addSeparator();
-    addItem(year, u"CallFechoAno"_s, u"&Fecho do ano"_s, {},
-            [this] { once([this] { closeYear(); }); });
-}
-
-void frmPrincipal::addHelpMenu() {
-    QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
-    addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
-    addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
-    menu->addSeparator();
-    addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
-        once([] {
-            core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(
-                             QApplication::applicationVersion()),
-                         core::Icon::Information);
-        });
-    });
-}
-
 void frmPrincipal::addStatusLine() {
     count_ = new QLabel;
     count_->setObjectName(u"Contagem"_s);
@@ -177,20 +110,6 @@ void frmPrincipal::addStatusLine() {
     statusBar()->addPermanentWidget(sample_);
     statusBar()->addPermanentWidget(book_);
     statusBar()->addPermanentWidget(user_);
-}
-
-void frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& caption,
-                           const QString& shortcut, const std::function<void()>& handler) {
-    QAction* action = menu->addAction(caption);
-    action->setObjectName(name);
-    action->setShortcut(QKeySequence(shortcut));
-    connect(action, &QAction::triggered, this, [handler] { forms::handle(handler); });
-}
-
-void frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
-                                const OperationCall& call, const QString& name) {
-    addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
-            [this, call] { run(call); });
 }
 
 /// A handler whose box or modal screen is still open is not started again, nor is another one: an
@@ -327,14 +246,14 @@ void frmPrincipal::closeEvent(QCloseEvent* event) {
 }
 
 void frmPrincipal::restoreLook() {
-    const QSettings settings = windowSettings();
+    const WindowSettings settings;
     if (!restoreGeometry(settings.value(u"janela"_s).toByteArray()))
         resize(QSize(1180, 700).boundedTo(screen()->availableSize() - FrameSize));
     movements_->setColumns(settings.value(u"colunas"_s).toByteArray());
 }
 
 void frmPrincipal::saveLook() const {
-    QSettings settings = windowSettings();
+    WindowSettings settings;
     settings.setValue(u"janela"_s, saveGeometry());
     settings.setValue(u"colunas"_s, movements_->columns());
 }

@@ -1,0 +1,88 @@
+// SPDX-License-Identifier: MIT
+// The menus of the main window. What an item does stands in frmPrincipal.cpp.
+#include <QAction>
+#include <QMenu>
+#include <QMenuBar>
+
+#include "host/MovementsView.h"
+#include "host/frmPrincipal.h"
+#include "platform/core/MsgBox.h"
+#include "platform/forms/Form.h"
+
+using namespace Qt::StringLiterals;
+
+namespace host {
+
+void frmPrincipal::addItem(QMenu* menu, const QString& name, const QString& caption,
+                           const QString& shortcut, const std::function<void()>& handler) {
+    QAction* action = menu->addAction(caption);
+    action->setObjectName(name);
+    action->setShortcut(QKeySequence(shortcut));
+    connect(action, &QAction::triggered, this, [handler] { forms::handle(handler); });
+}
+
+void frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
+                                const OperationCall& call, const QString& name) {
+    addItem(menu, name.isEmpty() ? call.operation : name, caption, shortcut,
+            [this, call] { run(call); });
+}
+
+void frmPrincipal::addEntryMenu() {
+    QMenu* menu = menuBar()->addMenu(u"&Lançamentos"_s);
+    addOperation(menu, u"&Novo documento"_s, u"Ctrl+N"_s, Operations::newDocument(false));
+    addOperation(menu, u"Novo documento de &hospital"_s, u"Ctrl+H"_s, Operations::newDocument(true),
+                 u"NewMovimentoHospital"_s);
+    addOperation(menu, u"&Recebimento"_s, u"Ctrl+R"_s, {u"Recebimento"_s, {}});
+    addOperation(menu, u"&Correção"_s, u"Ctrl+K"_s, {u"Correcao"_s, {}});
+    menu->addSeparator();
+    addItem(menu, u"Registo"_s, u"&Abrir movimento"_s, u"Ctrl+O"_s,
+            [this] { movements_->chooseCurrent(); });
+    menu->addSeparator();
+    addItem(menu, u"Login"_s, u"&Ligar novamente"_s, {}, [this] { once([this] { login(); }); });
+    addItem(menu, u"Sair"_s, u"&Sair"_s, u"Ctrl+Q"_s, [this] { close(); });
+}
+
+void frmPrincipal::addListingMenus() {
+    QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
+    addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
+    addItem(payments, u"FicheiroBanco"_s, u"&Ficheiro para o banco…"_s, {},
+            [this] { once([this] { makeBankFile(); }); });
+    QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
+    addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
+    addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
+    addItem(extracts, u"Documentos"_s, u"&Documentos de todos os associados…"_s, {},
+            [this] { once([this] { makeDocuments(); }); });
+    QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
+    addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
+    addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});
+}
+
+void frmPrincipal::addYearMenus() {
+    QMenu* tables = menuBar()->addMenu(u"&Tabelas"_s);
+    addOperation(tables, u"&Rubricas e plafonds"_s, {}, Operations::rubrics());
+    addOperation(tables, u"&Hospitais"_s, {}, Operations::hospitals());
+    QMenu* year = menuBar()->addMenu(u"&Anual"_s);
+    addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
+    addOperation(year, u"&Manutenção de dados"_s, {}, {u"CallManutencaoDados"_s, {}});
+    addItem(year, u"Verificar"_s, u"&Verificar o livro"_s, {},
+            [this] { once([this] { checkBook(); }); });
+    year->addSeparator();
+    addItem(year, u"CallFechoAno"_s, u"&Fecho do ano"_s, {},
+            [this] { once([this] { closeYear(); }); });
+}
+
+void frmPrincipal::addHelpMenu() {
+    QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
+    addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
+    addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
+    menu->addSeparator();
+    addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
+        once([] {
+            core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(
+                             QApplication::applicationVersion()),
+                         core::Icon::Information);
+        });
+    });
+}
+
+}  // namespace host
