@@ -32,9 +32,13 @@ Single spentFranchise(double net, double credit) {
     return Single(net - credit);
 }
 
+Single franchiseLeft(Single franchise, Single spent) {
+    return spent < franchise ? franchise - spent : Single();
+}
+
 Single creditAmount(Single net, Single franchise, Single spent) {
     if (!(spent < franchise)) return net;
-    const Single left = franchise - spent;
+    const Single left = franchiseLeft(franchise, spent);
     return left < net ? net - left : Single();
 }
 

@@ -32,6 +32,9 @@ Single netAmount(Single gross, Single left);
 /// more was credited than came out net.
 Single spentFranchise(double net, double credit);
 
+/// What of a franchise is still to be borne; it grows past the franchise where `spent` is below 0.
+Single franchiseLeft(Single franchise, Single spent);
+
 /// The net amount less what is left of the franchise, which brings it to 0 at most.
 Single creditAmount(Single net, Single franchise, Single spent);
 

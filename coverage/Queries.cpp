@@ -74,6 +74,30 @@ QString franchise(qint32 socio_id, const QVariant& rubrica_id) {
            core::toText(rubrica_id) + u" GROUP BY tbZelmar_Movimentos.socio_id"_s;
 }
 
+QString rubrics() {
+    return u"SELECT tbZelmar_Plafonds.*, code + '  -  ' + descrit AS completo FROM "
+           "tbZelmar_Plafonds ORDER BY code"_s;
+}
+
+QString accumulatorsOf(qint32 socio_id) {
+    return u"Select * from tbSocios_Acumulados WHERE socio_id="_s + QString::number(socio_id);
+}
+
+QString creditsBy(const QString& columns, qint32 socio_id) {
+    return u"SELECT %1, Sum(credito_ac) AS soma FROM tbSocios_Acumulados WHERE socio_id=%2 GROUP BY %1"_s
+        .arg(columns, QString::number(socio_id));
+}
+
+QString creditsOfRelativesBy(const QString& columns, qint32 socio_id) {
+    return u"SELECT %1, Sum(credito_ac) AS soma FROM tbSocios_Acumulados WHERE socio_id=%2 AND "
+           "codABC <> 'A' GROUP BY %1"_s.arg(columns, QString::number(socio_id));
+}
+
+QString franchises(qint32 socio_id) {
+    return u"SELECT rubrica_id, Sum(liquido) AS t_iliquido, Sum(credito) AS t_credito FROM "
+           "tbZelmar_Movimentos WHERE socio_id = %1 GROUP BY rubrica_id"_s.arg(socio_id);
+}
+
 QString member(qint32 socio_id) {
     return u"Select * from tbSocios where socio_id="_s + QString::number(socio_id);
 }

@@ -32,6 +32,17 @@ QString balance(qint32 socio_id);
 /// One row: what of the franchise is spent, whole family and every type of movement. Intentional:
 /// the alias `t_iliquido` sums `liquido`, whatever its name says.
 QString franchise(qint32 socio_id, const QVariant& rubrica_id);
+/// Every rubric, by code, with what the lists show of it as `completo`.
+QString rubrics();
+/// Every accumulator of one member, in order of insertion.
+QString accumulatorsOf(qint32 socio_id);
+/// A row for each value of the columns: a member's credit, he and all his family, as `soma`.
+/// @param columns  of the accumulators, parted by commas
+QString creditsBy(const QString& columns, qint32 socio_id);
+/// The same of the relatives alone.
+QString creditsOfRelativesBy(const QString& columns, qint32 socio_id);
+/// franchise() for every rubric at once, each row with its `rubrica_id`.
+QString franchises(qint32 socio_id);
 /// One row: a member.
 QString member(qint32 socio_id);
 

@@ -5,6 +5,7 @@
 #include <QVariant>
 #include <functional>
 
+#include "coverage/Explanation.h"
 #include "platform/ado/Recordset.h"
 
 namespace coverage {
@@ -48,6 +49,7 @@ struct TryOut {
     /// Called whenever a result is reached, so that it stands on the screen before the next box;
     /// may be empty.
     std::function<void(Result, const QVariant&)> onShown = {};
+    Explanation explanation = {};  ///< of this run, as far as it came
 };
 
 /// Works out what the plan pays for the pending document. Writes the result columns of the pending

@@ -46,10 +46,22 @@ Single spent(const Document& document) {
     return spentFranchise(core::toDouble(net), core::toDouble(credit));
 }
 
-Single credit(const Course& course) {
+Single credit(Course& course) {
     const Single net = course.single(u"liquido"_s);
-    if (course.franchise == Single()) return net;
-    return creditAmount(net, course.franchise, spent(course.document));
+    Explanation& told = course.told;
+    if (told.franchise == Single()) return net;
+    told.franchiseSpent = spent(course.document);
+    return creditAmount(net, told.franchise, told.franchiseSpent);
+}
+
+/// What the columns keep, beside how it came about.
+void tell(Course& course) {
+    Explanation& told = course.told;
+    told.gross = course.value(u"iliquido"_s);
+    told.net = course.value(u"liquido"_s);
+    told.credit = course.value(u"credito"_s);
+    told.debit = course.value(u"debito"_s);
+    told.end = Explanation::End::Reached;
 }
 
 }  // namespace
@@ -71,6 +83,7 @@ void setAmounts(Course& course) {
     } else {
         course.reach(Result::Debito, u"debito"_s, debitAmount(course.single(u"credito"_s)));
     }
+    tell(course);
     course.progress.finish();
 }
 

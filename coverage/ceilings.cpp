@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What is left of all ceilings that bind a document: each gives a remainder, floored at 0, and the
-// lowest remainder wins. The number of documents is the one limit that stops the try-out.
+// What is left of all ceilings that bind a document: the lowest remainder wins. The number of
+// documents is the one limit that stops the try-out.
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/Queries.h"
 #include "coverage/stages.h"
@@ -20,17 +20,6 @@ namespace {
 bool exists(const QVariant& ceiling) {
     return !core::isNullOrEmpty(ceiling);
 }
-
-/// What the accumulators say of the member, the person, the rubric and its main rubric.
-struct Accumulated {
-    Single creditOfPerson;
-    qint32 documents = 0;
-    Single creditOfHousehold;
-    Single creditOfRelatives;
-    Single groupCreditOfPerson;
-    Single groupCreditOfHousehold;
-    Single groupCreditOfRelatives;
-};
 
 /// The row stays also when the operator gives the entry up.
 void addAccumulator(const Course& course) {
@@ -91,44 +80,30 @@ Accumulated lookUpAccumulated(Course& course) {
     return found;
 }
 
-/// Lowers what is left to what a ceiling leaves, if that ceiling exists; one step of the progress.
-void narrow(Course& course, Single& left, const QVariant& ceiling, Single usedUp) {
-    if (exists(ceiling)) left = data::MinSingle(left, remainder(core::toDouble(ceiling), usedUp));
-    course.progress.advance();
+/// Adds ceilings to those that bind; a step of the progress for each that there could be.
+void take(Course& course, const std::vector<Ceiling>& ceilings, int steps) {
+    std::vector<Ceiling>& all = course.told.ceilings;
+    all.insert(all.end(), ceilings.begin(), ceilings.end());
+    for (int step = 0; step < steps; ++step) course.progress.advance();
 }
 
-/// A ceiling for relatives alone; for the member there is none.
-QVariant ofRelatives(const Course& course, const ado::Recordset& rubric) {
-    return course.isMembers() ? QVariant() : rubric.Collect(u"total_familia"_s);
-}
-
-void narrowByGroup(Course& course, const Accumulated& found, Single& left) {
+void takeGroup(Course& course) {
     const ado::RecordsetPtr main =
         data::openToRead(queries::rubric(course.rubric->Collect(u"rubrica_id_main"_s)));
-    if (!main->atEnd()) {
-        narrow(course, left, main->Collect(course.isMembers() ? u"socio"_s : u"familiar"_s),
-               found.groupCreditOfPerson);
-        narrow(course, left, main->Collect(u"agregado"_s), found.groupCreditOfHousehold);
-        narrow(course, left, ofRelatives(course, *main), found.groupCreditOfRelatives);
-    }
+    const Explanation& told = course.told;
+    if (!main->atEnd()) take(course, groupCeilings(limitsOf(*main, told.isMembers), told.used), 3);
     main->Close();
 }
 
 }  // namespace
 
 bool applyCeilings(Course& course) {
-    const ado::Recordset& rubric = *course.rubric;
-    const Accumulated found = lookUpAccumulated(course);
+    Explanation& told = course.told;
+    told.used = lookUpAccumulated(course);
+    take(course, ownCeilings(told.limits, told.used), 3);
 
-    Single left = NoCeiling;
-    narrow(course, left, rubric.Collect(u"agregado"_s), found.creditOfHousehold);
-    narrow(course, left, ofRelatives(course, rubric), found.creditOfRelatives);
-    // Intentional: always, so that a missing limit leaves nothing.
-    narrow(course, left, course.limit, found.creditOfPerson);
-
-    const QVariant documents =
-        rubric.Collect(course.isMembers() ? u"nomax_recibos_socio"_s : u"nomax_recibos_familiar"_s);
-    if (exists(documents) && isUsedUp(core::toDouble(documents), found.documents)) {
+    if (documentsAreUsedUp(told.limits, told.used)) {
+        told.end = Explanation::End::NoDocumentsLeft;
         course.progress.finish();
         core::MsgBox(u"O limite máximo do nº de documentos foi atingido."_s,
                      core::Icon::Information, course.document.caption);
@@ -137,15 +112,12 @@ bool applyCeilings(Course& course) {
     }
     course.progress.advance();
 
-    narrowByGroup(course, found, left);
+    takeGroup(course);
+    take(course, documentCeilings(told.limits), 0);
 
-    const QVariant most =
-        rubric.Collect(course.isMembers() ? u"socio_max_lan"_s : u"familiar_max_lan"_s);
-    // Intentional: the one limit without a floor; a negative maximum gives a negative remainder.
-    if (exists(most)) left = data::MinSingle(left, Single(most));
-
-    course.keep(u"saldo_plafond"_s, left);
-    course.show(Result::SaldoPlafond, course.value(u"saldo_plafond"_s));
+    course.keep(u"saldo_plafond"_s, leftOf(told.ceilings));
+    told.left = course.value(u"saldo_plafond"_s);
+    course.show(Result::SaldoPlafond, told.left);
     course.rubric->Close();
     return true;
 }

@@ -12,17 +12,14 @@ namespace coverage {
 /// A try-out under way: the document, what is known so far, and who is shown it.
 class Course {
 public:
-    Course(const Document& of, TryOut& as) : document(of), run(as) {}
+    Course(const Document& of, TryOut& as) : document(of), run(as), told(as.explanation) {}
 
     const Document& document;
     TryOut& run;
     Progress progress;
     ado::RecordsetPtr rubric;  ///< the rubric's row, open until the ceilings are done
-    Single limit;              ///< the rubric's yearly limit of this person; a missing one is 0
-    Single franchise;          ///< the rubric's franchise; a missing one is 0
+    Explanation& told;         ///< what is known so far, for a person who asks why
 
-    /// True when the document is the member's own, and not a relative's.
-    bool isMembers() const;
     /// A column of the movement.
     QVariant value(const QString& column) const { return document.record->Collect(column); }
     Single single(const QString& column) const { return Single(value(column)); }

@@ -61,50 +61,60 @@ Single singleOrZero(const QVariant& value) {
     return core::isNullOrEmpty(value) ? Single() : Single(value);
 }
 
+/// Ends the try-out with a box; false.
+bool endWith(Course& course, Explanation::End end, const QString& text) {
+    course.told.end = end;
+    course.progress.finish();
+    return refuse(text);
+}
+
 /// False when the document lies below the rubric's minimum.
 bool reachesMinimum(Course& course) {
-    const QVariant minimum =
-        course.rubric->Collect(course.isMembers() ? u"socio_min_lan"_s : u"familiar_min_lan"_s);
+    const QVariant& minimum = course.told.limits.minimum;
     if (core::isNullOrEmpty(minimum) ||
         !(core::compareNumbers(minimum, course.value(u"doc_valor"_s)) > 0))
         return true;
-    course.progress.finish();
-    return refuse(u"Este lançamento tem um limite minimo de "_s +
-                  core::formatted(minimum, core::format::Money));
+    return endWith(course, Explanation::End::BelowMinimum,
+                   u"Este lançamento tem um limite minimo de "_s +
+                       core::formatted(minimum, core::format::Money));
 }
 
 /// Limit, incidence and the plan's share. False when the try-out ends here: the box was shown.
 bool workOutShare(Course& course) {
     const ado::Recordset& rubric = *course.rubric;
-    course.limit = singleOrZero(rubric.Collect(course.isMembers() ? u"socio"_s : u"familiar"_s));
-    course.reach(Result::LimiteAplicavel, course.limit);
+    Explanation& told = course.told;
+    told.limits = limitsOf(rubric, told.isMembers);
+    course.reach(Result::LimiteAplicavel, singleOrZero(told.limits.person));
     if (!reachesMinimum(course)) return false;
 
-    course.franchise = singleOrZero(rubric.Collect(u"franquia"_s));
+    told.franchise = singleOrZero(rubric.Collect(u"franquia"_s));
     if (!course.document.isHospital) course.keep(u"incidencia"_s, course.value(u"doc_valor"_s));
-    course.reach(Result::Incidencia, course.value(u"incidencia"_s));
+    told.incidence = course.value(u"incidencia"_s);
+    course.reach(Result::Incidencia, told.incidence);
 
     const QVariant percent = rubric.Collect(u"Percent"_s);
     if (core::isNull(percent)) {
-        course.progress.finish();
-        course.run.bEnsaioValido = refuse(
+        course.run.bEnsaioValido = endWith(
+            course, Explanation::End::NoPercentage,
             u"Erro: não foi possível calcular a comparticipação, porque não existe valor para a "
             "percentagem."_s);
         return false;
     }
+    told.percent = Single(percent);
     course.reach(Result::Comparticipacao, u"comparticipacao"_s,
-                 share(core::toDouble(course.value(u"incidencia"_s)), Single(percent)));
+                 share(core::toDouble(told.incidence), told.percent));
+    told.share = course.value(u"comparticipacao"_s);
     return true;
 }
 
 }  // namespace
 
-bool Course::isMembers() const {
-    return document.personCode == data::person::Member;
-}
-
 void tryOut(const Document& document, TryOut& run) {
     run.bEnsaioValido = false;
+    run.explanation = {.isHospital = document.isHospital,
+                       .isMembers = document.personCode == data::person::Member,
+                       .documentValue = document.record->Collect(u"doc_valor"_s),
+                       .received = document.record->Collect(u"recebido"_s)};
     Course course(document, run);
     if (!amountsAreSound(*document.record) || !isComplete(document)) return;
 

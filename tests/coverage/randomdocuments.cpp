@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: MIT
 // What holds for every document, tried on thousands of them.
+#include <algorithm>
 #include <random>
 
+#include "coverage/Calculation.h"
+#include "coverage/Remainders.h"
 #include "platform/core/Values.h"
 #include "tests/coverage/Desk.h"
 
@@ -39,6 +42,7 @@ protected:
                                                          {"total_familia", maybe(1200)},
                                                          {"socio_max_lan", maybe(200)},
                                                          {"familiar_max_lan", maybe(200)},
+                                                         {"nomax_recibos_socio", maybeCount()},
                                                          {"franquia", maybe(60)}}));
         }
     }
@@ -48,6 +52,9 @@ protected:
     QVariant amount(int highest) { return (1 + below(highest * 100)) / 100.0; }
     /// The same, or none.
     QVariant maybe(int highest) { return below(2) ? amount(highest) : QVariant(); }
+
+    /// So many documents that none is refused.
+    QVariant maybeCount() { return below(2) ? QVariant(Documents + below(9)) : QVariant(); }
 
     Document anyDocument() {
         const double value = amount(400).toDouble();
@@ -76,6 +83,42 @@ protected:
                     0.0001);
     }
 
+    /// What the run tells of itself adds up to what the row keeps, and agrees with what was left to
+    /// that person beforehand.
+    void expectExplained(const coverage::Document& entry, const coverage::Remainders& before) {
+        const coverage::Explanation& told = run.explanation;
+        ASSERT_EQ(told.end, coverage::Explanation::End::Reached);
+        const coverage::Ceiling* bound = coverage::binding(told.ceilings);
+        ASSERT_NE(bound, nullptr);
+        // The column keeps four decimals.
+        EXPECT_NEAR(bound->left.toDouble(), number(entry, u"saldo_plafond"_s), 0.00005);
+        for (const coverage::Ceiling& each : told.ceilings) {
+            EXPECT_GE(each.left, bound->left);
+        }
+        EXPECT_EQ(told.net, entry.record->Collect(u"liquido"_s));
+        EXPECT_EQ(told.credit, entry.record->Collect(u"credito"_s));
+        expectLeftBefore(entry, before);
+    }
+    void expectLeftBefore(const coverage::Document& entry, const coverage::Remainders& before) {
+        const coverage::Explanation& told = run.explanation;
+        const std::vector<coverage::Remainder> all = before.of(entry.personCode);
+        EXPECT_EQ(all.size(), rubrics.size());
+        const auto found = std::find_if(all.begin(), all.end(), [&](const auto& each) {
+            return each.rubrica_id == core::toLong(entry.rubrica_id);
+        });
+        ASSERT_NE(found, all.end());
+        ASSERT_EQ(found->ceilings.size(), told.ceilings.size());
+        for (std::size_t at = 0; at < told.ceilings.size(); ++at) {
+            EXPECT_EQ(found->ceilings[at].of, told.ceilings[at].of);
+            EXPECT_EQ(found->ceilings[at].amount, told.ceilings[at].amount);
+            EXPECT_EQ(found->ceilings[at].used, told.ceilings[at].used);
+            EXPECT_EQ(found->ceilings[at].left, told.ceilings[at].left);
+        }
+        EXPECT_EQ(found->used.documents, told.used.documents);
+        EXPECT_EQ(found->franchiseLeft,
+                  coverage::franchiseLeft(told.franchise, told.franchiseSpent));
+    }
+
     std::string everything(const coverage::Document& entry) {
         std::string all = stored("select * from tbSocios_Acumulados order by 1, 2, 3");
         for (int column = 0; column < entry.record->columnCount(); ++column)
@@ -101,10 +144,12 @@ TEST_F(RandomDocuments, NeverCreditMoreThanTheCeilingsLeaveAndAddUp) {
         const Document document = anyDocument();
         socio = members[static_cast<std::size_t>(below(Members))];
         const coverage::Document entry = enter(document);
+        const coverage::Remainders before(socio);
         if (i % 3 == 0) expectSecondRunToChangeNothing(entry);
         begun = {};
         ASSERT_TRUE(coverage::post(posting(entry), run, begun));
         expectSoundAmounts(entry);
+        expectExplained(entry, before);
         EXPECT_EQ(entry.record->Collect(u"movimento_no"_s).toInt(), i + 1);
         if (HasFailure()) return;
     }
