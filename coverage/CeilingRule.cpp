@@ -39,6 +39,27 @@ Limits limitsOf(const ado::Recordset& rubric, bool isMembers) {
             .documents = either(u"nomax_recibos_socio"_s, u"nomax_recibos_familiar"_s)};
 }
 
+QString ceilingName(Ceiling::Of of, bool isMembers) {
+    const QString person = isMembers ? u"o próprio"_s : u"este familiar"_s;
+    switch (of) {
+        case Ceiling::Of::Household:
+            return u"Rubrica: todo o agregado"_s;
+        case Ceiling::Of::Relatives:
+            return u"Rubrica: os familiares"_s;
+        case Ceiling::Of::Person:
+            return u"Rubrica: "_s + person;
+        case Ceiling::Of::GroupPerson:
+            return u"Rubrica principal: "_s + person;
+        case Ceiling::Of::GroupHousehold:
+            return u"Rubrica principal: todo o agregado"_s;
+        case Ceiling::Of::GroupRelatives:
+            return u"Rubrica principal: os familiares"_s;
+        case Ceiling::Of::Document:
+            return u"Máximo por documento"_s;
+    }
+    return {};
+}
+
 std::vector<Ceiling> ownCeilings(const Limits& rubric, const Accumulated& used) {
     std::vector<Ceiling> ceilings;
     add(ceilings, Ceiling::Of::Household, rubric.household, used.creditOfHousehold);

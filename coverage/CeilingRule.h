@@ -54,6 +54,9 @@ struct Ceiling {
     Single left;
 };
 
+/// What a person calls such a ceiling: whose, and of which rubric.
+QString ceilingName(Ceiling::Of of, bool isMembers);
+
 /// The ceilings of the rubric itself. Intentional: the person's own is always there, so that a
 /// missing one leaves nothing.
 std::vector<Ceiling> ownCeilings(const Limits& rubric, const Accumulated& used);

@@ -2,12 +2,14 @@
 #include "entry/frmMovimentos.h"
 
 #include <QLabel>
+#include <QShortcut>
 
 #include "boundary/environment/dtZelmars.h"
 #include "coverage/annulment.h"
 #include "data/Codes.h"
 #include "data/MovementNote.h"
 #include "entry/DocumentVat.h"
+#include "entry/frmExplicacao.h"
 #include "payments/frmPagamentoCheque.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
@@ -73,6 +75,8 @@ void frmMovimentos::connectHandlers() {
     Command5->onClick = [this] { Command5_Click(); };
     Command4->onClick = [this] { Command4_Click(); };
     Command6->onClick = [this] { Command6_Click(); };
+    connect(new QShortcut(Qt::Key_F2, this), &QShortcut::activated, this,
+            [this] { forms::handle([this] { explain(); }); });
 }
 
 void frmMovimentos::connectFieldHandlers() {
@@ -101,6 +105,7 @@ void frmMovimentos::forgetEntry() {
     No_Kor->Clear();
     clearMember();
     operation_ = {};
+    explained_.reset();
     for (const ResultBox& result : resultBoxes()) result.box->Clear();
 }
 
@@ -273,9 +278,42 @@ coverage::TryOut frmMovimentos::tryOutShown() {
     return run;
 }
 
-void frmMovimentos::Command5_Click() {
+QVariantList frmMovimentos::asked() const {
+    return {Socio_ID, Text3->Text(), DataCombo1->BoundText(), Text6->Value(), Text9->Value()};
+}
+
+/// Work with a try-out in it, of which F2 tells afterwards.
+void frmMovimentos::tryOutAs(const std::function<void(coverage::TryOut& run)>& work) {
+    explained_.reset();
+    const QVariantList of = asked();
     coverage::TryOut run = tryOutShown();
-    coverage::tryOut(document(), run);
+    work(run);
+    explained_ = {run.explanation, of};
+}
+
+void frmMovimentos::Command5_Click() {
+    tryOutAs([this](coverage::TryOut& run) { coverage::tryOut(document(), run); });
+}
+
+/// Shows why the try-out came to its amounts.
+void frmMovimentos::explain() {
+    QString why;
+    if (bShowing())
+        why = u"Este movimento já está lançado: o porquê vê-se ao lançar, depois do ensaio."_s;
+    else if (!explained_)
+        why = u"Ainda não há ensaio. Faça o ensaio (F9); F2 diz então porquê."_s;
+    else if (explained_->of != asked())
+        why = u"O documento mudou depois do ensaio. Faça o ensaio de novo (F9), e depois F2."_s;
+    else if (explained_->explanation.end == coverage::Explanation::End::Refused)
+        why =
+            u"O ensaio foi recusado antes de calcular. Corrija o que ele disse e faça-o de novo "
+            "(F9)."_s;
+    if (!why.isEmpty()) {
+        MsgBox(why, Icon::Information, Caption());
+        return;
+    }
+    auto* shown = new frmExplicacao(explained_->explanation);
+    shown->ShowModal();
 }
 
 void frmMovimentos::post() {
@@ -287,9 +325,9 @@ void frmMovimentos::post() {
                                     .documentNumber = Text5->Text(),
                                     .hospital = DataCombo2->Text(),
                                     .askCheque = &payments::frmPagamentoCheque::ask};
-    coverage::TryOut run = tryOutShown();
-    if (coverage::post(posting, run, operation_))
-        return leaveEntry(u"Lançado com o nº %1"_s.arg(operation_.movimento_no));
+    bool isPosted = false;
+    tryOutAs([&](coverage::TryOut& run) { isPosted = coverage::post(posting, run, operation_); });
+    if (isPosted) return leaveEntry(u"Lançado com o nº %1"_s.arg(operation_.movimento_no));
     if (operation_.isRegistered) lockFields();
 }
 

@@ -103,6 +103,7 @@ private:
     void Command4_Click();
     void Command5_Click();
     void Command6_Click();
+    void explain();
 
     void takeMemberFound(ado::Recordset& member);
     void searchMember();
@@ -122,9 +123,19 @@ private:
     };
     std::vector<ResultBox> resultBoxes() const;
 
+    /// What a try-out came to, and what it was asked of: when that has changed since, it explains
+    /// another document than the screen shows.
+    struct Explained {
+        coverage::Explanation explanation;
+        QVariantList of;
+    };
+    QVariantList asked() const;
+    void tryOutAs(const std::function<void(coverage::TryOut& run)>& work);
+
     com::Object search_;  ///< the last search component; keeps its premium extract open
     QString memberNumber_;
-    data::Operation operation_;  ///< the posting or annulment that this screen is for
+    std::optional<Explained> explained_;  ///< the last try-out of this entry
+    data::Operation operation_;           ///< the posting or annulment that this screen is for
 };
 
 }  // namespace entry

@@ -98,8 +98,9 @@ public:
         chooseMember(u"03-pergunta-quotizacoes"_s);
         choosePerson(u"04-escolher-familiar"_s, {u"<Return>"_s});
         fillIn({u"4711"_s, u"87,35"_s, u"0"_s, u"23"_s, {}, u"Lentes"_s, u"5.02"_s, {}});
-        player_.step(u"frmMovimentos"_s, u"05-ensaio"_s, typing({u"<Alt+O>"_s}),
-                     shows(u"Debito"_s));
+        player_.step(u"frmMovimentos"_s, u"05-ensaio"_s, typing({u"<F2>"_s}), shows(u"Debito"_s));
+        player_.step(u"frmExplicacao"_s, u"39-porque"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<Alt+O>"_s}));
         player_.step(u"box:Deseja finalizar o registo?"_s, u"06-confirmar"_s,
                      typing({u"<Alt+S>"_s}));
         player_.step(u"frmMovimentosF"_s, u"07-sair-de-lancamentos"_s, typing({u"<Return>"_s}));
