@@ -35,19 +35,6 @@ bool inArrears(const ado::Recordset& premium) {
            core::compareNumbers(today.month() - 1, premium.Collect(u"ult_mes"_s)) > 0;
 }
 
-void warnOfPremium(const ado::Recordset& premium) {
-    if (inArrears(premium))
-        MsgBox(
-            u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) "
-            "desde "_s +
-                core::toText(premium.Collect(u"ult_mes"_s)) + u"/"_s +
-                core::toText(premium.Collect(u"ult_ano"_s)) + u"."_s,
-            Icon::Critical);
-    else if (differ(premium.Collect(u"total_quotas"_s), premium.Collect(u"total_pago"_s)))
-        MsgBox(u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s,
-               Icon::Critical);
-}
-
 /// True when the waiting period that ends on `end` is over: the last day still belongs to it. A
 /// person whose row is gone has no end, not even null, and is refused.
 bool waitingIsOver(const QVariant& end) {
@@ -99,15 +86,24 @@ QString premiumQuery(qint32 socio_id) {
     return u"select * from tbQuotas_Socios where socio_id="_s + QString::number(socio_id);
 }
 
-com::Object testPremium(qint32 socio_id) {
+QString premiumWarning(qint32 socio_id) {
     const ado::RecordsetPtr premium = data::openToRead(premiumQuery(socio_id));
     if (premium->atEnd())
-        MsgBox(
-            u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
-            "de Saúde)."_s,
-            Icon::Critical);
-    else
-        warnOfPremium(*premium);
+        return u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
+               "de Saúde)."_s;
+    if (inArrears(*premium))
+        return u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) "
+               "desde "_s +
+               core::toText(premium->Collect(u"ult_mes"_s)) + u"/"_s +
+               core::toText(premium->Collect(u"ult_ano"_s)) + u"."_s;
+    if (differ(premium->Collect(u"total_quotas"_s), premium->Collect(u"total_pago"_s)))
+        return u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s;
+    return {};
+}
+
+com::Object testPremium(qint32 socio_id) {
+    const QString warning = premiumWarning(socio_id);
+    if (!warning.isEmpty()) MsgBox(warning, Icon::Critical);
     if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
                u"Quotizações"_s, Buttons::NoYes) != Answer::Yes)
         return {};

@@ -55,6 +55,7 @@ void frmExplicacao::fill(const coverage::Explanation& told) {
             Grid1->setItem(row, column++, item(amount, line.stands, Qt::AlignRight));
         ++row;
     }
+    Grid1->horizontalHeader()->setMinimumSectionSize(fontMetrics().horizontalAdvance(u'0') * 13);
     Grid1->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
     Grid1->horizontalHeader()->setSectionResizeMode(0, QHeaderView::Stretch);
     for (int column = 1; column < Grid1->columnCount(); ++column)

@@ -16,17 +16,12 @@ using namespace Qt::StringLiterals;
 
 namespace host {
 
-namespace {
-
-/// Why a movement has no screen to be looked at on; empty for those that have one.
 QString reasonNotToOpen(const QString& tipo) {
     if (tipo == "ANL"_L1) return u"foi anulado."_s;
     if (tipo == "COR"_L1) return u"é a correção de um movimento anulado."_s;
     if (tipo == "SA"_L1) return u"é o saldo que passou do ano anterior."_s;
     return {};
 }
-
-}  // namespace
 
 MovementsView::MovementsView()
     : movements_(new MovementList(this)),
@@ -202,6 +197,12 @@ void MovementsView::focusFilter() {
 
 void MovementsView::focusList() {
     list_->setFocus();
+}
+
+qint32 MovementsView::current() const {
+    const QModelIndex index = list_->currentIndex();
+    return index.isValid() && stack_->currentIndex() == 0 ? movements_->movimento_id(index.row())
+                                                          : 0;
 }
 
 QByteArray MovementsView::columns() const {

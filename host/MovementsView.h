@@ -15,6 +15,9 @@ namespace host {
 class MovementTable;
 class Notice;
 
+/// Why a movement of that type has no screen to be looked at on; empty for those that have one.
+QString reasonNotToOpen(const QString& tipo);
+
 /// The list of movements in force with its filter; in place of the list a text when the book cannot
 /// be read.
 class MovementsView : public QWidget {
@@ -35,6 +38,8 @@ public:
     void focusList();
     /// As Enter on the movement under the cursor.
     void chooseCurrent();
+    /// The movement under the cursor; 0 for none.
+    qint32 current() const;
     QByteArray columns() const;
     /// Widths as columns() gave them; anything else leaves the usual ones.
     void setColumns(const QByteArray& columns);

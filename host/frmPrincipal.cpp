@@ -9,10 +9,12 @@
 
 #include "data/Procedures.h"
 #include "host/BookSettings.h"
+#include "host/MemberAccount.h"
 #include "host/MovementsView.h"
 #include "host/RulesConnection.h"
 #include "host/UnfinishedOperations.h"
 #include "host/WindowSettings.h"
+#include "host/frmConta.h"
 #include "host/frmDocumentos.h"
 #include "host/frmFicheiroBanco.h"
 #include "host/frmPrepararFecho.h"
@@ -159,6 +161,35 @@ void frmPrincipal::login() {
 void frmPrincipal::checkBook() {
     auto* shown = new frmVerificacao(checkedBook());
     shown->ShowModal();
+}
+
+void frmPrincipal::showAccountOfMovement() {
+    const qint32 movimento_id = movements_->current();
+    if (movimento_id == 0) return findMember();
+    const qint32 socio_id = memberOfMovement(BookSettings::read(), movimento_id);
+    if (socio_id != 0) return showAccount(socio_id);
+    core::MsgBox(u"O associado deste movimento já não está entre os activos."_s,
+                 core::Icon::Information);
+}
+
+void frmPrincipal::findMember() {
+    const com::Object members = com::createObject(u"Tiqueta.General"_s);
+    members.call(u"Login"_s);
+    const qint32 socio_id = members.call(u"FindSocios"_s).toInt();
+    if (socio_id != 0) showAccount(socio_id);
+}
+
+/// One member's page at a time: the next one takes the place of the last.
+void frmPrincipal::showAccount(qint32 socio_id) {
+    auto* shown = new frmConta(BookSettings::read(), socio_id);
+    if (account_) account_->Unload();
+    account_ = shown;
+    shown->onMovement = [this](qint32 movimento_id, const QString& tipo) {
+        const QString reason = reasonNotToOpen(tipo);
+        if (reason.isEmpty()) return run(Operations::movement(movimento_id, this));
+        core::MsgBox(u"Este movimento não se abre: "_s + reason, core::Icon::Information);
+    };
+    shown->Show();
 }
 
 void frmPrincipal::makeBankFile() {

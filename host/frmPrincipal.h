@@ -12,6 +12,7 @@ class QMenu;
 namespace host {
 
 class MovementsView;
+class frmConta;
 
 /// The window a person starts with: the movements in force, and a menu with every operation of the
 /// component.
@@ -54,6 +55,9 @@ private:
     void tellWhyNot();
     void login();
     void checkBook();
+    void showAccountOfMovement();
+    void findMember();
+    void showAccount(qint32 socio_id);
     void makeBankFile();
     void makeDocuments();
     void closeYear();
@@ -65,6 +69,7 @@ private:
     bool isOffering_ = false;  ///< the question about unfinished operations is being asked
     Operations operations_;
     bool isRunning_ = false;
+    QPointer<frmConta> account_;  ///< the member's page that is open; null for none
     MovementsView* movements_;
     QLabel* count_;
     QLabel* sample_;

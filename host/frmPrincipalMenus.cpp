@@ -76,6 +76,11 @@ void frmPrincipal::addHelpMenu() {
     addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
     addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
     menu->addSeparator();
+    addItem(menu, u"Conta"_s, u"&Conta do associado"_s, u"Ctrl+M"_s,
+            [this] { once([this] { showAccountOfMovement(); }); });
+    addItem(menu, u"Procurar"_s, u"&Procurar um associado…"_s, u"Ctrl+Shift+M"_s,
+            [this] { once([this] { findMember(); }); });
+    menu->addSeparator();
     addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
         once([] {
             core::MsgBox(u"Zelmars %1\nPlano de saúde: lançamentos, contas e pagamentos."_s.arg(

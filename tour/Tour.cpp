@@ -137,6 +137,16 @@ public:
         player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
     }
 
+    /// The member of the newest movement, and what the ceilings leave his family, printed.
+    void account() {
+        choose(u"Conta"_s);
+        player_.step(u"frmConta"_s, u"40-conta"_s, typing({u"<Alt+I>"_s}));
+        player_.step(u"prtResta"_s, u"41-o-que-resta"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        player_.step(u"frmConta"_s, {}, {});
+        player_.step(u"frmConta"_s, {}, typing({u"<Escape>"_s}));
+    }
+
     void otherWindows() {
         open({}, Operations::newDocument(false));
         player_.step(u"frmMovimentos"_s, {}, typing({u"<Alt+P>"_s}), shows(u"Text8"_s));
@@ -322,6 +332,7 @@ bool play(const QString& folder) {
     script.document();
     script.hospitalBill();
     script.view();
+    script.account();
     script.otherWindows();
     const QString extract = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);
     QFile::remove(extract);

@@ -2,6 +2,7 @@
 #include "platform/ado/Recordset.h"
 
 #include "platform/ado/RecordsetImplementation.h"
+#include "platform/ado/ValueRows.h"
 #include "platform/ado/engine/ColumnValue.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Values.h"
@@ -31,6 +32,14 @@ Recordset::~Recordset() = default;
 
 RecordsetPtr Recordset::create() {
     return RecordsetPtr(new Recordset);
+}
+
+RecordsetPtr Recordset::ofValues(std::vector<Column> columns, std::vector<QVariantList> rows) {
+    RecordsetPtr set = create();
+    set->d->rows = std::make_unique<Rows>(
+        std::make_shared<ValueRows>(std::move(columns), std::move(rows)), true);
+    set->MoveFirst();
+    return set;
 }
 
 void Recordset::Open(const QString& source, const ConnectionPtr& connection, CursorType cursor,

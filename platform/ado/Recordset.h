@@ -4,6 +4,7 @@
 #include <QObject>
 #include <QVariant>
 #include <memory>
+#include <vector>
 
 #include "platform/ado/Connection.h"
 #include "platform/ado/Constants.h"
@@ -44,6 +45,10 @@ class Recordset : public QObject {
     Q_OBJECT
 public:
     static RecordsetPtr create();
+    /// An open set of values that were never in a book, to be read only: for reports of what a
+    /// program worked out. Each row has a value of the column's type for each column; an invalid
+    /// one is null.
+    static RecordsetPtr ofValues(std::vector<Column> columns, std::vector<QVariantList> rows);
     ~Recordset() override;
 
     /// Opens a query: one SELECT, or a SHAPE on a shaping connection; anything else, or a

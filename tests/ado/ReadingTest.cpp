@@ -3,6 +3,7 @@
 #include <QFile>
 
 #include "SmallBook.h"
+#include "platform/core/Values.h"
 
 using namespace Qt::StringLiterals;
 
@@ -185,6 +186,28 @@ TEST_F(Reading, OfAStatementThatTheEngineRefusesBringsItsText) {
                                                               ? u"column \"nada\" does not exist"_s
                                                               : u"no such column: nada"_s));
     EXPECT_EQ(failure.code(), support::onServer() ? u"42703"_s : u"1"_s);
+}
+
+TEST_F(Reading, TakesValuesThatWereNeverInABook) {
+    const ado::RecordsetPtr set = ado::Recordset::ofValues(
+        {{u"Nome"_s, ado::ColumnType::Text},
+         {u"valor"_s, ado::ColumnType::Money},
+         {u"dia"_s, ado::ColumnType::DateTime},
+         {u"docs"_s, ado::ColumnType::Integer32}},
+        {{u"Conceição"_s, 12.5, QDateTime(QDate(2026, 11, 24), QTime(0, 0)), 3}, {{}, {}, {}, {}}});
+    ASSERT_EQ(set->RecordCount(), 2);
+    EXPECT_EQ(set->Collect(u"nome"_s), u"Conceição"_s);
+    EXPECT_EQ(core::toText(set->Collect(u"valor"_s)), u"12.5"_s);
+    EXPECT_EQ(core::toDate(set->Collect(u"dia"_s)), QDate(2026, 11, 24));
+    EXPECT_EQ(set->Collect(u"docs"_s).toInt(), 3);
+    set->MoveNext();
+    for (int column = 0; column < set->columnCount(); ++column)
+        EXPECT_TRUE(core::isNull(set->value(column))) << column;
+    set->MoveNext();
+    EXPECT_TRUE(set->atEnd());
+    EXPECT_EQ(failureOf([&] { set->setCollect(u"nome"_s, u"x"_s); }).number(), core::NoCurrentRow);
+    set->MoveFirst();
+    EXPECT_EQ(failureOf([&] { set->setCollect(u"nome"_s, u"x"_s); }).number(), core::NotUpdatable);
 }
 
 }  // namespace

@@ -54,6 +54,18 @@ QList<Listed> ofMovementsAndMembers() {
     };
 }
 
+/// What is left to a member, all rubrics at once.
+QList<Listed> ofRemainders() {
+    using namespace coverage::queries;
+    return {{u"rubrics"_s, rubrics()},
+            {u"accumulators of a member"_s, accumulatorsOf(Member)},
+            {u"credits by rubric"_s, creditsBy(u"rubrica_id"_s, Member)},
+            {u"credits by group and person"_s, creditsBy(u"rubrica_id_main, codABC"_s, Member)},
+            {u"credits of relatives by group"_s, creditsOfRelativesBy(u"rubrica_id_main"_s, Member),
+             false},
+            {u"franchises"_s, franchises(Member)}};
+}
+
 QList<Listed> ofAccumulators() {
     using namespace coverage::queries;
     const QString left = u"tbSocios_Acumulados_Inactivos"_s;
@@ -104,5 +116,5 @@ QList<Listed> printed() {
 }  // namespace
 
 QList<Listed> statementsOfTheCode() {
-    return commands() + ofMovementsAndMembers() + ofAccumulators() + printed();
+    return commands() + ofMovementsAndMembers() + ofAccumulators() + ofRemainders() + printed();
 }

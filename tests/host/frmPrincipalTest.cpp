@@ -65,6 +65,8 @@ public:
     }
     Q_INVOKABLE bool Lcartasdividas() { return note(u"Lcartasdividas"_s); }
     Q_INVOKABLE bool Lhospitais() { return note(u"Lhospitais"_s); }
+    /// As the search's, which the person gives up.
+    Q_INVOKABLE int FindSocios() { return 0; }
 
 private:
     static bool note(const QString& call) {
@@ -105,14 +107,18 @@ class PrincipalWindow : public FilledBook {
 protected:
     void SetUp() override {
         forms::install();
-        com::registerRunning(u"Zelmars.General"_s, [] { return new Recorder; });
+        for (const QString& name : {u"Zelmars.General"_s, u"Tiqueta.General"_s})
+            com::registerRunning(name, [] { return new Recorder; });
         Recorder::calls.clear();
         Recorder::failure.clear();
         window_.show();
         person_.screen(u"frmPrincipal"_s);
         person_.waitUntil([&] { return !count().contains(u"a ler"_s); }, u"the list is read"_s);
     }
-    void TearDown() override { com::registerRunning(u"Zelmars.General"_s, {}); }
+    void TearDown() override {
+        for (const QString& name : {u"Zelmars.General"_s, u"Tiqueta.General"_s})
+            com::registerRunning(name, {});
+    }
 
     QString count() { return person_.find<QLabel>(u"Contagem"_s)->text(); }
     /// What a cell shows as it is painted now.
@@ -332,6 +338,7 @@ TEST_F(PrincipalWindow, EveryKeyOfTheMenusWorksFromEverywhere) {
             const QKeySequence key = action->shortcut();
             if (key.isEmpty() || action->objectName() == u"Sair"_s || !action->isEnabled())
                 continue;
+            person_.screen(u"frmPrincipal"_s);  // a page may have come to the front
             window_.findChild<QWidget*>(widget)->setFocus();
             int triggered = 0;
             const auto heard = QObject::connect(action, &QAction::triggered, [&] { ++triggered; });
