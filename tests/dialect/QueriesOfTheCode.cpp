@@ -57,13 +57,13 @@ QList<Listed> ofMovementsAndMembers() {
 /// What is left to a member, all rubrics at once.
 QList<Listed> ofRemainders() {
     using namespace coverage::queries;
-    return {{u"rubrics"_s, rubrics()},
-            {u"accumulators of a family"_s, accumulatorsOf(Member)},
-            {u"credits by rubric"_s, creditsBy(u"rubrica_id"_s, Member)},
-            {u"credits by group and person"_s, creditsBy(u"rubrica_id_main, codABC"_s, Member)},
-            {u"credits of relatives by group"_s, creditsOfRelativesBy(u"rubrica_id_main"_s, Member),
-             false},
-            {u"franchises"_s, franchises(Member)}};
+    return {
+        {u"rubrics"_s, rubrics()},
+        {u"accumulators of a family"_s, accumulatorsOf(Member)},
+        {u"credits by rubric"_s, creditsBy(u"rubrica_id"_s, Member)},
+        {u"credits by group and person"_s, creditsBy(u"rubrica_id_main, codABC"_s, Member)},
+        {u"credits of relatives by group"_s, creditsOfRelativesBy(u"rubrica_id_main"_s, Member)},
+        {u"franchises"_s, franchises(Member)}};
 }
 
 QList<Listed> ofAccumulators() {
