@@ -24,7 +24,7 @@ namespace forms {
 
 namespace {
 
-constexpr QColor Accent(0x2b, 0x7a, 0x8c);
+constexpr QColor Accent(0x23, 0x6c, 0x7d);
 constexpr QColor AccentOnDark(0x62, 0xbc, 0xd0);
 constexpr QColor TextOnBright(0x10, 0x18, 0x1b);
 
