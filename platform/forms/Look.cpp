@@ -2,6 +2,7 @@
 #include "platform/forms/Look.h"
 
 #include <QApplication>
+#include <QFileDialog>
 #include <QHeaderView>
 #include <QIcon>
 #include <QLibraryInfo>
@@ -11,6 +12,7 @@
 #include <QPalette>
 #include <QPixmap>
 #include <QProxyStyle>
+#include <QScreen>
 #include <QStyleOption>
 #include <QTableView>
 #include <QTranslator>
@@ -275,6 +277,26 @@ private:
     };
 };
 
+/// The toolkit's box for files comes in a size, and with columns, of its own, whatever the size of
+/// the letters.
+class FileBoxes : public QObject {
+public:
+    using QObject::QObject;
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        if (event->type() != QEvent::Show) return false;
+        auto* box = qobject_cast<QFileDialog*>(watched);
+        if (!box) return false;
+        const QFontMetrics letters = box->fontMetrics();
+        box->resize(QSize(letters.averageCharWidth() * 90, letters.height() * 26)
+                        .boundedTo(box->screen()->availableSize() * 0.9));
+        for (QHeaderView* header : box->findChildren<QHeaderView*>())
+            header->setSectionResizeMode(QHeaderView::ResizeToContents);
+        return false;
+    }
+};
+
 }  // namespace
 
 QColor blended(const QColor& under, const QColor& over, double part) {
@@ -322,6 +344,7 @@ void settleLook() {
     QApplication::setWindowIcon(QIcon(emblem(128, Accent)));
     loadToolkitTexts();
     qApp->installTranslator(new Portuguese(qApp));
+    qApp->installEventFilter(new FileBoxes(qApp));
 }
 
 }  // namespace forms
