@@ -241,9 +241,11 @@ public:
     }
     void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
                        const QWidget* widget) const override {
-        const bool hasBorder = element == PE_FrameLineEdit || element == PE_IndicatorCheckBox ||
-                               element == PE_IndicatorRadioButton ||
-                               element == PE_PanelButtonCommand;
+        const bool isTextBox =
+            element == PE_Frame && widget && widget->inherits("forms::MultiLineBox");
+        const bool hasBorder =
+            isTextBox || element == PE_FrameLineEdit || element == PE_IndicatorCheckBox ||
+            element == PE_IndicatorRadioButton || element == PE_PanelButtonCommand;
         const Bordered bordered(hasBorder ? option : nullptr);
         QProxyStyle::drawPrimitive(element, option, painter, widget);
     }

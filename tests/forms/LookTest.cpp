@@ -10,6 +10,7 @@
 #include <QPushButton>
 
 #include "platform/forms/MsgBoxes.h"
+#include "platform/forms/MultiLineBox.h"
 #include "tests/support/Contrast.h"
 
 using namespace Qt::StringLiterals;
@@ -53,8 +54,9 @@ TEST(Look, CanBeReadOnLightAndDarkDesktops) {
         QLineEdit line;
         QComboBox list;
         QPushButton button(u"OK"_s);
+        forms::MultiLineBox notes(u"Notas"_s);
         for (QWidget* field : {static_cast<QWidget*>(&line), static_cast<QWidget*>(&list),
-                               static_cast<QWidget*>(&button)}) {
+                               static_cast<QWidget*>(&button), static_cast<QWidget*>(&notes)}) {
             field->setPalette(palette);
             field->resize(160, 30);
             EXPECT_GE(borderContrast(*field, palette.color(Role::Window)), 3)
