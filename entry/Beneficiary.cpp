@@ -3,6 +3,7 @@
 
 #include "data/Codes.h"
 #include "data/Members.h"
+#include "data/Premium.h"
 #include "data/RowSets.h"
 #include "platform/core/Clock.h"
 #include "platform/core/MsgBox.h"
@@ -21,19 +22,6 @@ using core::MsgBox;
 
 /// Stands for 25 years: a child who is exactly so many days old is too old.
 constexpr int ChildAgeLimitDays = 9132;
-
-/// A comparison with a null does not hold, neither this one.
-bool differ(const QVariant& a, const QVariant& b) {
-    const std::partial_ordering order = core::compareNumbers(a, b);
-    return order != std::partial_ordering::unordered && order != 0;
-}
-
-/// One month's delay is tolerated; a year ahead of today is a difference like one behind.
-bool inArrears(const ado::Recordset& premium) {
-    const QDate today = core::today();
-    return differ(today.year(), premium.Collect(u"ult_ano"_s)) ||
-           core::compareNumbers(today.month() - 1, premium.Collect(u"ult_mes"_s)) > 0;
-}
 
 /// True when the waiting period that ends on `end` is over: the last day still belongs to it. A
 /// person whose row is gone has no end, not even null, and is refused.
@@ -82,27 +70,8 @@ bool mayClaim(const QString& codABC, const QVariant& Familia_ID, qint32 Socio_ID
 
 }  // namespace
 
-QString premiumQuery(qint32 socio_id) {
-    return u"select * from tbQuotas_Socios where socio_id="_s + QString::number(socio_id);
-}
-
-QString premiumWarning(qint32 socio_id) {
-    const ado::RecordsetPtr premium = data::openToRead(premiumQuery(socio_id));
-    if (premium->atEnd())
-        return u"Este Associado ainda não liquidou nenhum prémio de zelmar (quotizações do Plano "
-               "de Saúde)."_s;
-    if (inArrears(*premium))
-        return u"Este Associado tem em atrazo o prémio de zelmar (quotizações do Plano de Saúde) "
-               "desde "_s +
-               core::toText(premium->Collect(u"ult_mes"_s)) + u"/"_s +
-               core::toText(premium->Collect(u"ult_ano"_s)) + u"."_s;
-    if (differ(premium->Collect(u"total_quotas"_s), premium->Collect(u"total_pago"_s)))
-        return u"Este Associado o prémio de zelmar (quotizações do Plano de Saúde) por liquidar."_s;
-    return {};
-}
-
 com::Object testPremium(qint32 socio_id) {
-    const QString warning = premiumWarning(socio_id);
+    const QString warning = data::premiumWarning(socio_id);
     if (!warning.isEmpty()) MsgBox(warning, Icon::Critical);
     if (MsgBox(u"Quer ver o extrato de quotizações deste Associado?"_s, Icon::Exclamation,
                u"Quotizações"_s, Buttons::NoYes) != Answer::Yes)

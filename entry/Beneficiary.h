@@ -11,12 +11,6 @@
 /// Who a document is for, and whether that member or relative may have one processed.
 namespace entry {
 
-/// One row: a member's premium.
-QString premiumQuery(qint32 socio_id);
-
-/// What is to be said of a member's premium; empty when it is paid up.
-QString premiumWarning(qint32 socio_id);
-
 /// Warns of premium arrears, and in every case offers the premium extract. Nothing of it stops
 /// the choice of the member. Gives the component that shows the extract, whose window lives as
 /// long as somebody keeps it; empty when no extract was wanted.

@@ -58,6 +58,7 @@ void frmExplicacao::fill(const coverage::Explanation& told) {
     Grid1->horizontalHeader()->setMinimumSectionSize(fontMetrics().horizontalAdvance(u'0') * 13);
     Grid1->horizontalHeader()->setSectionResizeMode(QHeaderView::ResizeToContents);
     Grid1->horizontalHeader()->setSectionResizeMode(0, QHeaderView::Stretch);
+    Grid1->horizontalHeaderItem(0)->setTextAlignment(Qt::AlignLeft | Qt::AlignVCenter);
     for (int column = 1; column < Grid1->columnCount(); ++column)
         Grid1->horizontalHeaderItem(column)->setTextAlignment(Qt::AlignRight | Qt::AlignVCenter);
     Grid1->selectRow(0);

@@ -2,6 +2,7 @@
 // Controls and layout of the entry screen.
 #include <QGridLayout>
 #include <QLabel>
+#include <QScreen>
 
 #include "data/Codes.h"
 #include "entry/frmMovimentos.h"
@@ -79,11 +80,12 @@ QWidget* frmMovimentos::beneficiaryFrame() {
     addRow(grid, 0, u"Número &KOR:"_s, {No_Kor, Text2, Command1}, u"Label1"_s);
     addRow(grid, 1, u"Familiar:"_s, {Text3, Text4, Command2}, u"Label3"_s);
     for (TextBox* code : {No_Kor, Text3}) code->setFixedWidth(widthFor(code, u"0000000000"));
-    // 6375 twips, fifteen to the pixel.
     Text2->setAccessibleName(u"Nome do sócio"_s);
     Text4->setAccessibleName(u"Nome do familiar"_s);
-    Text2->setMinimumWidth(425);
-    Text4->setMinimumWidth(425);
+    // 6375 twips, fifteen to the pixel; less where that would be most of the display.
+    const int nameWidth = std::min(425, screen()->availableSize().width() / 3);
+    Text2->setMinimumWidth(nameWidth);
+    Text4->setMinimumWidth(nameWidth);
     grid->setColumnStretch(2, 1);
     return frame;
 }
@@ -150,9 +152,14 @@ void frmMovimentos::layOut() {
     addRow(below, 0, u"&Modo de Pagamento:"_s, {DataCombo3});
     DataCombo3->setMinimumWidth(widthFor(DataCombo3, data::modo::Widest));
     below->setColumnStretch(2, 1);
-    int column = 3;
+    auto* buttons = new QHBoxLayout;
+    buttons->addStretch(1);
     for (forms::Button* button : {Command6, Command5, Command3, Command4})
-        below->addWidget(button, 0, column++);
+        buttons->addWidget(button);
+    if (forms::isNarrow(this))
+        below->addLayout(buttons, 1, 0, 1, 4);
+    else
+        below->addLayout(buttons, 0, 3);
 
     QWidget* band = forms::headingBand(
         u"Lançamento de Documentos"_s,

@@ -4,8 +4,8 @@
 #include "coverage/Queries.h"
 #include "data/Codes.h"
 #include "data/Members.h"
+#include "data/Premium.h"
 #include "data/RowSets.h"
-#include "entry/Beneficiary.h"
 #include "host/RulesConnection.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -100,7 +100,7 @@ MemberAccount MemberAccount::read(const BookSettings& settings, qint32 socio_id)
                               u", "_s),
             .nib = text(u"nib"_s),
             .standing = standingOf(*member),
-            .premium = entry::premiumWarning(socio_id),
+            .premium = data::premiumWarning(socio_id),
             .debit = hasSums ? sums->Collect(u"tdebito_ac"_s) : QVariant(0),
             .credit = hasSums ? sums->Collect(u"tcredito_ac"_s) : QVariant(0),
             .persons = personsOf(*member, socio_id),

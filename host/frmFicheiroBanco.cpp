@@ -140,7 +140,11 @@ void frmFicheiroBanco::layOut() {
     column->addWidget(Table1, 3);
     column->addWidget(Label2);
     column->addWidget(Table2, 2);
+    Table1->setAccessibleName(u"Transferências que vão no ficheiro"_s);
+    Table2->setAccessibleName(u"Transferências que não podem ir"_s);
+    Table3->setAccessibleName(u"Ficheiros feitos"_s);
     Tab1->setObjectName(u"Tab1"_s);
+    Tab1->setAccessibleName(u"Transferências e ficheiros"_s);
     Tab1->addTab(transfers, u"&Transferências"_s);
     Tab1->addTab(Table3, u"Ficheiros feito&s"_s);
     auto* foot = new QHBoxLayout;

@@ -9,6 +9,7 @@
 
 #include "data/Procedures.h"
 #include "host/BookSettings.h"
+#include "host/ElidedLabel.h"
 #include "host/MemberAccount.h"
 #include "host/MovementsView.h"
 #include "host/RulesConnection.h"
@@ -96,7 +97,7 @@ frmPrincipal::~frmPrincipal() = default;
 void frmPrincipal::addStatusLine() {
     count_ = new QLabel;
     count_->setObjectName(u"Contagem"_s);
-    book_ = new QLabel;
+    book_ = new ElidedLabel;
     book_->setObjectName(u"Livro"_s);
     sample_ = new QLabel(u"Dados de exemplo"_s);
     sample_->setObjectName(u"Exemplo"_s);

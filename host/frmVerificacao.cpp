@@ -51,6 +51,7 @@ frmVerificacao::frmVerificacao(const CheckResult& result)
       Command1(new forms::Button(u"Command1"_s, u"&Guardar…"_s)),
       Command2(new forms::Button(u"Command2"_s, u"&Sair"_s)) {
     Text1->setObjectName(u"Text1"_s);
+    Text1->setAccessibleName(u"Resultado da verificação"_s);
     Text1->setReadOnly(true);
     Text1->setPlainText(result.text());
     auto* foot = new QHBoxLayout;

@@ -39,6 +39,7 @@ frmHospitais::frmHospitais()
 }
 
 void frmHospitais::layOut() {
+    DataGrid1->setAccessibleName(u"Hospitais"_s);
     DataGrid1->setColumns({{u"code"_s, u"Código"_s, {}, 10},
                            {u"nome"_s, u"Nome"_s, {}, 40},
                            {u"morada"_s, u"Morada"_s, {}, 44},

@@ -38,6 +38,7 @@ frmPlafonds::frmPlafonds()
 
 void frmPlafonds::layOut() {
     const QString money = core::format::Money.toString();
+    DataGrid1->setAccessibleName(u"Grupos de rubricas"_s);
     DataGrid1->setColumns({{u"code"_s, u"Nº"_s, {}, 8},
                            {u"descrit"_s, u"Descrição"_s, {}, 44},
                            {u"agregado"_s, u"Agregado"_s, money, 16, true},

@@ -73,6 +73,7 @@ void frmPlafonds_Main::layOut() {
     addPair(grid, 1, 1, u"&Conjunto Familiares:"_s, Text9);
 
     const QString money = format::Money.toString();
+    DataGrid1->setAccessibleName(u"Rubricas do grupo"_s);
     DataGrid1->setColumns({{u"code"_s, u"Código"_s, {}, 10},
                            {u"descrit"_s, u"Descrição"_s, {}, 38},
                            {u"percent"_s, u"Percent."_s, format::Fraction.toString(), 10, true},

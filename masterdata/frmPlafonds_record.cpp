@@ -41,6 +41,9 @@ void addGroup(QGridLayout* grid, int column, const QString& heading, const QStri
     grid->addWidget(new QLabel(heading), 0, 2 * column, 1, 2);
     addPair(grid, 1, column, member, memberBox);
     addPair(grid, 2, column, relative, relativeBox);
+    // The same words stand under each heading.
+    for (TextBox* box : {memberBox, relativeBox})
+        box->setAccessibleName(heading + u' ' + box->accessibleName());
 }
 
 }  // namespace

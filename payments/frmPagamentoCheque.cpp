@@ -36,6 +36,7 @@ void frmPagamentoCheque::ask(const ado::RecordsetPtr& movement) {
 
 void frmPagamentoCheque::layOut() {
     Text1->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    Text1->setAccessibleName(u"Número do cheque"_s);
     Text1->onGotFocus = [this] { Text1->SelectAll(); };
     Command2->setIcon(style()->standardIcon(QStyle::SP_ArrowDown));
     Command2->setToolTip(u"Número anterior"_s);

@@ -63,6 +63,7 @@ void frmReposicao::bindControls() {
 void frmReposicao::addPersonRow() {
     forms::addRow(beneficiary(), 1, u"Familiar:"_s, {Text3, Text4, Command2});
     Text3->setFixedWidth(No_Kor->width());
+    Text4->setAccessibleName(u"Nome do familiar"_s);
 }
 
 QWidget* frmReposicao::propertiesFrame() {

@@ -51,6 +51,9 @@ void frmExtratos::makeControls() {
     Label2 = new QLabel(u"a"_s);
     Label2->setObjectName(u"Label2"_s);
     Text1 = new forms::TextBox(u"Text1"_s);
+    Text3->setAccessibleName(u"Primeiro dia"_s);
+    Text4->setAccessibleName(u"Último dia"_s);
+    Text1->setAccessibleName(u"Documento"_s);
 
     Check1 = new forms::CheckBox(u"Check1"_s, u"Imprimir Automáticamente"_s);
     Check2 = new forms::CheckBox(u"Check2"_s, u"Imprimir Extrato Detalhado"_s);

@@ -56,7 +56,8 @@ void send(const QPointer<QWindow>& window, const std::function<void(QTest::KeyAc
 
 }  // namespace
 
-Player::Player(const QString& folder) : folder_(folder) {
+Player::Player(const QString& folder, const std::function<void(QWidget*)>& look)
+    : folder_(folder), look_(look) {
     clock_.setSingleShot(true);
     connect(&clock_, &QTimer::timeout, this, &Player::tick);
 }
@@ -105,6 +106,8 @@ void Player::tick() {
     acting_ = true;
     QCoreApplication::sendPostedEvents();
     if (!step.picture.isEmpty()) take(step.picture, front);
+    // A step without either only lets what has just been left return.
+    if (look_ && (step.act || !step.picture.isEmpty())) look_(front);
     acting_ = false;
     if (step.act) step.act(front);
 }

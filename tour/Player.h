@@ -17,7 +17,8 @@ class Player : public QObject {
     Q_OBJECT
 public:
     /// @param folder  where the pictures go
-    explicit Player(const QString& folder);
+    /// @param look    gets the screen of each step before anything is done there; may be empty
+    explicit Player(const QString& folder, const std::function<void(QWidget*)>& look = {});
 
     /// @param screen   objectName of the screen; for a message box "box:" and what its text begins
     ///                 with
@@ -49,6 +50,7 @@ private:
     void take(const QString& picture, QWidget* screen);
 
     QString folder_;
+    std::function<void(QWidget*)> look_;
     std::vector<Step> steps_;
     std::size_t at_ = 0;
     int patience_ = 0;

@@ -6,6 +6,7 @@
 #include <QDir>
 #include <QLabel>
 #include <QLineEdit>
+#include <QScreen>
 #include <QTableView>
 #include <QTemporaryDir>
 
@@ -138,13 +139,26 @@ public:
     }
 
     /// The member of the newest movement, and what the ceilings leave his family, printed.
-    void account() {
+    void accountPage() {
         choose(u"Conta"_s);
         player_.step(u"frmConta"_s, u"40-conta"_s, typing({u"<Alt+I>"_s}));
         player_.step(u"prtResta"_s, u"41-o-que-resta"_s, typing({u"<Escape>"_s}),
                      says(u"Estado"_s, u"Página 1"_s));
         player_.step(u"frmConta"_s, {}, {});
         player_.step(u"frmConta"_s, {}, typing({u"<Escape>"_s}));
+    }
+
+    /// Money that a member brings, and a correction of what he owes; neither is posted.
+    void account() {
+        for (const auto& [operation, screen, picture] :
+             {std::tuple(u"Recebimento"_s, u"frmRecebimento"_s, u"12a-recebimento"_s),
+              std::tuple(u"Correcao"_s, u"frmReposicao"_s, u"12b-correcao"_s)}) {
+            open({}, {operation, {}});
+            player_.step(screen, {}, typing({GoodMember, u"<Tab>"_s}), shows(u"Text8"_s));
+            player_.step(screen, picture, typing({u"<Escape>"_s}), shows(u"Text2"_s));
+            player_.step(u"box:Há dados por lançar"_s, {}, typing({u"<Alt+S>"_s}));
+        }
+        player_.step(u"frmPrincipal"_s, {}, {});
     }
 
     void otherWindows() {
@@ -176,9 +190,11 @@ public:
                              u"<Tab>"_s, u"<Space>"_s}));
         player_.step(u"frmExtratos"_s, u"17-extratos"_s, typing({u"<Alt+I>"_s}),
                      unticked(u"Check1"_s));
-        player_.step(u"prtExtrato1"_s, u"18-pre-visualizacao"_s, typing({u"<Ctrl+S>"_s}),
-                     says(u"Estado"_s, u"Página 1"_s));
-        player_.step(u"FicheiroPdf"_s, {}, typing({u"<Ctrl+A>"_s, file, u"<Return>"_s}));
+        player_.step(u"prtExtrato1"_s, u"18-pre-visualizacao"_s,
+                     typing({u"<Ctrl+F>"_s, u"consulta"_s}), says(u"Estado"_s, u"Página 1"_s));
+        player_.step(u"prtExtrato1"_s, u"18a-localizar"_s, typing({u"<Escape>"_s, u"<Ctrl+S>"_s}));
+        player_.step(u"FicheiroPdf"_s, u"18b-guardar"_s,
+                     typing({u"<Ctrl+A>"_s, file, u"<Return>"_s}));
         player_.step(u"prtExtrato1"_s, {}, typing({u"<Escape>"_s}),
                      says(u"Mensagem"_s, u"Guardado: "_s));
         player_.step(u"frmPrincipal"_s, {}, {});
@@ -214,6 +230,10 @@ public:
         player_.step(u"frmTRFs"_s, {}, typing({u"<Alt+B>"_s}));
         player_.step(u"frmBanca"_s, u"26-banca"_s, typing({u"<Alt+A>"_s}));
         player_.step(u"box:Deseja abortar"_s, {}, typing({u"<Alt+S>"_s}));
+        choose(u"FicheiroBanco"_s);
+        player_.step(u"frmFicheiroBanco"_s, {}, typing({newYear, u"<Tab>"_s, u"<Alt+M>"_s}));
+        player_.step(u"frmFicheiroBanco"_s, u"26a-ficheiro-para-o-banco"_s,
+                     typing({u"<Escape>"_s}));
     }
 
     /// Who owes, and what was borne in a closed year.
@@ -313,7 +333,7 @@ private:
 
 }  // namespace
 
-bool play(const QString& folder) {
+bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     forms::install();
     const QTemporaryDir own;
     if (!own.isValid() || !QDir().mkpath(folder))
@@ -325,13 +345,14 @@ bool play(const QString& folder) {
         "que não fica:"_s);
 
     host::frmPrincipal principal;
-    principal.resize(1280, 800);
+    principal.resize(QSize(1280, 800).boundedTo(principal.screen()->availableSize()));
     principal.show();
-    Player player(folder);
+    Player player(folder, look);
     Script script(player);
     script.document();
     script.hospitalBill();
     script.view();
+    script.accountPage();
     script.account();
     script.otherWindows();
     const QString extract = QDir(folder).absoluteFilePath(u"extrato.pdf"_s);

@@ -35,6 +35,7 @@ void JobScreen::layOut(QWidget* heading, QLayout* above, const std::vector<Bar>&
         auto* label = new QLabel(each.label);
         label->setObjectName(each.labelName);
         label->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+        label->setBuddy(bars_.back());
         grid->addWidget(label, row, 0);
         grid->addWidget(bars_.back(), row, 1);
     }

@@ -81,6 +81,7 @@ void frmQuotas::layOut() {
     strong.setBold(true);
     lblAssociado->setFont(strong);
     lblTotais->setFont(strong);
+    DataGrid1->setAccessibleName(u"Quotizações"_s);
     DataGrid1->setColumns({{u"data"_s, u"Pago em"_s, core::format::Date.toString(), 14},
                            {u"ano"_s, u"Ano"_s, {}, 8, true},
                            {u"mes"_s, u"Mês"_s, {}, 7, true},

@@ -49,6 +49,7 @@ void frmProcurar::layOut() {
     lstSocios->viewport()->installEventFilter(this);
 
     lstSocios->setObjectName(u"lstSocios"_s);
+    lstSocios->setAccessibleName(u"Associados encontrados"_s);
     lstSocios->setModel(members_);
     lstSocios->setFocusPolicy(Qt::NoFocus);
     forms::settleTable(*lstSocios);

@@ -74,6 +74,7 @@ frmEscolherFamiliar::frmEscolherFamiliar(const ado::ConnectionPtr& connection, i
 
 void frmEscolherFamiliar::layOut(const QString& member) {
     lstFamiliares->setObjectName(u"lstFamiliares"_s);
+    lstFamiliares->setAccessibleName(u"Associado e familiares"_s);
     lstFamiliares->setHorizontalHeaderLabels(
         {u"Código"_s, u"Grau de parentesco"_s, u"Nome"_s, u"Nascimento"_s, u"Carência até"_s});
     forms::settleTable(*lstFamiliares);

@@ -44,12 +44,14 @@ frmProgresso::frmProgresso(int total, const QString& message, const QString& tit
 void frmProgresso::layOut(const QString& message, const QString& title) {
     auto* lblMensagem = new QLabel(message, this);
     lblMensagem->setObjectName(u"lblMensagem"_s);
+    lblMensagem->setBuddy(ProgressBar1);
     QVBoxLayout* body = forms::bodyUnder(
         forms::headingBand(title, {}, u"lblTitulo"_s, u"lblExplicacao"_s, u"picTitulo"_s), this);
     body->addWidget(lblMensagem);
     body->addWidget(ProgressBar1);
     setMinimumWidth(60 * fontMetrics().averageCharWidth());
-    adjustSize();
+    // The toolkit's own way would keep it to a part of the display, and cut the message.
+    resize(layout()->totalSizeHint().expandedTo(minimumSize()));
     move(middleOf(QApplication::activeWindow()) - rect().center());
 }
 

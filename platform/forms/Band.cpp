@@ -3,6 +3,7 @@
 #include <QHBoxLayout>
 #include <QLabel>
 #include <QPainter>
+#include <QScreen>
 #include <QVBoxLayout>
 
 #include "platform/forms/Emblem.h"
@@ -14,6 +15,11 @@ namespace forms {
 namespace {
 
 constexpr QStringView NoteName = u"Nota";
+
+// Parts of the display's width, 0..1: explanation and note fit beside each other.
+constexpr double LeastShare = 0.25;
+constexpr double TextShare = 0.4;
+constexpr double TitleShare = 0.8;
 
 class Band : public QWidget {
 public:
@@ -48,8 +54,42 @@ protected:
     }
 };
 
-QLabel* bandLabel(const QString& text, const QString& name) {
-    auto* label = new QLabel;
+/// One line where there is room, more where the letters are large.
+class BandLabel : public QLabel {
+public:
+    /// @param share  of the display's width that the label asks for at most; 0..1
+    explicit BandLabel(double share) : share_(share) { setWordWrap(true); }
+
+    QSize sizeHint() const override {
+        const int width = std::min(lineWidth(), part(share_));
+        return {width, heightForWidth(width)};
+    }
+    QSize minimumSizeHint() const override {
+        const int width = std::min(lineWidth(), part(LeastShare));
+        return {width, fontMetrics().height()};
+    }
+
+protected:
+    /// A window does not ask how high its layout is at its width, and would squeeze its fields.
+    void resizeEvent(QResizeEvent* event) override {
+        QLabel::resizeEvent(event);
+        setMinimumHeight(std::max(0, heightForWidth(width())));
+    }
+
+private:
+    /// Of the longest line, with a pixel for what the layout rounds off.
+    int lineWidth() const {
+        ensurePolished();
+        return fontMetrics().size(0, text()).width() + 1;
+    }
+    /// In pixels.
+    int part(double share) const { return qRound(screen()->availableSize().width() * share); }
+
+    double share_;
+};
+
+QLabel* bandLabel(const QString& text, const QString& name, double share) {
+    auto* label = new BandLabel(share);
     label->setObjectName(name);
     label->setTextFormat(Qt::PlainText);
     label->setText(text);
@@ -76,12 +116,12 @@ QPixmap emblem(int size, const QColor& color) {
 QWidget* headingBand(const QString& title, const QString& explanation, const QString& titleName,
                      const QString& explanationName, const QString& pictureName) {
     auto* band = new Band;
-    QLabel* titleLabel = bandLabel(title, titleName);
+    QLabel* titleLabel = bandLabel(title, titleName, TitleShare);
     QFont large = titleLabel->font();
     large.setPointSizeF(large.pointSizeF() * 1.35);
     large.setBold(true);
     titleLabel->setFont(large);
-    QLabel* explanationLabel = bandLabel(explanation, explanationName);
+    QLabel* explanationLabel = bandLabel(explanation, explanationName, TextShare);
     if (explanation.isEmpty()) explanationLabel->hide();
 
     auto* texts = new QVBoxLayout;
@@ -93,7 +133,7 @@ QWidget* headingBand(const QString& title, const QString& explanation, const QSt
     row->setSpacing(12);
     row->addWidget(new Picture(pictureName, band->fontMetrics().height() * 2 + 4));
     row->addLayout(texts, 1);
-    QLabel* note = bandLabel({}, NoteName.toString());
+    QLabel* note = bandLabel({}, NoteName.toString(), TextShare);
     note->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
     note->hide();
     row->addWidget(note);

@@ -5,6 +5,7 @@
 #include <QCalendarWidget>
 #include <QKeyEvent>
 #include <QPainter>
+#include <QScreen>
 #include <QVBoxLayout>
 
 #include "platform/core/Clock.h"
@@ -78,7 +79,11 @@ void DatePicker::openCalendar() {
     };
     connect(calendar, &QCalendarWidget::activated, this, choose);
     connect(calendar, &QCalendarWidget::clicked, this, choose);
-    sheet->move(mapToGlobal(QPoint(0, height())));
+    sheet->adjustSize();
+    const QRect room = screen()->availableGeometry();
+    const QPoint below = mapToGlobal(QPoint(0, height()));
+    sheet->move(qMax(room.left(), qMin(below.x(), room.right() - sheet->width())),
+                qMax(room.top(), qMin(below.y(), room.bottom() - sheet->height())));
     sheet->show();
     calendar->setFocus();
 }

@@ -20,6 +20,7 @@ public:
         marked_ = marked;
         QString plain = marked;
         setText(plain.remove(u'&'));
+        nameBuddy();
         releaseShortcut(shortcut_);
         shortcut_ = grabShortcut(QKeySequence::mnemonic(marked));
         update();
@@ -41,6 +42,14 @@ protected:
     }
 
 private:
+    /// Lists do not tell assistive programs of their labels, and a label that stands in another
+    /// frame than its field is not found by the toolkit either.
+    void nameBuddy() {
+        QString name = text();
+        if (name.endsWith(u':')) name.chop(1);
+        if (buddy()) buddy()->setAccessibleName(name);
+    }
+
     QString marked_;
     int shortcut_ = 0;
 };

@@ -4,6 +4,7 @@
 #include <QComboBox>
 #include <QGridLayout>
 #include <QLabel>
+#include <QScreen>
 
 #include "platform/forms/Form.h"
 #include "platform/forms/TextBox.h"
@@ -28,12 +29,32 @@ int widthFor(const QWidget* field, QStringView text) {
     return field->fontMetrics().horizontalAdvance(text.toString()) + frame + arrow;
 }
 
+namespace {
+
+/// Three pairs of label and field beside each other are as wide as so many letters.
+constexpr int LettersOfThreePairs = 128;
+
+constexpr char LabelsAbove[] = "rotulosPorCima";
+
+bool areLabelsAbove(const QGridLayout* grid) {
+    return grid->property(LabelsAbove).toBool();
+}
+
+}  // namespace
+
+bool isNarrow(const QWidget* part) {
+    return part->fontMetrics().averageCharWidth() * LettersOfThreePairs >
+           part->screen()->availableSize().width();
+}
+
 QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLabels) {
     auto* grid = new QGridLayout(frame);
+    if (widestLabels.size() >= 3 && isNarrow(frame)) grid->setProperty(LabelsAbove, true);
     int column = 0;
     for (const QStringView label : widestLabels) {
-        grid->setColumnMinimumWidth(column,
-                                    frame->fontMetrics().horizontalAdvance(label.toString()));
+        if (!areLabelsAbove(grid))
+            grid->setColumnMinimumWidth(column,
+                                        frame->fontMetrics().horizontalAdvance(label.toString()));
         grid->setColumnStretch(column + 1, widestLabels.size() > 1 ? 1 : 0);
         column += 2;
     }
@@ -43,8 +64,10 @@ QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLa
 QLabel* addPair(QGridLayout* grid, int row, int pair, const QString& label, QWidget* field,
                 const QString& labelName, int span) {
     QLabel* made = fieldLabel(label, field, labelName);
-    grid->addWidget(made, row, 2 * pair);
-    grid->addWidget(field, row, 2 * pair + 1, 1, 2 * span - 1);
+    const bool isAbove = areLabelsAbove(grid);
+    if (isAbove) made->setAlignment(Qt::AlignLeft | Qt::AlignBottom);
+    grid->addWidget(made, isAbove ? 2 * row : row, isAbove ? 2 * pair + 1 : 2 * pair);
+    grid->addWidget(field, isAbove ? 2 * row + 1 : row, 2 * pair + 1, 1, 2 * span - 1);
     return made;
 }
 

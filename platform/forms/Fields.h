@@ -23,9 +23,14 @@ TextBox* displayBox(const QString& name, QStringView format = {});
 /// Width in pixels at which a field shows `text` whole, whatever the font; a list beside its arrow.
 int widthFor(const QWidget* field, QStringView text);
 
+/// Whether the display, with letters of that size, has no room for three pairs of label and field
+/// beside each other.
+bool isNarrow(const QWidget* part);
+
 /// A grid for pairs of label and field, side by side, on a frame. The labels' columns are as wide
 /// as the texts given, so that the fields of several frames stand under each other; with several
-/// pairs the fields share the width.
+/// pairs the fields share the width. Three pairs on a narrow display have their labels above the
+/// fields.
 QGridLayout* pairsIn(QWidget* frame, std::initializer_list<QStringView> widestLabels);
 
 /// One pair in such a grid: its label, which is given back, and its field.

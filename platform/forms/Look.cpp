@@ -2,6 +2,7 @@
 #include "platform/forms/Look.h"
 
 #include <QApplication>
+#include <QFileDialog>
 #include <QHeaderView>
 #include <QIcon>
 #include <QLibraryInfo>
@@ -11,6 +12,7 @@
 #include <QPalette>
 #include <QPixmap>
 #include <QProxyStyle>
+#include <QScreen>
 #include <QStyleOption>
 #include <QTableView>
 #include <QTranslator>
@@ -24,7 +26,7 @@ namespace forms {
 
 namespace {
 
-constexpr QColor Accent(0x2b, 0x7a, 0x8c);
+constexpr QColor Accent(0x23, 0x6c, 0x7d);
 constexpr QColor AccentOnDark(0x62, 0xbc, 0xd0);
 constexpr QColor TextOnBright(0x10, 0x18, 0x1b);
 
@@ -239,9 +241,11 @@ public:
     }
     void drawPrimitive(PrimitiveElement element, const QStyleOption* option, QPainter* painter,
                        const QWidget* widget) const override {
-        const bool hasBorder = element == PE_FrameLineEdit || element == PE_IndicatorCheckBox ||
-                               element == PE_IndicatorRadioButton ||
-                               element == PE_PanelButtonCommand;
+        const bool isTextBox =
+            element == PE_Frame && widget && widget->inherits("forms::MultiLineBox");
+        const bool hasBorder =
+            isTextBox || element == PE_FrameLineEdit || element == PE_IndicatorCheckBox ||
+            element == PE_IndicatorRadioButton || element == PE_PanelButtonCommand;
         const Bordered bordered(hasBorder ? option : nullptr);
         QProxyStyle::drawPrimitive(element, option, painter, widget);
     }
@@ -273,6 +277,26 @@ private:
         QStyleOption* option_;
         QPalette before_;
     };
+};
+
+/// The toolkit's box for files comes in a size, and with columns, of its own, whatever the size of
+/// the letters.
+class FileBoxes : public QObject {
+public:
+    using QObject::QObject;
+
+protected:
+    bool eventFilter(QObject* watched, QEvent* event) override {
+        if (event->type() != QEvent::Show) return false;
+        auto* box = qobject_cast<QFileDialog*>(watched);
+        if (!box) return false;
+        const QFontMetrics letters = box->fontMetrics();
+        box->resize(QSize(letters.averageCharWidth() * 90, letters.height() * 26)
+                        .boundedTo(box->screen()->availableSize() * 0.9));
+        for (QHeaderView* header : box->findChildren<QHeaderView*>())
+            header->setSectionResizeMode(QHeaderView::ResizeToContents);
+        return false;
+    }
 };
 
 }  // namespace
@@ -322,6 +346,7 @@ void settleLook() {
     QApplication::setWindowIcon(QIcon(emblem(128, Accent)));
     loadToolkitTexts();
     qApp->installTranslator(new Portuguese(qApp));
+    qApp->installEventFilter(new FileBoxes(qApp));
 }
 
 }  // namespace forms

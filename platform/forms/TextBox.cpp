@@ -8,11 +8,20 @@
 #include "platform/core/Clock.h"
 #include "platform/core/Format.h"
 #include "platform/core/Values.h"
+#include "platform/forms/Fields.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/Look.h"
 #include "platform/forms/TypedText.h"
 
 namespace forms {
+
+namespace {
+
+/// Half of an amount or a date says something else: however narrow the screen, these are whole.
+constexpr QStringView DateWidth = u"00-00-0000";
+constexpr QStringView AmountWidth = u"€ 9.999,99";
+
+}  // namespace
 
 TextBox::TextBox(const QString& name, QWidget* parent) : QLineEdit(parent) {
     setObjectName(name);
@@ -36,6 +45,8 @@ void TextBox::setValue(const QVariant& value) {
 void TextBox::setFormat(QStringView format) {
     format_ = format.toString();
     setAlignment((isNumeric() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignVCenter);
+    if (isNumeric() || isDate())
+        setMinimumWidth(widthFor(this, isDate() ? DateWidth : AmountWidth));
     if (!isEdited()) showValue(shown_);
 }
 

@@ -39,6 +39,7 @@ public:
         auto* moving = new QProgressBar(this);
         moving->setRange(0, 0);  // goes to and fro: nobody knows how long it takes
         moving->setTextVisible(false);
+        moving->setAccessibleName(u"À espera"_s);
         moving->setFixedHeight(fontMetrics().height() / 2);
         auto* giveUp = new QPushButton(u"&Desistir"_s, this);
         giveUp->setObjectName(u"Command1"_s);

@@ -72,6 +72,7 @@ void Preview::Implementation::layOutWindow() {
     const PreviewHandler handler = [this](PreviewCommand command) { act(command); };
     bar = new PreviewBar(handler);
     view = new PreviewView(u"Folhas"_s, form);
+    view->setAccessibleName(u"Folhas do relatório"_s);
     findBar = new PreviewFindBar(handler, pages, view);
     place = new QLabel;
     place->setObjectName(u"Estado"_s);

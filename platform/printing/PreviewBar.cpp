@@ -4,6 +4,7 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QScreen>
 
 #include "platform/core/Format.h"
 #include "platform/core/MsgBox.h"
@@ -20,6 +21,8 @@ const QString Width = u"Largura"_s;
 const QString WholePage = u"Página inteira"_s;
 constexpr int OfferedPercents[] = {50, 75, 100, 125, 150, 200, 300};
 constexpr int MostDigits = 6;
+constexpr int Gaps = 60;             // between the groups of the bar and around them, in pixels
+constexpr double WindowShare = 0.9;  // of the display's width, of which the window takes a bit more
 
 QString percentText(double percent) {
     return u"%1 %"_s.arg(qRound(percent));
@@ -50,18 +53,35 @@ forms::Button* previewButton(PreviewCommand command, const PreviewHandler& handl
 }
 
 PreviewBar::PreviewBar(const PreviewHandler& handler) {
-    auto* row = new QHBoxLayout(this);
-    row->setContentsMargins(10, 8, 10, 8);
-    row->setSpacing(4);
-    addOutput(row, handler);
-    row->addSpacing(14);
-    addPages(row, handler);
-    row->addSpacing(14);
-    addZoom(row, handler);
-    row->addStretch(1);
-    row->addWidget(previewButton(PreviewCommand::Find, handler));
+    auto* lines = new QVBoxLayout(this);
+    lines->setContentsMargins(10, 8, 10, 8);
+    lines->setSpacing(4);
+    auto* upper = new QHBoxLayout;
+    auto* lower = new QHBoxLayout;
+    for (QBoxLayout* row : {upper, lower}) {
+        row->setSpacing(4);
+        lines->addLayout(row);
+    }
+    addOutput(upper, handler);
+    addPages(lower, handler);
+    lower->addSpacing(14);
+    addZoom(lower, handler);
+    auto* end = new QHBoxLayout;
+    end->setSpacing(4);
+    end->addWidget(previewButton(PreviewCommand::Find, handler));
     close_ = previewButton(PreviewCommand::Close, handler);
-    row->addWidget(close_);
+    end->addWidget(close_);
+    // With large letters the bar has two lines.
+    if (upper->sizeHint().width() + lower->sizeHint().width() + end->sizeHint().width() + Gaps >
+        screen()->availableSize().width() * WindowShare) {
+        lower->addStretch(1);
+    } else {
+        lines->removeItem(lower);
+        upper->addSpacing(14);
+        upper->addLayout(lower);
+    }
+    upper->addStretch(1);
+    upper->addLayout(end);
 }
 
 void PreviewBar::addOutput(QBoxLayout* row, const PreviewHandler& handler) {

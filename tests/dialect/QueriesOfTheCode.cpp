@@ -7,7 +7,7 @@
 #include "data/Annulment.h"
 #include "data/Members.h"
 #include "data/NewMovement.h"
-#include "entry/Beneficiary.h"
+#include "data/Premium.h"
 #include "payments/ChequeNumber.h"
 #include "receipts/receipt.h"
 #include "receipts/reposition.h"
@@ -46,7 +46,7 @@ QList<Listed> ofMovementsAndMembers() {
         {u"member by number"_s, data::memberQuery(u"100015"_s)},
         {u"member by number, unknown"_s, data::memberQuery(u"abc"_s), false},
         {u"member by id"_s, data::memberQuery(Member)},
-        {u"premium"_s, entry::premiumQuery(Member)},
+        {u"premium"_s, data::premiumQuery(Member)},
         {u"person"_s, data::personQuery(2)},
         {u"movement to annul"_s, data::movementQuery(u"tbZelmar_Movimentos"_s, Movement)},
         {u"movement to annul of a member who left"_s,

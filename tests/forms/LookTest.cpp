@@ -8,28 +8,15 @@
 #include <QLineEdit>
 #include <QMessageBox>
 #include <QPushButton>
-#include <cmath>
 
 #include "platform/forms/MsgBoxes.h"
+#include "platform/forms/MultiLineBox.h"
+#include "tests/support/Contrast.h"
 
 using namespace Qt::StringLiterals;
+using support::contrast;
 
 namespace {
-
-double brightness(const QColor& color) {
-    const auto linear = [](double part) {
-        return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
-    };
-    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) +
-           0.0722 * linear(color.blueF());
-}
-
-/// From 1, the same, to 21, black on white.
-double contrast(const QColor& a, const QColor& b) {
-    const double one = brightness(a) + 0.05;
-    const double other = brightness(b) + 0.05;
-    return std::max(one / other, other / one);
-}
 
 const QPalette Desktops[] = {
     QPalette(QColor(0xef, 0xef, 0xef)),
@@ -67,8 +54,9 @@ TEST(Look, CanBeReadOnLightAndDarkDesktops) {
         QLineEdit line;
         QComboBox list;
         QPushButton button(u"OK"_s);
+        forms::MultiLineBox notes(u"Notas"_s);
         for (QWidget* field : {static_cast<QWidget*>(&line), static_cast<QWidget*>(&list),
-                               static_cast<QWidget*>(&button)}) {
+                               static_cast<QWidget*>(&button), static_cast<QWidget*>(&notes)}) {
             field->setPalette(palette);
             field->resize(160, 30);
             EXPECT_GE(borderContrast(*field, palette.color(Role::Window)), 3)
