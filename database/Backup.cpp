@@ -4,6 +4,8 @@
 #include <QFile>
 
 #include "database/Book.h"
+#include "database/Schema.h"
+#include "database/Version.h"
 #include "platform/ado/postgres/Backup.h"
 #include "platform/ado/postgres/BulkAccess.h"
 #include "platform/ado/sqlite/Backup.h"
@@ -45,16 +47,40 @@ void refuseFilled(const BookPlace& book) {
                         "«--replace»: o que ele tem agora perde-se."_s.arg(book.shown()));
 }
 
+void refuseNewerBackup(const QString& file, const BookPlace& book) {
+    if (const int version = versionInBackup(file, book); version > SchemaVersion)
+        throw core::Failure(core::InvalidCall, newerText(version, file));
+}
+
+/// A server's own program leaves the tables alone that an older backup does not know. The book must
+/// not pass for newer than its content, also where the work ends in between, since the steps to a
+/// newer version may be taken twice; and the operations of its journal are those of other
+/// movements.
+void restoreOnServer(const QString& file, const BookPlace& book) {
+    const std::unique_ptr<ado::BulkAccess> opened = openedAnyway(book);
+    const std::set<QByteArray> parts = opened->parts();
+    if (parts.contains("tbversao"))
+        opened->execute("UPDATE tbVersao SET versao = " +
+                        QByteArray::number(versionInBackup(file, book)));
+    ado::postgres::restore(file, book.server);
+    if (parts.contains("tboperacoes") && !ado::postgres::hasTable(file, u"tbOperacoes"_s))
+        opened->execute("DELETE FROM tbOperacoes");
+}
+
 }  // namespace
+
+int versionInBackup(const QString& file, const BookPlace& book) {
+    const auto numberIn = book.isOnServer() ? ado::postgres::numberIn : ado::sqlite::numberIn;
+    return qMax(1, static_cast<int>(numberIn(file, u"tbversao"_s, u"versao"_s)));
+}
 
 bool canBackUp(const BookPlace& book) {
     return !book.isOnServer() || ado::postgres::canBackUp();
 }
 
 void backUpBook(const BookPlace& book, const QString& file) {
+    opened(book);  // fails for one that is not there, or is newer than the program
     if (book.isOnServer()) return ado::postgres::backUp(book.server, file);
-    if (!QFile::exists(fileOf(book)))
-        throw core::Failure(core::InvalidCall, u"Não existe o livro «%1»."_s.arg(fileOf(book)));
     ado::sqlite::backUp(fileOf(book), file);
 }
 
@@ -64,9 +90,11 @@ void restoreBook(const QString& file, const BookPlace& book, bool replace) {
     if (!replace) refuseFilled(book);
     if (book.isOnServer()) {
         ado::postgres::prove(file, Tables);
-        return ado::postgres::restore(file, book.server);
+        refuseNewerBackup(file, book);
+        return restoreOnServer(file, book);
     }
     ado::sqlite::prove(file, Tables);
+    refuseNewerBackup(file, book);
     const QStringList others = othersIn(book);
     if (!others.isEmpty())
         throw core::Failure(core::InvalidCall,

@@ -10,13 +10,18 @@ namespace database {
 /// server's own programs are installed.
 bool canBackUp(const BookPlace& book);
 
-/// Keeps the book as it stands now, while others may go on writing. Never writes over a file.
+/// Keeps the book as it stands now, of whatever version up to this program's, while others may go
+/// on writing. Never writes over a file.
 void backUpBook(const BookPlace& book, const QString& file);
 
 /// Puts a backup in the place of the book, once it is proved to be whole. On a server the catalogue
-/// has to be there, and the place names its administrator.
+/// has to be there, and the place names its administrator. The book then has the version of the
+/// backup, which may be an older one; one newer than this program is refused.
 /// @param replace  whether a book that has members or movements is to be lost
 void restoreBook(const QString& file, const BookPlace& book, bool replace);
+
+/// The version of the schema in a backup; 1 when it does not tell it.
+int versionInBackup(const QString& file, const BookPlace& book);
 
 /// Who else has the book open, for people: one entry a program or connection.
 QStringList othersIn(const BookPlace& book);

@@ -8,6 +8,7 @@
 
 #include "database/Book.h"
 #include "database/Schema.h"
+#include "database/Version.h"
 #include "platform/ado/postgres/BulkAccess.h"
 #include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/core/Failure.h"
@@ -59,28 +60,17 @@ TableShape ordered(const TableShape& shape, const TableShape& model) {
     return result;
 }
 
-/// Books of older programs have no journal of operations; nothing is lost without it.
-constexpr auto Journal = "tboperacoes";
-
-bool hasJournal(const std::vector<TableShape>& shapes) {
-    return std::any_of(shapes.begin(), shapes.end(),
-                       [](const TableShape& shape) { return folded(shape.name) == Journal; });
-}
-
-QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes, bool withJournal) {
+QSet<QByteArray> columnsOf(const std::vector<TableShape>& shapes) {
     QSet<QByteArray> names;
     for (const TableShape& shape : shapes)
-        for (const QByteArray& column : shape.columns)
-            if (withJournal || folded(shape.name) != Journal)
-                names += folded(shape.name + '.' + column);
+        for (const QByteArray& column : shape.columns) names += folded(shape.name + '.' + column);
     return names;
 }
 
 /// Nothing may be left behind, and nothing made up.
 void refuseDifferences(const std::vector<TableShape>& from, const std::vector<TableShape>& into) {
-    const bool withJournal = hasJournal(from);
-    const QSet<QByteArray> source = columnsOf(from, withJournal);
-    const QSet<QByteArray> target = columnsOf(into, withJournal);
+    const QSet<QByteArray> source = columnsOf(from);
+    const QSet<QByteArray> target = columnsOf(into);
     const auto refuse = [](const QSet<QByteArray>& lacking, const QString& where) {
         if (lacking.isEmpty()) return;
         QList<QByteArray> names = lacking.values();
@@ -157,6 +147,8 @@ CopySummary carry(BulkAccess& from, BulkAccess& into, const CopyListener& listen
 }
 
 CopySummary copied(const BookPlace& from, const BookPlace& into, const CopyListener& listener) {
+    refuseOtherVersion(from);
+    if (into.isOnServer()) refuseOtherVersion(into);
     const std::unique_ptr<BulkAccess> source = opened(from);
     source->begin(BulkAccess::Purpose::Reading);
     CopySummary summary;
@@ -174,11 +166,17 @@ CopySummary copied(const BookPlace& from, const BookPlace& into, const CopyListe
 
 }  // namespace
 
-std::unique_ptr<BulkAccess> opened(const BookPlace& place) {
+std::unique_ptr<BulkAccess> openedAnyway(const BookPlace& place) {
     if (place.isOnServer()) return std::make_unique<ado::postgres::BulkAccess>(place.server);
     const QString file = bookFile(place.folder, place.name);
     if (!QFile::exists(file)) throw refusal(u"Não existe o livro «%1»."_s.arg(file));
     return std::make_unique<ado::sqlite::BulkAccess>(file);
+}
+
+std::unique_ptr<BulkAccess> opened(const BookPlace& place) {
+    std::unique_ptr<BulkAccess> book = openedAnyway(place);
+    refuseNewer(*book, place.shown());
+    return book;
 }
 
 BookPlace BookPlace::parsed(const QString& text) {

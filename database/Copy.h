@@ -24,8 +24,10 @@ struct BookPlace {
     QString shown() const;
 };
 
-/// Opens an existing book for bulk work.
+/// Opens an existing book for bulk work. Fails when its schema is newer than this program.
 std::unique_ptr<ado::BulkAccess> opened(const BookPlace& place);
+/// The same whatever its version, for those who ask for that first.
+std::unique_ptr<ado::BulkAccess> openedAnyway(const BookPlace& place);
 
 /// How far a copy is.
 struct CopyProgress {
@@ -50,7 +52,8 @@ struct CopySummary {
 /// apart from its code lists and counters, which those of the source replace. The source is read as
 /// it stood at the beginning, so that others may go on working with it. In the end the number of
 /// rows and the sum of every column of amounts are compared. Fails with a core::Failure, leaving
-/// the target as it was, when a table or column lacks on either side or anything differs.
+/// the target as it was, when the version of either is another one, a table or column lacks on
+/// either side, or anything differs.
 CopySummary copyBook(const BookPlace& from, const BookPlace& into, const CopyListener& listener);
 
 }  // namespace database

@@ -24,16 +24,19 @@ QByteArray schemaText(const QString& name) {
 }
 
 void makeTables(ado::BulkAccess& book) {
-    // A movement keeps its id when its member leaves. What is first written among those of members
-    // who left (corrections, opening balances) is numbered far above, so that an id names one
-    // movement in both tables together.
-    constexpr qint64 FarAbove = 1'000'000'000;
     const QByteArray schema =
         schemaText(u"book.sql"_s).replace("{movement}", schemaText(u"movement.sql"_s).trimmed());
     book.execute(book.translated(schema));
-    book.execute(schemaText(u"codes.sql"_s));
-    book.continueAfter(ado::TableShapes(book.tables()).at("tbZelmar_Movimentos_Inactivos"),
-                       FarAbove);
+    book.execute(
+        schemaText(u"codes.sql"_s).replace("{version}", QByteArray::number(SchemaVersion)));
+    numberFarAbove(book);
+}
+
+void numberFarAbove(ado::BulkAccess& book) {
+    constexpr qint64 FarAbove = 1'000'000'000;
+    const ado::TableShapes shapes(book.tables());
+    const ado::TableShape& left = shapes.at("tbZelmar_Movimentos_Inactivos");
+    if (book.lastKeys()[left.name.toLower()] < FarAbove) book.continueAfter(left, FarAbove);
 }
 
 }  // namespace database

@@ -4,6 +4,7 @@
 #include <QScopeGuard>
 
 #include "database/Schema.h"
+#include "database/ServerRoles.h"
 #include "database/sample/SampleBook.h"
 #include "platform/ado/Connection.h"
 #include "platform/ado/postgres/BulkAccess.h"
@@ -76,10 +77,7 @@ private:
     }
 
     void refuseUnfit() {
-        if (!has("SELECT FROM pg_roles WHERE rolname = current_user AND rolsuper"))
-            throw refusal(
-                u"«%1» não é administrador do servidor; só um administrador pode fazer um livro."_s
-                    .arg(catalogue_.user));
+        refuseOthersThanAdministrator(server_, catalogue_.user);
         if (has("SELECT FROM pg_roles WHERE (rolsuper OR rolcreaterole OR rolcreatedb OR "
                 "rolreplication OR rolbypassrls OR NOT rolcanlogin) AND rolname = " +
                 server_.literal(worker_.user)))
@@ -119,7 +117,7 @@ private:
         book.execute("SET LOCAL ROLE " + book.name(owner()));
         makeTables(book);
         book.execute("RESET ROLE");
-        book.execute(rights(book));
+        giveRights(book, catalogue_.catalog, worker_.user);
         if (sample) sample::fill(book, {}, {});
         book.execute("COMMENT ON TABLE public.tbcontadores IS " + book.literal(mark_));
         book.commit();
@@ -148,13 +146,6 @@ private:
             book.execute("ALTER DATABASE " + book.name(catalogue_.catalog) + " OWNER TO " +
                          ownerName);
         book.execute("GRANT CREATE, USAGE ON SCHEMA public TO " + ownerName);
-    }
-
-    QByteArray rights(BulkAccess& book) const {
-        return schemaText(u"roles.sql"_s)
-            .replace("{catalogue}", book.name(catalogue_.catalog))
-            .replace("{operator}", book.name(worker_.user))
-            .replace("{manager}", book.name(manager()));
     }
 
     void enterAsOperator() {
@@ -192,8 +183,8 @@ private:
                      book.name(catalogue_.catalog) + " RESET search_path");
     }
 
-    QString owner() const { return catalogue_.catalog + u"_dono"_s; }
-    QString manager() const { return catalogue_.catalog + u"_gestor"_s; }
+    QString owner() const { return ownerRole(catalogue_.catalog); }
+    QString manager() const { return managerRole(catalogue_.catalog); }
 
     Address catalogue_;
     ServerOperator worker_;

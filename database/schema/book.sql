@@ -131,6 +131,14 @@ CREATE TABLE tbCheques (
     cheque_no BIGINT                                      -- the next cheque number to offer
 );
 
+-- Age --------------------------------------------------------------------------------------------
+
+-- Which version of this schema the book has; one row. Books made before there was this table have
+-- none and are of version 1.
+CREATE TABLE tbVersao (
+    versao INTEGER
+);
+
 -- Journal ----------------------------------------------------------------------------------------
 -- Postings and annulments are several writes, one commit each. A row here is written in the commit
 -- of the write that it tells of; it says what is missing of an operation that was cut short. A

@@ -1,5 +1,7 @@
 -- SPDX-License-Identifier: MIT
--- The code lists and the counters of a new book; the same text for every engine.
+-- The code lists, the counters and the version of a new book; the same text for every engine.
+
+INSERT INTO tbVersao (versao) VALUES ({version});
 
 INSERT INTO tbZelmar_movimentos_tipos (code, descrit) VALUES
     ('ANL', 'Anulado'),

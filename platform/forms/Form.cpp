@@ -13,6 +13,7 @@
 #include "platform/core/Failure.h"
 #include "platform/core/MsgBox.h"
 #include "platform/core/Wait.h"
+#include "platform/forms/Caught.h"
 #include "platform/forms/Controls.h"
 #include "platform/forms/MsgBoxes.h"
 #include "platform/forms/ScrolledBody.h"
@@ -28,6 +29,11 @@ namespace {
 int running = 0;
 std::vector<QPointer<Form>> unloadedScreens;
 std::vector<std::function<void()>> workAfterwards;
+CaughtListener toldOfCaught = nullptr;
+
+void tellOf(int number, const QString& code = {}) {
+    if (toldOfCaught) toldOfCaught({number, code, activeScreen()});
+}
 
 class Running {
 public:
@@ -58,10 +64,13 @@ bool run(const std::function<void()>& handler, core::Icon icon) {
         return true;
     } catch (const core::Failure& failure) {
         text = failure.text();
+        tellOf(failure.number(), failure.code());
     } catch (const std::exception& failure) {
         text = QString::fromUtf8(failure.what());
+        tellOf(0);
     } catch (...) {
         text = u"Erro inesperado."_s;
+        tellOf(0);
     }
     core::MsgBox(text, icon);
     return false;
@@ -75,6 +84,15 @@ bool handle(const std::function<void()>& handler) {
 
 bool handlePlainly(const std::function<void()>& handler) {
     return run(handler, core::Icon::None);
+}
+
+void setCaughtListener(CaughtListener listener) {
+    toldOfCaught = listener;
+}
+
+QString activeScreen() {
+    const QWidget* window = QApplication::activeWindow();
+    return window ? window->objectName() : QString();
 }
 
 void afterwards(const std::function<void()>& work) {

@@ -122,10 +122,16 @@ private:
     QList<Table> tables_;
 };
 
-TEST_F(Copy, OfABookOfAnOlderProgramLeavesTheJournalEmpty) {
-    file.rows(u"drop table tbOperacoes"_s);
-    EXPECT_EQ(failureOf(inFile, onServer), QString());
-    EXPECT_EQ(server.rows(u"select count(*) from tbOperacoes"_s).first().first(), u"0"_s);
+TEST_F(Copy, IsMadeOnlyBetweenBooksOfThisProgramsVersion) {
+    const struct {
+        const char* versao;
+        const char* answer;
+    } books[] = {{"1", "tem de ser atualizado"}, {"1000", "Instale o programa mais recente"}};
+    for (const auto& [versao, answer] : books) {
+        file.rows(u"update tbVersao set versao = "_s + QLatin1StringView(versao));
+        EXPECT_TRUE(failureOf(inFile, onServer).contains(QLatin1StringView(answer))) << versao;
+        EXPECT_EQ(server.rows(u"select count(*) from tbSocios"_s).first().first(), u"0"_s);
+    }
 }
 
 TEST_F(Copy, GoesThereAndBackWithEveryRowAndKeyAsItWas) {
@@ -138,7 +144,7 @@ TEST_F(Copy, GoesThereAndBackWithEveryRowAndKeyAsItWas) {
             rows += progress.isTableDone ? progress.rows : 0;
             EXPECT_LE(progress.allRows, progress.total);
         });
-    EXPECT_EQ(there.tables, 21);
+    EXPECT_EQ(there.tables, 22);
     EXPECT_EQ(there.rows, rows);
     EXPECT_EQ(failureOf(onServer, back), QString());
 

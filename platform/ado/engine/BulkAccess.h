@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include <QByteArray>
+#include <QStringList>
 #include <functional>
 #include <map>
+#include <set>
 #include <variant>
 #include <vector>
 
@@ -57,7 +58,9 @@ struct Totals {
 /// rows by the million. Failures are core::Failure with the engine's text.
 class BulkAccess {
 public:
-    enum class Purpose { Reading, Filling };
+    /// Filling is for a book that nobody uses yet; Changing for one with rows in it, which others
+    /// may go on reading meanwhile.
+    enum class Purpose { Reading, Filling, Changing };
 
     virtual ~BulkAccess() = default;
 
@@ -65,12 +68,14 @@ public:
     virtual void execute(const QByteArray& statements) = 0;
     /// The first column of the first row as a whole number; 0 when there is none, 1 for true.
     virtual qint64 number(const QByteArray& query) = 0;
+    /// The first column of all rows as texts; an empty one for null.
+    virtual QStringList texts(const QByteArray& query) = 0;
     /// The book's schema in the engine's own words. It is written in those of SQLite.
     virtual QByteArray translated(const QByteArray& schema) const = 0;
 
     /// Begins a transaction, which is undone unless commit() is reached. Whoever reads sees the
-    /// book as it stands now, whatever others write meanwhile; while somebody fills a book, nobody
-    /// else writes to it.
+    /// book as it stands now, whatever others write meanwhile; while somebody fills or changes a
+    /// book, nobody else writes to it.
     virtual void begin(Purpose purpose) = 0;
     virtual void commit() = 0;
 
@@ -80,6 +85,9 @@ public:
     /// does not grow with the rows.
     virtual void eachRow(const TableShape& shape,
                          const std::function<void(const BulkRow&)>& row) = 0;
+    /// What the book consists of: its tables, views and indexes that have a name of their own, in
+    /// lower case.
+    virtual std::set<QByteArray> parts() = 0;
     virtual Totals totals(const TableShape& shape) = 0;
     /// The last key given, of each table that generates its keys; names in lower case.
     virtual std::map<QByteArray, qint64> lastKeys() = 0;

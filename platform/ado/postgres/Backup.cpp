@@ -55,6 +55,15 @@ QStringList placeOf(const Address& book) {
     return place;
 }
 
+/// What the file holds, one thing a line, in lower case.
+QByteArray contentOf(const QString& file, const QString& what) {
+    return run(Restore, {u"--list"_s, file}, {}, what).toLower();
+}
+
+bool lists(const QByteArray& content, const QString& table) {
+    return content.contains(" table data public " + table.toLower().toUtf8() + ' ');
+}
+
 }  // namespace
 
 bool canBackUp() {
@@ -74,12 +83,32 @@ void backUp(const Address& book, const QString& file) {
 
 void prove(const QString& file, const QStringList& tables) {
     const QString what = u"«%1» não é uma cópia de segurança inteira de um livro."_s.arg(file);
-    const QByteArray list = run(Restore, {u"--list"_s, file}, {}, what).toLower();
+    const QByteArray content = contentOf(file, what);
     for (const QString& table : tables)
-        if (!list.contains(" table data public " + table.toLower().toUtf8() + ' '))
+        if (!lists(content, table))
             throw core::Failure(core::DatabaseFailure, what + u" Falta a tabela %1."_s.arg(table));
     // All of it can be read to its end.
     run(Restore, {u"--file=/dev/null"_s, file}, {}, what);
+}
+
+bool hasTable(const QString& file, const QString& table) {
+    return lists(contentOf(file, u"Não foi possível ler a cópia de segurança «%1»."_s.arg(file)),
+                 table);
+}
+
+qint64 numberIn(const QString& file, const QString& table, const QString& column) {
+    const QString what = u"Não foi possível ler a cópia de segurança «%1»."_s.arg(file);
+    const QStringList lines =
+        QString::fromUtf8(
+            run(Restore, {u"--data-only"_s, u"--table"_s, table, u"--file=-"_s, file}, {}, what))
+            .split(u'\n');
+    // "COPY public.tbversao (versao, _linha) FROM stdin;", and then the rows, parted by tabs.
+    for (qsizetype at = 0; at + 1 < lines.size(); ++at) {
+        const QStringList columns = lines[at].section(u'(', 1).section(u')', 0, 0).split(u", "_s);
+        if (lines[at].startsWith("COPY "_L1) && columns.contains(column))
+            return lines[at + 1].split(u'\t').value(columns.indexOf(column)).toLongLong();
+    }
+    return 0;
 }
 
 void restore(const QString& file, const Address& book) {

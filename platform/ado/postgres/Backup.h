@@ -17,6 +17,12 @@ void backUp(const Address& book, const QString& file);
 /// Fails unless the file is such a copy and has the tables.
 void prove(const QString& file, const QStringList& tables);
 
+/// The number in the first row of a table in such a file; 0 when there is none.
+qint64 numberIn(const QString& file, const QString& table, const QString& column);
+
+/// True when such a file has the table.
+bool hasTable(const QString& file, const QString& table);
+
 /// Puts the content of such a file in the place of the book's, in one step. The catalogue has to be
 /// there; the address is its administrator's.
 void restore(const QString& file, const Address& book);

@@ -223,11 +223,14 @@ void BulkAccess::begin(Purpose purpose) {
     execute("BEGIN");
     QByteArray names;
     for (const TableShape& shape : tables()) names += (names.isEmpty() ? "" : ", ") + shape.name;
-    if (!names.isEmpty()) execute("LOCK TABLE " + names + " IN SHARE ROW EXCLUSIVE MODE");
+    if (names.isEmpty()) return;
+    // Whoever holds a row for longer than any posting takes is told of, rather than waited for.
+    execute("SET LOCAL lock_timeout = '30s'");
+    execute("LOCK TABLE " + names + " IN SHARE ROW EXCLUSIVE MODE");
 }
 
 void BulkAccess::commit() {
-    if (purpose_ == Purpose::Filling) {
+    if (purpose_ != Purpose::Reading) {
         flush();
         execute(ContinueBehindHighest);
         execute("ANALYZE");
@@ -262,6 +265,21 @@ void BulkAccess::eachRow(const TableShape& shape, const std::function<void(const
         row(values);
     }
     while (PGresult* end = PQgetResult(connection_)) PQclear(checked(end));
+}
+
+std::set<QByteArray> BulkAccess::parts() {
+    std::set<QByteArray> names;
+    for (const QString& name :
+         texts("SELECT relname FROM pg_class WHERE relnamespace = 'public'::regnamespace AND "
+               "relkind IN ('r', 'v', 'i')"))
+        names.insert(name.toUtf8());
+    return names;
+}
+
+QStringList BulkAccess::texts(const QByteArray& query) {
+    QStringList texts;
+    eachResult(query, [&](const PGresult* row) { texts << QString::fromUtf8(textAt(row, 0)); });
+    return texts;
 }
 
 Totals BulkAccess::totals(const TableShape& shape) {

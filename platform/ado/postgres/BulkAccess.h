@@ -24,6 +24,7 @@ public:
 
     void execute(const QByteArray& statements) override;
     qint64 number(const QByteArray& query) override;
+    QStringList texts(const QByteArray& query) override;
     QByteArray translated(const QByteArray& schema) const override;
 
     void begin(Purpose purpose) override;
@@ -33,6 +34,7 @@ public:
 
     std::vector<TableShape> tables() override;
     void eachRow(const TableShape& shape, const std::function<void(const BulkRow&)>& row) override;
+    std::set<QByteArray> parts() override;
     Totals totals(const TableShape& shape) override;
     std::map<QByteArray, qint64> lastKeys() override;
 

@@ -115,6 +115,16 @@ void prove(const QString& file, const QStringList& tables) {
             throw core::Failure(core::DatabaseFailure, what + u" Falta a tabela %1."_s.arg(table));
 }
 
+qint64 numberIn(const QString& file, const QString& table, const QString& column) {
+    const QString what = u"Não foi possível ler a cópia de segurança «%1»."_s.arg(file);
+    const Opened opened(file, SQLITE_OPEN_READONLY, what);
+    const QStringList known = opened.texts("SELECT lower(name) FROM sqlite_schema");
+    if (!known.contains(table)) return 0;
+    return opened.texts(u"SELECT %1 FROM %2 LIMIT 1"_s.arg(column, table).toUtf8().constData())
+        .value(0)
+        .toLongLong();
+}
+
 void restore(const QString& file, const QString& book) {
     const QString what = u"Não foi possível repor o livro «%1»."_s.arg(book);
     const Opened from(file, SQLITE_OPEN_READONLY, what);

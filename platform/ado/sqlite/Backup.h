@@ -15,6 +15,9 @@ void backUp(const QString& book, const QString& file);
 /// tables.
 void prove(const QString& file, const QStringList& tables);
 
+/// The number in the first row of a table in such a file; 0 when there is none.
+qint64 numberIn(const QString& file, const QString& table, const QString& column);
+
 /// Puts the content of such a file in the place of the book's, in one step; the book is made when
 /// there is none.
 void restore(const QString& file, const QString& book);

@@ -82,7 +82,8 @@ BulkAccess::~BulkAccess() {
 
 void BulkAccess::begin(Purpose purpose) {
     purpose_ = purpose;
-    execute(purpose == Purpose::Filling ? BeginFilling : "BEGIN");
+    if (purpose == Purpose::Filling) return execute(BeginFilling);
+    execute(purpose == Purpose::Changing ? "BEGIN IMMEDIATE" : "BEGIN");
 }
 
 void BulkAccess::commit() {
@@ -92,6 +93,16 @@ void BulkAccess::commit() {
 qint64 BulkAccess::number(const QByteArray& query) {
     const SqliteStatement statement = handle_.prepare(query);
     return step(statement.get()) ? sqlite3_column_int64(statement.get(), 0) : 0;
+}
+
+QStringList BulkAccess::texts(const QByteArray& query) {
+    QStringList texts;
+    const SqliteStatement statement = handle_.prepare(query);
+    while (step(statement.get())) {
+        const auto* text = sqlite3_column_text(statement.get(), 0);
+        texts << QString::fromUtf8(reinterpret_cast<const char*>(text));
+    }
+    return texts;
 }
 
 /// False at the end.
@@ -125,6 +136,14 @@ void BulkAccess::eachRow(const TableShape& shape, const std::function<void(const
             values[at] = valueAt(rows.get(), static_cast<int>(at), shape.types[at]);
         row(values);
     }
+}
+
+std::set<QByteArray> BulkAccess::parts() {
+    std::set<QByteArray> names;
+    for (const QString& name :
+         texts("SELECT name FROM sqlite_master WHERE name NOT LIKE 'sqlite\\_%' ESCAPE '\\'"))
+        names.insert(name.toLower().toUtf8());
+    return names;
 }
 
 Totals BulkAccess::totals(const TableShape& shape) {

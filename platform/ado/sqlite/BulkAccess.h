@@ -19,6 +19,7 @@ public:
 
     void execute(const QByteArray& statements) override { handle_.execute(statements.constData()); }
     qint64 number(const QByteArray& query) override;
+    QStringList texts(const QByteArray& query) override;
     QByteArray translated(const QByteArray& schema) const override { return schema; }
 
     void begin(Purpose purpose) override;
@@ -26,6 +27,7 @@ public:
 
     std::vector<TableShape> tables() override;
     void eachRow(const TableShape& shape, const std::function<void(const BulkRow&)>& row) override;
+    std::set<QByteArray> parts() override;
     Totals totals(const TableShape& shape) override;
     std::map<QByteArray, qint64> lastKeys() override;
 
