@@ -9,7 +9,11 @@
 #include "database/Book.h"
 #include "database/Check.h"
 #include "database/Copy.h"
+#include "database/QuickCheck.h"
+#include "database/Schema.h"
 #include "database/ServerBook.h"
+#include "database/Upgrade.h"
+#include "database/Version.h"
 #include "host/BookSettings.h"
 #include "host/Console.h"
 #include "host/Password.h"
@@ -74,6 +78,16 @@ database::BookPlace placeOf(const CommandLine& line, bool asAdministrator) {
     return place;
 }
 
+/// The version that a book must have, and what a quick look finds.
+int tellQuickFindings(ado::BulkAccess& book, const database::BookPlace& place) {
+    const QString unfit = database::whyUnfit(database::schemaVersion(book), place);
+    const QStringList findings =
+        unfit.isEmpty() ? database::quickFindings(book) : QStringList(unfit);
+    for (const QString& finding : findings) say(finding);
+    if (findings.isEmpty()) say(u"Não foi encontrado nenhum erro, à primeira vista."_s);
+    return findings.isEmpty() ? 0 : 1;
+}
+
 }  // namespace
 
 int checkBook(const CommandLine& line) {
@@ -82,6 +96,7 @@ int checkBook(const CommandLine& line) {
         const database::BookPlace place = placeOf(line, false);
         const std::unique_ptr<ado::BulkAccess> book = database::opened(place);
         say(u"Livro: %1"_s.arg(place.shown()));
+        if (line.quick) return tellQuickFindings(*book, place);
         const database::CheckSummary summary =
             database::checkBook(*book, [](const QString& finding) { say(finding); });
         say(database::summaryText(summary));
@@ -104,6 +119,21 @@ void restoreBook(const CommandLine& line) {
     const QString file = QFileInfo(line.file).absoluteFilePath();
     database::restoreBook(file, place, line.replace);
     say(u"Livro %1 reposto a partir de %2"_s.arg(place.shown(), file));
+    const int version = database::versionInBackup(file, place);
+    if (const QString unfit = database::whyUnfit(version, place); !unfit.isEmpty()) say(unfit);
+}
+
+void upgradeBook(const CommandLine& line) {
+    const database::BookPlace place = placeOf(line, true);
+    const int version = database::schemaVersion(*database::opened(place));
+    const QString file = line.file.isEmpty() ? database::upgradeBackupFile(place, version)
+                                             : QFileInfo(line.file).absoluteFilePath();
+    const int from = database::bringUpToDate(place, file, say);
+    if (from == database::SchemaVersion)
+        say(u"O livro %1 já é da versão %2; não havia nada a fazer."_s.arg(place.shown())
+                .arg(database::SchemaVersion));
+    else
+        say(u"Livro %1 atualizado."_s.arg(place.shown()));
 }
 
 void makeBook(const CommandLine& line) {

@@ -16,5 +16,7 @@ void copyBook(const CommandLine& line);
 int checkBook(const CommandLine& line);
 void backUpBook(const CommandLine& line);
 void restoreBook(const CommandLine& line);
+/// Brings the book to the version of this program and says what was done.
+void upgradeBook(const CommandLine& line);
 
 }  // namespace host

@@ -124,6 +124,7 @@ CommandLine copyLine(const QStringList& all) {
 CommandLine checkLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::Check};
+    line.quick = words.flag(u"--quick"_s);
     words.value(u"--book"_s, line.book);
     words.value(u"--admin"_s, line.admin);
     return words.ended(line);
@@ -136,6 +137,15 @@ CommandLine backupLine(const QStringList& all, CommandLine::Task task) {
     words.value(u"--admin"_s, line.admin);
     if (task == CommandLine::Task::Restore) line.replace = words.flag(u"--replace"_s);
     line.file = words.next(u"o ficheiro da cópia de segurança"_s);
+    return words.ended(line);
+}
+
+CommandLine upgradeLine(const QStringList& all) {
+    Words words(all);
+    CommandLine line{.task = CommandLine::Task::Upgrade};
+    words.value(u"--book"_s, line.book);
+    words.value(u"--admin"_s, line.admin);
+    words.value(u"--backup"_s, line.file);
     return words.ended(line);
 }
 
@@ -211,6 +221,7 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     if (first == "check"_L1) return checkLine(words);
     if (first == "backup"_L1) return backupLine(words, Task::Backup);
     if (first == "restore"_L1) return backupLine(words, Task::Restore);
+    if (first == "upgrade"_L1) return upgradeLine(words);
     if (first == "bankfile"_L1) return bankFileLine(words);
     if (first == "documents"_L1) return documentsLine(words);
     if (first == "register"_L1) return registerLine(words);

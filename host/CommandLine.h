@@ -20,6 +20,7 @@ struct CommandLine {
         Check,
         Backup,
         Restore,
+        Upgrade,
         BankFile,
         Documents,
         Register,
@@ -39,8 +40,9 @@ struct CommandLine {
                          ///< that the settings name
     QString from = {};   ///< of Copy, as database::BookPlace reads it
     QString into = {};
-    QString book = {};  ///< of Check, Backup and Restore, likewise; empty for that of the settings
-    QString file = {};  ///< of Backup, Restore, BankFile and Documents
+    QString book = {};  ///< of Check, Backup, Restore and Upgrade, likewise; empty for that of the
+                        ///< settings
+    QString file = {};  ///< of Backup, Restore, Upgrade, BankFile and Documents
     QDate first = {};   ///< of BankFile: the days that are paid
     QDate last = {};
     QString version = {};         ///< of BankFile; empty for that of the settings
@@ -52,6 +54,7 @@ struct CommandLine {
     bool sample = false;          ///< of Init and InitServer: with the sample content
     bool ifNeeded = false;        ///< of Init: only when no book is set up for this user
     bool undo = false;            ///< of Register
+    bool quick = false;           ///< of Check: only what costs no time
     bool replace = false;         ///< of Restore: the book that is there may be lost
 
     /// @param words  without the program's name

@@ -3,6 +3,7 @@
 
 #include "host/LeftForLater.h"
 #include "host/MovementBook.h"
+#include "host/SystemJournal.h"
 #include "platform/core/Failure.h"
 
 namespace host {
@@ -31,7 +32,10 @@ void MovementLoader::run(const BookSettings& settings) {
         try {
             read(settings, stop);
         } catch (const core::Failure& thrown) {
-            tell([this, text = thrown.text()] { end([this, text] { emit failed(text); }); });
+            tell([this, thrown] {
+                journal::note(thrown, QStringLiteral("frmPrincipal"));
+                end([this, text = thrown.text()] { emit failed(text); });
+            });
         }
     });
 }

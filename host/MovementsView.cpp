@@ -93,12 +93,17 @@ void MovementsView::open(const BookSettings& settings) {
     if (!settings.unreadable.isEmpty())
         return showNotice(u"As definições não se deixam ler:\n"_s + settings.unreadable,
                           u"F5 tenta de novo."_s);
-    if (!settings.isComplete)
-        return showNotice(u"Ainda não há um livro para este utilizador."_s,
-                          u"Um livro novo faz-se com: zelmars init PASTA"_s);
+    if (!settings.isComplete) return showNotice({}, {});
     loader_->start(settings);
     stack_->setCurrentIndex(0);
     showCount();
+}
+
+void MovementsView::refuse(const QString& why, const QString& hint) {
+    loader_->stop();
+    settings_ = {};
+    forgetBook();
+    showNotice(why, hint);
 }
 
 void MovementsView::forgetBook() {
@@ -273,10 +278,9 @@ void MovementsView::filterChanged(const QString& text) {
 
 void MovementsView::showUnreadable(const QString& text) {
     book_.reset();
-    showNotice(
-        u"O livro não pode ser lido:\n"_s + text,
-        u"Livro: %1\nF5 tenta de novo. Outro livro novo faz-se com: zelmars init PASTA"_s.arg(
-            settings_.bookText()));
+    showNotice(u"O livro não pode ser lido:\n"_s + text,
+               u"Livro: %1\nF5 tenta de novo. Outro livro escolhe-se no menu Livro."_s.arg(
+                   settings_.bookText()));
 }
 
 void MovementsView::showNotice(const QString& text, const QString& hint) {

@@ -28,6 +28,8 @@ public:
     /// Reads a book beside the window: the newest movements are shown as soon as they are there,
     /// and what was shown of the same book until then.
     void open(const BookSettings& settings);
+    /// Shows, in place of the list, why the book is not opened, and what can be done about it.
+    void refuse(const QString& why, const QString& hint);
     /// Shows what was posted or annulled since, here or at another workstation.
     void takeNewer();
 

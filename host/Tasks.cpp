@@ -4,9 +4,12 @@
 #include <QLibrary>
 
 #include "host/BankFileTask.h"
+#include "host/BookAge.h"
+#include "host/BookSettings.h"
 #include "host/BookTasks.h"
 #include "host/Console.h"
 #include "host/DocumentsTask.h"
+#include "host/SystemJournal.h"
 #include "host/frmPrincipal.h"
 #include "platform/com/Place.h"
 #include "platform/core/Failure.h"
@@ -69,8 +72,18 @@ int showWindow() {
     return QApplication::exec();
 }
 
+/// The commands that look after books by themselves know what a book's version means to them.
+void refuseUnfitBook(const CommandLine& line) {
+    using Task = CommandLine::Task;
+    if (line.task != Task::Operation && line.task != Task::Documents && line.task != Task::BankFile)
+        return;
+    const QString why = reasonAgainst(BookSettings::readOrTell()).value_or(QString());
+    if (!why.isEmpty()) throw core::Failure(core::InvalidCall, why);
+}
+
 int performUntrapped(const CommandLine& line) {
     using Task = CommandLine::Task;
+    refuseUnfitBook(line);
     switch (line.task) {
         case Task::Window:
             return showWindow();
@@ -92,6 +105,9 @@ int performUntrapped(const CommandLine& line) {
             return Done;
         case Task::Restore:
             restoreBook(line);
+            return Done;
+        case Task::Upgrade:
+            upgradeBook(line);
             return Done;
         case Task::Documents:
             makeDocuments(line);
@@ -132,9 +148,11 @@ void registerComponents(bool undo) {
 }
 
 int perform(const CommandLine& line) {
+    journal::begin();
     try {
         return performUntrapped(line);
     } catch (const core::Failure& failure) {
+        journal::note(failure, u"zelmars"_s);
         complain(failure.text());
         return Failed;
     }

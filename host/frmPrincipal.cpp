@@ -5,10 +5,16 @@
 #include <QCloseEvent>
 #include <QScopedValueRollback>
 #include <QScreen>
+#include <QStackedWidget>
 #include <QStatusBar>
 
 #include "data/Procedures.h"
+#include "database/Book.h"
+#include "host/BookAge.h"
+#include "host/BookChoice.h"
+#include "host/BookPage.h"
 #include "host/BookSettings.h"
+#include "host/BookWatch.h"
 #include "host/ElidedLabel.h"
 #include "host/MemberAccount.h"
 #include "host/MovementsView.h"
@@ -56,14 +62,30 @@ void bringForward(QWidget* window) {
     window->activateWindow();
 }
 
+/// The file of the book that the settings name, when it is not there; otherwise empty.
+QString missingFile(const BookSettings& settings) {
+    if (!settings.isComplete || !settings.unreadable.isEmpty()) return {};
+    QString file;
+    core::passingOver([&] {
+        const database::BookPlace place = settings.place();
+        if (!place.isOnServer()) file = database::bookFile(place.folder, place.name);
+    });
+    return QFile::exists(file) ? QString() : file;
+}
+
 constexpr QSize FrameSize(16, 48);  // about what a window manager adds
 constexpr int MessageTime = 8000;   // in milliseconds
 
 }  // namespace
 
-frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
+frmPrincipal::frmPrincipal()
+    : pages_(new QStackedWidget),
+      movements_(new MovementsView),
+      books_(new BookPage),
+      watch_(new BookWatch(this)) {
     setObjectName(u"frmPrincipal"_s);
     setWindowTitle(u"Zelmars - Plano de Saúde"_s);
+    addBookMenu();
     addEntryMenu();
     addListingMenus();
     addYearMenus();
@@ -74,22 +96,29 @@ frmPrincipal::frmPrincipal() : movements_(new MovementsView) {
     column->setSpacing(0);
     column->addWidget(forms::headingBand(u"Plano de Saúde"_s, u"Movimentos em vigor"_s,
                                          u"Label25"_s, u"Label26"_s, u"Image1"_s));
-    column->addWidget(movements_, 1);
+    pages_->addWidget(movements_);
+    pages_->addWidget(books_);
+    column->addWidget(pages_, 1);
     setCentralWidget(page);
     addStatusLine();
     connect(movements_, &MovementsView::countChanged, this, &frmPrincipal::showCount);
     connect(movements_, &MovementsView::chosen, this,
             [this](qint32 key) { run(Operations::movement(key, this)); });
-    connect(movements_, &MovementsView::opened, this,
-            [this] { sample_->setVisible(movements_->isSample()); });
+    connect(movements_, &MovementsView::opened, this, [this] {
+        sample_->setVisible(movements_->isSample());
+        RememberedBooks::remember(BookSettings::readOrTell());
+    });
     connect(movements_, &MovementsView::bookRead, this, &frmPrincipal::offerToFinish,
             Qt::QueuedConnection);
     connect(movements_, &MovementsView::told, this,
             [this](const QString& text) { statusBar()->showMessage(text, MessageTime); });
+    connectBookPage();
+    connect(watch_, &BookWatch::unfit, this, &frmPrincipal::takeUnfit);
+    connect(watch_, &BookWatch::found, this, &frmPrincipal::takeFound);
     restoreLook();
     guardKeys();
     reload();
-    movements_->focusFilter();
+    if (pages_->currentWidget() == movements_) movements_->focusFilter();
 }
 
 frmPrincipal::~frmPrincipal() = default;
@@ -105,11 +134,17 @@ void frmPrincipal::addStatusLine() {
     bold.setBold(true);
     sample_->setFont(bold);
     sample_->hide();
+    findings_ = new QLabel;
+    findings_->setObjectName(u"PorVerificar"_s);
+    findings_->setFont(bold);
+    findings_->hide();
     // The name that goes into what is posted.
     user_ = new QLabel(u"Utilizador: "_s + data::ObterUtilizador());
     user_->setObjectName(u"Utilizador"_s);
-    for (QLabel* label : {count_, sample_, book_, user_}) label->setContentsMargins(8, 0, 8, 0);
+    for (QLabel* label : {count_, findings_, sample_, book_, user_})
+        label->setContentsMargins(8, 0, 8, 0);
     statusBar()->addWidget(count_, 1);
+    statusBar()->addPermanentWidget(findings_);
     statusBar()->addPermanentWidget(sample_);
     statusBar()->addPermanentWidget(book_);
     statusBar()->addPermanentWidget(user_);
@@ -123,8 +158,19 @@ void frmPrincipal::once(const std::function<void()>& handler) {
     handler();
 }
 
+/// The same for what works in the book, which has to be of this program's version.
+void frmPrincipal::inBook(const std::function<void()>& handler) {
+    once([&] {
+        const QString why = watch_->whyUnfit();
+        if (why.isEmpty())
+            handler();
+        else
+            core::MsgBox(why, core::Icon::Exclamation);
+    });
+}
+
 void frmPrincipal::run(const OperationCall& call) {
-    once([&] { runUnguarded(call); });
+    inBook([&] { runUnguarded(call); });
 }
 
 void frmPrincipal::runUnguarded(const OperationCall& call) {
@@ -157,6 +203,54 @@ void frmPrincipal::login() {
     else
         core::MsgBox(u"Não foi possível ligar ao livro: faltam valores na configuração."_s,
                      core::Icon::Critical);
+}
+
+void frmPrincipal::connectBookPage() {
+    const auto way = [this](void (BookPage::*wanted)(), const std::function<bool()>& to) {
+        connect(books_, wanted, this, [this, to] { forms::handle([&] { goOver(to); }); });
+    };
+    way(&BookPage::tryAgain, [] { return true; });
+    way(&BookPage::sampleWanted, &choice::sample);
+    way(&BookPage::newBookWanted, [this] { return choice::newBook(this); });
+    way(&BookPage::existingWanted, [this] { return choice::existing(this); });
+    way(&BookPage::serverWanted, [] { return choice::onServer(); });
+}
+
+/// Goes over to another book, unless an entry is under way, which would be posted into it.
+void frmPrincipal::goOver(const std::function<bool()>& way) {
+    once([&] {
+        if (QWidget* entry = entryUnderWay(EntryScreens)) {
+            core::MsgBox(
+                u"Há um lançamento aberto.\nTermine-o ou cancele-o antes de mudar de livro."_s,
+                core::Icon::Information);
+            return bringForward(entry);
+        }
+        if (!way()) return;
+        closeOtherWindows();
+        reload();
+        if (pages_->currentWidget() != movements_) return;
+        movements_->focusFilter();
+        statusBar()->showMessage(u"Livro: "_s + BookSettings::read().bookText(), MessageTime);
+    });
+}
+
+/// What is open shows the book that was left.
+void frmPrincipal::closeOtherWindows() {
+    for (QWidget* window : QApplication::topLevelWidgets())
+        if (window != this && window->isVisible()) window->close();
+}
+
+/// The list, or without a book the ways to one.
+void frmPrincipal::showPage(const BookSettings& settings) {
+    const bool isNone = !settings.isComplete && settings.unreadable.isEmpty();
+    const QString gone = missingFile(settings);
+    pages_->setCurrentWidget(isNone || !gone.isEmpty() ? static_cast<QWidget*>(books_)
+                                                       : movements_);
+    if (pages_->currentWidget() != books_) return;
+    books_->tell(isNone ? u"Ainda não há um livro para este utilizador. Por onde quer começar?"_s
+                        : u"O livro «%1» não está lá. Que livro quer abrir?"_s.arg(gone),
+                 !isNone);
+    books_->takeFocus();
 }
 
 void frmPrincipal::checkBook() {
@@ -224,13 +318,33 @@ void frmPrincipal::RemoteKey(const QVariant& /*movimento_id*/) {
 void frmPrincipal::reload() {
     const BookSettings settings = BookSettings::readOrTell();
     book_->setText(settings.isComplete ? u"Livro: "_s + settings.bookText() : u"Sem livro"_s);
+    showPage(settings);
+    findings_->hide();
+    watch_->look(settings);
     movements_->open(settings);
     sample_->setVisible(movements_->isSample());
 }
 
+/// Nobody works in a book of another version; one that is older can be brought up to date.
+void frmPrincipal::takeUnfit(const QString& why) {
+    movements_->refuse(why, u"F5 tenta de novo."_s);
+    sample_->hide();
+    once([&] {
+        forms::handle([this] {
+            if (offerToUpgrade(this, BookSettings::read())) reload();
+        });
+    });
+}
+
+void frmPrincipal::takeFound(const QStringList& findings) {
+    findings_->setText(u"Há erros no livro: veja Anual > Verificar o livro"_s);
+    findings_->setToolTip(findings.join(u'\n'));
+    findings_->show();
+}
+
 /// Asked whenever the book was read afresh: at the start, and after a lost connection.
 void frmPrincipal::offerToFinish() {
-    if (isOffering_) return;
+    if (isOffering_ || !watch_->whyUnfit().isEmpty()) return;
     const QScopedValueRollback offering(isOffering_, true);
     if (offerToFinishOperations(this, BookSettings::readOrTell())) movements_->takeNewer();
 }

@@ -4,13 +4,17 @@
 #include <QMainWindow>
 #include <QVariant>
 
+#include "host/BookSettings.h"
 #include "host/Operations.h"
 
 class QLabel;
 class QMenu;
+class QStackedWidget;
 
 namespace host {
 
+class BookPage;
+class BookWatch;
 class MovementsView;
 class frmConta;
 
@@ -43,6 +47,8 @@ private:
                  const std::function<void()>& handler);
     void addOperation(QMenu* menu, const QString& caption, const QString& shortcut,
                       const OperationCall& call, const QString& name = {});
+    void connectBookPage();
+    void addBookMenu();
     void addEntryMenu();
     void addListingMenus();
     void addYearMenus();
@@ -52,8 +58,14 @@ private:
     void guardKeys();
     void runUnguarded(const OperationCall& call);
     void once(const std::function<void()>& handler);
+    void inBook(const std::function<void()>& handler);
+    void takeUnfit(const QString& why);
+    void takeFound(const QStringList& findings);
     void tellWhyNot();
     void login();
+    void goOver(const std::function<bool()>& way);
+    void closeOtherWindows();
+    void showPage(const BookSettings& settings);
     void checkBook();
     void showAccountOfMovement();
     void findMember();
@@ -70,8 +82,12 @@ private:
     Operations operations_;
     bool isRunning_ = false;
     QPointer<frmConta> account_;  ///< the member's page that is open; null for none
+    QStackedWidget* pages_;       ///< the movements, or the ways to a book
     MovementsView* movements_;
+    BookPage* books_;
+    BookWatch* watch_;
     QLabel* count_;
+    QLabel* findings_;
     QLabel* sample_;
     QLabel* book_;
     QLabel* user_;

@@ -4,6 +4,8 @@
 #include <QMenu>
 #include <QMenuBar>
 
+#include "host/BookChoice.h"
+#include "host/BookMenu.h"
 #include "host/MovementsView.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/MsgBox.h"
@@ -27,6 +29,20 @@ void frmPrincipal::addOperation(QMenu* menu, const QString& caption, const QStri
             [this, call] { run(call); });
 }
 
+void frmPrincipal::addBookMenu() {
+    QMenu* menu = menuBar()->addMenu(u"L&ivro"_s);
+    const auto add = [&](const QString& name, const QString& caption,
+                         const std::function<bool()>& way) {
+        addItem(menu, name, caption, {}, [this, way] { goOver(way); });
+    };
+    add(u"MudarDeLivro"_s, u"&Abrir…"_s, [this] { return choice::existing(this); });
+    add(u"NovoLivro"_s, u"&Novo livro…"_s, [this] { return choice::newBook(this); });
+    add(u"Exemplo"_s, u"Livro de &exemplo"_s, &choice::sample);
+    add(u"Servidor"_s, u"&Servidor…"_s, [] { return choice::onServer(); });
+    menu->addSeparator();
+    new BookMenu(menu, [this](const std::function<bool()>& way) { goOver(way); });
+}
+
 void frmPrincipal::addEntryMenu() {
     QMenu* menu = menuBar()->addMenu(u"&Lançamentos"_s);
     addOperation(menu, u"&Novo documento"_s, u"Ctrl+N"_s, Operations::newDocument(false));
@@ -46,12 +62,12 @@ void frmPrincipal::addListingMenus() {
     QMenu* payments = menuBar()->addMenu(u"&Pagamentos"_s);
     addOperation(payments, u"&Listagens de pagamentos"_s, u"Ctrl+P"_s, {u"LPagamentos"_s, {}});
     addItem(payments, u"FicheiroBanco"_s, u"&Ficheiro para o banco…"_s, {},
-            [this] { once([this] { makeBankFile(); }); });
+            [this] { inBook([this] { makeBankFile(); }); });
     QMenu* extracts = menuBar()->addMenu(u"&Extratos"_s);
     addOperation(extracts, u"&Extratos"_s, u"Ctrl+E"_s, {u"Extratos"_s, {}});
     addOperation(extracts, u"Listagem de &hospitais"_s, {}, {u"Lhospitais"_s, {}});
     addItem(extracts, u"Documentos"_s, u"&Documentos de todos os associados…"_s, {},
-            [this] { once([this] { makeDocuments(); }); });
+            [this] { inBook([this] { makeDocuments(); }); });
     QMenu* debts = menuBar()->addMenu(u"&Dívidas"_s);
     addOperation(debts, u"&Listagem de dívidas"_s, u"Ctrl+D"_s, {u"Ldividas"_s, {}});
     addOperation(debts, u"&Cartas de dívidas"_s, {}, {u"Lcartasdividas"_s, {}});
@@ -68,7 +84,7 @@ void frmPrincipal::addYearMenus() {
             [this] { once([this] { checkBook(); }); });
     year->addSeparator();
     addItem(year, u"CallFechoAno"_s, u"&Fecho do ano"_s, {},
-            [this] { once([this] { closeYear(); }); });
+            [this] { inBook([this] { closeYear(); }); });
 }
 
 void frmPrincipal::addHelpMenu() {
@@ -77,9 +93,9 @@ void frmPrincipal::addHelpMenu() {
     addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
     menu->addSeparator();
     addItem(menu, u"Conta"_s, u"&Conta do associado"_s, u"Ctrl+M"_s,
-            [this] { once([this] { showAccountOfMovement(); }); });
+            [this] { inBook([this] { showAccountOfMovement(); }); });
     addItem(menu, u"Procurar"_s, u"&Procurar um associado…"_s, u"Ctrl+Shift+M"_s,
-            [this] { once([this] { findMember(); }); });
+            [this] { inBook([this] { findMember(); }); });
     menu->addSeparator();
     addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
         once([] {

@@ -14,6 +14,7 @@ namespace {
 const QStringList Screens{
     // The host's.
     u"frmPrincipal"_s,
+    u"frmServidor"_s,
     u"frmDocumentos"_s,
     u"frmFicheiroBanco"_s,
     u"frmPrepararFecho"_s,

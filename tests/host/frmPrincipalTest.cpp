@@ -437,6 +437,14 @@ TEST_F(PrincipalWindow, AnEntryUnderWayIsNotTakenAway) {
         {.text = u"Quer voltar ao lançamento?"_s, .answer = core::Answer::Yes, .partly = true});
     EXPECT_FALSE(window_.close());
 
+    // Nor is the book changed under it.
+    for (const char* name : {"Exemplo", "NovoLivro", "MudarDeLivro", "Servidor"}) {
+        person_.expectBox(
+            {.text = u"Termine-o ou cancele-o antes de mudar de livro."_s, .partly = true});
+        window_.findChild<QAction*>(QString::fromLatin1(name))->trigger();
+    }
+    person_.expectNoBoxesLeft();
+
     entry.view();
     window_.findChild<QAction*>(u"NewMovimento"_s)->trigger();
     EXPECT_EQ(Recorder::calls, QStringList{u"NewMovimento false"_s});
@@ -466,7 +474,7 @@ TEST_F(PrincipalWindow, ABookThatCannotBeReadIsToldOfInPlaceOfTheList) {
     EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"não se deixam ler"_s));
     ASSERT_TRUE(settings.remove());
     person_.press(Qt::Key_F5);
-    EXPECT_TRUE(person_.find<QLabel>(u"Aviso"_s)->text().contains(u"Ainda não há um livro"_s));
+    EXPECT_TRUE(person_.find<QLabel>(u"Porque"_s)->text().contains(u"Ainda não há um livro"_s));
     EXPECT_EQ(person_.find<QLabel>(u"Livro"_s)->text(), u"Sem livro"_s);
 
     // Of another machine, whether others can read along on the way there.
