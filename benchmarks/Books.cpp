@@ -11,6 +11,7 @@
 #include "benchmarks/BenchServer.h"
 #include "boundary/Login.h"
 #include "database/Book.h"
+#include "database/Schema.h"
 #include "platform/ado/postgres/BulkAccess.h"
 #include "platform/ado/sqlite/BulkAccess.h"
 #include "platform/registry/LoginValues.h"
@@ -25,6 +26,11 @@ const QString Catalogue = u"zelmars"_s;
 
 /// Where the system keeps files in memory.
 const QString Memory = u"/dev/shm"_s;
+
+/// A book of another version of the schema is another book.
+QString versioned(const QString& name) {
+    return name + u"_v%1"_s.arg(database::SchemaVersion);
+}
 
 /// One fixed day, so that a book made earlier and one made today hold the same.
 const QDate AsOf(2026, 11, 20);
@@ -95,7 +101,8 @@ Book serverBook(const QString& name, const database::BookSizes& sizes, const Fil
 
 Book book(Engine engine, const QString& name, const database::BookSizes& sizes,
           const Fill& more = {}) {
-    return engine == Engine::Sqlite ? fileBook(name, sizes, more) : serverBook(name, sizes, more);
+    return engine == Engine::Sqlite ? fileBook(versioned(name), sizes, more)
+                                    : serverBook(versioned(name), sizes, more);
 }
 
 /// Adds what the two members have beside the sample.

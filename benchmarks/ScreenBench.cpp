@@ -10,7 +10,9 @@
 #include "benchmarks/Books.h"
 #include "benchmarks/PaintWatch.h"
 #include "boundary/General.h"
+#include "boundary/environment/dtZelmars.h"
 #include "host/MovementsView.h"
+#include "host/frmConta.h"
 #include "platform/forms/Form.h"
 
 using namespace Qt::StringLiterals;
@@ -80,6 +82,34 @@ void measurePosted(Report& report, Engine engine) {
     report.value(name, u"ms"_s, 80, report.medianOf(15, [&] { return showPosted(view, *alone); }));
 }
 
+/// Milliseconds from the key until the member's page is painted.
+double openAccount(qint32 socio_id) {
+    QElapsedTimer clock;
+    clock.start();
+    bool isPainted = false;
+    const PaintWatch watch(u"frmConta"_s, [&](QWidget*) { isPainted = true; });
+    auto* page = new host::frmConta(host::BookSettings::read(), socio_id);
+    page->Show();
+    while (!isPainted) QCoreApplication::processEvents();
+    const double milliseconds = static_cast<double>(clock.nsecsElapsed()) / 1e6;
+    page->Unload();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    return milliseconds;
+}
+
+void measureAccountPage(Report& report, Engine engine) {
+    for (const auto& [what, socio_id] :
+         {std::pair{u"50,000 movements"_s, MemberOfMovements},
+          std::pair{u"6,000 accumulators"_s, MemberOfAccumulators}}) {
+        const QString name = u"page of a member with %1, painted, %2"_s.arg(what, nameOf(engine));
+        if (!report.wanted(name)) continue;
+        use(heavyBook(engine));
+        // The page opens a connection of its own, as in a program without the component.
+        environment::dtZelmars::instance().MSAccess()->Close();
+        report.value(name, u"ms"_s, 150, report.medianOf(7, [&] { return openAccount(socio_id); }));
+    }
+}
+
 }  // namespace
 
 void measureScreens(Report& report) {
@@ -88,6 +118,7 @@ void measureScreens(Report& report) {
         if (report.wanted(name))
             report.value(name, u"ms"_s, 80, medianOpening(report, largeBook(engine)));
         measurePosted(report, engine);
+        measureAccountPage(report, engine);
     }
     if (!report.wanted(u"NewMovimento, large book against"_s)) return;
     std::vector<double> onLarge, onSample;

@@ -10,7 +10,6 @@
 #include <QTableView>
 #include <QTemporaryDir>
 
-#include "database/Book.h"
 #include "host/Console.h"
 #include "host/Operations.h"
 #include "host/Tasks.h"
@@ -92,6 +91,14 @@ std::function<bool(QWidget*)> hasRows() {
 class Script {
 public:
     explicit Script(Player& player) : player_(player) {}
+
+    /// The page that meets somebody without a book, and the way from there to the examples.
+    void firstStart() {
+        player_.step(u"frmPrincipal"_s, u"00-primeiro-arranque"_s, typing({u"<Alt+S>"_s}));
+        player_.step(u"frmServidor"_s, u"00a-servidor"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmPrincipal"_s, {}, typing({u"<Alt+X>"_s}));
+        player_.step(u"frmPrincipal"_s, {}, {}, hasRows());
+    }
 
     void document() {
         open(u"01-janela-principal"_s, Operations::newDocument(false));
@@ -338,8 +345,9 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     const QTemporaryDir own;
     if (!own.isValid() || !QDir().mkpath(folder))
         throw core::Failure(core::InvalidCall, u"A pasta %1 não pode ser feita."_s.arg(folder));
-    qputenv("ZELMARS_REGISTRY", own.filePath(u"registry"_s).toUtf8());
-    database::initBook(own.filePath(u"livro"_s), true);
+    // Nothing of the person's own is read or left behind: neither books nor what windows remember.
+    for (const char* const name : {"ZELMARS_REGISTRY", "XDG_CONFIG_HOME", "XDG_DATA_HOME"})
+        qputenv(name, own.filePath(QString::fromLatin1(name)).toUtf8());
     host::registerComponents(false);
     say(u"Um documento médico, uma conta de hospital e as janelas do caminho, num livro de exemplo "
         "que não fica:"_s);
@@ -349,6 +357,7 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     principal.show();
     Player player(folder, look);
     Script script(player);
+    script.firstStart();
     script.document();
     script.hospitalBill();
     script.view();
