@@ -124,6 +124,25 @@ std::vector<quint32> MovementList::inOrder(const std::vector<quint32>& found) co
     return ordered;
 }
 
+const QString& MovementList::heading(int column) {
+    return look(column).heading;
+}
+
+QStringView MovementList::format(int column) {
+    return look(column).format;
+}
+
+Qt::Alignment MovementList::alignment(int column) {
+    return look(column).alignment;
+}
+
+std::vector<qint32> MovementList::keys() const {
+    std::vector<qint32> keys;
+    keys.reserve(found_.size());
+    for (const quint32 position : found_) keys.push_back(search_->movimento_id(position));
+    return keys;
+}
+
 qint32 MovementList::movimento_id(int row) const {
     return search_->movimento_id(found_[std::size_t(row)]);
 }

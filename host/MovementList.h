@@ -35,6 +35,13 @@ public:
     /// Nothing for a row that there is not, nor while the book is being waited for.
     void read(int row);
 
+    /// How a column is headed, written (as core::formatted takes it) and aligned.
+    static const QString& heading(int column);
+    static QStringView format(int column);
+    static Qt::Alignment alignment(int column);
+
+    /// The movements that are shown, in their order.
+    std::vector<qint32> keys() const;
     /// Movements in all, whatever the filter.
     int total() const { return search_ ? int(search_->size()) : 0; }
     qint32 movimento_id(int row) const;

@@ -1,14 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementTable.h"
 
-#include <QApplication>
-#include <QClipboard>
 #include <QHeaderView>
-#include <QKeyEvent>
 
 #include "host/MovementList.h"
 #include "host/Notice.h"
 #include "platform/forms/Look.h"
+#include "platform/forms/TableCopy.h"
 
 using namespace Qt::StringLiterals;
 
@@ -19,17 +17,18 @@ namespace {
 // Usual widths, in digits of the list's font; the names take what is left.
 constexpr int Widths[MovementRow::ColumnCount] = {8, 12, 9, 34, 34, 6, 14, 13, 13, 13};
 constexpr int LeastName = 16;
-constexpr int MostCopied = 10'000;
 
 }  // namespace
 
 MovementTable::MovementTable(MovementList* movements)
-    : movements_(movements), empty_(new Notice(viewport(), u"Vazio"_s, u"VazioSugestao"_s)) {
+    : empty_(new Notice(viewport(), u"Vazio"_s, u"VazioSugestao"_s)) {
     setObjectName(u"Lista"_s);
     setAccessibleName(u"Movimentos"_s);
     setModel(movements);
-    forms::settleTable(*this);
-    setSelectionMode(ExtendedSelection);
+    copying_ = forms::settleTable(*this, ExtendedSelection);
+    copying_->textOf = [movements](const QModelIndex& cell) {
+        return movements->text(cell.row(), cell.column());
+    };
     setFrameShape(QFrame::NoFrame);
     setHorizontalScrollMode(ScrollPerPixel);
     QHeaderView* header = horizontalHeader();
@@ -72,11 +71,10 @@ QByteArray MovementTable::columns() const {
 void MovementTable::setColumns(const QByteArray& columns) {
     QHeaderView* header = horizontalHeader();
     header->restoreState(columns);
-    // Only the widths come back, not the order: the newest are at the top when the window opens.
+    // What a person can do with the columns is not a matter of what was kept.
     header->setSectionResizeMode(QHeaderView::Interactive);
     header->setSortIndicatorClearable(true);
     header->setSortIndicatorShown(true);
-    header->setSortIndicator(-1, Qt::AscendingOrder);
 }
 
 // Before it is shown, the table has a width that means nothing.
@@ -110,34 +108,6 @@ void MovementTable::giveFreeSpace(int kept, int mostTaken) {
         free -= after - before;
     }
     isFitting_ = false;
-}
-
-void MovementTable::keyPressEvent(QKeyEvent* event) {
-    if (event->matches(QKeySequence::Copy))
-        copyRows();
-    else
-        QTableView::keyPressEvent(event);
-}
-
-/// The rows from top to bottom, a line each, their columns parted by tabs, as spreadsheets take
-/// them.
-void MovementTable::copyRows() {
-    QItemSelection ranges = selectionModel()->selection();
-    std::sort(ranges.begin(), ranges.end(),
-              [](const auto& a, const auto& b) { return a.top() < b.top(); });
-    QStringList lines;
-    for (const QItemSelectionRange& range : ranges)
-        for (int row = range.top(); row <= range.bottom() && lines.size() < MostCopied; ++row) {
-            QStringList cells;
-            for (int column = 0; column < movements_->columnCount(); ++column)
-                cells << movements_->text(row, column).simplified();
-            lines << cells.join('\t'_L1);
-        }
-    if (lines.isEmpty()) return;
-    QApplication::clipboard()->setText(lines.join('\n'_L1) + '\n'_L1);
-    const int selected = std::accumulate(ranges.begin(), ranges.end(), 0,
-                                         [](int sum, auto& range) { return sum + range.height(); });
-    emit copied(int(lines.size()), lines.size() == selected);
 }
 
 }  // namespace host

@@ -1,16 +1,24 @@
 // SPDX-License-Identifier: MIT
 #include "host/MovementsView.h"
 
+#include <QHeaderView>
 #include <QLineEdit>
 #include <QScrollBar>
 #include <QStackedWidget>
 
 #include "host/LeftForLater.h"
+#include "host/MovementOutput.h"
 #include "host/MovementTable.h"
 #include "host/Notice.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
+#include "platform/core/MsgBox.h"
 #include "platform/forms/Form.h"
+#include "platform/forms/Look.h"
+#include "platform/forms/TableCopy.h"
+#include "platform/printing/DataReport.h"
+#include "platform/printing/PreviewOutput.h"
+#include "platform/printing/Progress.h"
 
 using namespace Qt::StringLiterals;
 
@@ -70,7 +78,7 @@ void MovementsView::connectParts() {
         showCount();
     });
     connect(loader_, &MovementLoader::loaded, this, &MovementsView::takeLoaded);
-    connect(list_, &MovementTable::copied, this, [this](int rows, bool all) {
+    connect(list_->copying(), &forms::TableCopy::copied, this, [this](int rows, bool all) {
         const QString text = rows == 1 ? u"Uma linha copiada."_s : u"%1 linhas copiadas."_s;
         emit told((rows == 1 ? text : text.arg(core::grouped(rows))) +
                   (all ? QString() : u" As restantes não foram."_s));
@@ -218,6 +226,64 @@ void MovementsView::setColumns(const QByteArray& columns) {
     list_->setColumns(columns);
 }
 
+QString MovementsView::filter() const {
+    return filter_->text();
+}
+
+void MovementsView::setFilter(const QString& filter) {
+    filter_->setText(filter);
+}
+
+void MovementsView::orderBy(int column) {
+    const bool turns = column == sortColumn_ && sortOrder_ == Qt::AscendingOrder;
+    list_->horizontalHeader()->setSortIndicator(column,
+                                                turns ? Qt::DescendingOrder : Qt::AscendingOrder);
+}
+
+/// Whether there is a whole list to be given out; says so when there is none.
+bool MovementsView::isListed() {
+    if (stack_->currentIndex() == 0 && book_ && !loader_->isReading() && !sorter_->isBusy()) {
+        if (movements_->rowCount() > 0) return true;
+        emit told(u"A lista não tem movimentos."_s);
+    } else {
+        emit told(u"O livro ainda está a ser lido. Tente daqui a um momento."_s);
+    }
+    return false;
+}
+
+void MovementsView::print() {
+    if (!isListed()) return;
+    const std::vector<qint32> keys = movements_->keys();
+    if (keys.size() > MostPrinted) {
+        core::MsgBox(
+            u"A lista tem %1 movimentos; de uma vez imprimem-se %2.\n"
+            "Escolha menos com o filtro, ou guarde a lista em CSV."_s.arg(
+                core::grouped(qint64(keys.size())), core::grouped(qint64(MostPrinted))),
+            core::Icon::Information);
+        return;
+    }
+    const QString filter = movements_->filter().simplified();
+    printing::Progress progress(window(), u"Imprimir a lista"_s, u"A ler os movimentos…"_s,
+                                int(keys.size()));
+    const std::shared_ptr<MovementBook> book = book_;
+    if (const auto rows = movementRows(*book, keys, progress.goesOn()))
+        printing::DataReport(movementReport(filter))
+            .Show(rows, printing::DataReport::Wait::Modeless);
+}
+
+void MovementsView::keepAsCsv() {
+    if (!isListed()) return;
+    const std::vector<qint32> keys = movements_->keys();
+    const std::shared_ptr<MovementBook> book = book_;
+    const QString file = printing::askCsvFile(window(), u"Movimentos em vigor"_s);
+    if (file.isEmpty()) return;
+    printing::Progress progress(window(), u"Guardar a lista"_s, u"A escrever os movimentos…"_s,
+                                int(keys.size()));
+    emit told(writeMovements(*book, keys, file, progress.goesOn())
+                  ? printing::written(file)
+                  : u"Cancelado: o ficheiro não foi escrito."_s);
+}
+
 bool MovementsView::eventFilter(QObject* watched, QEvent* event) {
     if (event->type() == QEvent::KeyPress) {
         const auto& key = *static_cast<QKeyEvent*>(event);
@@ -268,7 +334,12 @@ void MovementsView::chooseCurrent() {
         movements_->text(current.row(), MovementRow::Number), reason));
 }
 
+/// A filter colours its field, so that nobody takes a part of the movements for all of them.
 void MovementsView::filterChanged(const QString& text) {
+    QPalette colours;
+    if (!text.trimmed().isEmpty())
+        colours.setColor(QPalette::Base, forms::focusedGround(palette()));
+    filter_->setPalette(colours);
     movements_->setFilter(text);
     list_->scrollToTop();
     list_->standOn(0);

@@ -42,9 +42,19 @@ public:
     void chooseCurrent();
     /// The movement under the cursor; 0 for none.
     qint32 current() const;
+    /// Widths and order, for setColumns; anything else leaves the usual ones.
     QByteArray columns() const;
-    /// Widths as columns() gave them; anything else leaves the usual ones.
     void setColumns(const QByteArray& columns);
+    QString filter() const;
+    void setFilter(const QString& filter);
+    /// Sorts by a column, and turns the order round when it is sorted by that one; -1 puts the
+    /// newest at the top.
+    void orderBy(int column);
+
+    /// Shows what the filter leaves as pages to print.
+    void print();
+    /// Asks for a file and writes what the filter leaves to it, for spreadsheets.
+    void keepAsCsv();
 
 signals:
     /// The newest movements of the book are shown.
@@ -81,6 +91,7 @@ private:
     void showNotice(const QString& text, const QString& hint);
     void showCount();
     void showEmptyText();
+    bool isListed();
 
     BookSettings settings_;
     int read_ = 0;  ///< movements that have been read of a book that is being read

@@ -9,6 +9,7 @@
 #include "host/BookTasks.h"
 #include "host/Console.h"
 #include "host/DocumentsTask.h"
+#include "host/KeptPlaces.h"
 #include "host/SystemJournal.h"
 #include "host/frmPrincipal.h"
 #include "platform/com/Place.h"
@@ -49,6 +50,7 @@ int login(Operations& operations, const OperationCall& call) {
 
 int showOperation(const OperationCall& call) {
     forms::install();
+    const KeptPlaces places;
     Operations operations;
     if (call.operation == "Login"_L1) return login(operations, call);
     bool isDone = false;
@@ -67,6 +69,7 @@ int showOperation(const OperationCall& call) {
 
 int showWindow() {
     forms::install();
+    const KeptPlaces places;
     frmPrincipal window;
     window.show();
     return QApplication::exec();

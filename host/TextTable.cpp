@@ -50,7 +50,7 @@ TextTable::TextTable(const QString& name, const std::vector<Column>& columns)
     : rows_(new Rows(columns, this)) {
     setObjectName(name);
     setModel(rows_);
-    forms::settleTable(*this);
+    forms::settleTable(*this, ExtendedSelection);
     setHorizontalScrollMode(ScrollPerPixel);
     horizontalHeader()->setStretchLastSection(true);
     for (std::size_t column = 0; column < columns.size(); ++column)

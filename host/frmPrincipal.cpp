@@ -118,6 +118,7 @@ frmPrincipal::frmPrincipal()
     restoreLook();
     guardKeys();
     reload();
+    restoreFilter();
     if (pages_->currentWidget() == movements_) movements_->focusFilter();
 }
 
@@ -386,9 +387,14 @@ void frmPrincipal::closeEvent(QCloseEvent* event) {
             return bringForward(entry);
         }
     }
-    saveLook();
     event->accept();
     QApplication::exit();
+}
+
+/// Closed, and not only made an icon.
+void frmPrincipal::hideEvent(QHideEvent* event) {
+    if (!event->spontaneous()) saveLook();
+    QMainWindow::hideEvent(event);
 }
 
 void frmPrincipal::restoreLook() {
@@ -398,8 +404,20 @@ void frmPrincipal::restoreLook() {
     movements_->setColumns(settings.value(u"colunas"_s).toByteArray());
 }
 
+/// The filter of the last time, if it was of this book.
+void frmPrincipal::restoreFilter() {
+    const WindowSettings settings;
+    const QString filter = settings.value(u"filtro"_s).toString();
+    if (filter.isEmpty() || settings.value(u"filtroDe"_s).toString() != book_->text()) return;
+    movements_->setFilter(filter);
+    statusBar()->showMessage(
+        u"Filtro da última vez: «%1». Esc mostra todos os movimentos."_s.arg(filter), MessageTime);
+}
+
 void frmPrincipal::saveLook() const {
     WindowSettings settings;
+    settings.setValue(u"filtro"_s, movements_->filter());
+    settings.setValue(u"filtroDe"_s, book_->text());
     settings.setValue(u"janela"_s, saveGeometry());
     settings.setValue(u"colunas"_s, movements_->columns());
 }

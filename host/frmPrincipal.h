@@ -41,6 +41,7 @@ protected:
     bool event(QEvent* event) override;
     bool eventFilter(QObject* watched, QEvent* event) override;
     void closeEvent(QCloseEvent* event) override;
+    void hideEvent(QHideEvent* event) override;
 
 private:
     void addItem(QMenu* menu, const QString& name, const QString& caption, const QString& shortcut,
@@ -52,6 +53,7 @@ private:
     void addEntryMenu();
     void addListingMenus();
     void addYearMenus();
+    void addOrderMenu(QMenu* menu);
     void addHelpMenu();
     void addStatusLine();
 
@@ -76,6 +78,7 @@ private:
     void offerToFinish();
     void showCount(const QString& text);
     void restoreLook();
+    void restoreFilter();
     void saveLook() const;
 
     bool isOffering_ = false;  ///< the question about unfinished operations is being asked

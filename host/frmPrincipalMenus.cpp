@@ -6,6 +6,7 @@
 
 #include "host/BookChoice.h"
 #include "host/BookMenu.h"
+#include "host/MovementList.h"
 #include "host/MovementsView.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/MsgBox.h"
@@ -87,10 +88,26 @@ void frmPrincipal::addYearMenus() {
             [this] { inBook([this] { closeYear(); }); });
 }
 
+/// The same as clicks on the columns' headings, by keys.
+void frmPrincipal::addOrderMenu(QMenu* menu) {
+    addItem(menu, u"OrdenarPorIdade"_s, u"&Mais novo em cima"_s, {},
+            [this] { movements_->orderBy(-1); });
+    menu->addSeparator();
+    for (int column = 0; column < MovementRow::ColumnCount; ++column)
+        addItem(menu, u"Ordenar%1"_s.arg(column),
+                u"&%1  %2"_s.arg((column + 1) % 10).arg(MovementList::heading(column)), {},
+                [this, column] { movements_->orderBy(column); });
+}
+
 void frmPrincipal::addHelpMenu() {
     QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
     addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
     addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
+    addOrderMenu(menu->addMenu(u"&Ordenar por"_s));
+    addItem(menu, u"ImprimirLista"_s, u"&Imprimir a lista…"_s, u"Ctrl+Shift+P"_s,
+            [this] { once([this] { movements_->print(); }); });
+    addItem(menu, u"GuardarLista"_s, u"&Guardar a lista em CSV…"_s, u"Ctrl+Shift+S"_s,
+            [this] { once([this] { movements_->keepAsCsv(); }); });
     menu->addSeparator();
     addItem(menu, u"Conta"_s, u"&Conta do associado"_s, u"Ctrl+M"_s,
             [this] { inBook([this] { showAccountOfMovement(); }); });

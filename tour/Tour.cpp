@@ -145,6 +145,16 @@ public:
         player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
     }
 
+    /// What a filter leaves of the list, printed.
+    void filteredList() {
+        player_.step(u"frmPrincipal"_s, {}, typing({u"<Ctrl+F>"_s, u"silva doc"_s}));
+        player_.step(u"frmPrincipal"_s, u"11a-filtro"_s, {}, hasRows());
+        choose(u"ImprimirLista"_s);
+        player_.step(u"prtMovimentos"_s, u"11b-lista-impressa"_s, typing({u"<Escape>"_s}),
+                     says(u"Estado"_s, u"Página 1"_s));
+        player_.step(u"frmPrincipal"_s, {}, typing({u"<Escape>"_s}));
+    }
+
     /// The member of the newest movement, and what the ceilings leave his family, printed.
     void accountPage() {
         choose(u"Conta"_s);
@@ -361,6 +371,7 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     script.document();
     script.hospitalBill();
     script.view();
+    script.filteredList();
     script.accountPage();
     script.account();
     script.otherWindows();

@@ -19,6 +19,7 @@
 
 #include "platform/core/Format.h"
 #include "platform/forms/Emblem.h"
+#include "platform/forms/TableCopy.h"
 
 using namespace Qt::StringLiterals;
 
@@ -307,9 +308,9 @@ QColor blended(const QColor& under, const QColor& over, double part) {
                   mix(under.blue(), over.blue()));
 }
 
-void settleTable(QTableView& table) {
+TableCopy* settleTable(QTableView& table, QAbstractItemView::SelectionMode chosen) {
     table.setSelectionBehavior(QAbstractItemView::SelectRows);
-    table.setSelectionMode(QAbstractItemView::SingleSelection);
+    table.setSelectionMode(chosen);
     table.setEditTriggers(QAbstractItemView::NoEditTriggers);
     table.setAlternatingRowColors(true);
     table.setShowGrid(false);
@@ -319,6 +320,7 @@ void settleTable(QTableView& table) {
     table.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     table.verticalHeader()->setDefaultSectionSize(table.fontMetrics().height() * 3 / 2);
     table.horizontalHeader()->setHighlightSections(false);
+    return new TableCopy(table);
 }
 
 QColor focusedGround(const QPalette& palette) {

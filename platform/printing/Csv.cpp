@@ -5,6 +5,7 @@
 #include "platform/core/Format.h"
 #include "platform/core/Money.h"
 #include "platform/core/Values.h"
+#include "platform/printing/CsvFile.h"
 #include "platform/printing/Output.h"
 #include "platform/printing/SavedFile.h"
 #include "platform/printing/Sections.h"
@@ -39,13 +40,6 @@ QString quoted(const QString& text) {
     return u'"' + QString(text).replace(u'"', u"\"\""_s) + u'"';
 }
 
-/// The names of columns as cells.
-QStringList heading(const QStringList& names) {
-    QStringList cells;
-    for (const QString& name : names) cells << quoted(name);
-    return cells;
-}
-
 /// An engine gives a computed column as a double, which lies a little beside the amount that is
 /// meant.
 QVariant asAmount(const QVariant& value) {
@@ -59,21 +53,6 @@ QString cell(const QVariant& value) {
     return quoted(harmless(value.toString()));
 }
 
-class CsvFile {
-public:
-    explicit CsvFile(const QString& name) : file_(name) {
-        if (!openPrivately(file_)) failToWrite(file_);
-        file_.write("\xEF\xBB\xBF");
-    }
-    void line(const QStringList& cells) { file_.write(cells.join(u';').toUtf8() + "\r\n"); }
-    void close() {
-        if (!file_.commit()) failToWrite(file_);
-    }
-
-private:
-    QSaveFile file_;
-};
-
 /// The columns of one row set.
 class Cells {
 public:
@@ -81,11 +60,9 @@ public:
         for (const QString& name : names) values_.place(name);
         values_.lookUp(rows);
     }
-    QStringList of(const ado::Recordset& rows, qint64 row) {
+    QVariantList of(const ado::Recordset& rows, qint64 row) {
         values_.read(rows, row);
-        QStringList cells;
-        for (const QVariant& value : values_.values()) cells << cell(value);
-        return cells;
+        return QVariantList(values_.values().begin(), values_.values().end());
     }
 
 private:
@@ -97,7 +74,7 @@ void writeGroups(CsvFile& file, const Report& report, ado::Recordset& rows) {
     for (qint64 row = 0; row < rows.rowsInMemory(); ++row) {
         rows.MoveTo(row);
         const ado::RecordsetPtr children = rows.Chapter(report.chapter);
-        const QStringList head = group.of(rows, row);
+        const QVariantList head = group.of(rows, row);
         Cells detail(columnsOf(report.detail), *children);
         for (qint64 child = 0; child < children->rowsInMemory(); ++child)
             file.line(head + detail.of(*children, child));
@@ -106,15 +83,40 @@ void writeGroups(CsvFile& file, const Report& report, ado::Recordset& rows) {
 
 }  // namespace
 
+CsvFile::CsvFile(const QString& name) : file_(name) {
+    if (!openPrivately(file_)) failToWrite(file_);
+    file_.write("\xEF\xBB\xBF");
+}
+
+void CsvFile::heading(const QStringList& names) {
+    QStringList cells;
+    for (const QString& name : names) cells << quoted(name);
+    write(cells);
+}
+
+void CsvFile::line(const QVariantList& values) {
+    QStringList cells;
+    for (const QVariant& value : values) cells << cell(value);
+    write(cells);
+}
+
+void CsvFile::write(const QStringList& cells) {
+    file_.write(cells.join(u';').toUtf8() + "\r\n");
+}
+
+void CsvFile::close() {
+    if (!file_.commit()) failToWrite(file_);
+}
+
 void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file) {
     rows->readAll();
     CsvFile out(file);
     const QStringList columns = columnsOf(report.detail);
     if (!report.chapter.isEmpty()) {
-        out.line(heading(columnsOf(report.groupHeader) + columns));
+        out.heading(columnsOf(report.groupHeader) + columns);
         writeGroups(out, report, *rows);
     } else {
-        out.line(heading(columns));
+        out.heading(columns);
         Cells detail(columns, *rows);
         for (qint64 row = 0; row < rows->rowsInMemory(); ++row) out.line(detail.of(*rows, row));
     }

@@ -51,10 +51,8 @@ bool print(const Pages& pages, const QPrinter& printer, int from, int to,
 /// there already, and says so in a box that names the file. False when given up.
 bool printUnasked(const Pages& pages, const GoesOn& goesOn = {});
 
-/// The rows as a text that spreadsheets open: semicolons, decimal comma, texts in quotes, UTF-8
-/// with a mark. One line with the columns that the report shows, one for each detail row; of a
-/// report with groups the group's columns stand first. A text that a spreadsheet would run as a
-/// formula, or read as a date or as a number with fewer digits, gets a leading apostrophe. Fails,
+/// The rows as a text for spreadsheets (CsvFile.h). One line with the columns that the report
+/// shows, one for each detail row; of a report with groups the group's columns stand first. Fails,
 /// leaving no half file, when the file cannot be written.
 void writeCsv(const Report& report, const ado::RecordsetPtr& rows, const QString& file);
 

@@ -55,11 +55,11 @@ QString askFile(QWidget* parent, const Kind& kind, const QString& caption) {
     return {};
 }
 
+}  // namespace
+
 QString written(const QString& file) {
     return u"Guardado: %1"_s.arg(QDir::toNativeSeparators(file));
 }
-
-}  // namespace
 
 QString printAsking(QWidget* parent, const Pages& pages, int current) {
     if (QPrinterInfo::availablePrinterNames().isEmpty()) {
@@ -97,10 +97,14 @@ QString savePdfAsking(QWidget* parent, const Pages& pages) {
     return writePdf(pages, file, progress.goesOn()) ? written(file) : QString();
 }
 
-QString exportCsvAsking(QWidget* parent, const Report& report, const ado::RecordsetPtr& rows) {
+QString askCsvFile(QWidget* parent, const QString& caption) {
     const Kind kind{u"FicheiroCsv"_s, u"Exportar CSV"_s, u"Folha de cálculo CSV (*.csv)"_s,
                     u"csv"_s};
-    const QString file = askFile(parent, kind, report.caption);
+    return askFile(parent, kind, caption);
+}
+
+QString exportCsvAsking(QWidget* parent, const Report& report, const ado::RecordsetPtr& rows) {
+    const QString file = askCsvFile(parent, report.caption);
     if (file.isEmpty()) return {};
     writeCsv(report, rows, file);
     return written(file);

@@ -25,4 +25,9 @@ QString savePdfAsking(QWidget* parent, const Pages& pages);
 /// The same for the rows as a text for spreadsheets; what they hold is told in Output.h.
 QString exportCsvAsking(QWidget* parent, const Report& report, const ado::RecordsetPtr& rows);
 
+/// The file for such a text that the person wants; empty for none.
+QString askCsvFile(QWidget* parent, const QString& caption);
+/// The line that says where something was put.
+QString written(const QString& file);
+
 }  // namespace printing
