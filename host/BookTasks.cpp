@@ -68,16 +68,6 @@ void showProgress(const database::CopyProgress& progress) {
 
 const QString Administrator = u"postgres"_s;
 
-/// The book that the line names, else that of the settings, with who enters it.
-database::BookPlace placeOf(const CommandLine& line, bool asAdministrator) {
-    database::BookPlace place =
-        line.book.isEmpty() ? BookSettings::read().place() : database::BookPlace::parsed(line.book);
-    const bool isKnown = line.book.isEmpty() && line.admin.isEmpty() && !asAdministrator;
-    if (place.isOnServer() && !isKnown)
-        enterAsAdministrator(place, line.admin.isEmpty() ? Administrator : line.admin);
-    return place;
-}
-
 /// The version that a book must have, and what a quick look finds.
 int tellQuickFindings(ado::BulkAccess& book, const database::BookPlace& place) {
     const QString unfit = database::whyUnfit(database::schemaVersion(book), place);
@@ -89,6 +79,15 @@ int tellQuickFindings(ado::BulkAccess& book, const database::BookPlace& place) {
 }
 
 }  // namespace
+
+database::BookPlace placeOf(const CommandLine& line, bool asAdministrator) {
+    database::BookPlace place =
+        line.book.isEmpty() ? BookSettings::read().place() : database::BookPlace::parsed(line.book);
+    const bool isKnown = line.book.isEmpty() && line.admin.isEmpty() && !asAdministrator;
+    if (place.isOnServer() && !isKnown)
+        enterAsAdministrator(place, line.admin.isEmpty() ? Administrator : line.admin);
+    return place;
+}
 
 int checkBook(const CommandLine& line) {
     constexpr int CouldNotLook = 2;

@@ -1,10 +1,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "database/Copy.h"
 #include "host/CommandLine.h"
 
 /// The commands that make books and carry them over. Failures are core::Failure.
 namespace host {
+
+/// The book that a line names, else that of the settings, with who enters it: the user of the
+/// settings, or the administrator when the line names a book or him.
+database::BookPlace placeOf(const CommandLine& line, bool asAdministrator);
 
 void makeBook(const CommandLine& line);
 void makeServerBook(const CommandLine& line);

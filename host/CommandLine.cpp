@@ -4,6 +4,7 @@
 #include <QFile>
 
 #include "host/bankfile/PayingAccount.h"
+#include "host/import/Kinds.h"
 
 using namespace Qt::StringLiterals;
 
@@ -195,6 +196,22 @@ CommandLine documentsLine(const QStringList& all) {
     return words.ended(line);
 }
 
+CommandLine importLine(const QStringList& all) {
+    Words words(all);
+    CommandLine line{.task = CommandLine::Task::Import};
+    line.dryRun = words.flag(u"--dry-run"_s);
+    line.withoutRefused = words.flag(u"--without-refused"_s);
+    words.value(u"--book"_s, line.book);
+    words.value(u"--admin"_s, line.admin);
+    QStringList kinds;
+    for (const importing::Description& each : importing::descriptions()) kinds << each.word;
+    line.kind = words.next(u"o que se importa: "_s + kinds.join(u", "_s));
+    words.require(line.kind.isEmpty() || kinds.contains(line.kind),
+                  u"não se importa «%1»; há %2."_s.arg(line.kind, kinds.join(u", "_s)));
+    line.file = words.next(u"o ficheiro a importar"_s);
+    return words.ended(line);
+}
+
 CommandLine registerLine(const QStringList& all) {
     Words words(all);
     CommandLine line{.task = CommandLine::Task::Register};
@@ -224,6 +241,7 @@ CommandLine CommandLine::parsed(const QStringList& words) {
     if (first == "upgrade"_L1) return upgradeLine(words);
     if (first == "bankfile"_L1) return bankFileLine(words);
     if (first == "documents"_L1) return documentsLine(words);
+    if (first == "import"_L1) return importLine(words);
     if (first == "register"_L1) return registerLine(words);
     if (first == "--help"_L1 || first == "-h"_L1) return Words(words).ended({.task = Task::Help});
     if (first == "--version"_L1) return Words(words).ended({.task = Task::Version});

@@ -23,6 +23,7 @@ struct CommandLine {
         Upgrade,
         BankFile,
         Documents,
+        Import,
         Register,
         Help,
         Version,
@@ -40,13 +41,15 @@ struct CommandLine {
                          ///< that the settings name
     QString from = {};   ///< of Copy, as database::BookPlace reads it
     QString into = {};
-    QString book = {};  ///< of Check, Backup, Restore and Upgrade, likewise; empty for that of the
-                        ///< settings
-    QString file = {};  ///< of Backup, Restore, Upgrade, BankFile and Documents
-    QDate first = {};   ///< of BankFile: the days that are paid
+    QString book = {};  ///< of Check, Backup, Restore, Upgrade and Import, likewise; empty for that
+                        ///< of the settings
+    QString file = {};  ///< of Backup, Restore, Upgrade, BankFile, Documents and Import
+    QString kind = {};  ///< of Import: a word of importing::descriptions()
+    bool dryRun = false;  ///< of Import: only tells what would happen
+    QDate first = {};     ///< of BankFile: the days that are paid
     QDate last = {};
     QString version = {};         ///< of BankFile; empty for that of the settings
-    bool withoutRefused = false;  ///< of BankFile: also where lines cannot go
+    bool withoutRefused = false;  ///< of BankFile and Import: also where lines cannot go
     bool withoutSent = false;     ///< of BankFile: leaves out what was sent before
     bool again = false;           ///< of BankFile: also what was sent before
     documents::Wish wish = {};    ///< of Documents; `file` is the folder, or the one file

@@ -9,6 +9,7 @@
 #include "host/BookTasks.h"
 #include "host/Console.h"
 #include "host/DocumentsTask.h"
+#include "host/ImportTask.h"
 #include "host/KeptPlaces.h"
 #include "host/SystemJournal.h"
 #include "host/frmPrincipal.h"
@@ -115,6 +116,8 @@ int performUntrapped(const CommandLine& line) {
         case Task::Documents:
             makeDocuments(line);
             return Done;
+        case Task::Import:
+            return importIntoBook(line);
         case Task::BankFile:
             return makeBankFile(line) ? Done : Failed;
         case Task::Register:

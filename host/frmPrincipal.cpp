@@ -24,6 +24,7 @@
 #include "host/frmConta.h"
 #include "host/frmDocumentos.h"
 #include "host/frmFicheiroBanco.h"
+#include "host/frmImportar.h"
 #include "host/frmPrepararFecho.h"
 #include "host/frmVerificacao.h"
 #include "platform/core/Failure.h"
@@ -296,6 +297,12 @@ void frmPrincipal::makeBankFile() {
 void frmPrincipal::makeDocuments() {
     auto* shown = new frmDocumentos;
     shown->ShowModal();
+}
+
+void frmPrincipal::importFiles() {
+    const QPointer<frmImportar> shown = new frmImportar(BookSettings::read().place());
+    shown->ShowModal();
+    if (shown && shown->hasWritten()) reload();  // names may have changed
 }
 
 /// Whoever may not close a year is told so by the component.

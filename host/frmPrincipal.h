@@ -74,6 +74,7 @@ private:
     void showAccount(qint32 socio_id);
     void makeBankFile();
     void makeDocuments();
+    void importFiles();
     void closeYear();
     void offerToFinish();
     void showCount(const QString& text);

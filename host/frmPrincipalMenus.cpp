@@ -78,6 +78,9 @@ void frmPrincipal::addYearMenus() {
     QMenu* tables = menuBar()->addMenu(u"&Tabelas"_s);
     addOperation(tables, u"&Rubricas e plafonds"_s, {}, Operations::rubrics());
     addOperation(tables, u"&Hospitais"_s, {}, Operations::hospitals());
+    tables->addSeparator();
+    addItem(tables, u"Importar"_s, u"&Importar…"_s, {},
+            [this] { inBook([this] { importFiles(); }); });
     QMenu* year = menuBar()->addMenu(u"&Anual"_s);
     addOperation(year, u"Declarações para &IRS"_s, {}, {u"CallIRS"_s, {}});
     addOperation(year, u"&Manutenção de dados"_s, {}, {u"CallManutencaoDados"_s, {}});

@@ -4,6 +4,7 @@
 #include <QGridLayout>
 #include <QLabel>
 
+#include "data/Rubrics.h"
 #include "masterdata/frmPlafonds_Main.h"
 #include "platform/core/Failure.h"
 #include "platform/core/Format.h"
@@ -179,8 +180,7 @@ void frmPlafonds_record::Command1_Click() {
         core::MsgBox(u"Tem de indicar um valor para a percentagem."_s, core::Icon::Information);
         return;
     }
-    const double percent = core::toDouble(Text3->Value());
-    if (percent > 1 || percent < 0) {
+    if (!data::isPercent(core::toDouble(Text3->Value()))) {
         core::MsgBox(u"Tem de indicar um valor entre 0 e 1 para a percentagem."_s,
                      core::Icon::Information);
         return;

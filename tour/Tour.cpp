@@ -232,6 +232,21 @@ public:
         leaveList(u"frmHospitais"_s);
     }
 
+    /// A file with a hospital that is new, one that changes, and one without a name.
+    void importedFile(const QString& name) {
+        QFile file(name);
+        const QByteArray rows =
+            "Código;Nome;Localidade\nH90;Clínica de São Gonçalo;Lisboa\nH91;;Faro\n"
+            "H92;Hospital do Mar;Faro\n";
+        if (!file.open(QFile::WriteOnly) || file.write(rows) != rows.size())
+            throw core::Failure(core::InvalidCall, file.errorString());
+        file.close();
+        choose(u"Importar"_s);
+        player_.step(u"frmImportar"_s, {}, typing({u"h"_s, u"<Tab>"_s, name, u"<Alt+V>"_s}));
+        player_.step(u"frmImportar"_s, u"42-importar"_s, typing({u"<Escape>"_s}), hasRows());
+        player_.step(u"frmPrincipal"_s, {}, {});
+    }
+
     /// What is paid by transfer since the beginning of the year, and the screen that types it into
     /// the bank's program.
     void payments() {
@@ -379,6 +394,7 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     QFile::remove(extract);
     script.extract(extract);
     script.masterData();
+    script.importedFile(own.filePath(u"hospitais.csv"_s));
     script.payments();
     script.debtsAndTaxes();
     script.hospitalList();

@@ -74,6 +74,24 @@ BEGIN
     END LOOP;
 END $do$;
 
+-- Files of other programs bring members, relatives and premiums, by the manager's import; what came
+-- before changes only in what a file can name.
+GRANT SELECT,
+    INSERT (
+        no_kor, nome, nome_guerra, nib, zelmar, zelmar_data_carencia, no_contribuinte, morada1,
+        code_postal1, localidade1),
+    UPDATE (
+        nome, nome_guerra, nib, zelmar, zelmar_data_carencia, no_contribuinte, morada1,
+        code_postal1, localidade1)
+    ON tbSocios TO {manager};
+GRANT SELECT, INSERT (socio_id, codABC, nome, data_nascimento, data_carencia),
+    UPDATE (nome, data_nascimento, data_carencia)
+    ON tbSocios_Familias TO {manager};
+GRANT SELECT, INSERT (socio_id, ult_ano, ult_mes, total_quotas, total_pago),
+    UPDATE (ult_ano, ult_mes, total_quotas, total_pago)
+    ON tbQuotas_Socios TO {manager};
+GRANT SELECT ON tbSocios_Inactivos, tbSocios_Familias_CodeABC TO {manager};
+
 -- The manager's bulk jobs: the repair of null amounts, the accumulators made anew, and the close,
 -- which moves all movements to history and opens the new year. What is in history stays there.
 DO $do$

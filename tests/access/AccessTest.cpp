@@ -17,6 +17,7 @@ const QStringList Screens{
     u"frmServidor"_s,
     u"frmDocumentos"_s,
     u"frmFicheiroBanco"_s,
+    u"frmImportar"_s,
     u"frmPrepararFecho"_s,
     u"frmVerificacao"_s,
     // The component's.

@@ -39,7 +39,8 @@ FLOORS = GROUND | {
     "companions": BASE + " platform/forms",
     "database": BASE + " platform/ado/sqlite platform/ado/postgres",
     "host/bankfile": BASE + " payments",
-    "host": ROOM + " coverage receipts reports database host/bankfile",
+    "host/import": BASE + " data database host/bankfile",
+    "host": ROOM + " coverage receipts reports database host/bankfile host/import",
     "tour": ROOM + " database host",
 }
 # The plan's arithmetic, on plain values, serves the sample books as well; where a server is, a

@@ -13,6 +13,20 @@ QByteArray TableShape::columnList(std::size_t count) const {
     return list;
 }
 
+QByteArray TableShape::changeStatement(const char* mark) const {
+    QByteArray changes;
+    for (std::size_t at = 1; at < columns.size(); ++at)
+        changes += (at == 1 ? "" : ", ") + columns[at] + " = " + mark +
+                   QByteArray::number(static_cast<qsizetype>(at) + 1);
+    return "UPDATE " + name + " SET " + changes + " WHERE " + columns.front() + " = " + mark + '1';
+}
+
+void TableShape::failForMissingRow() const {
+    throw core::Failure(
+        core::DatabaseFailure,
+        u"Uma linha da tabela %1 foi apagada entretanto."_s.arg(QString::fromUtf8(name)));
+}
+
 TableShapes::TableShapes(std::vector<TableShape> shapes) {
     for (TableShape& shape : shapes) {
         const QByteArray name = shape.name;

@@ -26,6 +26,10 @@ struct TableShape {
     /// The first so many columns as a list for a statement.
     QByteArray columnList(std::size_t count) const;
     QByteArray columnList() const { return columnList(columns.size()); }
+    /// The UPDATE of the row whose first column holds the first value; values are marked "?1", "?2"
+    /// and so on where the mark is "?".
+    QByteArray changeStatement(const char* mark) const;
+    [[noreturn]] void failForMissingRow() const;
 };
 
 /// The tables of a book by their names, without regard to case.
@@ -59,8 +63,9 @@ struct Totals {
 class BulkAccess {
 public:
     /// Filling is for a book that nobody uses yet; Changing for one with rows in it, which others
-    /// may go on reading meanwhile.
-    enum class Purpose { Reading, Filling, Changing };
+    /// may go on reading meanwhile; Importing for some tables, beside which others go on working,
+    /// by a user who may write those alone.
+    enum class Purpose { Reading, Filling, Changing, Importing };
 
     virtual ~BulkAccess() = default;
 
@@ -75,7 +80,7 @@ public:
 
     /// Begins a transaction, which is undone unless commit() is reached. Whoever reads sees the
     /// book as it stands now, whatever others write meanwhile; while somebody fills or changes a
-    /// book, nobody else writes to it.
+    /// book, nobody else writes to it; while somebody imports, nobody else does.
     virtual void begin(Purpose purpose) = 0;
     virtual void commit() = 0;
 
@@ -95,6 +100,9 @@ public:
     /// Adds a row, its values beside the table's first columns; the others take their defaults. All
     /// rows of a shape have as many values, and it must live until flush().
     virtual void add(const TableShape& shape, const BulkRow& row) = 0;
+    /// Writes a row's values beside the shape's columns, of which the first is the table's key.
+    /// Fails when there is no row of that key. The shape must live until flush().
+    virtual void change(const TableShape& shape, const BulkRow& row) = 0;
     /// Removes all rows of a table.
     virtual void clear(const TableShape& shape) = 0;
     /// From here on every row that was added can be read.

@@ -42,6 +42,9 @@ constexpr auto Generated =
     "  FROM pg_class c JOIN pg_attribute a ON a.attrelid = c.oid"
     " WHERE c.relnamespace = 'public'::regnamespace AND a.attidentity = 'd'";
 
+/// Held by whoever imports, of each catalogue; any number that nothing else uses.
+const QByteArray ImportLock = "7305190";
+
 constexpr auto ContinueBehindHighest = R"(
 DO $$
 DECLARE
@@ -157,20 +160,26 @@ void append(QByteArray& line, const QByteArray& text) {
     }
 }
 
+/// A value as the server reads it; empty for null.
+QByteArray plainText(const BulkValue& value) {
+    if (const auto* number = std::get_if<qint64>(&value)) return QByteArray::number(*number);
+    if (const auto* money = std::get_if<core::Money>(&value))
+        return money->toPlainText().toLatin1();
+    if (const auto* text = std::get_if<QByteArray>(&value)) return *text;
+    const auto* real = std::get_if<double>(&value);
+    if (!real) return {};
+    char digits[32];
+    const auto end = std::to_chars(std::begin(digits), std::end(digits), *real);
+    return {digits, end.ptr - digits};
+}
+
 void append(QByteArray& line, const BulkValue& value) {
-    if (const auto* number = std::get_if<qint64>(&value)) {
-        line += QByteArray::number(*number);
-    } else if (const auto* real = std::get_if<double>(&value)) {
-        char digits[32];
-        const auto end = std::to_chars(std::begin(digits), std::end(digits), *real);
-        line.append(digits, end.ptr - digits);
-    } else if (const auto* money = std::get_if<core::Money>(&value)) {
-        line += money->toPlainText().toLatin1();
-    } else if (const auto* text = std::get_if<QByteArray>(&value)) {
-        append(line, *text);
-    } else {
+    if (value.index() == 0)
         line += "\\N";
-    }
+    else if (const auto* text = std::get_if<QByteArray>(&value))
+        append(line, *text);
+    else
+        line += plainText(value);
 }
 
 /// The row that the server stumbled over. It counts the lines of what it was given; people know a
@@ -220,6 +229,13 @@ void BulkAccess::begin(Purpose purpose) {
         execute("BEGIN ISOLATION LEVEL REPEATABLE READ READ ONLY");
         return;
     }
+    if (purpose == Purpose::Importing) {
+        // Whoever imports next waits before the book that he is going to see is settled.
+        execute("SET lock_timeout = '30s'");
+        number("SELECT pg_advisory_lock(" + ImportLock + ")");
+        execute("BEGIN ISOLATION LEVEL REPEATABLE READ");
+        return;
+    }
     execute("BEGIN");
     QByteArray names;
     for (const TableShape& shape : tables()) names += (names.isEmpty() ? "" : ", ") + shape.name;
@@ -230,7 +246,8 @@ void BulkAccess::begin(Purpose purpose) {
 }
 
 void BulkAccess::commit() {
-    if (purpose_ != Purpose::Reading) {
+    if (purpose_ == Purpose::Importing) flush();
+    if (purpose_ == Purpose::Filling || purpose_ == Purpose::Changing) {
         flush();
         execute(ContinueBehindHighest);
         execute("ANALYZE");
@@ -316,6 +333,22 @@ void BulkAccess::add(const TableShape& shape, const BulkRow& row) {
     if (pending.lines.size() >= Enough) flush(shape, pending);
 }
 
+void BulkAccess::change(const TableShape& shape, const BulkRow& row) {
+    QByteArray& name = changes_[&shape];
+    if (name.isEmpty()) {
+        name = "change" + QByteArray::number(changes_.size());
+        PQclear(checked(PQprepare(connection_, name, shape.changeStatement("$"), 0, nullptr)));
+    }
+    std::vector<QByteArray> texts;
+    for (const BulkValue& value : row) texts.push_back(plainText(value));
+    std::vector<const char*> values;
+    for (std::size_t at = 0; at < row.size(); ++at)
+        values.push_back(row[at].index() == 0 ? nullptr : texts[at].constData());
+    const Result result(checked(PQexecPrepared(connection_, name, static_cast<int>(values.size()),
+                                               values.data(), nullptr, nullptr, 0)));
+    if (qstrcmp(PQcmdTuples(result.get()), "0") == 0) shape.failForMissingRow();
+}
+
 void BulkAccess::clear(const TableShape& shape) {
     flush();
     execute("DELETE FROM " + shape.name);
@@ -324,6 +357,8 @@ void BulkAccess::clear(const TableShape& shape) {
 void BulkAccess::flush() {
     for (auto& [shape, pending] : pending_) flush(*shape, pending);
     pending_.clear();
+    for (const auto& [shape, name] : changes_) execute("DEALLOCATE " + name);
+    changes_.clear();
 }
 
 void BulkAccess::flush(const TableShape& shape, Pending& pending) {

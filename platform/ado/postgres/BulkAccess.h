@@ -39,6 +39,7 @@ public:
     std::map<QByteArray, qint64> lastKeys() override;
 
     void add(const TableShape& shape, const BulkRow& row) override;
+    void change(const TableShape& shape, const BulkRow& row) override;
     void clear(const TableShape& shape) override;
     void flush() override;
     void continueAfter(const TableShape& shape, qint64 lastKey) override;
@@ -66,6 +67,7 @@ private:
     Purpose purpose_ = Purpose::Reading;
     std::map<QByteArray, QByteArray> order_;  ///< the column by which a table's rows were added
     std::unordered_map<const TableShape*, Pending> pending_;
+    std::unordered_map<const TableShape*, QByteArray> changes_;  ///< their names on the server
 };
 
 }  // namespace ado::postgres

@@ -83,7 +83,7 @@ BulkAccess::~BulkAccess() {
 void BulkAccess::begin(Purpose purpose) {
     purpose_ = purpose;
     if (purpose == Purpose::Filling) return execute(BeginFilling);
-    execute(purpose == Purpose::Changing ? "BEGIN IMMEDIATE" : "BEGIN");
+    execute(purpose == Purpose::Reading ? "BEGIN" : "BEGIN IMMEDIATE");
 }
 
 void BulkAccess::commit() {
@@ -178,10 +178,26 @@ void BulkAccess::add(const TableShape& shape, const BulkRow& row) {
         text = "INSERT INTO " + shape.name + " (" + shape.columnList(row.size()) + ") VALUES (" +
                marks + ')';
     }
-    sqlite3_stmt* insertion = handle_.cached(text);
+    run(text, row);
+}
+
+void BulkAccess::change(const TableShape& shape, const BulkRow& row) {
+    QByteArray& text = changes_[&shape];
+    if (text.isEmpty()) text = shape.changeStatement("?");
+    run(text, row);
+    if (sqlite3_changes(handle_.get()) == 0) shape.failForMissingRow();
+}
+
+void BulkAccess::run(const QByteArray& text, const BulkRow& row) {
+    sqlite3_stmt* statement = handle_.cached(text);
     for (std::size_t at = 0; at < row.size(); ++at)
-        bind(insertion, static_cast<int>(at) + 1, cellOf(row[at]));
-    handle_.run(insertion);
+        bind(statement, static_cast<int>(at) + 1, cellOf(row[at]));
+    handle_.run(statement);
+}
+
+void BulkAccess::flush() {
+    insertions_.clear();
+    changes_.clear();
 }
 
 void BulkAccess::clear(const TableShape& shape) {

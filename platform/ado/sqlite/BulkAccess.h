@@ -32,16 +32,20 @@ public:
     std::map<QByteArray, qint64> lastKeys() override;
 
     void add(const TableShape& shape, const BulkRow& row) override;
+    void change(const TableShape& shape, const BulkRow& row) override;
     void clear(const TableShape& shape) override;
-    void flush() override { insertions_.clear(); }
+    void flush() override;
     void continueAfter(const TableShape& shape, qint64 lastKey) override;
 
 private:
     bool step(sqlite3_stmt* statement);
+    void run(const QByteArray& text, const BulkRow& row);
 
     Handle handle_;
     Purpose purpose_ = Purpose::Reading;
+    // The statements for the rows of a shape.
     std::unordered_map<const TableShape*, QByteArray> insertions_;
+    std::unordered_map<const TableShape*, QByteArray> changes_;
 };
 
 }  // namespace ado::sqlite
