@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "host/Tasks.h"
 
-#include <QLibrary>
-
 #include "host/BankFileTask.h"
 #include "host/BookAge.h"
 #include "host/BookSettings.h"
@@ -11,9 +9,9 @@
 #include "host/DocumentsTask.h"
 #include "host/ImportTask.h"
 #include "host/KeptPlaces.h"
+#include "host/Registration.h"
 #include "host/SystemJournal.h"
 #include "host/frmPrincipal.h"
-#include "platform/com/Place.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/Form.h"
 #include "platform/forms/MsgBoxes.h"
@@ -51,6 +49,7 @@ int login(Operations& operations, const OperationCall& call) {
 
 int showOperation(const OperationCall& call) {
     forms::install();
+    registerMissing();
     const KeptPlaces places;
     Operations operations;
     if (call.operation == "Login"_L1) return login(operations, call);
@@ -70,6 +69,7 @@ int showOperation(const OperationCall& call) {
 
 int showWindow() {
     forms::install();
+    registerMissing();
     const KeptPlaces places;
     frmPrincipal window;
     window.show();
@@ -137,21 +137,6 @@ int performUntrapped(const CommandLine& line) {
 }
 
 }  // namespace
-
-void registerComponents(bool undo) {
-    const char* entry = undo ? "DllUnregisterServer" : "DllRegisterServer";
-    for (const QString& name : {u"Zelmars"_s, u"Lumbra"_s, u"Tiqueta"_s, u"Vorlane"_s}) {
-        const QString file = QCoreApplication::applicationDirPath() + u"/lib%1.so"_s.arg(name);
-        com::refuseOpenPlace(file);
-        QLibrary library(file);
-        const auto run = reinterpret_cast<com::Status (*)()>(library.resolve(entry));
-        if (!run) throw core::Failure(core::CannotCreateObject, library.errorString());
-        if (run() != com::Ok)
-            throw core::Failure(
-                core::CannotCreateObject,
-                u"O componente %1 não se deixou registar."_s.arg(library.fileName()));
-    }
-}
 
 int perform(const CommandLine& line) {
     journal::begin();

@@ -12,7 +12,7 @@
 
 #include "host/Console.h"
 #include "host/Operations.h"
-#include "host/Tasks.h"
+#include "host/Registration.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"

@@ -42,8 +42,20 @@ QString classesRootValue(const QString& path) {
     return key ? key->value({}).value_or(QString()) : QString();
 }
 
+QUuid registeredId(const QString& progId) {
+    return QUuid::fromString(classesRootValue(progId + u"\\CLSID"_s));
+}
+
+/// What the registry says, or the file of that name beside this library.
+QString serverFile(const QString& clsid) {
+    const QString file = classesRootValue(u"CLSID\\"_s + clsid + u"\\InprocServer32"_s);
+    const QString beside =
+        folderOf(reinterpret_cast<const void*>(&createObject)) + u'/' + QFileInfo(file).fileName();
+    return !file.isEmpty() && QFile::exists(beside) ? beside : file;
+}
+
 Guid classIdOf(const QString& progId) {
-    const QUuid id = QUuid::fromString(classesRootValue(progId + u"\\CLSID"_s));
+    const QUuid id = registeredId(progId);
     if (id.isNull()) cannotCreate(progId, u"não está registado."_s);
     Guid guid{id.data1, id.data2, id.data3, {}};
     std::copy(std::begin(id.data4), std::end(id.data4), std::begin(guid.data4));
@@ -52,7 +64,7 @@ Guid classIdOf(const QString& progId) {
 
 /// The server's entry point; its shared object stays loaded from then on.
 GetClassObject serverOf(const Guid& clsid, const QString& progId) {
-    const QString file = classesRootValue(u"CLSID\\"_s + guidText(clsid) + u"\\InprocServer32"_s);
+    const QString file = serverFile(guidText(clsid));
     if (file.isEmpty())
         cannotCreate(progId, u"a classe %1 não tem servidor registado."_s.arg(guidText(clsid)));
     // Without links on its way, so that the file that is loaded is the one that was looked at.
@@ -97,6 +109,11 @@ QVariant Object::call(const QString& member, QVariantList& arguments) const {
 
 QVariant Object::call(const QString& member, QVariantList&& arguments) const {
     return call(member, arguments);
+}
+
+bool isRegistered(const QString& progId) {
+    const QUuid id = registeredId(progId);
+    return !id.isNull() && QFile::exists(serverFile(id.toString()));
 }
 
 void registerRunning(const QString& progId, const std::function<QObject*()>& make) {

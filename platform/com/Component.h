@@ -48,10 +48,15 @@ private:
 };
 
 /// Makes a component by its programmatic name ("Lumbra.General"): looks first at the classes that
-/// this process registered itself, then in the registry, and loads the shared object found there.
+/// this process registered itself, then in the registry, and loads the shared object found there,
+/// or, where one of that name lies beside this library, that one: two installations of the program
+/// side by side each work with their own, whichever was registered last.
 /// Fails with CannotCreateObject and a text that names the component and what was missing, or,
 /// before anything is loaded, the place that others could write (Place.h).
 Object createObject(const QString& progId);
+
+/// Whether createObject() would find a shared object to load.
+bool isRegistered(const QString& progId);
 
 /// Registers (or, with an empty maker, withdraws) a class of this process under a programmatic
 /// name, before whatever the registry says.
