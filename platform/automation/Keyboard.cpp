@@ -5,6 +5,8 @@
 #include <xcb/xtest.h>
 
 #include <QChar>
+#include <chrono>
+#include <thread>
 
 #include "platform/core/Failure.h"
 
@@ -63,19 +65,25 @@ void Keyboard::send(bool down, xcb_keycode_t code) {
                         XCB_NONE, 0, 0, 0);
 }
 
-/// What the operator holds down at this moment is not meant for these keys.
-void Keyboard::letGoOfModifiers() {
-    const auto modifiersAsked = xcb_get_modifier_mapping(display_);
-    const auto downAsked = xcb_query_keymap(display_);
-    const ReplyPtr<xcb_get_modifier_mapping_reply_t> modifiers(
-        xcb_get_modifier_mapping_reply(display_, modifiersAsked, nullptr));
-    const ReplyPtr<xcb_query_keymap_reply_t> down(
-        xcb_query_keymap_reply(display_, downAsked, nullptr));
-    if (!modifiers || !down) return;
-    const xcb_keycode_t* codes = xcb_get_modifier_mapping_keycodes(modifiers.get());
-    for (int at = 0; at < xcb_get_modifier_mapping_keycodes_length(modifiers.get()); ++at)
-        if (codes[at] != 0 && (down->keys[codes[at] / 8] >> codes[at] % 8 & 1))
-            send(false, codes[at]);
+std::vector<xcb_keycode_t> Keyboard::keysDown() const {
+    const ReplyPtr<xcb_query_keymap_reply_t> state(
+        xcb_query_keymap_reply(display_, xcb_query_keymap(display_), nullptr));
+    std::vector<xcb_keycode_t> down;
+    for (int code = first_; state && code < int(std::size(state->keys)) * 8; ++code)
+        if (state->keys[code / 8] >> code % 8 & 1) down.push_back(static_cast<xcb_keycode_t>(code));
+    return down;
+}
+
+/// What the operator holds down at this moment is not meant for these keys, and a key that is down
+/// cannot be pressed. A finger is lifted a moment after the button that it pressed has begun all
+/// this; what stays down longer is let go of.
+void Keyboard::letGoOfKeys() {
+    constexpr auto Longest = std::chrono::milliseconds(500);
+    constexpr auto Between = std::chrono::milliseconds(2);
+    const auto end = std::chrono::steady_clock::now() + Longest;
+    while (!keysDown().empty() && std::chrono::steady_clock::now() < end)
+        std::this_thread::sleep_for(Between);
+    for (const xcb_keycode_t code : keysDown()) send(false, code);
 }
 
 void Keyboard::press(const Key& key, const Stroke& stroke) {
@@ -103,7 +111,7 @@ void Keyboard::type(const std::vector<Stroke>& strokes) {
         if (key.level3) keyFor(XK_ISO_Level3_Shift);
         keys.push_back(key);
     }
-    letGoOfModifiers();
+    letGoOfKeys();
     for (std::size_t at = 0; at < strokes.size(); ++at) press(keys[at], strokes[at]);
     xcb_flush(display_);
 }

@@ -23,7 +23,8 @@ private:
         bool level3 = false;
     };
     Key keyFor(quint32 symbol) const;
-    void letGoOfModifiers();
+    std::vector<xcb_keycode_t> keysDown() const;
+    void letGoOfKeys();
     void send(bool down, xcb_keycode_t code);
     void press(const Key& key, const Stroke& stroke);
 
