@@ -74,7 +74,7 @@ TEST_F(Components, NothingIsLoadedFromWhereOthersMayWrite) {
     QTemporaryDir root;
     const QString folder = root.filePath(u"fora/dentro"_s);
     ASSERT_TRUE(QDir().mkpath(folder));
-    const QString file = folder + u"/libSampleComponent.so"_s;
+    const QString file = folder + u"/libCarriedComponent.so"_s;
     ASSERT_TRUE(QFile::copy(server_.fileName(), file));
     registry::writeValue(registry::Hive::ClassesRoot,
                          u"CLSID\\%1\\InprocServer32"_s.arg(com::guidText(SampleClass)), {}, file);
