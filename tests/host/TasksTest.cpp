@@ -5,11 +5,13 @@
 #include <QDir>
 #include <QLockFile>
 #include <QProcess>
+#include <QScopeGuard>
 #include <QTemporaryDir>
 
 #include "host/MovementBook.h"
 #include "platform/ado/postgres/BulkAccess.h"
 #include "platform/ado/sqlite/BulkAccess.h"
+#include "platform/com/Component.h"
 #include "tests/support/Server.h"
 
 using namespace Qt::StringLiterals;
@@ -133,14 +135,22 @@ TEST_F(Program, EndsWithTheNextCallABookOnAServerThatWasCutOff) {
     }
 }
 
-TEST_F(Program, LogsInThroughTheRegisteredComponent) {
-    EXPECT_EQ(run({u"Login"_s}), 1);  // nothing is registered
-    EXPECT_EQ(run({u"register"_s}), 0) << errors_.toStdString();
+TEST_F(Program, LogsInThroughTheComponentWhichItRegistersByItself) {
+    const auto isRegistered = [&] {
+        const QByteArray own = qgetenv("ZELMARS_REGISTRY");
+        qputenv("ZELMARS_REGISTRY", QFile::encodeName(folder_.filePath(u"registry"_s)));
+        const auto putBack = qScopeGuard([&] { qputenv("ZELMARS_REGISTRY", own); });
+        return com::isRegistered(u"Zelmars.General"_s);
+    };
     EXPECT_EQ(run({u"Login"_s}), 1);  // no settings
     ASSERT_EQ(run({u"init"_s, book()}), 0);
+    ASSERT_EQ(run({u"register"_s, u"--undo"_s}), 0);
+    EXPECT_FALSE(isRegistered());
     EXPECT_EQ(run({u"login"_s}), 0) << errors_.toStdString();
-    EXPECT_EQ(run({u"register"_s, u"--undo"_s}), 0);
-    EXPECT_EQ(run({u"Login"_s}), 1);
+    EXPECT_TRUE(isRegistered());
+    ASSERT_EQ(run({u"register"_s, u"--undo"_s}), 0);
+    EXPECT_EQ(run({u"register"_s}), 0) << errors_.toStdString();
+    EXPECT_TRUE(isRegistered());
 }
 
 TEST_F(Program, CarriesABookToAServerAndWorksThere) {
