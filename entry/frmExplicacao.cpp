@@ -76,8 +76,12 @@ void frmExplicacao::layOut(const QString& inShort) {
     // All lines at once where the screen is high enough.
     const int lines = Grid1->rowCount() * Grid1->verticalHeader()->defaultSectionSize() +
                       Grid1->horizontalHeader()->sizeHint().height() + 2 * Grid1->frameWidth();
-    const QSize wanted(100 * fontMetrics().averageCharWidth(),
-                       sizeHint().height() - Grid1->sizeHint().height() + lines);
+    const QAbstractItemView& columns = *Grid1;
+    int width = 8 * fontMetrics().averageCharWidth();  // margins, and room for bold letters
+    for (int column = 0; column < Grid1->columnCount(); ++column)
+        width += qMax(columns.sizeHintForColumn(column),
+                      Grid1->horizontalHeader()->minimumSectionSize());
+    const QSize wanted(width, sizeHint().height() - Grid1->sizeHint().height() + lines);
     resize(wanted.boundedTo(screen()->availableSize()));
     forms::tabThrough({Grid1, Command1});
     Grid1->setFocus();
