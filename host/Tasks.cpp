@@ -11,6 +11,7 @@
 #include "host/KeptPlaces.h"
 #include "host/Registration.h"
 #include "host/SystemJournal.h"
+#include "host/frmAjuda.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/Failure.h"
 #include "platform/forms/Form.h"
@@ -51,6 +52,7 @@ int showOperation(const OperationCall& call) {
     forms::install();
     registerMissing();
     const KeptPlaces places;
+    const HelpKey help;
     Operations operations;
     if (call.operation == "Login"_L1) return login(operations, call);
     bool isDone = false;
@@ -71,6 +73,7 @@ int showWindow() {
     forms::install();
     registerMissing();
     const KeptPlaces places;
+    const HelpKey help;
     frmPrincipal window;
     window.show();
     return QApplication::exec();

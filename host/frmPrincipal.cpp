@@ -90,6 +90,7 @@ frmPrincipal::frmPrincipal()
     addEntryMenu();
     addListingMenus();
     addYearMenus();
+    addViewMenu();
     addHelpMenu();
     auto* page = new QWidget;
     auto* column = new QVBoxLayout(page);

@@ -54,6 +54,7 @@ private:
     void addListingMenus();
     void addYearMenus();
     void addOrderMenu(QMenu* menu);
+    void addViewMenu();
     void addHelpMenu();
     void addStatusLine();
 

@@ -6,8 +6,10 @@
 
 #include "host/BookChoice.h"
 #include "host/BookMenu.h"
+#include "host/HelpPages.h"
 #include "host/MovementList.h"
 #include "host/MovementsView.h"
+#include "host/frmAjuda.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/MsgBox.h"
 #include "platform/forms/Form.h"
@@ -102,7 +104,7 @@ void frmPrincipal::addOrderMenu(QMenu* menu) {
                 [this, column] { movements_->orderBy(column); });
 }
 
-void frmPrincipal::addHelpMenu() {
+void frmPrincipal::addViewMenu() {
     QMenu* menu = menuBar()->addMenu(u"&Ver"_s);
     addItem(menu, u"Atualizar"_s, u"&Atualizar a lista"_s, u"F5"_s, [this] { reload(); });
     addItem(menu, u"Filtrar"_s, u"&Filtrar"_s, u"Ctrl+F"_s, [this] { movements_->focusFilter(); });
@@ -116,6 +118,12 @@ void frmPrincipal::addHelpMenu() {
             [this] { inBook([this] { showAccountOfMovement(); }); });
     addItem(menu, u"Procurar"_s, u"&Procurar um associado…"_s, u"Ctrl+Shift+M"_s,
             [this] { inBook([this] { findMember(); }); });
+}
+
+void frmPrincipal::addHelpMenu() {
+    QMenu* menu = menuBar()->addMenu(u"A&juda"_s);
+    addItem(menu, u"Manual"_s, u"&Manual"_s, u"F1"_s, [this] { showHelp(helpPage(objectName())); });
+    addItem(menu, u"Teclas"_s, u"&Teclas"_s, {}, [] { showHelp(helpKeys()); });
     menu->addSeparator();
     addItem(menu, u"Acerca"_s, u"A&cerca do Zelmars"_s, {}, [this] {
         once([] {

@@ -13,6 +13,7 @@
 #include "host/Console.h"
 #include "host/Operations.h"
 #include "host/Registration.h"
+#include "host/frmAjuda.h"
 #include "host/frmPrincipal.h"
 #include "platform/core/Clock.h"
 #include "platform/core/Failure.h"
@@ -143,6 +144,16 @@ public:
         player_.step(u"frmPrincipal"_s, u"11-lista"_s, typing({u"<Return>"_s}),
                      listBeginsWith(u"H-2001"_s));
         player_.step(u"frmMovimentos"_s, u"12-movimento"_s, typing({u"<Alt+S>"_s}));
+    }
+
+    /// The manual, at the page of the screen.
+    void manual() {
+        open({}, Operations::newDocument(false));
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<F1>"_s}), shows(u"Text8"_s));
+        player_.step(u"frmAjuda"_s, u"43-manual"_s, typing({u"<Escape>"_s}));
+        player_.step(u"frmMovimentos"_s, {}, typing({u"<Escape>"_s}));
+        leave();
+        player_.step(u"frmPrincipal"_s, {}, {});
     }
 
     /// What a filter leaves of the list, printed.
@@ -377,6 +388,7 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     say(u"Um documento médico, uma conta de hospital e as janelas do caminho, num livro de exemplo "
         "que não fica:"_s);
 
+    const host::HelpKey help;
     host::frmPrincipal principal;
     principal.resize(QSize(1280, 800).boundedTo(principal.screen()->availableSize()));
     principal.show();
@@ -386,6 +398,7 @@ bool play(const QString& folder, const std::function<void(QWidget*)>& look) {
     script.document();
     script.hospitalBill();
     script.view();
+    script.manual();
     script.filteredList();
     script.accountPage();
     script.account();

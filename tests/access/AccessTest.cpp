@@ -15,6 +15,7 @@ const QStringList Screens{
     // The host's.
     u"frmPrincipal"_s,
     u"frmServidor"_s,
+    u"frmAjuda"_s,
     u"frmDocumentos"_s,
     u"frmFicheiroBanco"_s,
     u"frmImportar"_s,
