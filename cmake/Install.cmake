@@ -57,6 +57,8 @@ foreach(package zelmars zelmars-doc)
 endforeach()
 install(FILES README.md CHANGELOG.md DESTINATION ${ZELMARS_DOC_DIR} COMPONENT documents)
 install(DIRECTORY docs DESTINATION ${ZELMARS_DOC_DIR} COMPONENT documents)
+# Once set-up/manual has built it.
+install(DIRECTORY build/manual/ DESTINATION ${ZELMARS_DOC_DIR} COMPONENT documents OPTIONAL)
 
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME zelmars)
@@ -78,8 +80,8 @@ set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS ${CMAKE_BINARY_DIR}/bin)
 # What no library names: the toolkit's way to the display, its Portuguese, the faces of screens and
 # paper, and the print queue's library, which is looked for when something is printed.
 set(CPACK_DEBIAN_PROGRAM_PACKAGE_DEPENDS "qt6-qpa-plugins, qt6-translations-l10n, fonts-dejavu-core, fonts-liberation")
-set(CPACK_DEBIAN_PROGRAM_PACKAGE_RECOMMENDS "libcups2, postgresql-client, sqlite3")
-set(CPACK_DEBIAN_PROGRAM_PACKAGE_SUGGESTS "zelmars-doc")
+# The manual is in the program; its pictures are in the documents.
+set(CPACK_DEBIAN_PROGRAM_PACKAGE_RECOMMENDS "libcups2, postgresql-client, sqlite3, zelmars-doc")
 set(CPACK_COMPONENT_PROGRAM_DESCRIPTION "books of a collective health plan
 Zelmars keeps the books of a health plan that a members' organisation runs
 for its members and their families: documents and hospital bills, what the
