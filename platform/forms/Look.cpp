@@ -331,6 +331,7 @@ QPalette readable(QPalette palette) {
     const bool dark = palette.color(QPalette::Window).lightness() < 128;
     palette.setColor(QPalette::Highlight, dark ? AccentOnDark : Accent);
     palette.setColor(QPalette::HighlightedText, dark ? TextOnBright : QColor(Qt::white));
+    palette.setColor(QPalette::Link, dark ? AccentOnDark : Accent);
     // Dark desktops leave these near black.
     palette.setColor(QPalette::PlaceholderText,
                      blended(palette.color(QPalette::Base), palette.color(QPalette::Text), 0.68));

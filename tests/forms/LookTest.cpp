@@ -43,6 +43,7 @@ TEST(Look, CanBeReadOnLightAndDarkDesktops) {
         for (const auto& [text, ground] :
              std::initializer_list<std::pair<Role, Role>>{{Role::HighlightedText, Role::Highlight},
                                                           {Role::PlaceholderText, Role::Base},
+                                                          {Role::Link, Role::Base},
                                                           {Role::Text, Role::Base},
                                                           {Role::WindowText, Role::Window}})
             EXPECT_GE(contrast(palette.color(text), palette.color(ground)), 4.5) << text;
