@@ -52,7 +52,7 @@ void keep(const QWidget& screen) {
 }  // namespace
 
 KeptPlaces::KeptPlaces() {
-    qApp->installEventFilter(this);
+    QCoreApplication::instance()->installEventFilter(this);
 }
 
 bool KeptPlaces::eventFilter(QObject* watched, QEvent* event) {

@@ -132,7 +132,7 @@ void showHelp(const QUrl& page) {
 }
 
 HelpKey::HelpKey() {
-    qApp->installEventFilter(this);
+    QCoreApplication::instance()->installEventFilter(this);
 }
 
 bool HelpKey::eventFilter(QObject* watched, QEvent* event) {
