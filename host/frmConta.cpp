@@ -3,6 +3,7 @@
 
 #include <QComboBox>
 #include <QGridLayout>
+#include <QHeaderView>
 #include <QLabel>
 
 #include "data/Codes.h"
@@ -44,13 +45,13 @@ frmConta::frmConta(const BookSettings& settings, qint32 socio_id)
                                        {u"Crédito"_s, 13, true},
                                        {u"Débito"_s, 13, true}})),
       Grid2(new TextTable(u"Grid2"_s, {{u"Rubrica"_s, 37},
-                                       {u"Resta"_s, 13, true},
+                                       {u"Resta"_s, 12, true},
                                        {u"Limita"_s, 29},
-                                       {u"Plafond"_s, 12, true},
-                                       {u"Usado"_s, 12, true},
-                                       {u"Por doc."_s, 11, true},
+                                       {u"Plafond"_s, 11, true},
+                                       {u"Usado"_s, 11, true},
+                                       {u"Por doc."_s, 10, true},
                                        {u"Docs"_s, 6, true},
-                                       {u"Franquia"_s, 11, true}})),
+                                       {u"Franquia"_s, 10, true}})),
       Combo1(new QComboBox),
       Command1(new forms::Button(u"Command1"_s, u"&Imprimir o que resta…"_s)),
       Command2(new forms::Button(u"Command2"_s, u"&Fechar"_s)) {
@@ -136,7 +137,11 @@ void frmConta::layOut() {
     body->addWidget(movementsFrame(), 2);
     body->addWidget(remaindersFrame(), 3);
     body->addLayout(foot);
-    const QSize wanted(180 * fontMetrics().averageCharWidth(), 50 * fontMetrics().height());
+    // With large letters the screen scrolls rather than show a list of one row.
+    for (QTableView* list : {Grid1, Grid2})
+        list->setMinimumHeight(list->horizontalHeader()->sizeHint().height() +
+                               4 * list->verticalHeader()->defaultSectionSize());
+    const QSize wanted(186 * fontMetrics().averageCharWidth(), 50 * fontMetrics().height());
     resize(wanted.boundedTo(screen()->availableSize()));
     forms::tabThrough({Grid1, Combo1, Grid2, Command1, Command2});
     Grid1->setFocus();

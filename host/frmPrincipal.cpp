@@ -233,7 +233,8 @@ void frmPrincipal::goOver(const std::function<bool()>& way) {
         reload();
         if (pages_->currentWidget() != movements_) return;
         movements_->focusFilter();
-        statusBar()->showMessage(u"Livro: "_s + BookSettings::read().bookText(), MessageTime);
+        // Which one stands beside it.
+        statusBar()->showMessage(u"Livro aberto."_s, MessageTime);
     });
 }
 
