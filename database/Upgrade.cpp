@@ -77,11 +77,15 @@ int upgraded(const BookPlace& place, const QString& backup, const UpgradeListene
 }  // namespace
 
 QString upgradeBackupFile(const BookPlace& place, int version) {
-    const QString name =
-        u"%1-versao%2-%3.%4"_s.arg(place.name, QString::number(version),
-                                   QDateTime::currentDateTime().toString(u"yyyyMMdd-HHmmss"_s),
-                                   place.isOnServer() ? u"dump"_s : u"db"_s);
-    return QDir(place.isOnServer() ? QDir::homePath() : place.folder).absoluteFilePath(name);
+    const QDir folder(place.isOnServer() ? QDir::homePath() : place.folder);
+    const QString name = folder.absoluteFilePath(
+        u"%1-versao%2-%3"_s.arg(place.name, QString::number(version),
+                                QDateTime::currentDateTime().toString(u"yyyyMMdd-HHmmss"_s)));
+    const QString ending = place.isOnServer() ? u".dump"_s : u".db"_s;
+    QString file = name + ending;
+    for (int number = 2; QFile::exists(file); ++number)
+        file = name + u'-' + QString::number(number) + ending;
+    return file;
 }
 
 int bringUpToDate(const BookPlace& place, const QString& backup, const UpgradeListener& listener) {

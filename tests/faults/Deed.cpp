@@ -209,6 +209,7 @@ private:
 
 bool doAsAsked(const QStringList& words) {
     static Press press;
+    static QStringList last;  // for a press that did not come to a row
     static Screens screens;
     const QString& deed = words.first();
     const QString which = words.value(1);
@@ -220,6 +221,13 @@ bool doAsAsked(const QStringList& words) {
     if (deed == "rubric"_L1) return screens.rubric(which);
     if (deed == "maintenance"_L1) return screens.maintenance();
     if (deed == "close"_L1) return screens.close(which);
+    if (deed == "again"_L1) {
+        if (!press) return doAsAsked(last);
+        const core::HandlerScope handler;
+        return press();
+    }
+    press = nullptr;
+    last = words;
     if (deed == "posting"_L1 || deed == "bill"_L1) press = documentOf(which, deed == "bill"_L1);
     if (deed == "receipt"_L1) press = receipt();
     if (deed == "correction"_L1) press = correction();

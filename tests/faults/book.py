@@ -30,7 +30,7 @@ INSERT INTO tbSocios_Acumulados (socio_id, codABC, rubrica_id, rubrica_id_main, 
 
 # What differs between two runs of the same deed.
 PASSING = {"operacao_id", "quem", "quando", "concluida", "movimento_id", "movimento_no",
-           "correcao_no", "operador", "created_by", "created_date", "cheque"}
+           "correcao_no", "operador", "created_by", "created_date", "cheque", "_linha"}
 
 
 class Broken(Exception):

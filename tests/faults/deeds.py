@@ -88,6 +88,6 @@ DEEDS = [
     Deed("upgrade", command=["upgrade", "--book", BOOK], schema="../database/first/sqlite.sql",
          whole=True,
          tables=("tbSocios", "tbVersao", *ACCOUNT)),
-    Deed("day", "\n".join(f"posting D{number}\nreceipt\nbill B{number}" for number in range(1, 21)),
-         many=12),
+    Deed("day", "\n".join(f"posting D{number}\nreceipt\nbill B{number}" for number in range(1, 61)),
+         many=36),
 ]

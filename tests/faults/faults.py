@@ -309,6 +309,7 @@ def main(programs, form, *names):
     measure = LONG if form == "long" else SHORT
     deeds = [deed for deed in DEEDS if deed.name in names or
              not names and (form == "long" or deed.many == 1)]
+    deeds.sort(key=lambda deed: -deed.many)  # the longest first
     pictures = broken = faults = 0
     with concurrent.futures.ProcessPoolExecutor(os.cpu_count()) as pool:
         jobs = {pool.submit(prove, programs, deed, measure): deed for deed in deeds}
